@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Tells the address sanitizer which bytes of a region nobody owns, so that it finds a use after a
+// discard as it does with the host's heap. Without the sanitizer these are nothing.
+
+#pragma once
+
+#include <cstddef>
+
+#if defined(__SANITIZE_ADDRESS__)
+#include <sanitizer/asan_interface.h>
+#elif defined(__has_feature)
+#if __has_feature(address_sanitizer)
+#include <sanitizer/asan_interface.h>
+#endif
+#endif
+
+namespace alloclib {
+
+#ifdef ASAN_POISON_MEMORY_REGION
+inline void poison(const void* start, size_t bytes) {
+  ASAN_POISON_MEMORY_REGION(start, bytes);
+}
+inline void unpoison(const void* start, size_t bytes) {
+  ASAN_UNPOISON_MEMORY_REGION(start, bytes);
+}
+#else
+inline void poison(const void*, size_t) {}
+inline void unpoison(const void*, size_t) {}
+#endif
+
+} // namespace alloclib

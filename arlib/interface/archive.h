@@ -1,0 +1,220 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// One archive in memory: the ordered list of its members and the decoded symbol table.
+//
+// Reading a file into it is archive_file_reader.h, writing it out archive_file_writer.h. Edits only
+// mark derived data as stale; updateAuxiliaryMembers brings it up to date, and the writer calls it.
+#pragma once
+
+#include "alloclib/interface/region_objects.h"
+#include "arlib/interface/archive_member.h"
+#include "arlib/interface/error_handler.h"
+#include "arlib/interface/file_probe.h"
+#include "arlib/interface/result_list.h"
+#include "arlib/interface/symbol.h"
+#include "checking/interface/checking.h"
+#include "elfext/interface/fast_array.h"
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <optional>
+#include <span>
+#include <string_view>
+#include <utility>
+
+namespace elfext {
+class ErrorHandler;
+}
+
+namespace arlib {
+
+enum class SymbolTableMode : uint32_t {
+  Always = 0,    // keep a symbol table, even an empty one
+  Never = 1,     // never keep one
+  IfSymbols = 2, // keep one only if some member has symbols to publish
+};
+
+class Archive {
+public:
+  static constexpr uint32_t NotFound = 0x80000000;
+
+  // Empty and up to date. The host must outlive the archive.
+  explicit Archive(support::Host& host);
+  // Members' temporary files that no write has released stay on disk.
+  ~Archive() = default;
+  Archive(const Archive&) = delete;
+  Archive& operator=(const Archive&) = delete;
+
+  // Not owned. Null means that failures are silent.
+  void setErrorHandler(ErrorHandler* handler) { m_ErrorHandler = handler; }
+  [[nodiscard]] ErrorHandler* getErrorHandler() const { return m_ErrorHandler; }
+
+  // Not owned; installed in each object that is read for this archive's members.
+  void setElfextErrorHandler(elfext::ErrorHandler* handler) { m_ElfextErrorHandler = handler; }
+  [[nodiscard]] elfext::ErrorHandler* getElfextErrorHandler() const { return m_ElfextErrorHandler; }
+
+  // How symbols are published.
+  void setIncludeDebugSymbols(bool include) { m_IncludeDebugSymbols = include; }
+  [[nodiscard]] bool getIncludeDebugSymbols() const { return m_IncludeDebugSymbols; }
+  void setUniqueSymbolsOnly(bool unique) { m_UniqueSymbolsOnly = unique; }
+  [[nodiscard]] bool getUniqueSymbolsOnly() const { return m_UniqueSymbolsOnly; }
+  void setUseObjectBuildAttributes(bool use) { m_UseObjectBuildAttributes = use; }
+  [[nodiscard]] bool getUseObjectBuildAttributes() const { return m_UseObjectBuildAttributes; }
+
+  // Only on an archive that may be written. Marks the symbol table as stale.
+  void setSymbolTableMode(SymbolTableMode mode);
+  [[nodiscard]] SymbolTableMode getSymbolTableMode() const { return m_SymbolTableMode; }
+
+  // A pointer of the client's own.
+  void setClientData(void* data) { m_ClientData = data; }
+  [[nodiscard]] void* getClientData() const { return m_ClientData; }
+
+  // Copies the name, which may be null. Clears the read-only mark, unless it is the pointer that is
+  // stored already.
+  void setFileName(const char* name);
+  [[nodiscard]] const char* getFileName() const { return m_FileName; }
+
+  [[nodiscard]] bool isReadOnly() const { return m_ReadOnly; }
+  [[nodiscard]] support::Host& getHost() const { return *m_Host; }
+
+  // Removes all members and releases what they hold outside memory.
+  void clear();
+
+  // All members in file order, auxiliary ones included.
+  [[nodiscard]] std::span<ArchiveMember* const> getMembers() const {
+    return {m_ArchiveMembers.begin(), m_ArchiveMembers.getSize()};
+  }
+  // The symbol table's contents as read, in table order.
+  [[nodiscard]] std::span<Symbol* const> getSymbols() const {
+    return {m_Symbols.begin(), m_Symbols.getSize()};
+  }
+  [[nodiscard]] const ArchiveMember* getSymbolTable() const { return m_SymbolTable; }
+  [[nodiscard]] const ArchiveMember* getFileNameTable() const { return m_FileNameTable; }
+
+  // Appends an empty member.
+  ArchiveMember* addMember(std::string_view name, int64_t date, uint32_t uid, uint32_t gid,
+                           uint32_t mode);
+
+  // Appends a member that holds a file, named by the part behind the last separator. The file is
+  // read when the archive is written. Null after a report.
+  ArchiveMember* addMemberFromFile(const char* fileName);
+  ArchiveMember* addMemberFromFile(const char* fileName, const FileProbe& probe);
+
+  // The same for a piece of a file. `reportedName` is the name to use in the report of a piece that
+  // is not inside the file.
+  ArchiveMember* addMemberFromFileRegion(std::string_view memberName, const char* fileName,
+                                         uint32_t offset, uint32_t size,
+                                         std::optional<std::string_view> reportedName);
+
+  // Removes a member, and its symbols from the list of symbols; the order of the rest stays.
+  void removeMember(ArchiveMember* archiveMember);
+  // The same for many members at the cost of one pass; any order, no member twice.
+  void removeMembers(std::span<ArchiveMember* const> archiveMembers);
+
+  // Takes the member out and puts it back at `newIndex`, which counts without it.
+  void moveMember(ArchiveMember* archiveMember, uint32_t newIndex);
+  // Puts the last `count` members, in their order, in front of the one that stands at `newIndex`.
+  void moveLastMembers(uint32_t count, uint32_t newIndex);
+
+  // Position in the list, or NotFound.
+  [[nodiscard]] uint32_t getMemberIndex(const ArchiveMember* archiveMember) const;
+  [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
+
+  // All members of a name, in file order, ignoring ASCII case. False and an empty list if there is
+  // none. Auxiliary members have the empty name.
+  bool findMembers(std::string_view name, ArchiveMemberList& list);
+
+  // All symbols of a name, in table order, letter case counting.
+  bool findSymbols(std::string_view name, SymbolList& list);
+
+  // The symbols that the table as read ascribes to a member: in table order, or sorted by name. The
+  // view holds until the archive changes.
+  [[nodiscard]] std::span<Symbol* const> getDefinedSymbols(const ArchiveMember* archiveMember);
+  [[nodiscard]] std::span<Symbol* const>
+  getSortedDefinedSymbols(const ArchiveMember* archiveMember);
+
+  // Rebuilds what is stale: the long-name table, the symbol table, their places at the front of the
+  // list, and every member's offset. False if one of the tables could not be rebuilt.
+  bool updateAuxiliaryMembers();
+
+  // File size as laid out, in 64 bits, so that a layout too large for the format can be told.
+  [[nodiscard]] uint64_t computeFileSize() const;
+
+  // Report-and-fail in one expression: whether there is a handler and it says to go on.
+  template <class... P, class... A>
+  [[nodiscard]] bool goOn(bool (ErrorHandler::*operation)(const Archive&, P...),
+                          A&&... details) const {
+    return m_ErrorHandler != nullptr &&
+           (m_ErrorHandler->*operation)(*this, std::forward<A>(details)...);
+  }
+
+  // For failures with nothing to go on with: the handler must answer false. Always false.
+  template <class... P, class... A>
+  bool fail(bool (ErrorHandler::*operation)(const Archive&, P...), A&&... details) const {
+    [[maybe_unused]] const bool err_response = goOn(operation, std::forward<A>(details)...);
+    QUARN_ASSERT(1, !err_response);
+    return false;
+  }
+
+private:
+  friend class ArchiveMember;
+  friend class ArchiveFileReader;
+  friend class ArchiveFileWriter;
+  friend class AuxiliaryMembers;
+
+  // An entry of the symbol views: sorted by member, so that each member's symbols lie together.
+  struct SymbolView {
+    elfext::FastArray<Symbol*> byMember;
+    elfext::FastArray<Symbol*> byMemberAndName;
+  };
+
+  ArchiveMember* appendMember(std::string_view regionName);
+  ArchiveMember* appendFileMember(std::string_view regionName, const char* regionFileName,
+                                  uint32_t offset, uint32_t size,
+                                  const support::FileStatus& status);
+  // Whether a piece lies inside a file. If not, the handler decides: on true the piece is cut to
+  // what is there.
+  bool isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
+                    uint32_t& offset, uint32_t& size, int64_t fileSize) const;
+  void markEdited();
+  void sortMembers();
+  void sortSymbols();
+  void groupSymbols();
+  void forgetSymbolsOf(std::span<ArchiveMember* const> archiveMembers);
+  const char* copyToRegion(std::string_view text);
+  std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
+                                     const ArchiveMember* archiveMember) const;
+
+  support::Host* m_Host;
+  // Members, symbols and names. Declared before what lives in them, so destroyed after it.
+  alloclib::RegionOwner m_ObjectRegion;
+  // The arrays below, and the members' bytes.
+  alloclib::RegionOwner m_ContainerRegion;
+  ErrorHandler* m_ErrorHandler = nullptr;
+  elfext::ErrorHandler* m_ElfextErrorHandler = nullptr;
+  const char* m_FileName = nullptr;
+  void* m_ClientData = nullptr;
+  SymbolTableMode m_SymbolTableMode = SymbolTableMode::IfSymbols;
+  bool m_ReadOnly = false;
+  bool m_IncludeDebugSymbols = false;
+  bool m_UniqueSymbolsOnly = false;
+  bool m_UseObjectBuildAttributes = false;
+
+  elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
+  elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;
+  elfext::FastArray<Symbol*> m_Symbols;
+  elfext::FastArray<Symbol*> m_SortedSymbols;
+  SymbolView m_DefinedSymbols;
+  ArchiveMember* m_FileNameTable = nullptr;
+  ArchiveMember* m_SymbolTable = nullptr;
+
+  // What an edit makes stale, and what brings it up to date again.
+  bool m_SortedArchiveMembersUpToDate = true; // findMembers
+  bool m_SortedSymbolsUpToDate = true;        // findSymbols
+  bool m_DefinedSymbolsUpToDate = true;       // getDefinedSymbols
+  bool m_ArchiveMemberOffsetsUpToDate = true; // updateAuxiliaryMembers, as the next two
+  bool m_FileNameTableUpToDate = true;
+  bool m_SymbolTableUpToDate = true;
+};
+
+} // namespace arlib

@@ -1,0 +1,76 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What kind of thing a member's bytes are, and how an object member tells its symbols without the
+// archive knowing the object format. The types hold no data: each has one object in the process,
+// and a member's type is compared by the address of that object.
+#pragma once
+
+#include "arlib/interface/symbol_name_list.h"
+
+#include <cstdint>
+#include <span>
+#include <string>
+
+namespace arlib {
+
+class ArchiveMember;
+
+class ArchiveMemberType {
+public:
+  ArchiveMemberType() = default;
+  ArchiveMemberType(const ArchiveMemberType&) = delete;
+  ArchiveMemberType& operator=(const ArchiveMemberType&) = delete;
+  virtual ~ArchiveMemberType() = default;
+
+  [[nodiscard]] virtual bool isObjectModule() const { return false; }
+  [[nodiscard]] virtual bool isElfImage(const ArchiveMember*) const { return false; }
+  [[nodiscard]] virtual bool isAuxiliaryType() const = 0;
+
+  // The one rule that decides a member's type: an ELF image by the test of its bytes, or unknown.
+  // The auxiliary types are set by the reader and by the rebuild of the tables alone.
+  static const ArchiveMemberType* decide(const ArchiveMember* archiveMember);
+
+  // The same rule for a caller that has the first elfext::RecognizedBytes at hand.
+  static const ArchiveMemberType* decide(std::span<const uint8_t> firstBytes);
+};
+
+// Any file that the archive can't look into.
+class UnknownArchiveMemberType final : public ArchiveMemberType {
+public:
+  static const UnknownArchiveMemberType* getInstance();
+  [[nodiscard]] bool isAuxiliaryType() const override { return false; }
+};
+
+class SymbolTableArchiveMemberType final : public ArchiveMemberType {
+public:
+  static const SymbolTableArchiveMemberType* getInstance();
+  [[nodiscard]] bool isAuxiliaryType() const override { return true; }
+};
+
+class FileNameTableArchiveMemberType final : public ArchiveMemberType {
+public:
+  static const FileNameTableArchiveMemberType* getInstance();
+  [[nodiscard]] bool isAuxiliaryType() const override { return true; }
+};
+
+// An object whose symbols the symbol table publishes.
+class ObjectModuleArchiveMemberType : public ArchiveMemberType {
+public:
+  [[nodiscard]] bool isObjectModule() const override { return true; }
+  [[nodiscard]] bool isAuxiliaryType() const override { return false; }
+
+  // Fills `names` with what the symbol table should hold for this member. False if the object
+  // can't be read; `reason` then says why, or is empty if that has been reported already.
+  virtual bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
+                              std::string& reason) const = 0;
+};
+
+class ElfImageArchiveMemberType final : public ObjectModuleArchiveMemberType {
+public:
+  static const ElfImageArchiveMemberType* getInstance();
+  [[nodiscard]] bool isElfImage(const ArchiveMember* archiveMember) const override;
+  bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
+                      std::string& reason) const override;
+};
+
+} // namespace arlib

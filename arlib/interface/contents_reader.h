@@ -1,0 +1,68 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Reads members' contents in pieces, wherever they are, so that no member has to be in memory as a
+// whole. The file that holds the bytes stays open from one member to the next, as most members of a
+// run come from one file.
+#pragma once
+
+#include "arlib/interface/archive.h"
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <memory>
+#include <span>
+#include <string>
+
+namespace arlib {
+
+class ReadWindow;
+
+class ContentsReader {
+public:
+  // Failures are reported through the archive's handler.
+  explicit ContentsReader(Archive& archive);
+  // Closes without a report what `finish` has not closed.
+  ~ContentsReader();
+  ContentsReader(const ContentsReader&) = delete;
+  ContentsReader& operator=(const ContentsReader&) = delete;
+
+  // Turns to a member. False after a report.
+  bool begin(const ArchiveMember& member);
+
+  // How much of the member has not been read yet, in bytes.
+  [[nodiscard]] uint64_t getRemaining() const { return m_Remaining; }
+
+  // The next piece; empty at the end of the member. It holds until the next call. False after a
+  // report.
+  bool read(std::span<const uint8_t>& piece);
+
+  // Whether so much remains that it is worth letting the host copy it.
+  [[nodiscard]] bool isLarge() const { return m_Remaining >= LargeSize; }
+
+  // Lets the host copy what it can of the rest of the member to the position of `file`.
+  void copyInside(support::FileHandle file);
+
+  // Closes what is open. False after a report.
+  bool finish();
+
+  // The host's error number of the last failure; 0 if a file ended too early.
+  [[nodiscard]] int getError() const { return m_Error; }
+
+private:
+  static constexpr uint64_t LargeSize = 0x40000;
+
+  bool openFile(const char* fileName);
+  bool failToRead(int error);
+
+  Archive& m_Archive;
+  support::Host& m_Host;
+  support::FileHandle m_File;
+  std::string m_FileName; // of the open file
+  std::unique_ptr<ReadWindow> m_Window;
+  const uint8_t* m_Memory = nullptr; // the rest of a member that is in memory
+  uint64_t m_Offset = 0;             // of the rest of a member that is on disk
+  uint64_t m_Remaining = 0;
+  int m_Error = 0;
+};
+
+} // namespace arlib

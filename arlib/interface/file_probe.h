@@ -1,0 +1,41 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// All that the archive wants to know of a file before it takes it in, by one look: what the host
+// tells of it, and its first bytes.
+#pragma once
+
+#include "elfext/interface/format_recognizer.h"
+#include "support/interface/host.h"
+
+#include <array>
+#include <cstdint>
+#include <span>
+
+namespace arlib {
+
+struct FileProbe {
+  support::HostError statusError = 0; // why the host told nothing, or 0
+  support::FileStatus status;
+  std::array<uint8_t, elfext::RecognizedBytes> bytes = {};
+  uint32_t byteCount = 0; // 0 also for a file that can't be opened
+
+  [[nodiscard]] std::span<const uint8_t> firstBytes() const {
+    return std::span(bytes).first(byteCount);
+  }
+  [[nodiscard]] bool exists() const { return status.kind != support::FileKind::Nothing; }
+
+  // Whether the file begins as an archive does.
+  [[nodiscard]] bool hasArchiveMagic() const;
+
+  // Why the file can't become a member: 0, or the error number to report. It must be a regular
+  // file, and the numbers that go in the header must not be negative as signed 32-bit values.
+  [[nodiscard]] support::HostError refusal() const;
+};
+
+// Opens regular files only: looking at a device or a FIFO could have effects, or wait.
+FileProbe probeFile(support::Host& host, const char* fileName);
+
+// What may be said of a file's status alone, as FileProbe::refusal does.
+support::HostError refusalOf(const support::FileStatus& status);
+
+} // namespace arlib

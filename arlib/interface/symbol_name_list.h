@@ -1,0 +1,40 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The names that a member's object publishes, in the object's own symbol order.
+#pragma once
+
+#include "alloclib/interface/region_objects.h"
+#include "checking/interface/checking.h"
+#include "elfext/interface/fast_array.h"
+
+#include <cstdint>
+#include <string_view>
+
+namespace arlib {
+
+class SymbolNameList {
+public:
+  // Names and list live in the region, which must outlive the list.
+  explicit SymbolNameList(alloclib::RegionGeneral* region) : m_Region(region), m_Names(region) {
+    QUARN_ASSERT(1, region != NULL);
+  }
+
+  // Copies the name, so that the object it came from can go.
+  void add(const char* name) {
+    QUARN_ASSERT(1, name != NULL);
+    add(std::string_view(name));
+  }
+  void add(std::string_view name) {
+    m_Names.append(std::string_view(alloclib::copyString(*m_Region, name), name.size()));
+  }
+
+  [[nodiscard]] uint32_t getSize() const { return m_Names.getSize(); }
+  [[nodiscard]] std::string_view operator[](uint32_t index) const { return m_Names[index]; }
+  void clear() { m_Names.setSize(0); }
+
+private:
+  alloclib::RegionGeneral* m_Region;
+  elfext::FastArray<std::string_view> m_Names;
+};
+
+} // namespace arlib

@@ -1,0 +1,345 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/interface/archive.h"
+
+#include "arlib/interface/archive_format.h"
+#include "arlib/interface/name_order.h"
+#include "elfext/interface/sort.h"
+#include "support/interface/path.h"
+
+#include <algorithm>
+#include <cstring>
+#include <functional>
+#include <type_traits>
+
+namespace arlib {
+
+namespace {
+
+constexpr size_t InitialRegionSize = 1024;
+
+// Copies the equal range of a sorted view into a list.
+template <class Element, class List, class Compare>
+bool fillFromSorted(const elfext::FastArray<Element*>& sorted, std::string_view name, List& list,
+                    Compare compareNames) {
+  const auto first =
+      std::partition_point(sorted.begin(), sorted.end(), [&](const Element* element) {
+        return compareNames(element->getName(), name) < 0;
+      });
+  const auto last = std::partition_point(first, sorted.end(), [&](const Element* element) {
+    return compareNames(element->getName(), name) == 0;
+  });
+  const auto count = static_cast<uint32_t>(last - first);
+  list.setSize(count);
+  for (uint32_t i = 0; i < count; ++i)
+    list.set(i, first[i]);
+  return count != 0;
+}
+
+template <class T>
+uint32_t indexOf(const elfext::FastArray<T*>& array, const T* element) {
+  const auto found = std::find(array.begin(), array.end(), element);
+  return found == array.end() ? Archive::NotFound : static_cast<uint32_t>(found - array.begin());
+}
+
+} // namespace
+
+static_assert(std::is_trivially_destructible_v<Symbol>,
+              "symbols die with their region, without a destructor run");
+
+Archive::Archive(support::Host& host)
+    : m_Host(&host), m_ObjectRegion(alloclib::RegionGeneral::Create(
+                         InitialRegionSize, "arlib::Archive::ObjectRegion")),
+      m_ContainerRegion(
+          alloclib::RegionGeneral::Create(InitialRegionSize, "arlib::Archive::ContainerRegion")),
+      m_ArchiveMembers(m_ContainerRegion.get()), m_SortedArchiveMembers(m_ContainerRegion.get()),
+      m_Symbols(m_ContainerRegion.get()), m_SortedSymbols(m_ContainerRegion.get()),
+      m_DefinedSymbols{elfext::FastArray<Symbol*>(m_ContainerRegion.get()),
+                       elfext::FastArray<Symbol*>(m_ContainerRegion.get())} {}
+
+const char* Archive::copyToRegion(std::string_view text) {
+  return alloclib::copyString(*m_ObjectRegion, text);
+}
+
+void Archive::setSymbolTableMode(SymbolTableMode mode) {
+  QUARN_ASSERT(1, !isReadOnly());
+  m_SymbolTableMode = mode;
+  m_SymbolTableUpToDate = false;
+}
+
+void Archive::setFileName(const char* name) {
+  if (name == m_FileName) return;
+  m_ReadOnly = false;
+  if (name != nullptr && m_FileName != nullptr && std::strcmp(name, m_FileName) == 0) return;
+  m_FileName = name == nullptr ? nullptr : copyToRegion(name);
+}
+
+void Archive::clear() {
+  for (ArchiveMember* member : m_ArchiveMembers) {
+    member->releaseContentsLocation();
+    member->freeContents();
+  }
+  m_ArchiveMembers.setSize(0);
+  m_SortedArchiveMembers.setSize(0);
+  m_Symbols.setSize(0);
+  m_SortedSymbols.setSize(0);
+  m_FileNameTable = nullptr;
+  m_SymbolTable = nullptr;
+  m_SortedArchiveMembersUpToDate = true;
+  m_SortedSymbolsUpToDate = true;
+  m_DefinedSymbolsUpToDate = false;
+  m_ArchiveMemberOffsetsUpToDate = true;
+  m_FileNameTableUpToDate = true;
+  m_SymbolTableUpToDate = true;
+}
+
+void Archive::markEdited() {
+  m_FileNameTableUpToDate = false;
+  m_SymbolTableUpToDate = false;
+  m_SortedArchiveMembersUpToDate = false;
+  m_ArchiveMemberOffsetsUpToDate = false;
+}
+
+ArchiveMember* Archive::appendMember(std::string_view regionName) {
+  ArchiveMember* member = alloclib::create<ArchiveMember>(*m_ObjectRegion, this);
+  member->m_Name = regionName;
+  m_ArchiveMembers.append(member);
+  m_SortedArchiveMembersUpToDate = false;
+  return member;
+}
+
+ArchiveMember* Archive::appendFileMember(std::string_view regionName, const char* regionFileName,
+                                         uint32_t offset, uint32_t size,
+                                         const support::FileStatus& status) {
+  ArchiveMember* member = appendMember(regionName);
+  member->m_Date = status.modificationTime;
+  member->m_Uid = static_cast<uint32_t>(status.uid);
+  member->m_Gid = static_cast<uint32_t>(status.gid);
+  member->m_Mode = status.mode;
+  member->m_Size = size;
+  member->setLocation(regionFileName, offset, false);
+  member->m_Modified = true;
+  markEdited();
+  return member;
+}
+
+bool Archive::isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
+                           uint32_t& offset, uint32_t& size, int64_t fileSize) const {
+  const auto available = static_cast<uint64_t>(fileSize);
+  if (offset <= available && size <= available - offset) return true;
+  if (!goOn(&ErrorHandler::reportRegionOutsideFile, fileName, reportedName, offset, size,
+            available)) {
+    return false;
+  }
+  offset = static_cast<uint32_t>(std::min<uint64_t>(offset, available));
+  size = static_cast<uint32_t>(std::min<uint64_t>(size, available - offset));
+  return true;
+}
+
+ArchiveMember* Archive::addMember(std::string_view name, int64_t date, uint32_t uid, uint32_t gid,
+                                  uint32_t mode) {
+  QUARN_ASSERT(1, !m_ReadOnly);
+  ArchiveMember* member = appendMember({copyToRegion(name), name.size()});
+  member->m_Date = date;
+  member->m_Uid = uid;
+  member->m_Gid = gid;
+  member->m_Mode = mode;
+  member->replaceContents(0);
+  member->m_Type = ArchiveMemberType::decide(member);
+  m_FileNameTableUpToDate = false;
+  m_SymbolTableUpToDate = false;
+  return member;
+}
+
+ArchiveMember* Archive::addMemberFromFile(const char* fileName) {
+  QUARN_ASSERT(1, fileName != NULL);
+  return addMemberFromFile(fileName, probeFile(*m_Host, fileName));
+}
+
+ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe& probe) {
+  QUARN_ASSERT(1, fileName != NULL);
+  QUARN_ASSERT(1, !m_ReadOnly);
+  if (const int error = probe.refusal(); error != 0) {
+    fail(&ErrorHandler::reportReadError, fileName, error);
+    return nullptr;
+  }
+  const char* regionFileName = copyToRegion(fileName);
+  ArchiveMember* member =
+      appendFileMember(support::lastPathComponent(regionFileName), regionFileName, 0,
+                       static_cast<uint32_t>(probe.status.size), probe.status);
+  member->m_Type = ArchiveMemberType::decide(probe.firstBytes());
+  return member;
+}
+
+ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, const char* fileName,
+                                                uint32_t offset, uint32_t size,
+                                                std::optional<std::string_view> reportedName) {
+  QUARN_ASSERT(1, fileName != NULL);
+  QUARN_ASSERT(1, !m_ReadOnly);
+  FileProbe probe;
+  probe.statusError = m_Host->status(fileName, probe.status);
+  if (const int error = probe.refusal(); error != 0) {
+    fail(&ErrorHandler::reportReadError, fileName, error);
+    return nullptr;
+  }
+  if (!isInsideFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
+  const std::string_view leaf = support::lastPathComponent(memberName);
+  ArchiveMember* member = appendFileMember({copyToRegion(leaf), leaf.size()},
+                                           copyToRegion(fileName), offset, size, probe.status);
+  member->m_Type = ArchiveMemberType::decide(member);
+  return member;
+}
+
+void Archive::forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers) {
+  const auto isGone = [sortedMembers](const Symbol* symbol) {
+    return std::binary_search(sortedMembers.begin(), sortedMembers.end(),
+                              symbol->getDefiningMember(), std::less<>());
+  };
+  const auto end = std::remove_if(m_Symbols.begin(), m_Symbols.end(), isGone);
+  m_Symbols.setSize(static_cast<uint32_t>(end - m_Symbols.begin()));
+}
+
+void Archive::removeMember(ArchiveMember* archiveMember) {
+  QUARN_ASSERT(1, archiveMember != NULL);
+  removeMembers({&archiveMember, 1});
+}
+
+void Archive::removeMembers(std::span<ArchiveMember* const> archiveMembers) {
+  QUARN_ASSERT(1, !m_ReadOnly);
+  for ([[maybe_unused]] ArchiveMember* archiveMember : archiveMembers) {
+    QUARN_ASSERT(1, archiveMember->m_Archive == this);
+    QUARN_ASSERT(2, m_ArchiveMembers.contains(archiveMember));
+  }
+  // Only to find them fast: the order by address shows nowhere.
+  elfext::FastArray<ArchiveMember*> gone(m_ContainerRegion.get());
+  for (ArchiveMember* archiveMember : archiveMembers)
+    gone.append(archiveMember);
+  std::sort(gone.begin(), gone.end(), std::less<>());
+  const auto isGone = [&gone](ArchiveMember* member) {
+    return std::binary_search(gone.begin(), gone.end(), member, std::less<>());
+  };
+  const auto end = std::remove_if(m_ArchiveMembers.begin(), m_ArchiveMembers.end(), isGone);
+  m_ArchiveMembers.setSize(static_cast<uint32_t>(end - m_ArchiveMembers.begin()));
+  forgetSymbolsOf({gone.begin(), gone.getSize()});
+  m_SortedSymbolsUpToDate = false;
+  m_DefinedSymbolsUpToDate = false;
+  markEdited();
+  for (ArchiveMember* archiveMember : archiveMembers) {
+    archiveMember->releaseContentsLocation();
+    archiveMember->freeContents();
+  }
+}
+
+void Archive::moveMember(ArchiveMember* archiveMember, uint32_t newIndex) {
+  QUARN_ASSERT(1, archiveMember != NULL);
+  QUARN_ASSERT(1, archiveMember->m_Archive == this);
+  QUARN_ASSERT(2, m_ArchiveMembers.contains(archiveMember));
+  QUARN_ASSERT(1, newIndex <= m_ArchiveMembers.getSize());
+  const uint32_t oldIndex = getMemberIndex(archiveMember);
+  if (oldIndex == newIndex) return;
+  m_ArchiveMembers.remove(oldIndex);
+  m_ArchiveMembers.insert(std::min(newIndex, m_ArchiveMembers.getSize()), archiveMember);
+  m_FileNameTableUpToDate = false;
+  m_SymbolTableUpToDate = false;
+  m_SortedArchiveMembersUpToDate = false;
+}
+
+void Archive::moveLastMembers(uint32_t count, uint32_t newIndex) {
+  const uint32_t size = m_ArchiveMembers.getSize();
+  QUARN_ASSERT(1, count <= size && newIndex <= size - count);
+  if (count == 0 || newIndex == size - count) return;
+  std::rotate(m_ArchiveMembers.begin() + newIndex, m_ArchiveMembers.end() - count,
+              m_ArchiveMembers.end());
+  m_FileNameTableUpToDate = false;
+  m_SymbolTableUpToDate = false;
+  m_SortedArchiveMembersUpToDate = false;
+}
+
+uint32_t Archive::getMemberIndex(const ArchiveMember* archiveMember) const {
+  QUARN_ASSERT(1, archiveMember != NULL);
+  QUARN_ASSERT(1, archiveMember->m_Archive == this);
+  return indexOf(m_ArchiveMembers, archiveMember);
+}
+
+uint32_t Archive::getSymbolIndex(const Symbol* symbol) const {
+  QUARN_ASSERT(1, symbol != NULL);
+  return indexOf(m_Symbols, symbol);
+}
+
+void Archive::sortMembers() {
+  if (m_SortedArchiveMembersUpToDate) return;
+  m_SortedArchiveMembers.assign(m_ArchiveMembers);
+  elfext::mergeSort(m_SortedArchiveMembers.span(),
+                    [](const ArchiveMember* left, const ArchiveMember* right) {
+                      return compareIgnoringCase(left->m_Name, right->m_Name);
+                    });
+  m_SortedArchiveMembersUpToDate = true;
+}
+
+bool Archive::findMembers(std::string_view name, ArchiveMemberList& list) {
+  sortMembers();
+  return fillFromSorted(m_SortedArchiveMembers, name, list, compareIgnoringCase);
+}
+
+void Archive::sortSymbols() {
+  if (m_SortedSymbolsUpToDate) return;
+  m_SortedSymbols.assign(m_Symbols);
+  elfext::mergeSort(m_SortedSymbols.span(), [](const Symbol* left, const Symbol* right) {
+    return left->getName().compare(right->getName());
+  });
+  m_SortedSymbolsUpToDate = true;
+}
+
+bool Archive::findSymbols(std::string_view name, SymbolList& list) {
+  sortSymbols();
+  return fillFromSorted(m_SortedSymbols, name, list,
+                        [](std::string_view a, std::string_view b) { return a.compare(b); });
+}
+
+void Archive::groupSymbols() {
+  if (m_DefinedSymbolsUpToDate) return;
+  const auto byMember = [](const Symbol* left, const Symbol* right) {
+    return std::less<>()(left->getDefiningMember(), right->getDefiningMember());
+  };
+  m_DefinedSymbols.byMember.assign(m_Symbols);
+  std::stable_sort(m_DefinedSymbols.byMember.begin(), m_DefinedSymbols.byMember.end(), byMember);
+  m_DefinedSymbols.byMemberAndName.assign(m_DefinedSymbols.byMember);
+  std::stable_sort(m_DefinedSymbols.byMemberAndName.begin(), m_DefinedSymbols.byMemberAndName.end(),
+                   [byMember](const Symbol* left, const Symbol* right) {
+                     if (left->getDefiningMember() != right->getDefiningMember()) {
+                       return byMember(left, right);
+                     }
+                     return left->getName() < right->getName();
+                   });
+  m_DefinedSymbolsUpToDate = true;
+}
+
+std::span<Symbol* const> Archive::symbolsOf(const elfext::FastArray<Symbol*>& symbols,
+                                            const ArchiveMember* archiveMember) const {
+  const auto first =
+      std::partition_point(symbols.begin(), symbols.end(), [&](const Symbol* symbol) {
+        return std::less<const ArchiveMember*>()(symbol->getDefiningMember(), archiveMember);
+      });
+  const auto last = std::partition_point(first, symbols.end(), [&](const Symbol* symbol) {
+    return symbol->getDefiningMember() == archiveMember;
+  });
+  return {first, last};
+}
+
+std::span<Symbol* const> Archive::getDefinedSymbols(const ArchiveMember* archiveMember) {
+  groupSymbols();
+  return symbolsOf(m_DefinedSymbols.byMember, archiveMember);
+}
+
+std::span<Symbol* const> Archive::getSortedDefinedSymbols(const ArchiveMember* archiveMember) {
+  groupSymbols();
+  return symbolsOf(m_DefinedSymbols.byMemberAndName, archiveMember);
+}
+
+uint64_t Archive::computeFileSize() const {
+  uint64_t end = ArchiveMagic.size();
+  for (const ArchiveMember* member : m_ArchiveMembers)
+    end = nextHeaderOffset(end, member->m_Size);
+  return end;
+}
+
+} // namespace arlib

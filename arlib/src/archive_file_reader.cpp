@@ -1,0 +1,350 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/src/archive_file_reader.h"
+
+#include "arlib/interface/archive_file_reader.h"
+#include "support/interface/path.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstring>
+
+namespace arlib {
+
+namespace {
+
+bool isBlank(std::string_view field) {
+  return field.find_first_not_of(' ') == field.npos;
+}
+
+// Header fields are shown as they stand, up to a NUL.
+std::string_view untilNul(std::string_view field) {
+  return field.substr(0, field.find('\0'));
+}
+
+std::string_view asText(std::span<const uint8_t> bytes) {
+  return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+}
+
+} // namespace
+
+bool readFile(const char* fileName, Archive& archive) {
+  QUARN_ASSERT(1, fileName != NULL);
+  return ArchiveFileReader(archive).read(fileName);
+}
+
+bool ArchiveFileReader::read(const char* fileName) {
+  m_Archive.clear();
+  m_Archive.setFileName(fileName);
+  m_Archive.m_ReadOnly = false;
+  m_Archive.m_SymbolTableMode = SymbolTableMode::IfSymbols;
+  m_RegionFileName = m_Archive.getFileName();
+  if (const int error = m_Host.openForReading(fileName, m_File); error != 0) {
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  }
+  const bool isRead = readOpenFile();
+  if (!closeFile() || !isRead || !readSymbolTable()) {
+    m_Archive.clear();
+    return false;
+  }
+  m_Archive.m_ReadOnly = !m_Host.isWritable(fileName);
+  return true;
+}
+
+// A file that can't be closed fails the read, unless it had failed before.
+bool ArchiveFileReader::closeFile() {
+  const int error = m_Host.close(m_File);
+  if (error == 0) return true;
+  return m_Archive.fail(&ErrorHandler::reportCloseError, nullptr, error);
+}
+
+bool ArchiveFileReader::readOpenFile() {
+  if (const int error = m_Host.statusOf(m_File, m_Status); error != 0) {
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  }
+  if (m_Status.kind != support::FileKind::RegularFile) {
+    const int error = m_Status.kind == support::FileKind::Directory ? EISDIR : EINVAL;
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  }
+  m_Window.setFile(m_File);
+  return readMagic() && readMembers();
+}
+
+bool ArchiveFileReader::readMagic() {
+  int error = 0;
+  const std::string_view magic = asText(m_Window.fetch(0, ArchiveMagic.size(), error));
+  if (magic.size() < ArchiveMagic.size()) {
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  }
+  if (magic == ArchiveMagic) return true;
+  return m_Archive.fail(&ErrorHandler::reportBadArchiveMagic);
+}
+
+bool ArchiveFileReader::readMembers() {
+  m_Offset = ArchiveMagic.size();
+  for (;;) {
+    const Pass pass = readMember();
+    if (pass == Pass::End) break;
+    if (pass == Pass::Failure) return false;
+    ++m_Counter;
+  }
+  m_Archive.m_SymbolTableUpToDate = true;
+  m_Archive.m_FileNameTableUpToDate = true;
+  m_Archive.m_ArchiveMemberOffsetsUpToDate = true;
+  return true;
+}
+
+ArchiveFileReader::Pass ArchiveFileReader::readMember() {
+  if (const Pass pass = readHeader(); pass != Pass::Member) return pass;
+  std::string_view name;
+  if (!parseHeader() || !parseName(name)) return Pass::Failure;
+  ArchiveMember* member = addMember(name);
+  if (member == nullptr) return Pass::Failure;
+  const std::string_view nameField = field(NameField);
+  if (m_Counter == 0 && nameField == SymbolTableName) {
+    m_Archive.m_SymbolTable = member;
+    member->m_Type = SymbolTableArchiveMemberType::getInstance();
+  }
+  if (m_Counter <= 1 && nameField == FileNameTableName && m_Archive.m_FileNameTable == nullptr) {
+    m_Archive.m_FileNameTable = member;
+    member->m_Type = FileNameTableArchiveMemberType::getInstance();
+  }
+  if (!(member->isAuxiliary() ? takeAuxiliaryContents(member) : skipContents()) || !skipPadding()) {
+    return Pass::Failure;
+  }
+  m_Offset = nextHeaderOffset(m_Offset, m_Numbers.size);
+  return Pass::Member;
+}
+
+// Takes the first bytes of the contents along with the header: they decide the member's type.
+ArchiveFileReader::Pass ArchiveFileReader::readHeader() {
+  int error = 0;
+  const std::span<const uint8_t> bytes =
+      m_Window.fetch(m_Offset, MemberHeaderSize + elfext::RecognizedBytes, error);
+  if (error != 0) {
+    m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+    return Pass::Failure;
+  }
+  if (bytes.empty()) return Pass::End;
+  if (bytes.size() < MemberHeaderSize) {
+    m_Archive.fail(&ErrorHandler::reportTruncatedMemberHeader, m_Offset);
+    return Pass::Failure;
+  }
+  std::memcpy(m_HeaderBytes, bytes.data(), MemberHeaderSize);
+  m_Header = std::string_view(m_HeaderBytes, MemberHeaderSize);
+  m_FirstBytes.assign(bytes.begin() + MemberHeaderSize, bytes.end());
+  return Pass::Member;
+}
+
+bool ArchiveFileReader::parseHeader() {
+  const std::string_view name = field(NameField);
+  m_MayBeBlank = name == SymbolTableName || name == FileNameTableName;
+  if (field(MagicField) != MemberMagic &&
+      !m_Archive.goOn(&ErrorHandler::reportBadMemberMagic, m_Offset)) {
+    return false;
+  }
+  return parseNumber(DateField, 10, &ErrorHandler::reportBadDate, m_Numbers.date) &&
+         parseNumber(UidField, 10, &ErrorHandler::reportBadUid, m_Numbers.uid) &&
+         parseNumber(GidField, 10, &ErrorHandler::reportBadGid, m_Numbers.gid) &&
+         parseNumber(ModeField, 8, &ErrorHandler::reportBadMode, m_Numbers.mode) && parseSize();
+}
+
+bool ArchiveFileReader::parseNumber(HeaderField which, uint32_t base, FieldReport report,
+                                    uint32_t& value) {
+  const std::string_view text = field(which);
+  if (parseHeaderNumber(text, base, which.width, value)) return true;
+  value = 0;
+  if (m_MayBeBlank && isBlank(text)) return true;
+  return m_Archive.goOn(report, m_Offset, untilNul(text));
+}
+
+bool ArchiveFileReader::parseSize() {
+  const std::string_view text = field(SizeField);
+  if (parseHeaderNumber(text, 10, SizeField.width, m_Numbers.size)) return true;
+  return m_Archive.fail(&ErrorHandler::reportBadSize, m_Offset, untilNul(text));
+}
+
+bool ArchiveFileReader::parseName(std::string_view& name) {
+  m_LongNameIndex = ArchiveMember::NoFileNameTableOffset;
+  name = {};
+  if (m_MayBeBlank) return true;
+  const std::string_view text = field(NameField);
+  if (text[0] == '/' && text[1] >= '0' && text[1] <= '9')
+    return parseLongName(text.substr(1), name);
+  return parseShortName(text, name);
+}
+
+bool ArchiveFileReader::parseLongName(std::string_view digits, std::string_view& name) {
+  if (m_Archive.m_FileNameTable == nullptr) {
+    return m_Archive.goOn(&ErrorHandler::reportNoLongNameTable, m_Offset);
+  }
+  uint32_t index = 0;
+  const auto width = static_cast<uint32_t>(digits.size());
+  if (!parseHeaderNumber(digits, 10, width, index)) {
+    return m_Archive.goOn(&ErrorHandler::reportBadLongNameIndex, m_Offset, untilNul(digits));
+  }
+  m_LongNameIndex = index;
+  size_t end = 0;
+  if (!findLongNameEnd(m_LongNames, index, end)) {
+    return m_Archive.goOn(&ErrorHandler::reportLongNameIndexOutOfRange, m_Offset, index,
+                          static_cast<uint32_t>(m_LongNames.size()));
+  }
+  name = untilNul(m_LongNames.substr(index, end - index));
+  return true;
+}
+
+// An index is out of range behind the table, on an entry's newline, or where no entry ends behind
+// it. The last terminator is known beforehand, so that a table without one is not searched again
+// for each member.
+bool ArchiveFileReader::findLongNameEnd(std::string_view table, uint32_t index, size_t& end) {
+  if (index >= table.size()) return false;
+  if (index > 0 && table[index] == '\n' && table[index - 1] == '/') return false;
+  if (m_LastTerminator == table.npos || index > m_LastTerminator) return false;
+  end = table.find(LongNameTerminator, index);
+  return true;
+}
+
+bool ArchiveFileReader::parseShortName(std::string_view text, std::string_view& name) {
+  const size_t slash = text.find('/');
+  if (slash == text.npos) return m_Archive.goOn(&ErrorHandler::reportNoNameTerminator, m_Offset);
+  if (!isBlank(text.substr(slash + 1))) {
+    return m_Archive.goOn(&ErrorHandler::reportTrailingNameCharacter, m_Offset);
+  }
+  name = untilNul(text.substr(0, slash));
+  return true;
+}
+
+// The host's numbers must fit the format, also for an archive that is only read. Asked once, and
+// only if there is a member at all.
+bool ArchiveFileReader::checkHostFile() {
+  if (m_HostFileIsChecked) return true;
+  m_HostFileIsChecked = true;
+  const int error = refusalOf(m_Status);
+  if (error == 0) return true;
+  return m_Archive.fail(&ErrorHandler::reportReadError, m_RegionFileName, error);
+}
+
+ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
+  if (!checkHostFile()) return nullptr;
+  auto offset = static_cast<uint32_t>(m_Offset + MemberHeaderSize);
+  uint32_t size = m_Numbers.size;
+  if (!m_Archive.isInsideFile(m_RegionFileName, name, offset, size, m_Status.size)) return nullptr;
+  // A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
+  std::string_view leaf = support::lastPathComponent(name);
+  if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
+    leaf = {m_Archive.copyToRegion(leaf), leaf.size()};
+  }
+  ArchiveMember* member =
+      m_Archive.appendFileMember(leaf, m_RegionFileName, offset, size, m_Status);
+  member->m_FileNameTableOffset = m_LongNameIndex;
+  member->m_Date = m_Numbers.date;
+  member->m_Uid = m_Numbers.uid;
+  member->m_Gid = m_Numbers.gid;
+  member->m_Mode = m_Numbers.mode;
+  member->m_Offset = static_cast<uint32_t>(m_Offset);
+  member->m_Modified = false;
+  const std::span<const uint8_t> first = m_FirstBytes;
+  member->m_Type = ArchiveMemberType::decide(first.first(std::min<size_t>(first.size(), size)));
+  return member;
+}
+
+bool ArchiveFileReader::takeAuxiliaryContents(ArchiveMember* member) {
+  const std::span<uint8_t> bytes = member->replaceContents(member->m_Size);
+  member->m_ContentsAreViewed = true;
+  size_t done = 0;
+  const int error = m_Host.readAt(m_File, bytes, m_Offset + MemberHeaderSize, done);
+  if (error != 0 || done < m_Numbers.size) {
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  }
+  if (member == m_Archive.m_FileNameTable) {
+    m_LongNames = asText(bytes);
+    m_LastTerminator = m_LongNames.rfind(LongNameTerminator);
+  }
+  return true;
+}
+
+// A handler may have accepted a member that reaches beyond the end of the file; there is then
+// nothing to go on with behind it.
+bool ArchiveFileReader::skipContents() {
+  if (m_Offset + MemberHeaderSize + m_Numbers.size <= static_cast<uint64_t>(m_Status.size)) {
+    return true;
+  }
+  return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, 0);
+}
+
+bool ArchiveFileReader::skipPadding() {
+  if (m_Numbers.size % 2 == 0) return true;
+  const uint64_t offset = m_Offset + MemberHeaderSize + m_Numbers.size;
+  int error = 0;
+  // The next header comes along, as it will be wanted next.
+  const std::span<const uint8_t> bytes =
+      m_Window.fetch(offset, 1 + MemberHeaderSize + elfext::RecognizedBytes, error);
+  if (bytes.empty()) return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  if (bytes[0] == PaddingByte) return true;
+  return m_Archive.goOn(&ErrorHandler::reportBadPadding, offset, static_cast<int>(bytes[0]));
+}
+
+bool ArchiveFileReader::readSymbolTable() {
+  QUARN_ASSERT(1, m_Archive.m_SymbolTableUpToDate);
+  m_Archive.m_Symbols.setSize(0);
+  m_Archive.m_SortedSymbolsUpToDate = false;
+  m_Archive.m_DefinedSymbolsUpToDate = false;
+  if (m_Archive.m_SymbolTable == nullptr) return true;
+  const std::span<const uint8_t> bytes = m_Archive.m_SymbolTable->getContents();
+  const auto size = static_cast<uint32_t>(bytes.size());
+  if (size < 4) return m_Archive.fail(&ErrorHandler::reportSymbolTableTooShort, size);
+  const uint32_t count = getBigEndian32(bytes.data());
+  const uint64_t required = 4 + 4 * uint64_t{count};
+  if (size < required) {
+    return m_Archive.fail(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
+  }
+  uint64_t offset = ArchiveMagic.size();
+  for (const ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    m_MemberOffsets.push_back(static_cast<uint32_t>(offset));
+    offset = nextHeaderOffset(offset, member->m_Size);
+  }
+  // A name takes at least its NUL, so that no more symbols than bytes are ever reserved for.
+  m_Archive.m_Symbols.reserve(std::min(count, size));
+  const std::string_view text = asText(bytes);
+  size_t position = static_cast<size_t>(required);
+  for (uint32_t i = 0; i < count; ++i) {
+    const size_t end = text.find('\0', position);
+    if (end == text.npos) {
+      return m_Archive.fail(&ErrorHandler::reportSymbolNameUnterminated, i, count);
+    }
+    const std::string_view name = text.substr(position, end - position);
+    if (!addSymbol(i, name, getBigEndian32(bytes.data() + 4 + 4 * size_t{i}))) return false;
+    position = end + 1;
+  }
+  const size_t trailing = text.find_first_not_of('\0', position);
+  if (trailing == text.npos) return true;
+  return m_Archive.goOn(&ErrorHandler::reportSymbolTableTrailingData,
+                        static_cast<uint32_t>(trailing), static_cast<uint32_t>(position));
+}
+
+bool ArchiveFileReader::addSymbol(uint32_t index, std::string_view name, uint32_t offset) {
+  ArchiveMember* member = memberAt(offset);
+  if (member == nullptr) {
+    return m_Archive.goOn(&ErrorHandler::reportSymbolAtNoMember, index, name, offset);
+  }
+  if (member->isAuxiliary()) {
+    return m_Archive.goOn(&ErrorHandler::reportSymbolInNonObject, index, name, offset);
+  }
+  const size_t marker = name.find(AttributeMarker);
+  const std::string_view attributes =
+      marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
+  m_Archive.m_Symbols.append(alloclib::create<Symbol>(
+      *m_Archive.m_ObjectRegion, name.substr(0, marker), attributes, &m_Archive, member));
+  return true;
+}
+
+// Symbols of one member stand together in most tables, so the last answer is tried first.
+ArchiveMember* ArchiveFileReader::memberAt(uint32_t offset) {
+  if (m_LastMember >= m_MemberOffsets.size() || m_MemberOffsets[m_LastMember] != offset) {
+    const auto found = std::lower_bound(m_MemberOffsets.begin(), m_MemberOffsets.end(), offset);
+    if (found == m_MemberOffsets.end() || *found != offset) return nullptr;
+    m_LastMember = static_cast<size_t>(found - m_MemberOffsets.begin());
+  }
+  return m_Archive.m_ArchiveMembers[static_cast<uint32_t>(m_LastMember)];
+}
+
+} // namespace arlib

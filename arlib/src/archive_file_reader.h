@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// One read of an archive file. The order of the checks is the order in which a strictly forward
+// reader would meet the bytes, since the first failure is the one that is told.
+#pragma once
+
+#include "arlib/interface/archive.h"
+#include "arlib/interface/archive_format.h"
+#include "arlib/src/read_window.h"
+
+#include <cstdint>
+#include <span>
+#include <string_view>
+#include <vector>
+
+namespace arlib {
+
+class ArchiveFileReader {
+public:
+  explicit ArchiveFileReader(Archive& archive)
+      : m_Archive(archive), m_Host(archive.getHost()), m_Window(m_Host) {}
+
+  bool read(const char* fileName);
+
+private:
+  using FieldReport = bool (ErrorHandler::*)(const Archive&, uint64_t, std::string_view);
+
+  enum class Pass { Member, End, Failure };
+
+  bool readOpenFile();
+  bool readMagic();
+  bool readMembers();
+  Pass readMember();
+  Pass readHeader();
+  bool parseHeader();
+  bool parseNumber(HeaderField field, uint32_t base, FieldReport report, uint32_t& value);
+  bool parseSize();
+  bool parseName(std::string_view& name);
+  bool parseLongName(std::string_view digits, std::string_view& name);
+  bool parseShortName(std::string_view field, std::string_view& name);
+  bool findLongNameEnd(std::string_view table, uint32_t index, size_t& end);
+  bool checkHostFile();
+  ArchiveMember* addMember(std::string_view name);
+  bool takeAuxiliaryContents(ArchiveMember* member);
+  bool skipContents();
+  bool skipPadding();
+  bool closeFile();
+
+  bool readSymbolTable();
+  bool addSymbol(uint32_t index, std::string_view name, uint32_t offset);
+  ArchiveMember* memberAt(uint32_t offset);
+
+  [[nodiscard]] std::string_view field(HeaderField which) const {
+    return m_Header.substr(which.position, which.width);
+  }
+
+  Archive& m_Archive;
+  support::Host& m_Host;
+  support::FileHandle m_File;
+  ReadWindow m_Window;
+  support::FileStatus m_Status;
+  bool m_HostFileIsChecked = false;
+  const char* m_RegionFileName = nullptr;
+
+  // The member being read.
+  uint64_t m_Offset = 0; // of its header
+  uint32_t m_Counter = 0;
+  char m_HeaderBytes[MemberHeaderSize] = {};
+  std::string_view m_Header; // the same, as text
+  std::vector<uint8_t> m_FirstBytes;
+  bool m_MayBeBlank = false;
+  MemberHeaderNumbers m_Numbers;
+  uint32_t m_LongNameIndex = ArchiveMember::NoFileNameTableOffset;
+
+  // The long-name table's text, and where the last terminator in it starts.
+  std::string_view m_LongNames;
+  size_t m_LastTerminator = std::string_view::npos;
+
+  // The symbol table's look-up: header offset of each member, ascending.
+  std::vector<uint32_t> m_MemberOffsets;
+  size_t m_LastMember = 0;
+};
+
+} // namespace arlib

@@ -1,0 +1,233 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Layout first, then one straight pass: updateAuxiliaryMembers has given each member its offset,
+// and the pass asserts at each member that it has arrived there.
+#include "arlib/interface/archive_file_writer.h"
+
+#include "arlib/interface/archive.h"
+#include "arlib/interface/archive_format.h"
+#include "arlib/interface/contents_reader.h"
+
+#include <array>
+#include <cerrno>
+#include <cinttypes>
+#include <string>
+#include <vector>
+
+namespace arlib {
+
+namespace {
+
+using support::FileKind;
+using support::FileStatus;
+
+// Small writes are gathered up to this size; a body that is larger goes from file to file.
+constexpr size_t BufferSize = 0x40000;
+
+// Collects small pieces and writes large ones.
+class GatheringOutput {
+public:
+  GatheringOutput(support::Host& host, support::FileHandle file) : m_Host(host), m_File(file) {
+    m_Buffer.reserve(BufferSize);
+  }
+
+  [[nodiscard]] int write(std::span<const uint8_t> bytes) {
+    m_Position += bytes.size();
+    if (bytes.size() > BufferSize - m_Buffer.size()) {
+      if (const int error = drain(); error != 0) return error;
+      if (bytes.size() >= BufferSize) return m_Host.write(m_File, bytes);
+    }
+    m_Buffer.insert(m_Buffer.end(), bytes.begin(), bytes.end());
+    return 0;
+  }
+
+  // Writes what is held back, so that the file's position is that of the output.
+  [[nodiscard]] int drain() {
+    if (m_Buffer.empty()) return 0;
+    const int error = m_Host.write(m_File, m_Buffer);
+    m_Buffer.clear();
+    return error;
+  }
+
+  // Takes note of bytes that reached the file another way, after a drain.
+  void addToPosition(uint64_t count) { m_Position += count; }
+
+  [[nodiscard]] uint64_t getPosition() const { return m_Position; }
+  [[nodiscard]] support::FileHandle getFile() const { return m_File; }
+
+private:
+  support::Host& m_Host;
+  support::FileHandle m_File;
+  std::vector<uint8_t> m_Buffer;
+  uint64_t m_Position = 0;
+};
+
+std::span<const uint8_t> asBytes(std::string_view text) {
+  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
+}
+
+std::string nameField(const ArchiveMember& member) {
+  if (member.getType() == FileNameTableArchiveMemberType::getInstance()) return "//";
+  if (member.getType() == SymbolTableArchiveMemberType::getInstance()) return "/";
+  if (member.getName().size() > MaximumShortName) {
+    return "/" + std::to_string(member.getFileNameTableOffset());
+  }
+  return std::string(member.getName()) + "/";
+}
+
+} // namespace
+
+class ArchiveFileWriter {
+public:
+  ArchiveFileWriter(const char* fileName, Archive& archive)
+      : m_FileName(fileName), m_Archive(archive), m_Host(archive.getHost()),
+        m_Target(m_Host.followLinks(fileName)), m_Contents(archive) {}
+
+  bool write();
+
+private:
+  bool createTemporary();
+  bool writeTemporary();
+  bool writeMember(GatheringOutput& output, const ArchiveMember& member);
+  int writeHeader(GatheringOutput& output, const ArchiveMember& member);
+  bool writeContents(GatheringOutput& output, const ArchiveMember& member);
+  bool closeTemporary();
+  bool replaceTarget();
+  bool removeTemporary();
+  void relocateMembers();
+  bool failToWrite(int error) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_TemporaryName.c_str(), error);
+  }
+
+  const char* m_FileName;
+  Archive& m_Archive;
+  support::Host& m_Host;
+  std::string m_Target; // the file that the name leads to
+  FileStatus m_OldStatus;
+  std::string m_TemporaryName;
+  support::FileHandle m_Temporary;
+  ContentsReader m_Contents;
+};
+
+bool writeFile(const char* fileName, Archive& archive) {
+  QUARN_ASSERT(1, fileName != NULL);
+  return ArchiveFileWriter(fileName, archive).write();
+}
+
+bool ArchiveFileWriter::write() {
+  const bool isThere = m_Host.status(m_Target.c_str(), m_OldStatus) == 0;
+  if (isThere && !m_Host.isWritable(m_Target.c_str())) {
+    return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
+  }
+  // A table that could not be rebuilt has been reported; it is written as it stands.
+  m_Archive.updateAuxiliaryMembers();
+  if (m_Archive.computeFileSize() > MaximumFileSize) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, EFBIG);
+  }
+  if (!createTemporary()) return false;
+  if (!writeTemporary()) {
+    [[maybe_unused]] const int error = m_Host.close(m_Temporary);
+    return removeTemporary();
+  }
+  if (!closeTemporary() || !replaceTarget()) return removeTemporary();
+  m_Archive.setFileName(m_FileName);
+  relocateMembers();
+  return true;
+}
+
+// The first free name of lib.a.0, lib.a.1 and so on, beside the target, so that the rename stays
+// within one file system.
+bool ArchiveFileWriter::createTemporary() {
+  int error = EEXIST;
+  for (uint32_t number = 0; error == EEXIST; ++number) {
+    m_TemporaryName = m_Target + "." + std::to_string(number);
+    error = m_Host.createTemporary(m_TemporaryName.c_str(), m_Temporary);
+  }
+  return error == 0 || failToWrite(error);
+}
+
+bool ArchiveFileWriter::writeTemporary() {
+  GatheringOutput output(m_Host, m_Temporary);
+  if (const int error = output.write(asBytes(ArchiveMagic)); error != 0) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+  }
+  for (const ArchiveMember* member : m_Archive.getMembers()) {
+    if (!writeMember(output, *member)) return false;
+  }
+  if (!m_Contents.finish()) return failToWrite(m_Contents.getError());
+  int error = output.drain();
+  if (error == 0) error = m_Host.flush(m_Temporary);
+  return error == 0 || failToWrite(error);
+}
+
+bool ArchiveFileWriter::writeMember(GatheringOutput& output, const ArchiveMember& member) {
+  QUARN_ASSERT(1, output.getPosition() == member.getOffset());
+  if (const int error = writeHeader(output, member); error != 0) return failToWrite(error);
+  if (!writeContents(output, member)) return false;
+  if (member.getSize() % 2 == 0) return true;
+  const int error = output.write({&PaddingByte, 1});
+  return error == 0 || failToWrite(error);
+}
+
+int ArchiveFileWriter::writeHeader(GatheringOutput& output, const ArchiveMember& member) {
+  std::array<uint8_t, MemberHeaderSize> header;
+  putMemberHeader(header, nameField(member),
+                  {static_cast<uint32_t>(member.getDate()), member.getUid(), member.getGid(),
+                   member.getMode(), member.getSize()});
+  return output.write(header);
+}
+
+bool ArchiveFileWriter::writeContents(GatheringOutput& output, const ArchiveMember& member) {
+  if (!m_Contents.begin(member)) return failToWrite(m_Contents.getError());
+  if (m_Contents.isLarge()) {
+    if (const int error = output.drain(); error != 0) return failToWrite(error);
+    const uint64_t before = m_Contents.getRemaining();
+    m_Contents.copyInside(output.getFile());
+    output.addToPosition(before - m_Contents.getRemaining());
+  }
+  for (;;) {
+    std::span<const uint8_t> piece;
+    if (!m_Contents.read(piece)) return failToWrite(m_Contents.getError());
+    if (piece.empty()) return true;
+    if (const int error = output.write(piece); error != 0) return failToWrite(error);
+  }
+}
+
+bool ArchiveFileWriter::closeTemporary() {
+  if (m_OldStatus.kind == FileKind::RegularFile) {
+    m_Host.setPermissions(m_Temporary, m_OldStatus.mode);
+  }
+  const int error = m_Host.close(m_Temporary);
+  if (error == 0) return true;
+  return m_Archive.fail(&ErrorHandler::reportCloseError, m_TemporaryName.c_str(), error);
+}
+
+// Only a regular file is ever replaced: a directory or a device stays what it is.
+bool ArchiveFileWriter::replaceTarget() {
+  if (m_OldStatus.kind == FileKind::Directory || m_OldStatus.kind == FileKind::Special) {
+    const int reason = m_OldStatus.kind == FileKind::Directory ? EISDIR : EINVAL;
+    return m_Archive.fail(&ErrorHandler::reportDeleteError, m_FileName, reason);
+  }
+  const int error = m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
+  if (error == 0) return true;
+  return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+}
+
+// The one way out of every failure. What made it necessary has been reported, so a temporary that
+// can't be removed is not told of as well.
+bool ArchiveFileWriter::removeTemporary() {
+  [[maybe_unused]] const int error = m_Host.remove(m_TemporaryName.c_str());
+  return false;
+}
+
+void ArchiveFileWriter::relocateMembers() {
+  const char* fileName = m_Archive.getFileName();
+  uint64_t offset = ArchiveMagic.size();
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    member->releaseContentsLocation();
+    member->setLocation(fileName, static_cast<uint32_t>(offset + MemberHeaderSize), false);
+    offset = nextHeaderOffset(offset, member->m_Size);
+  }
+}
+
+} // namespace arlib

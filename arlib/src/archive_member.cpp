@@ -1,0 +1,244 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/interface/archive_member.h"
+
+#include "arlib/interface/archive.h"
+#include "arlib/interface/archive_format.h"
+#include "elfext/interface/format_recognizer.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstring>
+#include <string>
+#include <type_traits>
+
+namespace arlib {
+
+static_assert(std::is_trivially_destructible_v<ArchiveMember>,
+              "members die with their region, without a destructor run");
+
+ArchiveMember::ArchiveMember(Archive* archive)
+    : m_Type(UnknownArchiveMemberType::getInstance()), m_Archive(archive) {}
+
+uint32_t ArchiveMember::getOffset() const {
+  QUARN_ASSERT(1, m_Archive->m_ArchiveMemberOffsetsUpToDate);
+  return m_Offset;
+}
+
+bool ArchiveMember::isAuxiliary() const {
+  QUARN_ASSERT(1, m_Type != NULL);
+  return m_Type == SymbolTableArchiveMemberType::getInstance() ||
+         m_Type == FileNameTableArchiveMemberType::getInstance();
+}
+
+void ArchiveMember::setDate(int64_t date) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  m_Date = date;
+}
+
+void ArchiveMember::setUid(uint32_t uid) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  m_Uid = uid;
+}
+
+void ArchiveMember::setGid(uint32_t gid) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  m_Gid = gid;
+}
+
+void ArchiveMember::setMode(uint32_t mode) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  m_Mode = mode;
+}
+
+void ArchiveMember::setName(std::string_view name) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  QUARN_ASSERT(1, !isAuxiliary());
+  if (name == m_Name) return;
+  m_Name = std::string_view(m_Archive->copyToRegion(name), name.size());
+  m_Archive->m_FileNameTableUpToDate = false;
+  m_Archive->m_SortedArchiveMembersUpToDate = false;
+}
+
+std::span<const uint8_t> ArchiveMember::getContents() const {
+  QUARN_ASSERT(1, m_Contents.has_value());
+  return {m_Contents->bytes, m_Contents->size};
+}
+
+const std::optional<ArchiveMember::ContentsLocation>& ArchiveMember::getContentsLocation() const {
+  QUARN_ASSERT(1, m_Type != NULL);
+  return m_ContentsLocation;
+}
+
+std::span<uint8_t> ArchiveMember::replaceContents(uint32_t size) {
+  if (m_Contents && m_Contents->capacity >= size && !m_ContentsAreViewed) {
+    m_Contents->size = size;
+    return {m_Contents->bytes, size};
+  }
+  freeContents();
+  const uint32_t capacity = std::max(size, 1u);
+  m_Contents = Contents{static_cast<uint8_t*>(m_Archive->m_ContainerRegion->allocate(capacity)),
+                        size, capacity};
+  return {m_Contents->bytes, size};
+}
+
+void ArchiveMember::freeContents() {
+  if (m_Contents && !m_ContentsAreViewed) {
+    m_Archive->m_ContainerRegion->discard(m_Contents->bytes, m_Contents->capacity);
+  }
+  m_Contents.reset();
+  m_ContentsAreViewed = false;
+}
+
+void ArchiveMember::setLocation(const char* regionFileName, uint32_t offset, bool isTemporary) {
+  m_ContentsLocation = ContentsLocation{regionFileName, offset, isTemporary};
+}
+
+bool ArchiveMember::readContents(std::span<uint8_t> bytes) {
+  support::Host& host = m_Archive->getHost();
+  const char* fileName = m_ContentsLocation->fileName;
+  support::FileHandle file;
+  if (const int error = host.openForReading(fileName, file); error != 0) {
+    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
+  }
+  size_t done = 0;
+  const int readError = host.readAt(file, bytes, m_ContentsLocation->offset, done);
+  const int closeError = host.close(file);
+  if (readError != 0 || done < bytes.size()) {
+    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, readError);
+  }
+  if (closeError != 0) {
+    return m_Archive->fail(&ErrorHandler::reportCloseError, fileName, closeError);
+  }
+  return true;
+}
+
+bool ArchiveMember::loadContents() {
+  if (m_Contents) return true;
+  QUARN_ASSERT(1, m_ContentsLocation.has_value());
+  if (readContents(replaceContents(m_Size))) return true;
+  freeContents();
+  return false;
+}
+
+bool ArchiveMember::flushContents() {
+  if (m_ContentsLocation) return true;
+  support::Host& host = m_Archive->getHost();
+  std::string name;
+  support::FileHandle file;
+  if (const int error = host.createUnnamedTemporary(name, file); error != 0) {
+    return m_Archive->fail(&ErrorHandler::reportWriteError, name.c_str(), error);
+  }
+  const std::span<const uint8_t> bytes = getContents();
+  const int writeError = host.write(file, bytes.first(std::min<size_t>(m_Size, bytes.size())));
+  const int closeError = host.close(file);
+  if (writeError == 0 && closeError == 0) {
+    setLocation(m_Archive->copyToRegion(name), 0, true);
+    return true;
+  }
+  // Of the two failures the first one is told; a temporary that can't be removed is only litter.
+  [[maybe_unused]] const int removeError = host.remove(name.c_str());
+  if (writeError != 0) {
+    return m_Archive->fail(&ErrorHandler::reportWriteError, name.c_str(), writeError);
+  }
+  return m_Archive->fail(&ErrorHandler::reportCloseError, name.c_str(), closeError);
+}
+
+bool ArchiveMember::discardContents() {
+  flushContents();
+  freeContents();
+  return true;
+}
+
+void ArchiveMember::determineType() {
+  QUARN_ASSERT(1, m_Type == NULL);
+  m_Type = ArchiveMemberType::decide(this);
+}
+
+void ArchiveMember::setContents(const void* data, uint32_t size) {
+  QUARN_ASSERT(1, data != NULL);
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  QUARN_ASSERT(1, m_Type != NULL);
+  std::memcpy(replaceContents(size).data(), data, size);
+  m_Size = size;
+  m_Type = nullptr;
+  determineType();
+  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
+  m_Archive->m_SymbolTableUpToDate = false;
+  m_Modified = true;
+  releaseContentsLocation();
+}
+
+void ArchiveMember::takeFile(const char* fileName, uint32_t offset, uint32_t size,
+                             const FileProbe& probe) {
+  freeContents();
+  // A temporary file of the old contents is left alone: only releaseContentsLocation deletes.
+  setLocation(m_Archive->copyToRegion(fileName), offset, false);
+  m_Size = size;
+  m_Date = probe.status.modificationTime;
+  m_Uid = static_cast<uint32_t>(probe.status.uid);
+  m_Gid = static_cast<uint32_t>(probe.status.gid);
+  m_Mode = probe.status.mode;
+  m_Archive->m_FileNameTableUpToDate = false;
+  m_Archive->m_SymbolTableUpToDate = false;
+  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
+  m_Modified = true;
+}
+
+bool ArchiveMember::setContentsFromFile(const char* fileName) {
+  QUARN_ASSERT(1, fileName != NULL);
+  return setContentsFromFile(fileName, probeFile(m_Archive->getHost(), fileName));
+}
+
+bool ArchiveMember::setContentsFromFile(const char* fileName, const FileProbe& probe) {
+  QUARN_ASSERT(1, m_Type != NULL);
+  if (const int error = probe.refusal(); error != 0) {
+    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
+  }
+  takeFile(fileName, 0, static_cast<uint32_t>(probe.status.size), probe);
+  m_Type = ArchiveMemberType::decide(probe.firstBytes());
+  return true;
+}
+
+bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t offset,
+                                              uint32_t size) {
+  QUARN_ASSERT(1, fileName != NULL);
+  QUARN_ASSERT(1, m_Type != NULL);
+  FileProbe probe;
+  probe.statusError = m_Archive->getHost().status(fileName, probe.status);
+  if (const int error = probe.refusal(); error != 0) {
+    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
+  }
+  if (!m_Archive->isInsideFile(fileName, std::nullopt, offset, size, probe.status.size)) {
+    return false;
+  }
+  takeFile(fileName, offset, size, probe);
+  m_Type = nullptr;
+  determineType();
+  return true;
+}
+
+bool ArchiveMember::clearType() {
+  QUARN_ASSERT(1, !isAuxiliary());
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  QUARN_ASSERT(1, m_Type != NULL);
+  const bool isLoaded = loadContents();
+  // Without its bytes in memory the member must keep its location, or it would have neither.
+  if (isLoaded) releaseContentsLocation();
+  m_Type = nullptr;
+  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
+  m_Archive->m_SymbolTableUpToDate = false;
+  m_Modified = true;
+  return isLoaded;
+}
+
+bool ArchiveMember::releaseContentsLocation() {
+  if (!m_ContentsLocation) return true;
+  const ContentsLocation location = *m_ContentsLocation;
+  m_ContentsLocation.reset();
+  if (!location.isTemporary) return true;
+  const int error = m_Archive->getHost().remove(location.fileName);
+  if (error == 0) return true;
+  return m_Archive->fail(&ErrorHandler::reportDeleteError, location.fileName, error);
+}
+
+} // namespace arlib

@@ -1,0 +1,225 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/src/auxiliary_members.h"
+
+#include "arlib/interface/archive_format.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstring>
+#include <string>
+#include <unordered_set>
+
+namespace arlib {
+
+namespace {
+
+constexpr size_t ScratchRegionSize = 0x100000;
+
+bool hasLongName(const ArchiveMember* member) {
+  return !member->isAuxiliary() && member->getName().size() > MaximumShortName;
+}
+
+} // namespace
+
+bool Archive::updateAuxiliaryMembers() {
+  return AuxiliaryMembers(*this).update();
+}
+
+AuxiliaryMembers::AuxiliaryMembers(Archive& archive)
+    : m_Archive(archive),
+      m_Region(alloclib::RegionGeneral::Create(ScratchRegionSize,
+                                               "arlib::Archive::updateAuxiliaryMembers() region")),
+      m_SymbolHostingMembers(m_Region.get()), m_Output(m_Region.get()) {}
+
+bool AuxiliaryMembers::update() {
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (member->m_Type == nullptr) member->determineType();
+  }
+  if (!m_Archive.m_FileNameTableUpToDate) {
+    m_Archive.m_ArchiveMemberOffsetsUpToDate = false;
+    if (!updateFileNameTable()) return false;
+  }
+  if (!m_Archive.m_SymbolTableUpToDate) {
+    m_Archive.m_ArchiveMemberOffsetsUpToDate = false;
+    if (!updateSymbolTable()) return false;
+  }
+  putTablesInPlace();
+  computeOffsets();
+  return true;
+}
+
+// Moving a table to the front makes nothing stale that was not stale before.
+void AuxiliaryMembers::putTablesInPlace() {
+  uint32_t place = 0;
+  if (m_Archive.m_SymbolTable != nullptr) m_Archive.moveMember(m_Archive.m_SymbolTable, place++);
+  if (m_Archive.m_FileNameTable != nullptr) m_Archive.moveMember(m_Archive.m_FileNameTable, place);
+  m_Archive.m_FileNameTableUpToDate = true;
+  m_Archive.m_SymbolTableUpToDate = true;
+}
+
+void AuxiliaryMembers::computeOffsets() {
+  if (m_Archive.m_ArchiveMemberOffsetsUpToDate) return;
+  uint64_t offset = ArchiveMagic.size();
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    // A layout that doesn't fit in 32 bits is refused by the writer, which sums in 64.
+    member->m_Offset = static_cast<uint32_t>(offset);
+    offset = nextHeaderOffset(offset, member->m_Size);
+  }
+  m_Archive.m_ArchiveMemberOffsetsUpToDate = true;
+}
+
+ArchiveMember* AuxiliaryMembers::appendTable(const ArchiveMemberType* type) {
+  ArchiveMember* table = m_Archive.appendMember("");
+  table->m_Type = type;
+  table->replaceContents(0);
+  return table;
+}
+
+bool AuxiliaryMembers::resizeTable(ArchiveMember* table, uint32_t size) {
+  if (!table->loadContents()) return false;
+  table->replaceContents(size);
+  table->releaseContentsLocation();
+  table->m_Size = size;
+  return true;
+}
+
+// The object is only forgotten: names and symbols may be views of its bytes.
+void AuxiliaryMembers::forgetTable(ArchiveMember*& table) {
+  if (table == nullptr) return;
+  m_Archive.m_ArchiveMembers.remove(m_Archive.getMemberIndex(table));
+  m_Archive.m_SortedArchiveMembersUpToDate = false;
+  table = nullptr;
+}
+
+// Rewritten whole, since the offsets in all headers of long-named members point into it.
+bool AuxiliaryMembers::updateFileNameTable() {
+  uint64_t required = 0;
+  for (const ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (hasLongName(member)) required += member->m_Name.size() + LongNameTerminator.size();
+  }
+  if (required == 0) {
+    forgetTable(m_Archive.m_FileNameTable);
+    m_Archive.m_FileNameTableUpToDate = true;
+    return true;
+  }
+  if (required > MaximumFileSize) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_Archive.getFileName(), EFBIG);
+  }
+  ArchiveMember*& table = m_Archive.m_FileNameTable;
+  if (table == nullptr) table = appendTable(FileNameTableArchiveMemberType::getInstance());
+  const auto requiredFileNameTableSize = static_cast<uint32_t>(required);
+  if (!resizeTable(table, requiredFileNameTableSize)) return false;
+  uint8_t* bytes = table->m_Contents->bytes;
+  uint32_t fileNameTableOffset = 0;
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (!hasLongName(member)) continue;
+    member->m_FileNameTableOffset = fileNameTableOffset;
+    for (const std::string_view part : {member->m_Name, LongNameTerminator}) {
+      std::memcpy(bytes + fileNameTableOffset, part.data(), part.size());
+      fileNameTableOffset += static_cast<uint32_t>(part.size());
+    }
+  }
+  QUARN_ASSERT(1, fileNameTableOffset == requiredFileNameTableSize);
+  m_Archive.m_FileNameTableUpToDate = true;
+  return true;
+}
+
+void AuxiliaryMembers::removeSymbolTable() {
+  forgetTable(m_Archive.m_SymbolTable);
+  m_Archive.m_SymbolTableUpToDate = true;
+}
+
+bool AuxiliaryMembers::updateSymbolTable() {
+  QUARN_ASSERT(1, m_Archive.m_FileNameTableUpToDate);
+  if (m_Archive.m_SymbolTableMode == SymbolTableMode::Never) {
+    removeSymbolTable();
+    return true;
+  }
+  collectSymbolHostingMembers();
+  if (m_SymbolHostingMembers.getSize() == 0 &&
+      m_Archive.m_SymbolTableMode == SymbolTableMode::IfSymbols) {
+    removeSymbolTable();
+    return true;
+  }
+  m_Output.reserve(m_SymbolCount);
+  uint64_t tableSize = 4;
+  addPlainSymbols(tableSize);
+  return makeSymbolTable(tableSize);
+}
+
+// A member that can't be read is told of and has no entries. A handler that says to stop there
+// leaves the table with the members collected so far.
+void AuxiliaryMembers::collectSymbolHostingMembers() {
+  QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (!member->m_Type->isObjectModule()) continue;
+    const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(member->m_Type);
+    auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+    std::string reason;
+    if (!type->getSymbolNames(member, *names, reason) &&
+        !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
+      return;
+    }
+    if (names->getSize() == 0) continue;
+    m_SymbolHostingMembers.append({member, names});
+    m_SymbolCount += names->getSize();
+  }
+}
+
+void AuxiliaryMembers::addPlainSymbols(uint64_t& tableSize) {
+  std::unordered_set<std::string_view> seenNames;
+  for (const HostingMember& hosting : m_SymbolHostingMembers) {
+    for (uint32_t i = 0; i < hosting.names->getSize(); ++i) {
+      const std::string_view name = (*hosting.names)[i];
+      if (m_Archive.m_UniqueSymbolsOnly && !seenNames.insert(name).second) continue;
+      m_Output.append({name, hosting.member});
+      tableSize += 4 + name.size() + 1;
+    }
+  }
+}
+
+bool AuxiliaryMembers::makeSymbolTable(uint64_t tableSize) {
+  if (tableSize > MaximumFileSize) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_Archive.getFileName(), EFBIG);
+  }
+  ArchiveMember*& table = m_Archive.m_SymbolTable;
+  if (table == nullptr) table = appendTable(SymbolTableArchiveMemberType::getInstance());
+  if (!resizeTable(table, static_cast<uint32_t>(tableSize))) return false;
+  computeMemberOffsets(tableSize);
+  fillSymbolTable({table->m_Contents->bytes, table->m_Contents->size});
+  m_Archive.m_SymbolTableUpToDate = true;
+  return true;
+}
+
+// As they will be on disk: symbol table, long-name table, then the other members in list order.
+void AuxiliaryMembers::computeMemberOffsets(uint64_t tableSize) {
+  uint64_t cursor = nextHeaderOffset(ArchiveMagic.size(), tableSize);
+  m_Archive.m_SymbolTable->m_Offset = static_cast<uint32_t>(ArchiveMagic.size());
+  if (ArchiveMember* names = m_Archive.m_FileNameTable; names != nullptr) {
+    names->m_Offset = static_cast<uint32_t>(cursor);
+    cursor = nextHeaderOffset(cursor, names->m_Size);
+  }
+  for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (member->isAuxiliary()) continue;
+    member->m_Offset = static_cast<uint32_t>(cursor);
+    cursor = nextHeaderOffset(cursor, member->m_Size);
+  }
+  m_Archive.m_ArchiveMemberOffsetsUpToDate = true;
+}
+
+void AuxiliaryMembers::fillSymbolTable(std::span<uint8_t> bytes) const {
+  const size_t symbolTableSize = bytes.size();
+  putBigEndian32(bytes.data(), m_Output.getSize());
+  size_t offsetPosition = 4;
+  size_t symbolTablePosition = 4 + 4 * size_t{m_Output.getSize()};
+  for (const OutputEntry& entry : m_Output) {
+    putBigEndian32(bytes.data() + offsetPosition, entry.member->m_Offset);
+    offsetPosition += 4;
+    std::memcpy(bytes.data() + symbolTablePosition, entry.name.data(), entry.name.size());
+    symbolTablePosition += entry.name.size();
+    bytes[symbolTablePosition++] = 0;
+  }
+  QUARN_ASSERT(1, symbolTablePosition == symbolTableSize);
+}
+
+} // namespace arlib

@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// One rebuild of the two tables of an archive. The order of the steps is forced: the symbol table
+// holds the offsets of members, and these depend on the size of the long-name table.
+#pragma once
+
+#include "alloclib/interface/region_objects.h"
+#include "arlib/interface/archive.h"
+#include "arlib/interface/symbol_name_list.h"
+#include "elfext/interface/fast_array.h"
+#include "elfext/interface/fast_hash_set.h"
+#include "elfext/interface/fast_hash_table.h"
+
+#include <cstdint>
+#include <string_view>
+
+namespace arlib {
+
+// All working storage lies in one scratch region that is dropped as a whole.
+class AuxiliaryMembers {
+public:
+  explicit AuxiliaryMembers(Archive& archive);
+
+  // False if one of the tables could not be rebuilt; it then stands as it was.
+  bool update();
+
+private:
+  // Entry i of the table to come: the text of its name, and the member that defines it.
+  struct OutputEntry {
+    std::string_view name;
+    const ArchiveMember* member;
+  };
+
+  struct HostingMember {
+    ArchiveMember* member;
+    SymbolNameList* names;
+  };
+
+  bool updateFileNameTable();
+  bool updateSymbolTable();
+  void removeSymbolTable();
+  void collectSymbolHostingMembers();
+  void addPlainSymbols(uint64_t& tableSize);
+  bool makeSymbolTable(uint64_t tableSize);
+  void computeMemberOffsets(uint64_t tableSize);
+  void fillSymbolTable(std::span<uint8_t> bytes) const;
+  ArchiveMember* appendTable(const ArchiveMemberType* type);
+  bool resizeTable(ArchiveMember* table, uint32_t size);
+  void forgetTable(ArchiveMember*& table);
+  void putTablesInPlace();
+  void computeOffsets();
+
+  Archive& m_Archive;
+  alloclib::RegionOwner m_Region;
+  elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
+  uint32_t m_SymbolCount = 0;
+  elfext::FastArray<OutputEntry> m_Output;
+};
+
+} // namespace arlib

@@ -1,0 +1,46 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/interface/file_probe.h"
+
+#include "arlib/interface/archive_format.h"
+
+#include <algorithm>
+#include <cerrno>
+
+namespace arlib {
+
+using support::FileKind;
+using support::FileStatus;
+
+bool FileProbe::hasArchiveMagic() const {
+  return byteCount >= ArchiveMagic.size() &&
+         std::equal(ArchiveMagic.begin(), ArchiveMagic.end(), bytes.begin());
+}
+
+support::HostError FileProbe::refusal() const {
+  return statusError != 0 ? statusError : refusalOf(status);
+}
+
+support::HostError refusalOf(const FileStatus& status) {
+  if (status.kind == FileKind::Directory) return EISDIR;
+  if (status.kind != FileKind::RegularFile) return EINVAL;
+  const auto isOutside = [](int64_t value) { return value < 0 || value > 0x7FFFFFFF; };
+  if (isOutside(status.modificationTime) || isOutside(status.size) || isOutside(status.uid) ||
+      isOutside(status.gid)) {
+    return EOVERFLOW;
+  }
+  return 0;
+}
+
+FileProbe probeFile(support::Host& host, const char* fileName) {
+  FileProbe probe;
+  probe.statusError = host.status(fileName, probe.status);
+  if (probe.statusError != 0 || probe.status.kind != FileKind::RegularFile) return probe;
+  support::FileHandle file;
+  if (host.openForReading(fileName, file) != 0) return probe;
+  size_t done = 0;
+  if (host.readAt(file, probe.bytes, 0, done) == 0) probe.byteCount = static_cast<uint32_t>(done);
+  if (host.close(file) != 0) probe.byteCount = 0;
+  return probe;
+}
+
+} // namespace arlib

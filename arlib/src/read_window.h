@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A view of a file through a buffer: whoever walks a file in small steps gets its bytes without a
+// host call for each step, and whoever leaps over large bodies doesn't read them.
+#pragma once
+
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+namespace arlib {
+
+class ReadWindow {
+public:
+  explicit ReadWindow(support::Host& host) : m_Host(&host) {}
+
+  // What has been read of another file is forgotten. The file stays the caller's.
+  void setFile(support::FileHandle file) {
+    m_File = file;
+    m_Start = 0;
+    m_Used = 0;
+    m_LastEnd = 0;
+    m_EndsFile = false;
+  }
+
+  // Makes up to `size` bytes at `offset` available; fewer only where the file ends, or on an error.
+  // The view holds until the next call.
+  std::span<const uint8_t> fetch(uint64_t offset, size_t size, support::HostError& error);
+
+private:
+  support::HostError read(uint64_t offset, size_t size);
+
+  // A step over at most so many bytes is part of a walk, and worth reading ahead for. A longer one
+  // is a leap: reading what it leaps over would cost more than the host call that it saves.
+  static constexpr size_t WalkStep = 0x1000;
+  static constexpr size_t AheadSize = 0x8000;
+  // What a leap reads at least: room for a header, its neighbours and a body's first bytes.
+  static constexpr size_t LeapSize = 0x200;
+
+  support::Host* m_Host;
+  support::FileHandle m_File;
+  std::vector<uint8_t> m_Bytes;
+  uint64_t m_Start = 0; // file offset of the first byte
+  size_t m_Used = 0;
+  uint64_t m_LastEnd = 0;  // end of the last request
+  bool m_EndsFile = false; // the file has nothing behind the bytes held
+};
+
+} // namespace arlib

@@ -1,0 +1,18 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A set in a region. Keys compare with ==: pointers by address, texts by their bytes.
+
+#pragma once
+
+#include "elfext/interface/hash_base.h"
+
+namespace elfext {
+
+template <class K>
+class FastHashSet : public HashSetBase<K, RegionStorage> {
+public:
+  explicit FastHashSet(alloclib::Region* region, HashFunction<K> hashFunction = &hashKey<K>)
+      : HashSetBase<K, RegionStorage>(hashFunction, region) {}
+};
+
+} // namespace elfext

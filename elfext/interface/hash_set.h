@@ -1,0 +1,18 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A set on the general heap, for what outlives any region.
+
+#pragma once
+
+#include "elfext/interface/hash_base.h"
+
+namespace elfext {
+
+template <class K>
+class HashSet : public HashSetBase<K, HeapStorage> {
+public:
+  explicit HashSet(HashFunction<K> hashFunction = &hashKey<K>)
+      : HashSetBase<K, HeapStorage>(hashFunction) {}
+};
+
+} // namespace elfext

@@ -1,0 +1,28 @@
+// SPDX-License-Identifier: Apache-2.0
+// printf's formats over typed arguments, in no locale. Conversions are %s %c %d %i %u %x %X %o and
+// %%, with flags, width and precision, "*" for either, and positions as in "%2$s" and "%*1$d", so
+// that a translated text may turn its arguments round. Length letters are read past.
+#pragma once
+
+#include "messages/interface/argument.h"
+
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace messages {
+
+enum FormatStatus : uint8_t {
+  FormatStatus_Done,
+  FormatStatus_BadFormat,        // unknown conversion, or one that does not fit its argument
+  FormatStatus_TooManyArguments, // the format reaches beyond MostFormatArguments
+};
+
+inline constexpr uint32_t MostFormatArguments = 20;
+
+// Appends the formatted text. On another status than Done the text holds what came out before the
+// fault. Arguments that the format does not use are fine.
+[[nodiscard]] FormatStatus appendFormatted(std::string& text, std::string_view format,
+                                           std::span<const Argument> arguments);
+
+} // namespace messages

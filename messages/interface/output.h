@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: Apache-2.0
+// The two streams of the process. All text and all raw bytes for stdout pass through one buffer,
+// so that they come out in the order in which they were written; stderr has no buffer, and stdout
+// is flushed before each write to it. In the tool both are private duplicates of the descriptors:
+// a file that is opened later can never get the number of a closed stdout and be written into.
+#pragma once
+
+#include "messages/interface/output_sink.h"
+
+#include <cstdint>
+#include <string_view>
+
+namespace messages {
+
+enum Stream : uint8_t { Stream_Output, Stream_Error };
+
+// Duplicates stdout and stderr, unless this was done before. What is written to a stream that is
+// closed at this moment is dropped silently.
+void openStreams();
+
+// Flushes stdout and closes both duplicates; what is written afterwards is dropped.
+void closeStreams();
+
+// Puts other sinks in place of the descriptors; null brings the descriptor back. The sinks belong
+// to the caller and must outlive their use. What is still buffered goes to the sink it was
+// written for, and an earlier failure of stdout is forgotten.
+void setOutputSinks(OutputSink* output, OutputSink* error);
+
+// Writes a text with its control bytes as backslash and three octal digits, other than tab and
+// line feed. Bytes above 127 pass as they are.
+void writeText(Stream stream, std::string_view text);
+
+// Writes bytes to stdout unchanged.
+void writeRaw(std::string_view bytes);
+
+// Call at every way out of the process. False if stdout has failed, now or earlier.
+bool flushAll();
+
+// Whether a write to stdout failed; from then on everything for stdout is dropped.
+bool stdoutFailed();
+// The host's error number of that failure, or 0.
+int stdoutError();
+
+} // namespace messages

@@ -1,0 +1,16 @@
+// SPDX-License-Identifier: Apache-2.0
+// Where the bytes of one stream go: a descriptor in the tool, a string in a test.
+#pragma once
+
+#include <string_view>
+
+namespace messages {
+
+class OutputSink {
+public:
+  virtual ~OutputSink() = default;
+  // Takes all the bytes. 0, or the host's error number, after which an unknown part is written.
+  virtual int write(std::string_view bytes) = 0;
+};
+
+} // namespace messages

@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: Apache-2.0
+// The list of catalogues, the look-up of a text, and the choice of a language.
+#include "messages/interface/catalogue.h"
+
+#include "messages/src/english_catalogue.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace messages {
+
+namespace {
+
+struct Catalogue {
+  std::string_view name;
+  std::span<const CatalogueRow> (*rows)();
+};
+
+// Until it has texts of its own, "ja_JP" is a known language that shows the English ones.
+constexpr Catalogue Catalogues[CatalogueCount] = {
+    {"en_US", englishCatalogue},
+    {"ja_JP", englishCatalogue},
+};
+
+struct CodePage {
+  std::string_view name;
+  uint32_t number;
+};
+
+constexpr uint32_t Utf8CodePage = 65001;
+
+// A host without code pages writes UTF-8 as it is, so no other number passes a conversion test.
+constexpr CodePage CodePages[] = {
+    {"UTF-8", Utf8CodePage}, {"utf-8", Utf8CodePage}, {"UTF8", Utf8CodePage},
+    {"utf8", Utf8CodePage},  {"65001", Utf8CodePage}, {"gb2312", 20936},
+    {"20936", 20936},
+};
+
+uint32_t catalogueIndex = EnglishCatalogue;
+uint32_t codePageNumber = Utf8CodePage;
+std::span<const CatalogueRow> externalCatalogue;
+
+// Null if the rows don't have the key.
+const CatalogueRow* findRow(std::span<const CatalogueRow> rows, Key key) {
+  const auto row = std::lower_bound(
+      rows.begin(), rows.end(), key,
+      [](const CatalogueRow& candidate, Key wanted) { return candidate.key < wanted; });
+  return row != rows.end() && row->key == key ? &*row : nullptr;
+}
+
+std::string_view notFoundText(Key key) {
+  static char text[64];
+  const KeyText keyText(key);
+  const int length = std::snprintf(text, sizeof text, "<NotFound Code=%.*s key=0x%.8x>",
+                                   static_cast<int>(keyText.text().size()), keyText.text().data(),
+                                   static_cast<unsigned>(valueOf(key)));
+  return {text, static_cast<size_t>(length)};
+}
+
+template <class Row>
+const Row* findByName(std::span<const Row> rows, std::string_view name) {
+  const auto row =
+      std::find_if(rows.begin(), rows.end(), [name](const Row& r) { return r.name == name; });
+  return row != rows.end() ? &*row : nullptr;
+}
+
+} // namespace
+
+std::span<const CatalogueRow> catalogueRows(uint32_t index) {
+  return Catalogues[index].rows();
+}
+
+std::string_view messageText(Key key) {
+  if (const CatalogueRow* row = findRow(externalCatalogue, key)) return row->text;
+  const CatalogueRow* row = findRow(catalogueRows(catalogueIndex), key);
+  return row ? row->text : notFoundText(key);
+}
+
+void setExternalCatalogue(std::span<const CatalogueRow> rows) {
+  externalCatalogue = rows;
+}
+
+bool setLocale(std::string_view name) {
+  const size_t dot = name.find('.');
+  const bool hasDot = dot != std::string_view::npos;
+  const Catalogue* catalogue =
+      findByName(std::span<const Catalogue>(Catalogues), name.substr(0, dot));
+  const CodePage* codePage =
+      findByName(std::span<const CodePage>(CodePages), hasDot ? name.substr(dot + 1) : name);
+  const bool isValid = hasDot ? catalogue && codePage : catalogue || codePage;
+  if (!isValid) return false;
+  if (catalogue) catalogueIndex = static_cast<uint32_t>(catalogue - Catalogues);
+  if (codePage) codePageNumber = codePage->number;
+  return true;
+}
+
+void resetLocale() {
+  catalogueIndex = EnglishCatalogue;
+  codePageNumber = Utf8CodePage;
+}
+
+uint32_t currentCatalogue() {
+  return catalogueIndex;
+}
+
+uint32_t outputCodePage() {
+  return codePageNumber;
+}
+
+} // namespace messages

@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: Apache-2.0
+// One printf conversion with its flags, and the rendering of each kind of value under it.
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace messages {
+
+struct Conversion {
+  bool isLeftAligned = false; // -
+  bool showsPlus = false;     // +
+  bool showsBlank = false;    // blank
+  bool isAlternate = false;   // #
+  bool isZeroPadded = false;  // 0
+  size_t width = 0;
+  bool hasPrecision = false;
+  size_t precision = 0;
+  char letter = '\0';
+};
+
+// For %s; the precision cuts the text.
+void appendString(std::string& text, const Conversion& conversion, std::string_view value);
+// For %c.
+void appendCharacter(std::string& text, const Conversion& conversion, char value);
+// For %d and %i.
+void appendSigned(std::string& text, const Conversion& conversion, int64_t value);
+// For %u, %o, %x and %X.
+void appendUnsigned(std::string& text, const Conversion& conversion, uint64_t value);
+
+} // namespace messages

@@ -1,0 +1,218 @@
+// SPDX-License-Identifier: Apache-2.0
+// Composing, counting and printing of messages. A line is composed whole and written with one
+// call, so that lines of several processes on one terminal don't mix.
+#include "messages/interface/messages.h"
+
+#include "messages/interface/catalogue.h"
+#include "messages/interface/format.h"
+#include "messages/interface/process_end.h"
+#include "messages/src/message_state.h"
+
+#include <algorithm>
+#include <string>
+
+namespace messages {
+
+constinit MessageState messageState;
+
+namespace {
+
+constexpr size_t LineCapacity = 10240; // bytes; enough for all but the oddest names
+
+struct StyleRow {
+  // By what is known of the location: nothing, file, line, column.
+  std::array<std::string_view, 4> locationFormats;
+  std::array<std::string_view, SeverityCount> prefixes;
+  std::string_view codeFormat;
+};
+
+// clang-format off
+constexpr StyleRow Styles[] = {
+    {{"", "\"%s\": ", "\"%s\", line %u: ", "\"%s\", line %u (column %u): "},
+     {"", "", "", "Warning: ", "Error: ", "Fatal error: ", "Internal fault: "},
+     "%c%.5s: "},
+    {{"%s : ", "%s : ", "%s(%u) : ", "%s(%u,%u) : "},
+     {"", "", "", "warning ", "error ", "Fatal error ", "Internal fault: "},
+     "%c%.4s:  "}, // development environments don't expect a severity letter
+    {{"", "%s: ", "%s:%u: ", "%s:%u:%u: "},
+     {"", "", "", "Warning: ", "Error: ", "Fatal error: ", "Internal fault: "},
+     "%c%.5s: "},
+};
+// clang-format on
+
+// The report of a bad style needs a style itself.
+const StyleRow& currentStyle() {
+  return Styles[messageState.style < std::size(Styles) ? messageState.style : 0];
+}
+
+size_t knownFieldCount(const Location& location) {
+  if (location.file.empty()) return 0;
+  if (location.line == 0) return 1;
+  return location.column == 0 ? 2 : 3;
+}
+
+void appendCode(std::string& line, Key key) {
+  const KeyText keyText(key);
+  appendArguments(line, currentStyle().codeFormat,
+                  ArgumentArray<char, std::string_view>{CodeLetter, keyText.textBehindLetter()});
+}
+
+void appendBody(std::string& line, std::string_view format, std::span<const Argument> arguments) {
+  appendArguments(line, format, arguments);
+  if (!format.empty()) line += '\n';
+}
+
+void checkStyle() {
+  if (messageState.style >= std::size(Styles)) {
+    internalFault("Messages: unexpected diagnostic style %d", messageState.style);
+  }
+}
+
+[[noreturn]] void endWithTooManyArguments() {
+  writeText(Stream_Error, "** NLS Fatal Error: Too many arguments in format string\n");
+  endProcess(1);
+}
+
+uint32_t columnAfter(uint32_t column, std::string_view text) {
+  const size_t lineEnd = text.rfind('\n');
+  if (lineEnd == std::string_view::npos) return column + static_cast<uint32_t>(text.size());
+  return static_cast<uint32_t>(text.size() - lineEnd - 1);
+}
+
+} // namespace
+
+std::string& freshLine() {
+  static std::string line;
+  line.clear();
+  line.reserve(LineCapacity);
+  return line;
+}
+
+void appendArguments(std::string& line, std::string_view format,
+                     std::span<const Argument> arguments) {
+  switch (appendFormatted(line, format, arguments)) {
+  case FormatStatus_Done:
+    return;
+  case FormatStatus_BadFormat:
+    internalFault("Messages: Bad message format %s\n", format);
+  case FormatStatus_TooManyArguments:
+    endWithTooManyArguments();
+  }
+}
+
+void appendLead(std::string& line, const Location* location, uint32_t severity) {
+  const Location place = location ? *location : Location{};
+  const size_t known = knownFieldCount(place);
+  const std::string_view file = known == 0 ? ToolName : place.file;
+  appendArguments(
+      line, currentStyle().locationFormats[known],
+      ArgumentArray<std::string_view, uint32_t, uint32_t>{file, place.line, place.column});
+  line += currentStyle().prefixes[severity];
+}
+
+bool countMessage(uint32_t severity) {
+  MessageState& state = messageState;
+  state.column = 0;
+  ++state.counts[severity];
+  const uint32_t errorSum = state.counts[Severity_Error] + state.counts[Severity_Fatal] +
+                            state.counts[Severity_InternalFault];
+  if (severity >= Severity_Error && errorSum == state.limit + 1) {
+    if (!state.limitHandler) endProcess(1);
+    state.limitHandler();
+  }
+  return severity != Severity_Suppressed;
+}
+
+void initialise() {
+  MessageState& state = messageState;
+  if (state.hasNumberOverrides) state.numberOverride.fill(0);
+  state.hasNumberOverrides = false;
+  state.severityMap = {0, 1, 2, 3, 4, 5, 6};
+  state.counts.fill(0);
+  state.style = 0;
+  setLimit(50, nullptr);
+  state.column = 0;
+  state.diagnosticStream = Stream_Error;
+  resetLocale();
+  setExternalCatalogue({});
+  freshLine();
+  openStreams();
+  installFaultHandlers();
+}
+
+bool reportArguments(uint32_t severityWord, const Location* location, Key key,
+                     std::span<const Argument> arguments) {
+  const uint32_t severity = effectiveSeverity(severityWord, key);
+  if (!countMessage(severity)) return false;
+  checkStyle();
+  std::string& line = freshLine();
+  appendLead(line, location, severity);
+  const std::string_view text = messageText(key);
+  if (severity != Severity_Remark) appendCode(line, key);
+  appendBody(line, text, arguments);
+  writeText(messageState.diagnosticStream, line);
+  return true;
+}
+
+bool reportFormatArguments(uint32_t severityWord, const Location* location, std::string_view format,
+                           std::span<const Argument> arguments) {
+  const uint32_t severity = effectiveSeverity(severityWord, Key{});
+  if (!countMessage(severity)) return false;
+  checkStyle();
+  std::string& line = freshLine();
+  appendLead(line, location, severity);
+  appendBody(line, format, arguments);
+  writeText(messageState.diagnosticStream, line);
+  return true;
+}
+
+void plainMessageArguments(Key key, std::span<const Argument> arguments) {
+  std::string& line = freshLine();
+  appendArguments(line, messageText(key), arguments);
+  messageState.column = columnAfter(messageState.column, line);
+  writeText(messageState.diagnosticStream, line);
+}
+
+void listingMessageArguments(Key key, std::span<const Argument> arguments) {
+  std::string& line = freshLine();
+  appendArguments(line, messageText(key), arguments);
+  if (line.ends_with('\n')) messageState.column = 0;
+  writeText(Stream_Output, line);
+}
+
+Counters counters() {
+  const auto& counts = messageState.counts;
+  return {counts[Severity_Suppressed], counts[Severity_Remark], counts[Severity_Warning],
+          counts[Severity_Error],      counts[Severity_Fatal],  counts[Severity_InternalFault]};
+}
+
+uint32_t errorCount() {
+  return messageState.counts[Severity_Error];
+}
+
+void setLimit(uint32_t limit, LimitHandler handler) {
+  messageState.limit = limit;
+  messageState.limitHandler = handler;
+}
+
+uint32_t style() {
+  return messageState.style;
+}
+
+void setStyle(uint32_t style) {
+  messageState.style = style;
+}
+
+Stream diagnosticStream() {
+  return messageState.diagnosticStream;
+}
+
+void setDiagnosticStream(Stream stream) {
+  messageState.diagnosticStream = stream;
+}
+
+uint32_t column() {
+  return messageState.column;
+}
+
+} // namespace messages

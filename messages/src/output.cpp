@@ -1,0 +1,97 @@
+// SPDX-License-Identifier: Apache-2.0
+// The two streams, and the one routine that every text passes.
+#include "messages/interface/output.h"
+
+#include "messages/src/descriptor_sink.h"
+#include "messages/src/output_buffer.h"
+
+#include <algorithm>
+#include <string>
+#include <unistd.h>
+
+namespace messages {
+
+namespace {
+
+constinit DescriptorSink outputDescriptor;
+constinit DescriptorSink errorDescriptor;
+constinit OutputBuffer outputBuffer(&outputDescriptor);
+constinit OutputSink* errorSink = &errorDescriptor;
+
+// A name with such a byte could otherwise move the cursor, or change a terminal's settings.
+bool mustBeEscaped(char character) {
+  const unsigned char byte = static_cast<unsigned char>(character);
+  return (byte < 32 && byte != '\t' && byte != '\n') || byte == 127;
+}
+
+char octalDigit(unsigned value) {
+  return static_cast<char>('0' + (value & 7));
+}
+
+std::string escaped(std::string_view text) {
+  std::string result;
+  for (const char character : text) {
+    if (!mustBeEscaped(character)) {
+      result += character;
+      continue;
+    }
+    const unsigned byte = static_cast<unsigned char>(character);
+    result += {'\\', octalDigit(byte >> 6), octalDigit(byte >> 3), octalDigit(byte)};
+  }
+  return result;
+}
+
+void writeBytes(Stream stream, std::string_view bytes) {
+  if (stream == Stream_Output) {
+    outputBuffer.append(bytes);
+    return;
+  }
+  outputBuffer.flush();
+  // There is nobody left to tell when stderr fails.
+  static_cast<void>(errorSink->write(bytes));
+}
+
+} // namespace
+
+void openStreams() {
+  outputDescriptor.open(STDOUT_FILENO);
+  errorDescriptor.open(STDERR_FILENO);
+}
+
+void closeStreams() {
+  outputBuffer.flush();
+  outputBuffer.noteError(outputDescriptor.close());
+  static_cast<void>(errorDescriptor.close());
+}
+
+void setOutputSinks(OutputSink* output, OutputSink* error) {
+  outputBuffer.setSink(output ? output : &outputDescriptor);
+  errorSink = error ? error : &errorDescriptor;
+}
+
+void writeText(Stream stream, std::string_view text) {
+  if (std::any_of(text.begin(), text.end(), mustBeEscaped)) {
+    writeBytes(stream, escaped(text));
+    return;
+  }
+  writeBytes(stream, text);
+}
+
+void writeRaw(std::string_view bytes) {
+  outputBuffer.append(bytes);
+}
+
+bool flushAll() {
+  outputBuffer.flush();
+  return !stdoutFailed();
+}
+
+bool stdoutFailed() {
+  return outputBuffer.error() != 0;
+}
+
+int stdoutError() {
+  return outputBuffer.error();
+}
+
+} // namespace messages

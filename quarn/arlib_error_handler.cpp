@@ -1,0 +1,102 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "quarn/arlib_error_handler.h"
+
+#include "arlib/interface/archive.h"
+#include "messages/interface/catalogue.h"
+#include "quarn/reporting.h"
+
+namespace quarn {
+
+using arlib::Archive;
+using arlib::ArchiveMember;
+using arlib::MinorVariantGroup;
+using messages::ErrorWord;
+using messages::FatalWord;
+using messages::Key;
+using messages::RemarkWord;
+using messages::WarningWord;
+
+namespace {
+
+bool reportHostError(Key key, const Archive& archive, int errorNumber) {
+  reportMessage(ErrorWord, key, archive.getFileName(), hostErrorText(errorNumber));
+  return false;
+}
+
+} // namespace
+
+bool ArlibErrorHandler::report(const Archive& archive, arlib::Severity severity,
+                               std::string_view text) {
+  const bool isTolerable = severity != arlib::Severity::Fatal;
+  reportMessage(isTolerable ? WarningWord : ErrorWord,
+                isTolerable ? messages::MalformedArchiveWarning : messages::MalformedArchive,
+                archive.getFileName(), text);
+  return isTolerable;
+}
+
+bool ArlibErrorHandler::reportOutOfMemory(const Archive&) {
+  reportMessage(FatalWord, messages::OutOfMemory);
+  return false;
+}
+
+bool ArlibErrorHandler::reportReadError(const Archive& archive, const char*, int errorNumber) {
+  return reportHostError(messages::ReadingFile, archive, errorNumber);
+}
+
+bool ArlibErrorHandler::reportSeekError(const Archive& archive, const char*, int errorNumber) {
+  return reportHostError(messages::SeekingFile, archive, errorNumber);
+}
+
+bool ArlibErrorHandler::reportCloseError(const Archive& archive, const char*, int errorNumber) {
+  return reportHostError(messages::ClosingFile, archive, errorNumber);
+}
+
+bool ArlibErrorHandler::reportDeleteError(const Archive& archive, const char*, int errorNumber) {
+  return reportHostError(messages::DeletingFile, archive, errorNumber);
+}
+
+bool ArlibErrorHandler::reportWriteError(const Archive& archive, const char*, int errorNumber) {
+  return reportHostError(messages::WritingArchive, archive, errorNumber);
+}
+
+bool ArlibErrorHandler::reportReadOnlyOutput(const Archive& archive, const char*) {
+  reportMessage(ErrorWord, messages::OutputReadOnly, archive.getFileName());
+  return false;
+}
+
+bool ArlibErrorHandler::reportBadArchiveMagic(const Archive& archive) {
+  reportMessage(ErrorWord, messages::NotInArchiveFormat, archive.getFileName());
+  return false;
+}
+
+bool ArlibErrorHandler::reportNoBaseVariant(const Archive&, MinorVariantGroup group) {
+  reportMessage(WarningWord, messages::NoBaseVariant, group.front()->getName());
+  showGroup(group);
+  return true;
+}
+
+bool ArlibErrorHandler::reportMultipleBaseVariants(const Archive&, MinorVariantGroup baseVariants) {
+  reportMessage(WarningWord, messages::MultipleBaseVariants, baseVariants.front()->getName());
+  showGroup(baseVariants);
+  return true;
+}
+
+bool ArlibErrorHandler::reportUndecoratableDifference(const Archive&, const ArchiveMember& member,
+                                                      MinorVariantGroup group) {
+  reportMessage(WarningWord, messages::UndecoratableDifference, member.getName(),
+                group.front()->getName());
+  showGroup(group);
+  return true;
+}
+
+// The lines have a severity of their own, so that they also come when the warning is silenced.
+void ArlibErrorHandler::showGroup(MinorVariantGroup group) const {
+  if (!m_ShowDetails) return;
+  const std::string_view format = messages::messageText(messages::VariantGroupMember);
+  for (size_t i = 0; i < group.size(); ++i) {
+    messages::reportFormat(RemarkWord, nullptr, format, group.front()->getName(), i,
+                           group[i]->getName());
+  }
+}
+
+} // namespace quarn

@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+namespace quarn {
+
+enum class BannerMode { WithHelp, Alone };
+
+// Prints which build this is, and the help, on stdout; at most once a run. `toolName` is the name
+// that the user called the tool by.
+void showBanner(BannerMode mode, const char* toolName);
+
+} // namespace quarn

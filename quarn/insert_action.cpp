@@ -1,0 +1,183 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Names are looked up in a sorted view made once: members that this run has made or replaced are
+// never found again, so the view stays true while the list grows. New members gather at the end
+// of the list, and go to the position in one step when all words are done.
+#include "quarn/actions.h"
+
+#include "arlib/interface/archive_file_reader.h"
+#include "arlib/interface/file_probe.h"
+#include "checking/interface/checking.h"
+#include "quarn/member_names.h"
+#include "quarn/reporting.h"
+#include "support/interface/path.h"
+
+#include <string>
+
+namespace quarn {
+
+using arlib::ArchiveMember;
+using arlib::FileProbe;
+
+namespace {
+
+constexpr uint32_t NormalisedMode = 0100644;
+
+bool mayReplace(UpdateMode mode, int64_t memberTime, int64_t newTime) {
+  switch (mode) {
+  case Update_Always:
+    return true;
+  case Update_IfNotNewer:
+    return memberTime <= newTime;
+  case Update_IfOlder:
+    return memberTime < newTime;
+  }
+  QUARN_ASSERT(1, false);
+  return false;
+}
+
+class Insertion {
+public:
+  explicit Insertion(Run& run)
+      : m_Run(run), m_Archive(run.archive), m_Names(run.archive),
+        m_FirstNew(static_cast<uint32_t>(run.archive.getMembers().size())) {}
+
+  void insert(const std::string& word);
+  void moveNewMembers();
+
+private:
+  bool insertArchive(const std::string& word);
+  void insertMemberOf(const ArchiveMember& source);
+  void insertPlainFile(const std::string& word, const FileProbe& probe);
+  ArchiveMember* addPlainFile(const std::string& word, const FileProbe& probe);
+  bool replacePlainFile(ArchiveMember& member, const std::string& word, const FileProbe& probe);
+  void normalise(ArchiveMember& member) const;
+  void warnIfNotElf(const ArchiveMember& member);
+  void tell(messages::Key key, const ArchiveMember& member) const {
+    verboseMessage(m_Run.settings, key, member.getName());
+  }
+
+  Run& m_Run;
+  arlib::Archive& m_Archive;
+  MemberNames m_Names;
+  uint32_t m_FirstNew;
+  bool m_NonElfWarned = false;
+};
+
+void Insertion::insert(const std::string& word) {
+  const FileProbe probe = arlib::probeFile(m_Archive.getHost(), word.c_str());
+  if (!probe.exists()) {
+    reportMessage(messages::ErrorWord, messages::FileDoesNotExist, word);
+    return;
+  }
+  if (probe.hasArchiveMagic() && insertArchive(word)) return;
+  insertPlainFile(word, probe);
+}
+
+// A file that begins like an archive but can't be read as one is a plain file, and nothing is said
+// of what was wrong with it.
+bool Insertion::insertArchive(const std::string& word) {
+  arlib::Archive source(m_Archive.getHost());
+  if (!arlib::readFile(word.c_str(), source)) return false;
+  for (const ArchiveMember* member : source.getMembers()) {
+    if (!member->isAuxiliary()) insertMemberOf(*member);
+  }
+  return true;
+}
+
+void Insertion::insertMemberOf(const ArchiveMember& source) {
+  const ArchiveMember::ContentsLocation& location = *source.getContentsLocation();
+  ArchiveMember* target = m_Names.findUnmodified(source.getName());
+  const bool isNew = target == nullptr;
+  bool isKept = false;
+  if (isNew) {
+    target = m_Archive.addMemberFromFileRegion(source.getName(), location.fileName, location.offset,
+                                               source.getSize(), std::nullopt);
+    if (target == nullptr) return;
+  } else if (!mayReplace(m_Run.settings.updateMode, target->getDate(), source.getDate())) {
+    isKept = true;
+  } else if (!target->setContentsFromFileRegion(location.fileName, location.offset,
+                                                source.getSize())) {
+    return;
+  }
+  target->setDate(source.getDate());
+  target->setUid(source.getUid());
+  target->setGid(source.getGid());
+  target->setMode(source.getMode());
+  warnIfNotElf(*target);
+  if (!isKept) tell(isNew ? messages::AddedMember : messages::ReplacedMember, *target);
+}
+
+void Insertion::insertPlainFile(const std::string& word, const FileProbe& probe) {
+  const std::string_view leaf =
+      support::lastPathComponent(word).substr(0, support::LongestPathComponent);
+  if (ArchiveMember* existing = m_Names.findUnmodified(leaf); existing != nullptr) {
+    const int64_t time = probe.status.modificationTime;
+    if (time > 0 && !mayReplace(m_Run.settings.updateMode, existing->getDate(), time)) {
+      warnIfNotElf(*existing);
+      return;
+    }
+    if (!replacePlainFile(*existing, word, probe)) return;
+    warnIfNotElf(*existing);
+    tell(messages::ReplacedMember, *existing);
+    return;
+  }
+  ArchiveMember* added = addPlainFile(word, probe);
+  if (added == nullptr) return;
+  warnIfNotElf(*added);
+  tell(messages::AddedMember, *added);
+}
+
+ArchiveMember* Insertion::addPlainFile(const std::string& word, const FileProbe& probe) {
+  ArchiveMember* member = m_Archive.addMemberFromFile(word.c_str(), probe);
+  if (member != nullptr) normalise(*member);
+  return member;
+}
+
+bool Insertion::replacePlainFile(ArchiveMember& member, const std::string& word,
+                                 const FileProbe& probe) {
+  if (!member.setContentsFromFile(word.c_str(), probe)) return false;
+  normalise(member);
+  return true;
+}
+
+void Insertion::normalise(ArchiveMember& member) const {
+  if (!m_Run.settings.normaliseHeaders) return;
+  member.setUid(0);
+  member.setGid(0);
+  member.setMode(NormalisedMode);
+  member.setDate(m_Run.settings.normaliseTime);
+}
+
+void Insertion::warnIfNotElf(const ArchiveMember& member) {
+  if (m_NonElfWarned || member.getType() == arlib::ElfImageArchiveMemberType::getInstance()) return;
+  reportMessage(messages::WarningWord, messages::AddingNonElfObject, member.getName(),
+                m_Run.archiveName());
+  m_NonElfWarned = true;
+}
+
+void Insertion::moveNewMembers() {
+  const auto count = static_cast<uint32_t>(m_Archive.getMembers().size()) - m_FirstNew;
+  if (m_Run.position < 0) return;
+  m_Archive.moveLastMembers(count, static_cast<uint32_t>(m_Run.position));
+  m_Run.position += static_cast<int32_t>(count);
+}
+
+} // namespace
+
+void insertFiles(Run& run) {
+  if (run.openStatus.missing && run.settings.fileList.empty()) {
+    if (run.settings.createArchive) {
+      reportMessage(messages::ErrorWord, messages::NoMembersForCreate);
+    }
+    run.settings.accessMode = Access_None;
+    run.openStatus.missing = false;
+    return;
+  }
+  Insertion insertion(run);
+  for (const std::string& word : run.settings.fileList)
+    insertion.insert(word);
+  insertion.moveNewMembers();
+}
+
+} // namespace quarn

@@ -1,0 +1,88 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The table of contents and the symbol table, as lines on stdout.
+#include "quarn/actions.h"
+
+#include "arlib/interface/archive_format.h"
+#include "checking/interface/checking.h"
+#include "quarn/member_selection.h"
+#include "quarn/reporting.h"
+
+#include <array>
+#include <ctime>
+#include <string>
+
+namespace quarn {
+
+using arlib::ArchiveMember;
+
+namespace {
+
+constexpr size_t DateSize = 18; // bytes, the NUL included
+
+// "rw-r--r--": the low nine bits alone.
+std::string modeText(uint32_t mode) {
+  std::string text = "rwxrwxrwx";
+  for (size_t i = 0; i < text.size(); ++i) {
+    if ((mode >> (text.size() - 1 - i) & 1) == 0) text[i] = '-';
+  }
+  return text;
+}
+
+// In local time. A date that the host can't break down, or that needs more room than there is,
+// is left empty.
+std::string dateText(int64_t date) {
+  const time_t seconds = static_cast<time_t>(date);
+  tm brokenDown = {};
+  if (localtime_r(&seconds, &brokenDown) == nullptr) return {};
+  std::array<char, DateSize> text;
+  return {text.data(), strftime(text.data(), text.size(), "%b %d %H:%M %Y", &brokenDown)};
+}
+
+class Listing final : public MemberRoutine {
+public:
+  explicit Listing(bool isLong) : m_IsLong(isLong) {}
+
+  void operator()(ArchiveMember& member) override {
+    if (!m_IsLong) {
+      messages::listingMessage(messages::ListedMember, member.getName());
+      return;
+    }
+    messages::listingMessage(messages::ListedMemberLong, modeText(member.getMode()),
+                             member.getUid(), member.getGid(), member.getSize(),
+                             dateText(member.getDate()), member.getName(), member.getOffset());
+  }
+
+private:
+  bool m_IsLong;
+};
+
+} // namespace
+
+void listMembers(Run& run) {
+  if (isMissing(run)) return;
+  Listing listing(run.settings.verbose);
+  forEachSelectedMember(run.archive, run.settings.fileList, listing);
+}
+
+void listSymbolTable(Run& run) {
+  if (isMissing(run)) return;
+  run.archive.updateAuxiliaryMembers();
+  if (run.archive.getSymbolTable() == nullptr) {
+    reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.archiveName());
+    return;
+  }
+  std::string shownName;
+  for (const arlib::Symbol* symbol : run.archive.getSymbols()) {
+    shownName = symbol->getName();
+    if (symbol->hasBuildAttributes()) {
+      shownName += arlib::AttributeMarker;
+      shownName += symbol->getAttributeText();
+    }
+    const ArchiveMember* member = symbol->getDefiningMember();
+    messages::listingMessage(messages::ListedSymbol, shownName, member->getName(),
+                             member->getOffset());
+  }
+}
+
+} // namespace quarn

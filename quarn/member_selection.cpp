@@ -1,0 +1,63 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "quarn/member_selection.h"
+
+#include "quarn/reporting.h"
+#include "support/interface/host_files.h"
+#include "support/interface/path.h"
+#include "support/interface/pattern.h"
+
+namespace quarn {
+
+using arlib::ArchiveMember;
+
+namespace {
+
+std::string_view leafOf(std::string_view name) {
+  return support::lastPathComponent(name).substr(0, support::LongestPathComponent);
+}
+
+bool leafMatches(std::string_view pattern, const ArchiveMember& member) {
+  return support::matchesPattern(pattern, leafOf(member.getName()), false);
+}
+
+} // namespace
+
+bool memberMatches(const ArchiveMember& member, std::string_view word) {
+  return leafMatches(leafOf(word), member);
+}
+
+std::vector<ArchiveMember*> MemberSelection::find(std::string_view word) const {
+  const std::string_view pattern = leafOf(word);
+  // A name that is cut for the comparison is not the name that the look-up knows.
+  if (!support::hasWildcard(pattern) && pattern.size() < support::LongestPathComponent) {
+    const std::span<ArchiveMember* const> named = m_Names.find(pattern);
+    return {named.begin(), named.end()};
+  }
+  std::vector<ArchiveMember*> found;
+  for (ArchiveMember* member : m_Archive.getMembers()) {
+    if (!member->isAuxiliary() && leafMatches(pattern, *member)) found.push_back(member);
+  }
+  return found;
+}
+
+void forEachSelectedMember(arlib::Archive& archive, const std::vector<std::string>& words,
+                           MemberRoutine& routine) {
+  if (words.empty()) {
+    for (ArchiveMember* member : archive.getMembers()) {
+      if (!member->isAuxiliary()) routine(*member);
+    }
+    return;
+  }
+  const MemberSelection selection(archive);
+  for (const std::string& word : words) {
+    const std::vector<ArchiveMember*> members = selection.find(word);
+    for (ArchiveMember* member : members)
+      routine(*member);
+    if (members.empty()) {
+      reportMessage(messages::ErrorWord, messages::NotPresentInArchive, word,
+                    archive.getFileName());
+    }
+  }
+}
+
+} // namespace quarn

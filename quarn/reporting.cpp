@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "quarn/reporting.h"
+
+#include "quarn/start_up.h"
+
+#include <cstring>
+
+namespace quarn {
+
+void endAfterFatalMessage() {
+  shutDown(1);
+}
+
+// The process never leaves the C locale, so the text is the same for every user.
+std::string hostErrorText(int errorNumber) {
+  return std::strerror(errorNumber);
+}
+
+} // namespace quarn

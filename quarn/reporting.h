@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// How the driver reports. Texts are chosen by key; whatever comes from outside is an argument.
+#pragma once
+
+#include "messages/interface/messages.h"
+
+#include <string>
+
+namespace quarn {
+
+// Ends the process with status 1; does not return.
+[[noreturn]] void endAfterFatalMessage();
+
+// Prints a catalogue message. A severity word of fatal or above ends the process. Returns whether
+// something was printed.
+template <class... Arguments>
+bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&... arguments) {
+  const bool isPrinted = messages::report(severityWord, nullptr, key, arguments...);
+  if (severityWord >= messages::FatalWord) endAfterFatalMessage();
+  return isPrinted;
+}
+
+// The host's text for an error number; "Success" for 0.
+std::string hostErrorText(int errorNumber);
+
+} // namespace quarn

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "quarn/start_up.h"
+
+#include "alloclib/interface/region.h"
+#include "messages/interface/messages.h"
+#include "messages/interface/output.h"
+#include "messages/interface/process_end.h"
+#include "quarn/quarn_main.h"
+#include "quarn/reporting.h"
+#include "support/interface/tool_name.h"
+
+#include <array>
+#include <cstdlib>
+
+namespace quarn {
+
+namespace {
+
+constexpr size_t DriverRegionSize = 1024;
+
+alloclib::RegionGeneral* driverRegion = nullptr;
+
+// What stdout could not take must not look like success to whoever reads the status only.
+void reportFailedOutput() {
+  if (messages::flushAll()) return;
+  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, "stdout",
+                hostErrorText(messages::stdoutError()));
+}
+
+} // namespace
+
+void startUp(int argc, const char* const* argv, support::Host& host) {
+  alloclib::initialise();
+  driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
+  messages::initialise();
+  messages::setExitHandler(shutDown);
+  std::array<char, support::ToolNameSize> toolName;
+  support::toolNameFrom(argc > 0 ? argv[0] : nullptr, toolName);
+  quarnMain(argc, argv, toolName.data(), host, *driverRegion);
+  reportFailedOutput();
+  shutDown(messages::errorCount() != 0 ? 1 : 0);
+}
+
+// Objects of the work may still be alive where a message ends the run, so regions are left to the
+// host then.
+void shutDown(int code) {
+  messages::closeStreams();
+  std::exit(code);
+}
+
+} // namespace quarn

@@ -1,0 +1,122 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The host: every file operation of the product goes through this one interface, so that tests can
+// put another host in its place (a map in memory, a disk that is full, a k-th call that fails).
+//
+// Errors come back as the host's own error number (errno), at once; 0 is success. Nothing is kept
+// in a process-wide error variable between two calls. Names are NUL-terminated byte strings; only
+// "/" separates their parts.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <span>
+#include <string>
+#include <vector>
+
+namespace support {
+
+// The host's error number; 0 means success.
+using HostError = int;
+
+enum class FileKind : uint8_t {
+  Nothing,     // no such name, or the host refuses to say
+  RegularFile, // an ordinary file
+  Directory,
+  Special, // a device, FIFO or socket: never opened, never removed
+};
+
+// What the host knows of a file, all in 64 bits: the caller narrows, with checks.
+struct FileStatus {
+  FileKind kind = FileKind::Nothing;
+  int64_t size = 0;             // bytes
+  int64_t modificationTime = 0; // seconds since 1970
+  int64_t uid = 0;
+  int64_t gid = 0;
+  uint32_t mode = 0; // type and permission bits, as in st_mode
+  uint64_t device = 0;
+  uint64_t inode = 0;
+
+  [[nodiscard]] bool isSameFile(const FileStatus& other) const {
+    return kind != FileKind::Nothing && kind == other.kind && device == other.device &&
+           inode == other.inode;
+  }
+};
+
+// An open file. A plain number, so that it can be copied; whoever opened it closes it.
+struct FileHandle {
+  int number = -1;
+
+  [[nodiscard]] bool isOpen() const { return number >= 0; }
+};
+
+class Host {
+public:
+  virtual ~Host() = default;
+
+  // Opens an existing file. Never waits, also not on a FIFO.
+  [[nodiscard]] virtual HostError openForReading(const char* name, FileHandle& file) = 0;
+
+  // Creates a file that must not exist yet (else EEXIST). It is a temporary: should a signal end
+  // the process before `rename` or `remove` was called with its name, the host removes it.
+  [[nodiscard]] virtual HostError createTemporary(const char* name, FileHandle& file) = 0;
+
+  // Creates a temporary with a name of the host's choice in a writable place, and stores the name.
+  [[nodiscard]] virtual HostError createUnnamedTemporary(std::string& name, FileHandle& file) = 0;
+
+  // Creates a file, or empties the one that is there.
+  [[nodiscard]] virtual HostError openForWriting(const char* name, FileHandle& file) = 0;
+
+  // Reads up to bytes.size() bytes at `offset`; `done` is how many there were. Fewer than asked
+  // for with a result of 0 means that the file ends there.
+  [[nodiscard]] virtual HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                                         size_t& done) = 0;
+
+  // Writes all bytes at the file's position, or fails.
+  [[nodiscard]] virtual HostError write(FileHandle file, std::span<const uint8_t> bytes) = 0;
+
+  // Lets the host copy up to `size` bytes from `offset` of one file to the position of another,
+  // without passing them through the process. Returns how many it copied, which may be none: the
+  // caller goes on with readAt and write, and learns of any error there.
+  [[nodiscard]] virtual uint64_t copyInside(FileHandle from, uint64_t offset, uint64_t size,
+                                            FileHandle to) = 0;
+
+  // Hands over what the host has held back of earlier writes, so that a full disk shows here and
+  // not at the close.
+  [[nodiscard]] virtual HostError flush(FileHandle file) = 0;
+
+  // The handle is closed in any case.
+  [[nodiscard]] virtual HostError close(FileHandle file) = 0;
+
+  // Puts `from` in the place of `to` in one step: at no moment is there no `to`.
+  [[nodiscard]] virtual HostError rename(const char* from, const char* to) = 0;
+
+  [[nodiscard]] virtual HostError remove(const char* name) = 0;
+
+  // Links are followed. A name that isn't there gives an error and the kind Nothing.
+  [[nodiscard]] virtual HostError status(const char* name, FileStatus& status) = 0;
+  [[nodiscard]] virtual HostError statusOf(FileHandle file, FileStatus& status) = 0;
+
+  // Whether the file may be written, by the host's access test.
+  [[nodiscard]] virtual bool isWritable(const char* name) = 0;
+
+  // Best effort: the permission bits of `mode`.
+  virtual void setPermissions(FileHandle file, uint32_t mode) = 0;
+
+  // The name that a chain of symbolic links leads to, also when nothing is there. A name that is
+  // no link is returned as it is.
+  [[nodiscard]] virtual std::string followLinks(const char* name) = 0;
+
+  // All names of a directory but "." and "..", in the host's order.
+  [[nodiscard]] virtual HostError listDirectory(const char* name,
+                                                std::vector<std::string>& names) = 0;
+};
+
+// The host that the process runs on.
+Host& posixHost();
+
+// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of posixHost() before they
+// end the process, and a file size limit shows as a failed write instead of a signal.
+void installSignalCleanUp();
+
+} // namespace support

@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: Apache-2.0
+// A file name taken apart, so that its leaf can be replaced. Nothing is lost: an unchanged path
+// gives back the text it was made from, but for the separators of a Windows name.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace support {
+
+enum PathStyle : uint32_t {
+  PathStyle_Detect = 0,
+  PathStyle_Windows = 2,
+  PathStyle_Posix = 3,
+  PathStyle_Undetermined = 5, // treated as a Windows name
+};
+
+// No name that a host takes as a member or leaf is longer; longer ones are cut.
+inline constexpr size_t LongestPathComponent = 1029; // bytes
+
+class path {
+public:
+  // With PathStyle_Detect the style is worked out from the name. In a POSIX name only "/"
+  // separates, there is no drive, and the directory is kept byte for byte; in a Windows name "/"
+  // and "\" both separate, and both become "\".
+  explicit path(std::string_view name, PathStyle style = PathStyle_Detect);
+
+  PathStyle style() const { return m_Style; }
+  const std::string& drive() const { return m_Drive; }         // "c:" or "\\server\share"
+  const std::string& directory() const { return m_Directory; } // with its last separator
+  const std::string& base() const { return m_Base; }
+  const std::string& extension() const { return m_Extension; } // with its "."; may be empty
+  std::string leaf() const { return m_Base + m_Extension; }
+
+  void replaceLeaf(std::string_view leaf);
+  std::string toString() const;
+
+private:
+  std::string m_Drive;
+  std::string m_Directory;
+  std::string m_Base;
+  std::string m_Extension;
+  PathStyle m_Style;
+};
+
+// PathStyle_Windows, PathStyle_Posix or PathStyle_Undetermined.
+PathStyle detectPathStyle(std::string_view name);
+
+// What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
+std::string_view lastPathComponent(std::string_view name);
+
+} // namespace support

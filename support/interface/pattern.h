@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: Apache-2.0
+// The patterns of file_list words: "*" is any run of characters, also none, and "?" any one
+// character. There are no sets and no escapes.
+#pragma once
+
+#include <string_view>
+
+namespace support {
+
+// Whether the pattern matches the whole text. Without caseSensitive, A-Z and a-z are equal; other
+// bytes are themselves in any case.
+bool matchesPattern(std::string_view pattern, std::string_view text, bool caseSensitive);
+
+} // namespace support

@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "support/interface/host_files.h"
+
+#include "support/interface/pattern.h"
+
+#include <algorithm>
+
+namespace support {
+
+FileKind fileKind(Host& host, const char* name) {
+  FileStatus status;
+  if (host.status(name, status) != 0) return FileKind::Nothing;
+  return status.kind;
+}
+
+int64_t fileTime(Host& host, const char* name) {
+  FileStatus status;
+  if (host.status(name, status) != 0) return -1;
+  return status.modificationTime;
+}
+
+bool hasWildcard(std::string_view text) {
+  return text.find_first_of("?*") != std::string_view::npos;
+}
+
+std::string_view directoryPart(std::string_view word) {
+  const size_t slash = word.rfind('/');
+  return slash == std::string_view::npos ? std::string_view() : word.substr(0, slash + 1);
+}
+
+std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
+                                        std::string_view leaf) {
+  const std::string place = directory.empty() ? std::string("./") : std::string(directory);
+  std::vector<std::string> names;
+  if (host.listDirectory(place.c_str(), names) != 0) return {};
+  std::erase_if(names,
+                [leaf](const std::string& name) { return !matchesPattern(leaf, name, true); });
+  std::sort(names.begin(), names.end());
+  return names;
+}
+
+} // namespace support

@@ -1,0 +1,70 @@
+// SPDX-License-Identifier: Apache-2.0
+// Parsing of path names. Each string takes its front off what is left of the name, so that
+// rebuilding is plain joining.
+#include "support/interface/path.h"
+
+#include <algorithm>
+
+namespace support {
+
+namespace {
+
+constexpr std::string_view AnySeparator = "/\\";
+
+bool isSeparator(char character) {
+  return AnySeparator.find(character) != std::string_view::npos;
+}
+
+// The length of "\\server\share" in a name that begins with two separators.
+size_t shareLength(std::string_view name) {
+  const size_t serverEnd = std::min(name.find('\\', 2), name.size());
+  return std::min(name.find('\\', serverEnd + 1), name.size());
+}
+
+size_t driveLength(std::string_view name) {
+  if (name.size() >= 2 && name[1] == ':') return 2;
+  return name.starts_with("\\\\") ? shareLength(name) : 0;
+}
+
+std::string takeFront(std::string_view& rest, size_t length) {
+  std::string front(rest.substr(0, length));
+  rest.remove_prefix(length);
+  return front;
+}
+
+} // namespace
+
+PathStyle detectPathStyle(std::string_view name) {
+  if (name.size() >= 2 && name[1] == ':') return PathStyle_Windows;
+  if (name.starts_with('\\') || name.starts_with("//")) return PathStyle_Windows;
+  if (name.starts_with('/')) return PathStyle_Posix;
+  return name.find('\\') == std::string_view::npos ? PathStyle_Undetermined : PathStyle_Windows;
+}
+
+std::string_view lastPathComponent(std::string_view name) {
+  return name.substr(name.find_last_of(AnySeparator) + 1);
+}
+
+path::path(std::string_view name, PathStyle style)
+    : m_Style(style == PathStyle_Detect ? detectPathStyle(name) : style) {
+  std::string normalised(name);
+  const bool isPosix = m_Style == PathStyle_Posix;
+  if (!isPosix) std::replace_if(normalised.begin(), normalised.end(), isSeparator, '\\');
+
+  std::string_view rest = normalised;
+  m_Drive = takeFront(rest, isPosix ? 0 : driveLength(rest));
+  m_Directory = takeFront(rest, rest.rfind(isPosix ? '/' : '\\') + 1);
+  replaceLeaf(rest);
+}
+
+void path::replaceLeaf(std::string_view leaf) {
+  leaf = leaf.substr(0, LongestPathComponent);
+  m_Base = takeFront(leaf, std::min(leaf.rfind('.'), leaf.size()));
+  m_Extension = leaf;
+}
+
+std::string path::toString() const {
+  return m_Drive + m_Directory + m_Base + m_Extension;
+}
+
+} // namespace support

@@ -1,0 +1,277 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The POSIX host. Two things here are more than one call each:
+//
+// Temporaries. A file made by createTemporary is entered in a small table until it is renamed or
+// removed. The signal handler walks that table with `unlink` alone, which is allowed in a handler;
+// the signals are held back while the table and the disk disagree.
+//
+// Copying. `copy_file_range` keeps the bytes out of the process where both files lie on a file
+// system that can do it. It is an offer only: whatever it doesn't copy goes through read and write,
+// which tell the reading side's errors from the writing side's.
+#include "support/interface/host.h"
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <dirent.h>
+#include <fcntl.h>
+#include <memory>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace support {
+
+namespace {
+
+constexpr std::array<int, 4> EndingSignals = {SIGINT, SIGTERM, SIGHUP, SIGPIPE};
+
+// One archive is written at a time, and its members rarely have temporaries of their own; what
+// finds no room here is simply not removed by a signal.
+constexpr size_t MaximumTemporaries = 16;
+constexpr size_t MaximumTemporaryName = 4096;
+
+struct TemporarySlot {
+  volatile sig_atomic_t isUsed = 0;
+  char name[MaximumTemporaryName] = {};
+};
+
+std::array<TemporarySlot, MaximumTemporaries> temporarySlots;
+
+// Holds the ending signals back while it lives.
+class SignalHold {
+public:
+  SignalHold() {
+    sigset_t ending;
+    sigemptyset(&ending);
+    for (const int signal : EndingSignals)
+      sigaddset(&ending, signal);
+    sigprocmask(SIG_BLOCK, &ending, &m_Before);
+  }
+  ~SignalHold() { sigprocmask(SIG_SETMASK, &m_Before, nullptr); }
+  SignalHold(const SignalHold&) = delete;
+  SignalHold& operator=(const SignalHold&) = delete;
+
+private:
+  sigset_t m_Before;
+};
+
+void enterTemporary(const char* name) {
+  const size_t length = std::strlen(name);
+  if (length >= MaximumTemporaryName) return;
+  for (TemporarySlot& slot : temporarySlots) {
+    if (slot.isUsed != 0) continue;
+    std::memcpy(slot.name, name, length + 1);
+    slot.isUsed = 1;
+    return;
+  }
+}
+
+void forgetTemporary(const char* name) {
+  for (TemporarySlot& slot : temporarySlots) {
+    if (slot.isUsed != 0 && std::strcmp(slot.name, name) == 0) slot.isUsed = 0;
+  }
+}
+
+extern "C" void removeTemporariesAndEnd(int signal) {
+  for (TemporarySlot& slot : temporarySlots) {
+    if (slot.isUsed != 0) unlink(slot.name);
+  }
+  std::signal(signal, SIG_DFL);
+  std::raise(signal);
+}
+
+FileKind kindOf(mode_t mode) {
+  if (S_ISREG(mode)) return FileKind::RegularFile;
+  if (S_ISDIR(mode)) return FileKind::Directory;
+  return FileKind::Special;
+}
+
+FileStatus statusFrom(const struct stat& native) {
+  FileStatus status;
+  status.kind = kindOf(native.st_mode);
+  status.size = native.st_size;
+  status.modificationTime = native.st_mtime;
+  status.uid = native.st_uid;
+  status.gid = native.st_gid;
+  status.mode = native.st_mode;
+  status.device = native.st_dev;
+  status.inode = native.st_ino;
+  return status;
+}
+
+HostError openNative(const char* name, int flags, FileHandle& file) {
+  do {
+    file.number = ::open(name, flags | O_CLOEXEC, 0666);
+  } while (file.number < 0 && errno == EINTR);
+  return file.isOpen() ? 0 : errno;
+}
+
+// One step of followLinks: the text of a link, or empty if the name is no link.
+std::string linkText(const std::string& name) {
+  std::array<char, MaximumTemporaryName> text;
+  const ssize_t length = readlink(name.c_str(), text.data(), text.size());
+  if (length <= 0 || static_cast<size_t>(length) == text.size()) return {};
+  return std::string(text.data(), static_cast<size_t>(length));
+}
+
+class PosixHost final : public Host {
+public:
+  HostError openForReading(const char* name, FileHandle& file) override {
+    return openNative(name, O_RDONLY | O_NONBLOCK, file);
+  }
+
+  HostError createTemporary(const char* name, FileHandle& file) override {
+    const SignalHold hold;
+    const HostError error = openNative(name, O_WRONLY | O_CREAT | O_EXCL, file);
+    if (error == 0) enterTemporary(name);
+    return error;
+  }
+
+  HostError createUnnamedTemporary(std::string& name, FileHandle& file) override {
+    const char* place = std::getenv("TMPDIR");
+    name = place != nullptr && *place != '\0' ? place : "/tmp";
+    name += "/quarn.XXXXXX";
+    const SignalHold hold;
+    file.number = mkostemp(name.data(), O_CLOEXEC);
+    if (!file.isOpen()) return errno;
+    enterTemporary(name.c_str());
+    return 0;
+  }
+
+  HostError openForWriting(const char* name, FileHandle& file) override {
+    return openNative(name, O_WRONLY | O_CREAT | O_TRUNC | O_NONBLOCK, file);
+  }
+
+  HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                   size_t& done) override {
+    done = 0;
+    while (done < bytes.size()) {
+      const ssize_t count = pread(file.number, bytes.data() + done, bytes.size() - done,
+                                  static_cast<off_t>(offset + done));
+      if (count == 0) break;
+      if (count > 0) {
+        done += static_cast<size_t>(count);
+      } else if (errno != EINTR) {
+        return errno;
+      }
+    }
+    return 0;
+  }
+
+  HostError write(FileHandle file, std::span<const uint8_t> bytes) override {
+    while (!bytes.empty()) {
+      const ssize_t count = ::write(file.number, bytes.data(), bytes.size());
+      if (count == 0) return EIO;
+      if (count > 0) {
+        bytes = bytes.subspan(static_cast<size_t>(count));
+      } else if (errno != EINTR) {
+        return errno;
+      }
+    }
+    return 0;
+  }
+
+  uint64_t copyInside(FileHandle from, uint64_t offset, uint64_t size, FileHandle to) override {
+    off_t position = static_cast<off_t>(offset);
+    uint64_t done = 0;
+    while (done < size) {
+      const ssize_t count =
+          copy_file_range(from.number, &position, to.number, nullptr, size - done, 0);
+      if (count <= 0) break;
+      done += static_cast<uint64_t>(count);
+    }
+    return done;
+  }
+
+  // Every write has reached the kernel when it returns: nothing is held back in the process.
+  HostError flush(FileHandle) override { return 0; }
+
+  HostError close(FileHandle file) override {
+    // The descriptor is gone also when the call was interrupted, so there is no second try.
+    return ::close(file.number) == 0 || errno == EINTR ? 0 : errno;
+  }
+
+  HostError rename(const char* from, const char* to) override {
+    const SignalHold hold;
+    if (std::rename(from, to) != 0) return errno;
+    forgetTemporary(from);
+    return 0;
+  }
+
+  HostError remove(const char* name) override {
+    const SignalHold hold;
+    if (unlink(name) != 0) return errno;
+    forgetTemporary(name);
+    return 0;
+  }
+
+  HostError status(const char* name, FileStatus& status) override {
+    struct stat native;
+    status = FileStatus();
+    if (stat(name, &native) != 0) return errno;
+    status = statusFrom(native);
+    return 0;
+  }
+
+  HostError statusOf(FileHandle file, FileStatus& status) override {
+    struct stat native;
+    status = FileStatus();
+    if (fstat(file.number, &native) != 0) return errno;
+    status = statusFrom(native);
+    return 0;
+  }
+
+  bool isWritable(const char* name) override { return access(name, W_OK) == 0; }
+
+  void setPermissions(FileHandle file, uint32_t mode) override {
+    [[maybe_unused]] const int result = fchmod(file.number, mode & 07777);
+  }
+
+  std::string followLinks(const char* name) override {
+    constexpr int MaximumLinks = 40; // as the kernel: a longer chain is a circle
+    std::string place = name;
+    for (int i = 0; i < MaximumLinks; ++i) {
+      const std::string text = linkText(place);
+      if (text.empty()) return place;
+      place = text.front() == '/' ? text : place.substr(0, place.rfind('/') + 1) + text;
+    }
+    return name;
+  }
+
+  HostError listDirectory(const char* name, std::vector<std::string>& names) override {
+    names.clear();
+    const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(name), closedir);
+    if (!directory) return errno;
+    for (;;) {
+      errno = 0;
+      const dirent* entry = readdir(directory.get());
+      if (entry == nullptr) return errno;
+      const std::string leaf = entry->d_name;
+      if (leaf != "." && leaf != "..") names.push_back(leaf);
+    }
+  }
+};
+
+} // namespace
+
+Host& posixHost() {
+  static PosixHost host;
+  return host;
+}
+
+void installSignalCleanUp() {
+  for (const int signal : EndingSignals) {
+    struct sigaction before;
+    // A signal that the parent process ignores (a job in the background) stays ignored.
+    if (sigaction(signal, nullptr, &before) == 0 && before.sa_handler == SIG_IGN) continue;
+    std::signal(signal, removeTemporariesAndEnd);
+  }
+  std::signal(SIGXFSZ, SIG_IGN);
+}
+
+} // namespace support

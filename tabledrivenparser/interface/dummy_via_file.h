@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: Apache-2.0
+// The scanner of via files over a text that is already in memory. The text is taken as it stands:
+// comments are removed when a file is read, so here "#" and ";" are plain characters.
+#pragma once
+
+#include "tabledrivenparser/interface/via_file.h"
+
+namespace tabledrivenparser {
+
+class DummyViaFile final : public ViaFile {
+public:
+  // text is NUL-terminated and must outlive this object.
+  DummyViaFile(Parser& parser, const char* text) : ViaFile(parser, "", text) {}
+
+protected:
+  bool refill() override { return false; }
+};
+
+} // namespace tabledrivenparser

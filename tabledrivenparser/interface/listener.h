@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: Apache-2.0
+// Who listens sees every option at its place in the command line, before it is stored.
+#pragma once
+
+#include "tabledrivenparser/interface/value.h"
+
+#include <cstdint>
+
+namespace tabledrivenparser {
+
+class Parser;
+
+class Listener {
+public:
+  virtual ~Listener() = default;
+  // For a vector option, value is the one element to be appended: integer for numbers, text for
+  // texts. Words that a call-back handler takes and names of via files are not offered. Returns
+  // true if the listener has taken the value: the parser then stores nothing, but the option still
+  // counts as set.
+  virtual bool onOption(Parser& parser, uint32_t id, const Value& value) = 0;
+};
+
+} // namespace tabledrivenparser

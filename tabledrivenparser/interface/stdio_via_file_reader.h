@@ -1,0 +1,16 @@
+// SPDX-License-Identifier: Apache-2.0
+// Via files from the C library's streams.
+#pragma once
+
+#include "tabledrivenparser/interface/via_file_reader.h"
+
+namespace tabledrivenparser {
+
+class StdioViaFileReader final : public ViaFileReader {
+public:
+  void* open(const char* name) override;
+  ptrdiff_t read(void* file, char* buffer, size_t size) override;
+  bool close(void* file) override;
+};
+
+} // namespace tabledrivenparser

@@ -1,0 +1,57 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tabledrivenparser/src/number.h"
+
+#include "tabledrivenparser/interface/letters.h"
+
+#include <cerrno>
+#include <cstdlib>
+#include <limits>
+
+namespace tabledrivenparser {
+
+namespace {
+
+bool isDigit(char character, int base) {
+  if (character >= '0' && character <= '9') return true;
+  return base == 16 && lowered(character) >= 'a' && lowered(character) <= 'f';
+}
+
+// A negative unsigned number stands for the one that wraps to it.
+uint64_t largestMagnitude(ValueType type, bool isNegative) {
+  switch (type) {
+  case Type_Address:
+    return std::numeric_limits<uint32_t>::max();
+  case Type_Address64:
+    return std::numeric_limits<uint64_t>::max();
+  case Type_Int64Vector:
+    return uint64_t{std::numeric_limits<int64_t>::max()} + (isNegative ? 1 : 0);
+  default:
+    return uint64_t{std::numeric_limits<int32_t>::max()} + (isNegative ? 1 : 0);
+  }
+}
+
+} // namespace
+
+NumberText readNumber(const char* text, ValueType type) {
+  NumberText number;
+  const bool isHexadecimal = text[0] == '0' && lowered(text[1]) == 'x';
+  const int base = isHexadecimal ? 16 : 10;
+  if (isHexadecimal) text += 2;
+  while (isWhiteSpace(*text))
+    ++text;
+  const bool isNegative = *text == '-';
+  if (isNegative || *text == '+') ++text;
+  if (!isDigit(*text, base)) return number;
+
+  char* end = nullptr;
+  errno = 0;
+  const unsigned long long magnitude = std::strtoull(text, &end, base);
+  const bool isTooLarge = errno == ERANGE || magnitude > largestMagnitude(type, isNegative);
+  number.end = end;
+  number.result = isTooLarge ? Number_Overflow : Number_Good;
+  number.value = static_cast<int64_t>(isNegative ? 0 - magnitude : magnitude);
+  if (type == Type_Address) number.value = static_cast<uint32_t>(number.value);
+  return number;
+}
+
+} // namespace tabledrivenparser

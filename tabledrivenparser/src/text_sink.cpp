@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tabledrivenparser/interface/text_sink.h"
+
+namespace tabledrivenparser {
+
+void TextSink::put(char character) {
+  if (m_Used < m_Buffer.size()) m_Buffer[m_Used] = character;
+  ++m_Used;
+}
+
+void TextSink::put(std::string_view text) {
+  for (char character : text)
+    put(character);
+}
+
+void TextSink::putValue(std::string_view prefix, std::string_view value) {
+  put(prefix);
+  const bool hasBlank = value.find_first_of(" \t") != std::string_view::npos;
+  const bool isQuoted = m_QuoteMode == Quote_Blanks && (value.empty() ? m_QuoteEmpty : hasBlank);
+  if (isQuoted) put('"');
+  put(value);
+  if (isQuoted) put('"');
+}
+
+void TextSink::startEntry() {
+  if (m_HasEntries) put(m_Separator);
+  m_HasEntries = true;
+}
+
+} // namespace tabledrivenparser

@@ -1,0 +1,118 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What the region tests share: the region system's life around each test, a parent that writes
+// down what is asked of it, and a look inside the regions.
+
+#pragma once
+
+#include "alloclib/interface/region.h"
+#include "alloclib/interface/region_large_block.h"
+#include "alloclib/interface/region_malloc_free.h"
+#include "alloclib/interface/region_stats.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+#include <vector>
+
+#include <sys/mman.h>
+
+namespace alloclib {
+
+class RegionGeneralPeer {
+public:
+  static RegionGeneral* create(Region* parent, uint32_t flagsState = 1) {
+    return RegionGeneral::createPlain(parent, 4096, 4096, "test region", flagsState);
+  }
+  static uint32_t getState(const RegionGeneral* region) { return region->m_FlagsState; }
+  static void setState(RegionGeneral* region, uint32_t state) { region->m_FlagsState = state; }
+  static size_t getBucketBytes(const RegionGeneral* region) { return region->m_BucketBytes; }
+  static char* getCursor(const RegionGeneral* region) { return region->m_Cursor; }
+  static void setCursor(RegionGeneral* region, char* cursor) { region->m_Cursor = cursor; }
+  static char* getFastLimit(const RegionGeneral* region) { return region->m_FastLimit; }
+  static char* getWorkingEnd(const RegionGeneral* region) { return region->m_WorkingEnd; }
+  static bool hasLargeBlocks(const RegionGeneral* region) {
+    return region->m_LargeBlocks != nullptr;
+  }
+  static RegionStats& getStats(RegionGeneral* region) { return *region->m_Stats; }
+  static void setBlockWorkingState(RegionGeneral* region) { region->SetBlockWorkingState(); }
+  static void setFastLimit(RegionGeneral* region) { region->setFastLimit(); }
+};
+
+class RegionLargeBlockPeer {
+public:
+  static RegionLargeBlock* create(Region* parent) {
+    return RegionLargeBlock::createOn(parent, "test pages", false, false);
+  }
+  static uint32_t getHint(const RegionLargeBlock* region) { return region->m_Hint; }
+  static RegionLargeBlock* getOverflow(const RegionLargeBlock* region) {
+    return region->m_Overflow;
+  }
+  static void setBits(RegionLargeBlock* region, uint32_t firstBit, uint32_t count, bool free) {
+    region->SetBits(firstBit, count, free);
+  }
+  static char* getChunk(const RegionLargeBlock* region, uint32_t chunk) {
+    return region->m_Chunks[chunk];
+  }
+};
+
+class RegionStatsPeer {
+public:
+  static void breakList(RegionStats* record) { record->m_Previous = record; }
+};
+
+// Blocks of its own making, with a log of sizes. What is larger than the machine likes to give
+// is address space without memory.
+class RecordingRegion final : public Region {
+public:
+  void* AllocFull(size_t size, size_t alignment, const char*) override {
+    allocations.push_back(size);
+    if (size >= hugeSize)
+      return mmap(nullptr, size, PROT_READ | PROT_WRITE,
+                  MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
+    return std::aligned_alloc(std::max<size_t>(alignment, 16),
+                              roundUp(size, std::max<size_t>(alignment, 16)));
+  }
+  void DiscardFull(void* pointer, size_t size, size_t) override {
+    discards.push_back(size);
+    if (size >= hugeSize)
+      munmap(pointer, size);
+    else
+      std::free(pointer);
+  }
+  void Destroy(bool) override {}
+
+  std::vector<size_t> allocations;
+  std::vector<size_t> discards;
+
+private:
+  static constexpr size_t hugeSize = size_t{1} << 30;
+};
+
+class RegionTest : public testing::Test {
+protected:
+  void SetUp() override { initialise(); }
+  void TearDown() override {
+    setDebugMode(Debug_Off);
+    setTraceLevel(0);
+    RegionStats::setFinishedLimit(0);
+    shutDown();
+  }
+};
+
+inline std::string getReport(bool includeFinished, bool flagLive) {
+  char* text = nullptr;
+  size_t length = 0;
+  std::FILE* stream = open_memstream(&text, &length);
+  RegionStats::report(stream, includeFinished, flagLive);
+  std::fclose(stream);
+  std::string report(text, length);
+  std::free(text);
+  return report;
+}
+
+} // namespace alloclib

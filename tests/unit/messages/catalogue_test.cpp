@@ -1,0 +1,256 @@
+// SPDX-License-Identifier: Apache-2.0
+// Keys, texts and the choice of a language.
+#include "messages/interface/catalogue.h"
+
+#include "tests/unit/messages/messages_fixture.h"
+
+#include <gmock/gmock.h>
+
+namespace messages {
+
+namespace {
+
+using testing::ElementsAre;
+
+struct CatalogueTest : MessagesTest {};
+
+std::string textOf(Key key) {
+  return std::string(KeyText(key).text());
+}
+
+} // namespace
+
+TEST(MessageKey, PacksLetterNumberAndSeverityLetter) {
+  EXPECT_EQ(valueOf(makeKey('L', 6839, 'E')), 20032374u);
+  EXPECT_EQ(valueOf(makeKey('X', 3900, 'U')), 23131082u);
+}
+
+TEST(MessageKey, GivesBackItsParts) {
+  constexpr Key key = makeKey('X', 16383, 'W');
+  EXPECT_EQ(letterOf(key), 'X');
+  EXPECT_EQ(numberOf(key), 16383u);
+  EXPECT_EQ(severityLetterOf(key), 'W');
+}
+
+TEST(MessageKey, PrintsAsLetterFourDigitsAndLetter) {
+  EXPECT_EQ(textOf(NoActionSpecified), "L6839E");
+  EXPECT_EQ(textOf(UnrecognizedOption), "X3900U");
+  EXPECT_EQ(textOf(makeKey('L', 7, 'I')), "L0007I");
+  EXPECT_EQ(textOf(makeKey('L', 16383, 'I')), "L16383I");
+}
+
+TEST(MessageKey, PrintsAQuestionMarkForWhatIsNoLetter) {
+  EXPECT_EQ(textOf(makeKey('5', 1, 'E')), "?0001E");
+  EXPECT_EQ(textOf(makeKey('L', 1, 'Q')), "L0001?");
+  EXPECT_EQ(textOf(Key{}), "?0000?");
+  EXPECT_EQ(textOf(Key{0xFFFFFFFF}), "?16383?");
+}
+
+TEST(Catalogue, AscendsByKeyInEveryLanguageWithTheSameKeys) {
+  const auto english = catalogueRows(EnglishCatalogue);
+  for (uint32_t index = 0; index < CatalogueCount; ++index) {
+    const auto rows = catalogueRows(index);
+    ASSERT_EQ(rows.size(), english.size());
+    for (size_t i = 0; i < rows.size(); ++i)
+      EXPECT_EQ(rows[i].key, english[i].key);
+    for (size_t i = 1; i < rows.size(); ++i)
+      EXPECT_LT(rows[i - 1].key, rows[i].key);
+  }
+}
+
+TEST(Catalogue, HasTheTextsOfTheDiagnostics) {
+  const std::pair<const char*, const char*> expected[] = {
+      {"L6800U", "Out of memory"},
+      {"L6826E", "'%s' not in archive format"},
+      {"L6829E", "'%s': malformed archive: %s"},
+      {"L6830E", "Writing file '%s' : %s"},
+      {"L6831E", "'%s' not present in archive '%s'"},
+      {"L6832E", "Archive '%s' not found : %s"},
+      {"L6833E", "File '%s' does not exist"},
+      {"L6835E", "Reading file '%s' : %s"},
+      {"L6836E", "'%s' already exists, so will not be extracted"},
+      {"L6838E", "No archive specified"},
+      {"L6839E", "One of the actions -[%s] must be specified"},
+      {"L6840E", "Only one action option may be specified"},
+      {"L6841E", "Position '%s' not found"},
+      {"L6842E", "Filename '%s' too long for file system"},
+      {"L6843E", "Writing file '%s' : %s"},
+      {"L6872I", "Archive '%s' does not have a symbol table"},
+      {"L6873I", "Creating archive '%s'"},
+      {"L6874W", "Minor variants of archive member '%s' include no base variant"},
+      {"L6875W", "Adding non-ELF object '%s' to archive '%s'"},
+      {"L6876W", "Minor variants of archive member '%s' include multiple base variants"},
+      {"L6877W", "Attribute difference of archive member '%s' in minor variant group beginning "
+                 "with '%s' includes attribute(s) with no symbol decoration representation"},
+      {"L6878W", "Common attributes of minor variant group beginning with '%s' are incompatible "
+                 "with library attributes."},
+      {"L6879W", "Attributes of minor variant member object '%s' are incompatible with library "
+                 "attributes."},
+      {"L6974W", "'%s': malformed archive: %s"},
+      {"L6976E", "Seeking in file '%s' : %s"},
+      {"L6977E", "Closing file '%s' : %s"},
+      {"L6978E", "Deleting file '%s' : %s"},
+      {"L6979E", "Output file '%s' is read-only"},
+      {"L6980E", "No archive members specified with --create"},
+      {"X3900U", "Unrecognized option '%s%s'."},
+      {"X3901U", "Missing argument for option '%s'."},
+      {"X3902U", "Recursive via file inclusion depth of %d reached in file '%s'."},
+      {"X3903U", "Argument '%s' not permitted for option '%s'."},
+      {"X3904U", "Could not open via file '%s'."},
+      {"X3905U", "Error when reading from via file '%s'."},
+      {"X3906U", "Malformed via file '%s'."},
+      {"X3907U", "Via file '%s' command too long for buffer."},
+      {"X3908U", "Overflow: '%s' will not fit in an integer."},
+      {"X3910W", "Old syntax, please use '%s%s%s%s'."},
+      {"X3912W", "Option '%s' is deprecated."},
+      {"X3913W", "Could not close via file '%s'."},
+      {"X3914I", "The following arguments to option '%s' can be selected:\n %s"},
+      {"X3915W", "Argument '%s' to option '%s' is deprecated"},
+      {"X3916U", "Unexpected argument for option '%s%s'"},
+      {"X3917U", "Concatenated options cannot have arguments: -%s %s"},
+      {"X3918U", "'\\0' character found in via file '%s' - possible binary file.  Aborting via "
+                 "file parse."},
+      {"X3919I", "Possible matches for '%s' include '%s' and '%s'."},
+      {"X3920W", "Option '-%s' repeated in concatenated options '-%s%s%s'."},
+      {"X9780E", "Could not initialise message locale %s"},
+      {"X9962I", "Unknown diagnostic number %s"},
+  };
+  for (const auto& [code, text] : expected) {
+    const Key key = makeKey(code[0], static_cast<uint32_t>(std::stoul(code + 1)), code[5]);
+    EXPECT_EQ(textOf(key), code);
+    EXPECT_EQ(messageText(key), text) << code;
+  }
+}
+
+TEST_F(CatalogueTest, PrintsTheListingLinesToTheLetter) {
+  listingMessage(ListedMember, "a.o");
+  listingMessage(ListedMemberLong, "rw-r--r--", 1, 22u, 333, "Jan  1 00:00 1970", "a.o", 8u);
+  listingMessage(AddedMember, "a.o");
+  listingMessage(ReplacedMember, "a.o");
+  listingMessage(DeletedMember, "a.o");
+  listingMessage(MovedMember, "a.o");
+  listingMessage(ExtractedMember, "a.o");
+  listingMessage(PrintedMember, "a.o");
+  listingMessage(SizesHeader);
+  listingMessage(SizesRow, 1u, 22u, 333u, 4444u, 55555u, "TOTAL\n");
+  listingMessage(EntryPoint, 32768u, "ER_RO", "a.o");
+  listingMessage(NoEntryPoints);
+  listingMessage(ListedSymbol, "main", "a.o", 68u);
+  EXPECT_EQ(outputText(), "a.o\n"
+                          "rw-r--r--     1/    22    333 Jan  1 00:00 1970 a.o (offset      8)\n"
+                          "a - a.o\nr - a.o\nd - a.o\nm - a.o\nx - a.o\n\n<a.o>\n\n"
+                          "\n      Code    RO Data    RW Data    ZI Data      Debug   Object Name\n"
+                          "         1         22        333       4444      55555   TOTAL\n\n"
+                          "ENTRY at offset 32768 in section ER_RO of a.o\n"
+                          "No ENTRY points found.\n"
+                          "main                 from a.o        at offset     68\n");
+}
+
+TEST_F(CatalogueTest, GrowsListingColumnsWithTheirValues) {
+  listingMessage(ListedMemberLong, "rwxrwxrwx", 12345678, 12345678, 123456789u, "d", "m", 1234567);
+  EXPECT_EQ(outputText(), "rwxrwxrwx12345678/12345678123456789 d m (offset 1234567)\n");
+}
+
+TEST_F(CatalogueTest, PrintsTheHelpToTheLetter) {
+  listingMessage(HelpCommandFormat, "quarn");
+  listingMessage(HelpWildcards, '?');
+  listingMessage(HelpEditOptions);
+  listingMessage(HelpOtherOptions);
+  listingMessage(HelpExamples, "quarn", "quarn", '?', "quarn", "quarn");
+  EXPECT_EQ(outputText(), R"(
+Archive creation and maintenance tool
+
+Command format:
+
+quarn options archive [ file_list ]
+
+Wildcards '?' and '*' may be used in file_list
+
+Options:-
+
+ -r         Insert files in <file_list>, replace existing members of the same name.
+ -d         Delete the members in <file_list>.
+ -x         Extract members in <file_list> placing in files of the same name.
+ -m         Move files in <file_list>.
+ -p         Print files to stdout.
+ -a pos     Insert/move files after file named <pos>.
+ -b pos     Insert/move files before file named <pos>.
+ -u         Update older files only, used with -r.
+
+ -n         Do not add a symbol table to an object archive.
+ -s         Force regeneration of archive symbol table.
+ -t         Print table of contents of archive.
+--zs        Show the symbol table.
+--zt        Summarize the archive contents (sizes + entries).
+ -c         Suppress warning when a new archive is created.
+ -C         Do not overwrite existing files when extracting.
+ -T         Truncate file names to system maximum length.
+ -v         Give verbose output.
+--create    Force creation of a new archive.
+--via file  Take additional arguments from via file.
+--sizes     List the size of each member and the library total.
+--entries   List sections containing ENTRY points.
+--vsn       Print the current Quarn Version. )"
+                          "\n--help      Print this message. \n"
+                          R"(
+Examples:-
+
+        quarn -r  mylib.a obj1 obj2 obj3...
+        quarn -x  mylib.a ?sort*
+        quarn -d  mylib.a hash.o
+        quarn -tv ansilib.a
+
+)");
+}
+
+TEST_F(CatalogueTest, AMissingRowShowsItsKeyAndTheRunGoesOn) {
+  const Key missing = makeKey('L', 1, 'E');
+  EXPECT_EQ(messageText(missing), "<NotFound Code=L0001E key=0x01300016>");
+  EXPECT_TRUE(report(ErrorWord, nullptr, missing, "unused"));
+  EXPECT_EQ(errorText(), "Error: L0001E: <NotFound Code=L0001E key=0x01300016>\n");
+  EXPECT_EQ(errorCount(), 1u);
+}
+
+TEST_F(CatalogueTest, AnExternalCatalogueComesFirst) {
+  static constexpr CatalogueRow rows[] = {{OutOfMemory, "No memory"},
+                                          {makeKey('L', 6801, 'E'), "New text"}};
+  setExternalCatalogue(rows);
+  EXPECT_EQ(messageText(OutOfMemory), "No memory");
+  EXPECT_EQ(messageText(makeKey('L', 6801, 'E')), "New text");
+  EXPECT_EQ(messageText(NoArchiveSpecified), "No archive specified");
+  setExternalCatalogue({});
+  EXPECT_EQ(messageText(OutOfMemory), "Out of memory");
+}
+
+TEST_F(CatalogueTest, ALocaleNameChoosesTableAndCodePage) {
+  EXPECT_TRUE(setLocale("ja_JP.UTF-8"));
+  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+  EXPECT_TRUE(setLocale("en_US"));
+  EXPECT_EQ(currentCatalogue(), EnglishCatalogue);
+  EXPECT_TRUE(setLocale("ja_JP"));
+  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+}
+
+TEST_F(CatalogueTest, ACodePageAloneLeavesTheTable) {
+  ASSERT_TRUE(setLocale("ja_JP"));
+  for (const char* name : {"UTF-8", "utf-8", "UTF8", "utf8", "65001"}) {
+    EXPECT_TRUE(setLocale(name)) << name;
+    EXPECT_EQ(outputCodePage(), 65001u);
+  }
+  for (const char* name : {"gb2312", "20936"}) {
+    EXPECT_TRUE(setLocale(name)) << name;
+    EXPECT_EQ(outputCodePage(), 20936u);
+  }
+  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+}
+
+TEST_F(CatalogueTest, ABadLocaleNameChangesNothing) {
+  for (const char* name : {"fr_FR.UTF-8", "en_US.", "en_US.latin1", "C", "", ".", ".UTF-8",
+                           "ja_JP.1252", "1252", "Utf-8", "en_US.UTF-8.x", "EN_US"}) {
+    EXPECT_FALSE(setLocale(name)) << name;
+  }
+  EXPECT_EQ(currentCatalogue(), EnglishCatalogue);
+  EXPECT_EQ(outputCodePage(), 65001u);
+}
+
+} // namespace messages

@@ -1,0 +1,133 @@
+// SPDX-License-Identifier: Apache-2.0
+// Faults of the program: their line, their number, and that they end the run.
+#include "alloclib/interface/handlers.h"
+#include "checking/interface/checking.h"
+#include "tests/unit/messages/messages_fixture.h"
+
+#include <new>
+
+namespace messages {
+
+namespace {
+
+struct InternalFaultTest : MessagesTest {};
+
+} // namespace
+
+TEST_F(InternalFaultTest, PrintsNumberVersionAndMessageAndEndsTheRun) {
+  EXPECT_EQ(statusOf([] { internalFault("Broken %s", "thing"); }), 1);
+  EXPECT_EQ(errorText(), "Internal fault: [0x1698f9:1000001] Broken thing\n");
+  EXPECT_EQ(counters().internalFaults, 1u);
+}
+
+TEST_F(InternalFaultTest, StartsWithTheToolNameInStyleOne) {
+  setStyle(1);
+  EXPECT_EQ(statusOf([] { internalFault("Broken %s", "thing"); }), 1);
+  EXPECT_EQ(errorText(), "quarn : Internal fault: [0x1698f9:1000001] Broken thing\n");
+}
+
+TEST_F(InternalFaultTest, ShowsTheHostsNumberWithSixDigits) {
+  EXPECT_EQ(statusOf([] { internalFault("a"); }), 1);
+  EXPECT_EQ(errorText(), "Internal fault: [0x000061:1000001] a\n");
+}
+
+TEST_F(InternalFaultTest, EndsSilentlyAtTheLimit) {
+  setLimit(0, nullptr);
+  EXPECT_EQ(statusOf([] { internalFault("a"); }), 1);
+  EXPECT_EQ(errorText(), "");
+}
+
+TEST(FaultHash, EndsAtTheFirstNewline) {
+  EXPECT_EQ(faultHash("Broken %s\nmore"), 0x1698f9u);
+  EXPECT_EQ(faultHash(""), 0u);
+}
+
+TEST(FaultHash, CountsABackslashAsASlash) {
+  EXPECT_EQ(faultHash("a\\b"), faultHash("a/b"));
+}
+
+TEST(FaultHash, CutsThePathOfAnAssertionToItsLastWorkComponent) {
+  const uint32_t hash = faultHash("Assertion failed: work/arlib/src/a.cpp line 12 (%s)");
+  EXPECT_EQ(hash, 0x017813u);
+  for (const char* text : {"Assertion failed: /home/me/work/arlib/src/a.cpp line 12 (%s)",
+                           "Assertion failed: C:\\work\\x\\work\\arlib\\src\\a.cpp line 12 (%s)",
+                           "Assertion failed: /work/work/arlib/src/a.cpp line 12 (%s)"}) {
+    EXPECT_EQ(faultHash(text), hash) << text;
+  }
+}
+
+TEST(FaultHash, TakesOnlyAWholeComponentForTheTree) {
+  const char* const whole = "Assertion failed: /homework/workshop/a.cpp line 12 (%s)";
+  EXPECT_NE(faultHash(whole), faultHash("Assertion failed: work/workshop/a.cpp line 12 (%s)"));
+  EXPECT_NE(faultHash(whole), faultHash("Assertion failed: workshop/a.cpp line 12 (%s)"));
+  EXPECT_NE(faultHash("Broken /work/a.cpp"), faultHash("Broken work/a.cpp"));
+}
+
+TEST_F(InternalFaultTest, AFailedAssertionShowsPathLineAndExpression) {
+  EXPECT_EQ(statusOf([] { assertionFault("quarn/src/a.cpp", 12, "m_Type != NULL"); }), 1);
+  EXPECT_EQ(errorText(), "Internal fault: [0x208ed2:1000001] Assertion failed: quarn/src/a.cpp "
+                         "line 12 (m_Type != NULL)\n");
+}
+
+TEST_F(InternalFaultTest, AnExpressionIsNotReadAsFormat) {
+  EXPECT_EQ(statusOf([] { assertionFault("a.cpp", 1, "x %s 2"); }), 1);
+  EXPECT_TRUE(errorText().ends_with("Assertion failed: a.cpp line 1 (x %s 2)\n"));
+}
+
+TEST_F(InternalFaultTest, FailedAssertionsOfAllLibrariesComeHere) {
+  EXPECT_EQ(statusOf([] { QUARN_ASSERT(1, 1 + 1 == 3); }), 1);
+  EXPECT_NE(errorText().find(" Assertion failed: "), std::string::npos);
+  EXPECT_TRUE(errorText().ends_with(" (1 + 1 == 3)\n"));
+}
+
+TEST_F(InternalFaultTest, FaultsOfTheCheckingLibraryComeHere) {
+  EXPECT_EQ(statusOf([] { checking::reportFault("Unreachable code: set_checking_level"); }), 1);
+  EXPECT_EQ(errorText(),
+            "Internal fault: [0xc1295b:1000001] Unreachable code: set_checking_level\n");
+}
+
+TEST_F(InternalFaultTest, CheckingLevelsAreShownRawOnTheStreamOfDiagnostics) {
+  setStyle(1);
+  EXPECT_TRUE(checking::set_checking_level("show"));
+  EXPECT_EQ(errorText(), "COLD LOW checks enabled\nHOT LOW checks enabled\n");
+}
+
+TEST_F(InternalFaultTest, RunningOutOfRegionMemoryIsFatal) {
+  EXPECT_EQ(statusOf([] { alloclib::outOfMemory(1000); }), 1);
+  EXPECT_EQ(errorText(), "Fatal error: L6800U: Out of memory\n");
+}
+
+TEST_F(InternalFaultTest, RunningOutOfHeapMemoryIsFatal) {
+  EXPECT_EQ(statusOf([] { std::get_new_handler()(); }), 1);
+  EXPECT_EQ(errorText(), "Fatal error: L6800U: Out of memory\n");
+}
+
+TEST_F(InternalFaultTest, AnErrorInsideTheRegionsEndsTheRun) {
+  EXPECT_EQ(statusOf([] { alloclib::internalError("RegionStats list is inconsistent"); }), 1);
+  EXPECT_EQ(errorText(), "Internal alloclib error: RegionStats list is inconsistent\n");
+}
+
+TEST_F(InternalFaultTest, ABadFormatIsAFaultAndIsShownUnread) {
+  EXPECT_EQ(statusOf([] { reportFormat(RemarkWord, nullptr, "%d of %s", "a"); }), 1);
+  EXPECT_EQ(errorText(),
+            "Internal fault: [0xeabb11:1000001] Messages: Bad message format %d of %s\n\n");
+}
+
+TEST_F(InternalFaultTest, ABadFormatOfAFaultIsShownAsItIs) {
+  EXPECT_EQ(statusOf([] { internalFault("a %d", "x"); }), 1);
+  EXPECT_TRUE(errorText().ends_with("] a %d\n"));
+}
+
+TEST_F(InternalFaultTest, ABadSeverityIsAFault) {
+  EXPECT_EQ(statusOf([] { report(0x70000, nullptr, NoArchiveSpecified); }), 1);
+  EXPECT_EQ(errorText(), "Internal fault: [0x89cfe0:1000001] Messages: Bad severity number 7\n\n");
+}
+
+TEST_F(InternalFaultTest, ABadStyleIsAFault) {
+  setStyle(3);
+  EXPECT_EQ(statusOf([] { report(ErrorWord, nullptr, NoArchiveSpecified); }), 1);
+  EXPECT_EQ(errorText(),
+            "Internal fault: [0x4541ca:1000001] Messages: unexpected diagnostic style 3\n");
+}
+
+} // namespace messages

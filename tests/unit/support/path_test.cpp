@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: Apache-2.0
+// Taking file names apart and putting them together again.
+#include "support/interface/path.h"
+
+#include <gtest/gtest.h>
+
+namespace support {
+
+TEST(PathStyle, IsWindowsForADriveAShareOrALeadingBackslash) {
+  EXPECT_EQ(detectPathStyle("c:x.o"), PathStyle_Windows);
+  EXPECT_EQ(detectPathStyle("\\\\server\\share\\x.o"), PathStyle_Windows);
+  EXPECT_EQ(detectPathStyle("//server/share/x.o"), PathStyle_Windows);
+  EXPECT_EQ(detectPathStyle("\\x.o"), PathStyle_Windows);
+}
+
+TEST(PathStyle, IsPosixForALeadingSlashEvenWithABackslashInside) {
+  EXPECT_EQ(detectPathStyle("/lib/x.o"), PathStyle_Posix);
+  EXPECT_EQ(detectPathStyle("/lib\\x.o"), PathStyle_Posix);
+}
+
+TEST(PathStyle, IsWindowsForABackslashInsideElseUndetermined) {
+  EXPECT_EQ(detectPathStyle("dir\\x.o"), PathStyle_Windows);
+  EXPECT_EQ(detectPathStyle("dir/x.o"), PathStyle_Undetermined);
+  EXPECT_EQ(detectPathStyle("x.o"), PathStyle_Undetermined);
+  EXPECT_EQ(detectPathStyle(""), PathStyle_Undetermined);
+}
+
+TEST(PathStyle, HasTheStyleNumbersOfItsFormat) {
+  EXPECT_EQ(path("c:\\x").style(), 2u);
+  EXPECT_EQ(path("/x").style(), 3u);
+  EXPECT_EQ(path("x").style(), 5u);
+}
+
+TEST(Path, SplitsAWindowsNameIntoFourStrings) {
+  const path name("c:/lib/sub\\mem.v1.o");
+  EXPECT_EQ(name.drive(), "c:");
+  EXPECT_EQ(name.directory(), "\\lib\\sub\\");
+  EXPECT_EQ(name.base(), "mem.v1");
+  EXPECT_EQ(name.extension(), ".o");
+  EXPECT_EQ(name.toString(), "c:\\lib\\sub\\mem.v1.o");
+}
+
+TEST(Path, SplitsAShareFromItsDirectory) {
+  const path name("//server/share/dir/x.o");
+  EXPECT_EQ(name.drive(), "\\\\server\\share");
+  EXPECT_EQ(name.directory(), "\\dir\\");
+  EXPECT_EQ(name.leaf(), "x.o");
+  EXPECT_EQ(path("\\\\server").drive(), "\\\\server");
+  EXPECT_EQ(path("\\\\").toString(), "\\\\");
+}
+
+TEST(Path, TreatsAnUndeterminedNameAsAWindowsName) {
+  const path name("dir/x.o");
+  EXPECT_EQ(name.style(), PathStyle_Undetermined);
+  EXPECT_EQ(name.directory(), "dir\\");
+}
+
+TEST(Path, KeepsAPosixDirectoryByteForByte) {
+  path name("a:b//./c\\d*/x?.o", PathStyle_Posix);
+  EXPECT_EQ(name.drive(), "");
+  EXPECT_EQ(name.directory(), "a:b//./c\\d*/");
+  name.replaceLeaf("x1.o");
+  EXPECT_EQ(name.toString(), "a:b//./c\\d*/x1.o");
+}
+
+TEST(Path, ReplacesOnlyTheLeaf) {
+  path name("c:dir\\*.o");
+  name.replaceLeaf("new");
+  EXPECT_EQ(name.base(), "new");
+  EXPECT_EQ(name.extension(), "");
+  EXPECT_EQ(name.toString(), "c:dir\\new");
+}
+
+TEST(Path, GivesBackEveryPosixNameUnchanged) {
+  for (const char* text :
+       {"", ".", "..", "/", "a.", ".a", "a..b", "dir/", "dir/.x", "a\\b", "\xff"}) {
+    EXPECT_EQ(path(text, PathStyle_Posix).toString(), text);
+  }
+}
+
+TEST(Path, CutsALeafBeyondTheLongestComponent) {
+  const path name(std::string("d/") + std::string(5000, 'x'), PathStyle_Posix);
+  EXPECT_EQ(name.leaf(), std::string(LongestPathComponent, 'x'));
+}
+
+TEST(LastPathComponent, StandsBehindTheLastSeparatorOfEitherKind) {
+  EXPECT_EQ(lastPathComponent("a/b\\c.o"), "c.o");
+  EXPECT_EQ(lastPathComponent("a\\b/c.o"), "c.o");
+  EXPECT_EQ(lastPathComponent("c:x.o"), "c:x.o");
+  EXPECT_EQ(lastPathComponent("dir/"), "");
+  EXPECT_EQ(lastPathComponent("x"), "x");
+  EXPECT_EQ(lastPathComponent(""), "");
+}
+
+} // namespace support

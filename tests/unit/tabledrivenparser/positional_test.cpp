@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: Apache-2.0
+// Words without dashes, and the mark that ends the options.
+#include "tool_table.h"
+
+namespace tabledrivenparser::tool {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+TEST(PositionalWord, keepsItsOrder) {
+  Session session;
+  session.parse({"tv", "-t", "lib.a", "x.o"});
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("tv", "lib.a", "x.o"));
+}
+
+TEST(PositionalWord, mayBeEmpty) {
+  Session session;
+  session.parse({"", "x", ""});
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("", "x", ""));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(PositionalWord, keepsSignsAndSeparators) {
+  Session session;
+  session.parse({"=x.a", ",y", "a,b", "%s%n"});
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("=x.a", ",y", "a,b", "%s%n"));
+}
+
+TEST(PositionalWord, mayBeASingleDash) {
+  Session session;
+  session.parse({"-", "-t"});
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("-"));
+  EXPECT_TRUE(session.parser().booleanValue(Id_List));
+}
+
+TEST(EndOfOptions, makesEveryWordPositional) {
+  Session session;
+  session.parse({"-t", "--", "-odd.a", "--", "-", "=x", ""});
+  EXPECT_TRUE(session.parser().isEndOfOptions());
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("-odd.a", "--", "-", "=x", ""));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(EndOfOptions, isAWordOfItsOwn) {
+  Session session;
+  EXPECT_EQ(session.parser().parseWord("--", "next"), 1u);
+  EXPECT_THAT(session.texts(Id_Words), IsEmpty());
+}
+
+} // namespace tabledrivenparser::tool

@@ -1,0 +1,414 @@
+// SPDX-License-Identifier: Apache-2.0
+// Which row a word means.
+#include "tool_table.h"
+
+#include "tabledrivenparser/interface/fallback_handler.h"
+
+namespace tabledrivenparser::tool {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+TEST(RowLookup, takesALongNameInAnyCase) {
+  Session session;
+  session.parse({"--CREATE", "--Help"});
+  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+  EXPECT_TRUE(session.parser().booleanValue(Id_Help));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, takesAHyphenForAnUnderscore) {
+  Session session;
+  session.parse({"--new-files_only"});
+  EXPECT_TRUE(session.parser().booleanValue(Id_NewFilesOnly));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, completesANameThatEndsInADot) {
+  Session session;
+  session.parse({"--cre."});
+  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, refusesADotBehindAWholeName) {
+  EXPECT_THAT(reportsOf({"--create."}), ElementsAre("fatal: Unrecognized option '--create.'."));
+}
+
+TEST(RowLookup, refusesAnUnfinishedNameWithoutADot) {
+  EXPECT_THAT(reportsOf({"--creat"}), ElementsAre("fatal: Unrecognized option '--creat'."));
+  EXPECT_THAT(reportsOf({"--created"}), ElementsAre("fatal: Unrecognized option '--created'."));
+}
+
+TEST(RowLookup, refusesADotWithOneDash) {
+  EXPECT_THAT(reportsOf({"-new."}), ElementsAre("fatal: Unrecognized option '-new.'."));
+}
+
+TEST(RowLookup, takesAnArgumentBehindAnAbbreviation) {
+  Session session;
+  session.parse({"--db.=low"});
+  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "low");
+}
+
+TEST(RowLookup, refusesAnArgumentThatTouchesALongName) {
+  EXPECT_THAT(reportsOf({"--db_checklow"}),
+              ElementsAre("fatal: Unrecognized option '--db_checklow'."));
+}
+
+struct Ambiguity {
+  const char* word;
+  const char* first;
+  const char* second;
+};
+
+class AmbiguousWord : public testing::TestWithParam<Ambiguity> {};
+
+TEST_P(AmbiguousWord, namesTheBestAndTheLastRowAndIsUnrecognized) {
+  const std::string word = GetParam().word;
+  const Lines reports = reportsOf({GetParam().word});
+  EXPECT_THAT(reports, ElementsAre("remark: Possible matches for '" + word.substr(2) +
+                                       "' include '" + GetParam().first + "' and '" +
+                                       GetParam().second + "'.",
+                                   "fatal: Unrecognized option '" + word + "'."));
+}
+
+INSTANTIATE_TEST_SUITE_P(RowLookup, AmbiguousWord,
+                         testing::Values(Ambiguity{"--no.", "no_debug_symbols", "no_unique_symbols"},
+                                         Ambiguity{"--n.", "new_files_only", "no_unique_symbols"},
+                                         Ambiguity{"--diag.", "diag_error", "diag_warning"},
+                                         Ambiguity{"--s.", "show_cmdline", "sizes"},
+                                         Ambiguity{"--v.", "version", "vsn"}));
+
+TEST(RowLookup, prefersARowWithoutArgumentWhereNoneIsGiven) {
+  Session session;
+  session.parse({"--d."});
+  EXPECT_TRUE(session.parser().booleanValue(Id_DebugSymbols));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, prefersARowWithArgumentWhereOneIsGiven) {
+  Session session;
+  session.parse({"--no_.=5", "--de.", "--no_d."});
+  EXPECT_EQ(session.parser().integerValue(Id_Normalise), 5);
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, prefersTheLongerName) {
+  Session session;
+  session.parse({"--version."});
+  EXPECT_TRUE(session.parser().booleanValue(Id_VersionNumber));
+  EXPECT_FALSE(session.parser().booleanValue(Id_Version));
+}
+
+TEST(RowLookup, refusesALetterWithTwoDashes) {
+  EXPECT_THAT(reportsOf({"--d"}), ElementsAre("fatal: Unrecognized option '--d'."));
+}
+
+TEST(RowLookup, tellsTwinLettersApart) {
+  Session session;
+  session.parse({"-V", "-T", "-C"});
+  EXPECT_TRUE(session.parser().booleanValue(Id_Version));
+  EXPECT_FALSE(session.parser().booleanValue(Id_Verbose));
+  EXPECT_TRUE(session.parser().booleanValue(Id_Truncate));
+  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_TRUE(session.parser().booleanValue(Id_KeepOld));
+  EXPECT_FALSE(session.parser().booleanValue(Id_NoBanner));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(RowLookup, warnsOfAnOldLetterInTheOtherCase) {
+  Session session;
+  session.parse({"-D", "-X"});
+  EXPECT_TRUE(session.parser().booleanValue(Id_Delete));
+  EXPECT_TRUE(session.parser().booleanValue(Id_Extract));
+  EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '-d'.",
+                                             "warning: Old syntax, please use '-x'."));
+}
+
+TEST(RowLookup, warnsOfAnOldLongNameWithOneDash) {
+  Session session;
+  session.parse({"-create"});
+  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+  EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '--create'."));
+}
+
+TEST(RowLookup, refusesANewLongNameWithOneDash) {
+  EXPECT_THAT(reportsOf({"-libattrmap=x"}),
+              ElementsAre("fatal: Unrecognized option '-libattrmap=x'."));
+}
+
+TEST(RowLookup, takesOldSyntaxInSilenceWhereThePolicySaysSo) {
+  OptionTable silent = table;
+  for (uint32_t policy : {0u, 3u}) {
+    silent.oldSyntaxPolicy = static_cast<SyntaxPolicy>(policy);
+    ParserSession session(silent, definitions);
+    session.parse({"-create", "-D"});
+    EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+    EXPECT_TRUE(session.parser().booleanValue(Id_Delete));
+    EXPECT_THAT(session.reports(), IsEmpty());
+  }
+}
+
+TEST(RowLookup, refusesOldSyntaxWhereThePolicySaysSo) {
+  OptionTable strict = table;
+  strict.oldSyntaxPolicy = Policy_Reject;
+  ParserSession name(strict, definitions);
+  name.parse({"-help"});
+  EXPECT_THAT(name.reports(), ElementsAre("fatal: Unrecognized option '-elp'."));
+  ParserSession letter(strict, definitions);
+  letter.parse({"-D"});
+  EXPECT_THAT(letter.reports(), ElementsAre("fatal: Unrecognized option '-D'."));
+  ParserSession exact(strict, definitions);
+  exact.parse({"-d", "--help"});
+  EXPECT_THAT(exact.reports(), IsEmpty());
+}
+
+TEST(RowLookup, comparesAWordThatStartsWithNoLetterToo) {
+  EXPECT_THAT(reportsOf({"-1"}), ElementsAre("fatal: Unrecognized option '-1'."));
+  EXPECT_THAT(reportsOf({"--."}), ElementsAre("fatal: Unrecognized option '--.'."));
+  EXPECT_THAT(reportsOf({"---x"}), ElementsAre("fatal: Unrecognized option '---x'."));
+  EXPECT_THAT(reportsOf({"---"}), ElementsAre("fatal: Unrecognized option '---'."));
+}
+
+TEST(RowLookup, takesBytesAbove127AsPlainCharacters) {
+  EXPECT_THAT(reportsOf({"-\xe9"}), ElementsAre("fatal: Unrecognized option '-\xe9'."));
+  EXPECT_THAT(reportsOf({"--\xff\x80"}), ElementsAre("fatal: Unrecognized option '--\xff\x80'."));
+}
+
+TEST(RowLookup, refusesALetterThatNoRowStartsWith) {
+  EXPECT_THAT(reportsOf({"-k"}), ElementsAre("fatal: Unrecognized option '-k'."));
+}
+
+TEST(RowLookup, findsNothingForAnEmptyWordWithDashes) {
+  Session session;
+  EXPECT_EQ(session.parser().parseArgument("", "next", 1), 1u);
+  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unrecognized option '-'."));
+}
+
+TEST(RowLookup, findsNothingForAPositionalWordWithoutItsRow) {
+  OptionTable noWords = table;
+  noWords.rows = noWords.rows.subspan(1);
+  noWords.firstRows = indexByFirstLetter(noWords.rows);
+  ParserSession session(noWords, definitions);
+  session.parse({"word"});
+  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unrecognized option 'word'."));
+}
+
+// Arguments.
+
+TEST(RowArgument, standsBehindALetterOrIsTheNextWord) {
+  for (const auto& words : {Lines{"-apos"}, Lines{"-a", "pos"}, Lines{"-a=pos"}}) {
+    Session session;
+    session.parse(words);
+    EXPECT_STREQ(session.parser().textValue(Id_After), "pos");
+    EXPECT_THAT(session.texts(Id_Words), IsEmpty());
+    EXPECT_THAT(session.reports(), IsEmpty());
+  }
+}
+
+TEST(RowArgument, countsTheWordsUsed) {
+  Session session;
+  EXPECT_EQ(session.parser().parseWord("-apos", "x", {}), 1u);
+  EXPECT_EQ(session.parser().parseWord("-a", "x", {}), 2u);
+  EXPECT_EQ(session.parser().parseWord("-t", "x", {}), 1u);
+  EXPECT_EQ(session.parser().parseWord("x", "y", {}), 1u);
+}
+
+TEST(RowArgument, mayLookLikeAnOption) {
+  Session session;
+  session.parse({"-a", "-t", "--db_check", "--"});
+  EXPECT_STREQ(session.parser().textValue(Id_After), "-t");
+  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "--");
+  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(session.parser().isEndOfOptions());
+}
+
+TEST(RowArgument, mayBeEmptyBehindTheSign) {
+  Session session;
+  session.parse({"--db_check=", "-a=", "word"});
+  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "");
+  EXPECT_STREQ(session.parser().textValue(Id_After), "");
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("word"));
+}
+
+TEST(RowArgument, isMissedAtTheEnd) {
+  EXPECT_THAT(reportsOf({"--via"}), ElementsAre("fatal: Missing argument for option 'via'."));
+  EXPECT_THAT(reportsOf({"-a"}), ElementsAre("fatal: Missing argument for option 'a'."));
+}
+
+TEST(RowArgument, isUnexpectedBehindALongFlag) {
+  EXPECT_THAT(reportsOf({"--create=1"}),
+              ElementsAre("fatal: Unexpected argument for option '--create'"));
+  EXPECT_THAT(reportsOf({"--create,1"}),
+              ElementsAre("fatal: Unexpected argument for option '--create'"));
+  EXPECT_THAT(reportsOf({"-create=1"}),
+              ElementsAre("warning: Old syntax, please use '--create'.",
+                          "fatal: Unexpected argument for option '-create'"));
+}
+
+TEST(RowArgument, isNoneForAFlagLetter) {
+  EXPECT_THAT(reportsOf({"-t=1"}), ElementsAre("fatal: Unrecognized option '-t=1'."));
+  EXPECT_THAT(reportsOf({"-t,1"}), ElementsAre("fatal: Unrecognized option '-t,1'."));
+}
+
+TEST(RowArgument, isNotPartedFromALetterByTheSeparator) {
+  EXPECT_THAT(reportsOf({"-a,pos"}), ElementsAre("fatal: Unrecognized option '-a,pos'."));
+}
+
+TEST(RowArgument, behindTheSeparatorIsOldSyntax) {
+  Session session;
+  session.parse({"--diag_error,L6875,L1"});
+  EXPECT_THAT(session.texts(Id_DiagError), ElementsAre("L6875", "L1"));
+  EXPECT_THAT(session.reports(),
+              ElementsAre("warning: Old syntax, please use '--diag_error=L6875,L1'."));
+}
+
+TEST(RowArgument, isTheLastOneGiven) {
+  Session session;
+  session.parse({"-b", "one", "-i", "two"});
+  EXPECT_STREQ(session.parser().textValue(Id_Before), "two");
+}
+
+// A small table with what the big one lacks.
+
+constexpr uint32_t k_Reds[] = {1, 0};
+constexpr uint32_t k_RedAndGreen[] = {1, 2, 0};
+// clang-format off
+constexpr MatchString specialRows[] = {
+  {"",        0, Kind_Required, {},     nullptr,       0,   Flag_Public},
+  {"1st",     1, Kind_Implied,  k_True, nullptr,       ',', Flag_Public},
+  {"aged",    2, Kind_Implied,  k_True, nullptr,       ',', Flag_Public | Flag_Deprecated | Flag_OldSyntax},
+  {"hidden",  3, Kind_Implied,  k_True, k_Reds,        ',', Flag_Public},
+  {"hinted",  3, Kind_Implied,  k_True, k_RedAndGreen, ',', Flag_Public},
+  {"O",       4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
+  {"other",   4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
+  {"private", 1, Kind_Implied,  k_True, nullptr,       ',', 0},
+  {"w",       0, Kind_Required, {},     nullptr,       '=', Flag_Public},
+};
+constexpr ValueDefinition specialDefinitions[] = {
+  textsOf(nullptr), flagOf(nullptr), flagOf(nullptr), flagOf(nullptr), textOf(nullptr),
+};
+// clang-format on
+static_assert(areWellFormed(specialRows, std::size(specialDefinitions)));
+
+OptionTable specialTable() {
+  return {specialRows, indexByFirstLetter(specialRows), Policy_Warn, Policy_Warn};
+}
+
+Lines specialReports(const OptionTable& special, std::initializer_list<const char*> words) {
+  ParserSession session(special, specialDefinitions);
+  session.parse(words);
+  return session.reports();
+}
+
+TEST(SpecialRow, mayStartWithADigit) {
+  const OptionTable special = specialTable();
+  ParserSession session(special, specialDefinitions);
+  session.parse({"--1ST"});
+  EXPECT_TRUE(session.parser().booleanValue(1));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(SpecialRow, warnsOfDeprecationAndThenNotOfOldSyntax) {
+  OptionTable special = specialTable();
+  EXPECT_THAT(specialReports(special, {"-aged"}),
+              ElementsAre("warning: Option 'aged' is deprecated."));
+  special.deprecatedPolicy = Policy_Accept;
+  EXPECT_THAT(specialReports(special, {"-aged"}),
+              ElementsAre("warning: Old syntax, please use '--aged'."));
+  EXPECT_THAT(specialReports(special, {"--aged"}), IsEmpty());
+}
+
+TEST(SpecialRow, isHiddenUnlessEveryMaskMeetsTheTables) {
+  OptionTable special = specialTable();
+  special.restrictionMask = 1;
+  EXPECT_THAT(specialReports(special, {"--hidden"}), IsEmpty());
+  EXPECT_THAT(specialReports(special, {"--hinted"}),
+              ElementsAre("fatal: Unrecognized option '--hinted'."));
+  EXPECT_THAT(specialReports(special, {"--hi."}), IsEmpty());
+  special.restrictionMask = 2;
+  EXPECT_THAT(specialReports(special, {"--hidden=1"}),
+              ElementsAre("fatal: Unrecognized option '--hidden=1'."));
+  special.restrictionMask = 3;
+  EXPECT_THAT(specialReports(special, {"--hinted"}), IsEmpty());
+}
+
+TEST(SpecialRow, isNotAbbreviatedUnlessPublic) {
+  EXPECT_THAT(specialReports(specialTable(), {"--priv."}),
+              ElementsAre("fatal: Unrecognized option '--priv.'."));
+  EXPECT_THAT(specialReports(specialTable(), {"--private"}), IsEmpty());
+}
+
+TEST(SpecialRow, withAnOptionalArgumentLeavesTheNextWord) {
+  const OptionTable special = specialTable();
+  ParserSession session(special, specialDefinitions);
+  session.parse({"-O", "word"});
+  EXPECT_STREQ(session.parser().textValue(4), "implied");
+  EXPECT_THAT(session.texts(0), ElementsAre("word"));
+  session.parse({"-Onear"});
+  EXPECT_STREQ(session.parser().textValue(4), "near");
+  session.parse({"--other"});
+  EXPECT_STREQ(session.parser().textValue(4), "implied");
+  session.parse({"--other=far"});
+  EXPECT_STREQ(session.parser().textValue(4), "far");
+  session.parse({"--other="});
+  EXPECT_STREQ(session.parser().textValue(4), "");
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(SpecialRow, takesTheEqualsSignAlsoAsItsSeparator) {
+  const OptionTable special = specialTable();
+  ParserSession session(special, specialDefinitions);
+  session.parse({"-w=x"});
+  EXPECT_THAT(session.texts(0), ElementsAre("x"));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+// The last resort.
+
+class Fallback final : public FallbackHandler {
+public:
+  uint32_t takeWord(Parser&, const char* word, const char* next, uint32_t dashes) override {
+    m_Lines.push_back(std::to_string(dashes) + word + "/" + (next != nullptr ? next : "<null>"));
+    return m_Answer;
+  }
+
+  Lines m_Lines;
+  uint32_t m_Answer = 0;
+};
+
+TEST(FallbackHandling, isOfferedWhatNoRowAccepts) {
+  Fallback fallback;
+  fallback.m_Answer = 2;
+  OptionTable open = table;
+  open.fallback = &fallback;
+  ParserSession session(open, definitions);
+  session.parse({"--odd", "word", "-t", "-k", "-tk", "last"});
+  EXPECT_THAT(fallback.m_Lines, ElementsAre("2odd/word", "1k/-tk"));
+  EXPECT_TRUE(session.parser().booleanValue(Id_List));
+  EXPECT_THAT(session.texts(Id_Words), ElementsAre("last"));
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(FallbackHandling, mayDecline) {
+  Fallback fallback;
+  OptionTable open = table;
+  open.fallback = &fallback;
+  ParserSession session(open, definitions);
+  session.parse({"--create=1"});
+  EXPECT_THAT(fallback.m_Lines, ElementsAre("2create=1/<null>"));
+  EXPECT_THAT(session.reports(),
+              ElementsAre("fatal: Unexpected argument for option '--create'"));
+}
+
+TEST(Failure, endsAllParsing) {
+  Session session;
+  session.parse({"--nonsense", "-t", "--", "-a"});
+  EXPECT_TRUE(session.parser().hasFailed());
+  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(session.parser().isEndOfOptions());
+  EXPECT_EQ(session.parser().parseWord("-t", "x"), 1u);
+  EXPECT_EQ(session.reports().size(), 1u);
+}
+
+} // namespace tabledrivenparser::tool

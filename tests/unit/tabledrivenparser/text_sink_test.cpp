@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tabledrivenparser/interface/text_sink.h"
+
+#include <gtest/gtest.h>
+
+#include <array>
+#include <string>
+
+namespace tabledrivenparser {
+
+TEST(TextSink, goesOnCountingWhenItIsFull) {
+  std::array<char, 4> buffer{};
+  TextSink sink(buffer, TextSink::Quote_Never, ' ');
+  sink.put("abcdef");
+  sink.put('g');
+  EXPECT_EQ(sink.used(), 7u);
+  EXPECT_EQ(std::string(buffer.data(), buffer.size()), "abcd");
+}
+
+TEST(TextSink, countsWithoutAnyBuffer) {
+  TextSink sink({}, TextSink::Quote_Never, ' ');
+  sink.put("abc");
+  EXPECT_EQ(sink.used(), 3u);
+}
+
+TEST(TextSink, separatesEntriesAfterTheFirst) {
+  std::array<char, 16> buffer{};
+  TextSink sink(buffer, TextSink::Quote_Never, ',');
+  for (const char* text : {"a", "b", "c"}) {
+    sink.startEntry();
+    sink.put(text);
+  }
+  sink.startList();
+  sink.startEntry();
+  sink.put("d");
+  EXPECT_STREQ(buffer.data(), "a,b,cd");
+}
+
+std::string valueText(TextSink::QuoteMode mode, bool quoteEmpty, std::string_view value) {
+  std::array<char, 64> buffer{};
+  TextSink sink(buffer, mode, ' ');
+  sink.setQuoteEmpty(quoteEmpty);
+  sink.putValue("p=", value);
+  return std::string(buffer.data(), sink.used());
+}
+
+TEST(TextSink, quotesAValueWithABlankOrATab) {
+  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "a b"), "p=\"a b\"");
+  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "\t"), "p=\"\t\"");
+  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "ab"), "p=ab");
+  EXPECT_EQ(valueText(TextSink::Quote_Never, true, "a b"), "p=a b");
+}
+
+TEST(TextSink, quotesAnEmptyValueOnDemand) {
+  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, ""), "p=");
+  EXPECT_EQ(valueText(TextSink::Quote_Blanks, true, ""), "p=\"\"");
+  EXPECT_EQ(valueText(TextSink::Quote_Never, true, ""), "p=");
+}
+
+} // namespace tabledrivenparser
