@@ -78,7 +78,6 @@ void Extraction::operator()(ArchiveMember& member) {
 // False if the member could not be read, which has been reported. A failed write ends the copy.
 bool Extraction::copy(const ArchiveMember& member, support::FileHandle file, int& writeError) {
   if (!m_Contents.begin(member)) return false;
-  if (m_Contents.isLarge()) m_Contents.copyInside(file);
   while (writeError == 0) {
     std::span<const uint8_t> piece;
     if (!m_Contents.read(piece)) return false;

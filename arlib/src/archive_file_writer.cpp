@@ -21,7 +21,7 @@ namespace {
 using support::FileKind;
 using support::FileStatus;
 
-// Small writes are gathered up to this size; a body that is larger goes from file to file.
+// Small pieces are gathered up to this size; what is larger is written as it is.
 constexpr size_t BufferSize = 0x40000;
 
 // Collects small pieces and writes large ones.
@@ -41,7 +41,7 @@ public:
     return 0;
   }
 
-  // Writes what is held back, so that the file's position is that of the output.
+  // Writes what is held back.
   [[nodiscard]] int drain() {
     if (m_Buffer.empty()) return 0;
     const int error = m_Host.write(m_File, m_Buffer);
@@ -49,11 +49,7 @@ public:
     return error;
   }
 
-  // Takes note of bytes that reached the file another way, after a drain.
-  void addToPosition(uint64_t count) { m_Position += count; }
-
   [[nodiscard]] uint64_t getPosition() const { return m_Position; }
-  [[nodiscard]] support::FileHandle getFile() const { return m_File; }
 
 private:
   support::Host& m_Host;
@@ -179,12 +175,6 @@ int ArchiveFileWriter::writeHeader(GatheringOutput& output, const ArchiveMember&
 
 bool ArchiveFileWriter::writeContents(GatheringOutput& output, const ArchiveMember& member) {
   if (!m_Contents.begin(member)) return failToWrite(m_Contents.getError());
-  if (m_Contents.isLarge()) {
-    if (const int error = output.drain(); error != 0) return failToWrite(error);
-    const uint64_t before = m_Contents.getRemaining();
-    m_Contents.copyInside(output.getFile());
-    output.addToPosition(before - m_Contents.getRemaining());
-  }
   for (;;) {
     std::span<const uint8_t> piece;
     if (!m_Contents.read(piece)) return failToWrite(m_Contents.getError());

@@ -55,7 +55,7 @@ bool ContentsReader::begin(const ArchiveMember& member) {
 }
 
 bool ContentsReader::read(std::span<const uint8_t>& piece) {
-  const auto wanted = static_cast<size_t>(std::min(m_Remaining, LargeSize));
+  const auto wanted = static_cast<size_t>(std::min(m_Remaining, PieceSize));
   piece = {};
   if (wanted == 0) return true;
   if (m_Memory != nullptr) {
@@ -69,13 +69,6 @@ bool ContentsReader::read(std::span<const uint8_t>& piece) {
   }
   m_Remaining -= wanted;
   return true;
-}
-
-void ContentsReader::copyInside(support::FileHandle file) {
-  if (m_Memory != nullptr) return;
-  const uint64_t copied = m_Host.copyInside(m_File, m_Offset, m_Remaining, file);
-  m_Offset += copied;
-  m_Remaining -= copied;
 }
 
 } // namespace arlib

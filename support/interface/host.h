@@ -75,12 +75,6 @@ public:
   // Writes all bytes at the file's position, or fails.
   [[nodiscard]] virtual HostError write(FileHandle file, std::span<const uint8_t> bytes) = 0;
 
-  // Lets the host copy up to `size` bytes from `offset` of one file to the position of another,
-  // without passing them through the process. Returns how many it copied, which may be none: the
-  // caller goes on with readAt and write, and learns of any error there.
-  [[nodiscard]] virtual uint64_t copyInside(FileHandle from, uint64_t offset, uint64_t size,
-                                            FileHandle to) = 0;
-
   // Hands over what the host has held back of earlier writes, so that a full disk shows here and
   // not at the close.
   [[nodiscard]] virtual HostError flush(FileHandle file) = 0;

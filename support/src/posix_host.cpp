@@ -1,14 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The POSIX host. Two things here are more than one call each:
-//
-// Temporaries. A file made by createTemporary is entered in a small table until it is renamed or
-// removed. The signal handler walks that table with `unlink` alone, which is allowed in a handler;
-// the signals are held back while the table and the disk disagree.
-//
-// Copying. `copy_file_range` keeps the bytes out of the process where both files lie on a file
-// system that can do it. It is an offer only: whatever it doesn't copy goes through read and write,
-// which tell the reading side's errors from the writing side's.
+// The POSIX host. One thing here is more than one call each: a file made by createTemporary stands
+// in a small table until it is renamed or removed. The signal handler walks that table with
+// `unlink` alone, which is allowed in a handler; the signals are held back while the table and the
+// disk disagree.
 #include "support/interface/host.h"
 
 #include <algorithm>
@@ -174,18 +169,6 @@ public:
       }
     }
     return 0;
-  }
-
-  uint64_t copyInside(FileHandle from, uint64_t offset, uint64_t size, FileHandle to) override {
-    off_t position = static_cast<off_t>(offset);
-    uint64_t done = 0;
-    while (done < size) {
-      const ssize_t count =
-          copy_file_range(from.number, &position, to.number, nullptr, size - done, 0);
-      if (count <= 0) break;
-      done += static_cast<uint64_t>(count);
-    }
-    return done;
   }
 
   // Every write has reached the kernel when it returns: nothing is held back in the process.
