@@ -2,6 +2,7 @@
 #include "arlib/src/archive_file_reader.h"
 
 #include "arlib/interface/archive_file_reader.h"
+#include "support/interface/host_files.h"
 #include "support/interface/path.h"
 
 #include <algorithm>
@@ -38,11 +39,14 @@ bool ArchiveFileReader::read(const char* fileName) {
   m_Archive.m_ReadOnly = false;
   m_Archive.m_SymbolTableMode = SymbolTableMode::IfSymbols;
   m_RegionFileName = m_Archive.getFileName();
+  // A device or a socket is not even opened: that could have effects, or fail in words of its own.
+  if (support::fileKind(m_Host, fileName) == support::FileKind::Special) {
+    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, EINVAL);
+  }
   if (const int error = m_Host.openForReading(fileName, m_File); error != 0) {
     return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
   }
-  const bool isRead = readOpenFile();
-  if (!closeFile() || !isRead || !readSymbolTable()) {
+  if (!closeFile(readOpenFile()) || !readSymbolTable()) {
     m_Archive.clear();
     return false;
   }
@@ -51,9 +55,9 @@ bool ArchiveFileReader::read(const char* fileName) {
 }
 
 // A file that can't be closed fails the read, unless it had failed before.
-bool ArchiveFileReader::closeFile() {
+bool ArchiveFileReader::closeFile(bool isRead) {
   const int error = m_Host.close(m_File);
-  if (error == 0) return true;
+  if (error == 0 || !isRead) return isRead;
   return m_Archive.fail(&ErrorHandler::reportCloseError, nullptr, error);
 }
 

@@ -44,7 +44,7 @@ private:
   bool takeAuxiliaryContents(ArchiveMember* member);
   bool skipContents();
   bool skipPadding();
-  bool closeFile();
+  bool closeFile(bool isRead);
 
   bool readSymbolTable();
   bool addSymbol(uint32_t index, std::string_view name, uint32_t offset);

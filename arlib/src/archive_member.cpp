@@ -151,6 +151,8 @@ bool ArchiveMember::discardContents() {
 
 void ArchiveMember::determineType() {
   QUARN_ASSERT(1, m_Type == NULL);
+  // The test looks at the contents or their location, which want a member of some type.
+  m_Type = UnknownArchiveMemberType::getInstance();
   m_Type = ArchiveMemberType::decide(this);
 }
 

@@ -48,11 +48,18 @@ bool AuxiliaryMembers::update() {
   return true;
 }
 
-// Moving a table to the front makes nothing stale that was not stale before.
+// Moving a table to the front makes no table stale that was not stale before. It does shift the
+// members: a long-name table that came second in the file changes places with the first.
 void AuxiliaryMembers::putTablesInPlace() {
   uint32_t place = 0;
-  if (m_Archive.m_SymbolTable != nullptr) m_Archive.moveMember(m_Archive.m_SymbolTable, place++);
-  if (m_Archive.m_FileNameTable != nullptr) m_Archive.moveMember(m_Archive.m_FileNameTable, place);
+  for (ArchiveMember* table : {m_Archive.m_SymbolTable, m_Archive.m_FileNameTable}) {
+    if (table == nullptr) continue;
+    if (m_Archive.m_ArchiveMembers[place] != table) {
+      m_Archive.moveMember(table, place);
+      m_Archive.m_ArchiveMemberOffsetsUpToDate = false;
+    }
+    ++place;
+  }
   m_Archive.m_FileNameTableUpToDate = true;
   m_Archive.m_SymbolTableUpToDate = true;
 }

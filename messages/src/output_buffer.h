@@ -26,7 +26,7 @@ public:
   }
 
 private:
-  static constexpr size_t Capacity = 64 * 1024; // bytes
+  static constexpr size_t Capacity = 0x10000; // bytes
 
   OutputSink* m_Sink;
   size_t m_Used = 0;

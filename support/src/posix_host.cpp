@@ -221,7 +221,9 @@ public:
     for (int i = 0; i < MaximumLinks; ++i) {
       const std::string text = linkText(place);
       if (text.empty()) return place;
-      place = text.front() == '/' ? text : place.substr(0, place.rfind('/') + 1) + text;
+      // A relative link starts from the folder that it lies in.
+      place.resize(text.front() == '/' ? 0 : place.rfind('/') + 1);
+      place += text;
     }
     return name;
   }

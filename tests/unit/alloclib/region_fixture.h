@@ -25,8 +25,8 @@ namespace alloclib {
 
 class RegionGeneralPeer {
 public:
-  static RegionGeneral* create(Region* parent, uint32_t flagsState = 1) {
-    return RegionGeneral::createPlain(parent, 4096, 4096, "test region", flagsState);
+  static RegionGeneral* create(Region* parent, uint32_t flagsState = 1, size_t firstBlock = 4096) {
+    return RegionGeneral::createPlain(parent, firstBlock, firstBlock, "test region", flagsState);
   }
   static uint32_t getState(const RegionGeneral* region) { return region->m_FlagsState; }
   static void setState(RegionGeneral* region, uint32_t state) { region->m_FlagsState = state; }

@@ -106,22 +106,30 @@ TEST_F(RegionGeneralTest, OneByteLessComesFromABlock) {
   region->discard(block, 10239);
   EXPECT_TRUE(parent.discards.empty());
   // The piece serves again, as a working block.
-  allocate(8000);
   EXPECT_EQ(allocate(8000), block);
 }
 
 TEST_F(RegionGeneralTest, TheInlinePathNeverServesALargeRequest) {
-  // A working block with room for two such requests would be needed, so one of just that size is
-  // made from a discarded piece.
-  char* piece = allocate(10239);
-  region->discard(piece, 10239);
-  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
-  char* small = allocate(4000);
-  ASSERT_EQ(small, piece);
-  char* cursor = Peer::getCursor(region);
-  region->discard(allocate(10240), 10240);
-  EXPECT_EQ(Peer::getCursor(region), cursor);
-  EXPECT_LE(Peer::getFastLimit(region) - cursor, 10240);
+  RegionGeneral* roomy = Peer::create(&parent, 1, 40960);
+  char* cursor = Peer::getCursor(roomy);
+  EXPECT_EQ(Peer::getFastLimit(roomy), cursor + 10240);
+  void* block = roomy->allocate(10240);
+  EXPECT_EQ(Peer::getCursor(roomy), cursor);
+  EXPECT_TRUE(Peer::hasLargeBlocks(roomy));
+  roomy->discard(block, 10240);
+  EXPECT_EQ(roomy->allocate(10232), cursor);
+  EXPECT_EQ(roomy->allocate(10239), cursor + 10232);
+  roomy->Destroy(true);
+}
+
+TEST_F(RegionGeneralTest, TheFastLimitIsTheEndIfNoMoreThan10240BytesRemain) {
+  for (size_t remaining : {10232u, 10240u, 10248u}) {
+    RegionGeneral* roomy = Peer::create(&parent, 1, 40960);
+    Peer::setCursor(roomy, Peer::getWorkingEnd(roomy) - remaining);
+    Peer::setBlockWorkingState(roomy);
+    EXPECT_EQ(Peer::getWorkingEnd(roomy) - Peer::getFastLimit(roomy), remaining > 10240 ? 8 : 0);
+    roomy->Destroy(true);
+  }
 }
 
 TEST_F(RegionGeneralTest, LargeBlocksAreUnlinkedFromAnyPlaceInTheirList) {
@@ -217,8 +225,8 @@ TEST_F(RegionGeneralTest, AnAlignedRequestTakesALargerPieceAndReturnsTheRest) {
 }
 
 TEST_F(RegionGeneralTest, AlignedRequestsAreAligned) {
-  for (size_t alignment : {1, 2, 4, 8, 16, 64, 512, 4096})
-    for (size_t size : {1, 100, 5000, 10240, 200000}) {
+  for (size_t alignment : {1u, 2u, 4u, 8u, 16u, 64u, 512u, 4096u})
+    for (size_t size : {1u, 100u, 5000u, 10240u, 200000u}) {
       char* block = allocate(size, alignment);
       EXPECT_EQ(reinterpret_cast<uintptr_t>(block) % alignment, 0u);
       allocate(8);
@@ -290,6 +298,7 @@ TEST_F(RegionGeneralTest, TracingSendsEachAllocationTheSlowWay) {
   fillBucket(64);
   EXPECT_EQ(Peer::getState(region), 6u);
   allocate(64);
+  allocate(64);
   EXPECT_EQ(Peer::getState(region), 5u);
 }
 
@@ -316,7 +325,7 @@ TEST_F(RegionGeneralTest, APlainRegionCountsItsBlocks) {
   EXPECT_EQ(stats.getFrees(), 1u);
 }
 
-#if !defined(__SANITIZE_ADDRESS__)
+#ifndef ASAN_POISON_MEMORY_REGION
 TEST_F(RegionGeneralTest, MoreThanFourGibibytesInOnePieceKeepTheirSize) {
   constexpr size_t size = (size_t{5} << 30) + 1;
   char* block = static_cast<char*>(region->allocate(size));
@@ -329,7 +338,7 @@ TEST_F(RegionGeneralTest, MoreThanFourGibibytesInOnePieceKeepTheirSize) {
 
 TEST_F(RegionGeneralDeathTest, ASizeThatWouldWrapIsOutOfMemory) {
   for (size_t size : {SIZE_MAX, SIZE_MAX - 7, SIZE_MAX - 4096, SIZE_MAX / 2})
-    for (size_t alignment : {8, 4096})
+    for (size_t alignment : {8u, 4096u})
       EXPECT_EXIT((void)region->allocate(size, alignment), ExitedWithCode(1),
                   "^Out of memory. Allocation of " + std::to_string(size) + " bytes failed");
 }
@@ -418,7 +427,7 @@ TEST_F(RegionGeneralCreateTest, TheTransparentModeForwardsToARegionOfItsOwn) {
   region->discard(large, 20000);
   EXPECT_EQ(Peer::getState(region), 3u);
   // The initial size is that of the inner region's first block.
-  EXPECT_THAT(getReport(false, false), testing::HasSubstr("shell,           20480,"));
+  EXPECT_THAT(getReport(false, false), testing::HasSubstr("shell,               20480,"));
   region->Destroy(true);
 }
 
@@ -442,7 +451,7 @@ TEST_F(RegionGeneralCreateDeathTest, AWishThatWouldWrapIsOutOfMemory) {
       ExitedWithCode(1), "^Out of memory. Allocation of 18446744073709551615 bytes failed");
 }
 
-#if defined(__SANITIZE_ADDRESS__)
+#ifdef ASAN_POISON_MEMORY_REGION
 TEST_F(RegionGeneralDeathTest, TheSanitizerSeesUsesAfterADiscardAndBehindABlock) {
   char* block = allocate(20);
   EXPECT_DEATH(block[20] = 1, "use-after-poison");

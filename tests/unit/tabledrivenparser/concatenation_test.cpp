@@ -77,7 +77,7 @@ TEST(Concatenation, hasNoLimit) {
 
 // A million letters would be 10^12 steps to anything quadratic.
 TEST(Concatenation, isLinearWithoutWarnings) {
-  static constexpr MatchString letterRows[] = {{"h", 0, Kind_Implied, k_True}};
+  static constexpr MatchString letterRows[] = {{"h", 0, Kind_Implied, on}};
   static constexpr ValueDefinition letterDefinitions[] = {flagOf(nullptr)};
   static const OptionTable letters{letterRows, indexByFirstLetter(letterRows)};
   class Silent final : public Reporter {

@@ -14,16 +14,19 @@ class LinkedListTest : public testing::Test {
 protected:
   Lines strings() const {
     Lines lines;
-    for (const char* text : m_Strings) lines.push_back(text);
+    for (const char* text : m_Strings)
+      lines.push_back(text);
     return lines;
   }
   std::vector<int> numbers() const {
     std::vector<int> result;
-    for (int number : m_Numbers) result.push_back(number);
+    for (int number : m_Numbers)
+      result.push_back(number);
     return result;
   }
   void appendAll(std::initializer_list<const char*> texts) {
-    for (const char* text : texts) m_Strings.append(text);
+    for (const char* text : texts)
+      m_Strings.append(text);
   }
 
   alloclib::RegionOwner m_Region = makeRegion();
@@ -38,7 +41,8 @@ TEST_F(LinkedListTest, startsEmpty) {
 }
 
 TEST_F(LinkedListTest, keepsTheOrderOfAppending) {
-  for (int number : {3, 1, 2}) m_Numbers.append(number);
+  for (int number : {3, 1, 2})
+    m_Numbers.append(number);
   EXPECT_THAT(numbers(), ElementsAre(3, 1, 2));
   EXPECT_EQ(m_Numbers.size(), 3u);
   EXPECT_FALSE(m_Numbers.isEmpty());
@@ -51,7 +55,8 @@ TEST_F(LinkedListTest, findsTheFirstEqualElement) {
 }
 
 TEST_F(LinkedListTest, removesAllEqualElements) {
-  for (int number : {7, 1, 7, 2, 7}) m_Numbers.append(number);
+  for (int number : {7, 1, 7, 2, 7})
+    m_Numbers.append(number);
   m_Numbers.removeAll(7);
   EXPECT_THAT(numbers(), ElementsAre(1, 2));
   m_Numbers.append(3);

@@ -103,12 +103,12 @@ bool RecordingListener::onOption(Parser& parser, uint32_t id, const Value& value
 }
 
 ParserSession::ParserSession(const OptionTable& table, std::span<const ValueDefinition> definitions)
-    : m_Records(definitions.size()), m_Table(table), m_Definitions(definitions),
+    : m_Records(definitions.size()), m_Options(table), m_DefinitionTable(definitions),
       m_Region(makeRegion()) {}
 
 Parser& ParserSession::parser() {
   if (!m_Parser) {
-    m_Parser = std::make_unique<Parser>(ParserTables{m_Table, m_Definitions, m_Records},
+    m_Parser = std::make_unique<Parser>(ParserTables{m_Options, m_DefinitionTable, m_Records},
                                         &m_Listener, m_Reporter, m_Files, *m_Region);
   }
   return *m_Parser;
@@ -126,14 +126,16 @@ void ParserSession::parse(const Lines& words) {
     argv.push_back(m_Words.back()->c_str());
   }
   argv.push_back(nullptr);
-  for (size_t at = 0; argv[at] != nullptr;) at += parser().parseWord(argv[at], argv[at + 1]);
+  for (size_t at = 0; argv[at] != nullptr;)
+    at += parser().parseWord(argv[at], argv[at + 1]);
 }
 
 Lines ParserSession::texts(uint32_t id) {
   Lines lines;
   const StrList* list = parser().textsValue(id);
   if (list == nullptr) return lines;
-  for (const char* text : *list) lines.push_back(text);
+  for (const char* text : *list)
+    lines.push_back(text);
   return lines;
 }
 
@@ -141,10 +143,12 @@ std::vector<long long> ParserSession::numbers(uint32_t id) {
   std::vector<long long> result;
   const Value& value = parser().record(id).value;
   if (parser().definition(id).type == Type_IntVector && value.integers != nullptr) {
-    for (int number : *value.integers) result.push_back(number);
+    for (int number : *value.integers)
+      result.push_back(number);
   }
   if (parser().definition(id).type == Type_Int64Vector && value.longIntegers != nullptr) {
-    for (long long number : *value.longIntegers) result.push_back(number);
+    for (long long number : *value.longIntegers)
+      result.push_back(number);
   }
   return result;
 }

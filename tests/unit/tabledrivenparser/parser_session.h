@@ -88,8 +88,8 @@ public:
   std::vector<ValueRecord> m_Records;
 
 private:
-  const OptionTable& m_Table;
-  std::span<const ValueDefinition> m_Definitions;
+  const OptionTable& m_Options;
+  std::span<const ValueDefinition> m_DefinitionTable;
   alloclib::RegionOwner m_Region;
   std::unique_ptr<Parser> m_Parser;
   std::vector<std::unique_ptr<std::string>> m_Words;

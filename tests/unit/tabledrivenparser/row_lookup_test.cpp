@@ -66,14 +66,15 @@ class AmbiguousWord : public testing::TestWithParam<Ambiguity> {};
 TEST_P(AmbiguousWord, namesTheBestAndTheLastRowAndIsUnrecognized) {
   const std::string word = GetParam().word;
   const Lines reports = reportsOf({GetParam().word});
-  EXPECT_THAT(reports, ElementsAre("remark: Possible matches for '" + word.substr(2) +
-                                       "' include '" + GetParam().first + "' and '" +
-                                       GetParam().second + "'.",
-                                   "fatal: Unrecognized option '" + word + "'."));
+  EXPECT_THAT(reports,
+              ElementsAre("remark: Possible matches for '" + word.substr(2) + "' include '" +
+                              GetParam().first + "' and '" + GetParam().second + "'.",
+                          "fatal: Unrecognized option '" + word + "'."));
 }
 
 INSTANTIATE_TEST_SUITE_P(RowLookup, AmbiguousWord,
-                         testing::Values(Ambiguity{"--no.", "no_debug_symbols", "no_unique_symbols"},
+                         testing::Values(Ambiguity{"--no.", "no_debug_symbols",
+                                                   "no_unique_symbols"},
                                          Ambiguity{"--n.", "new_files_only", "no_unique_symbols"},
                                          Ambiguity{"--diag.", "diag_error", "diag_warning"},
                                          Ambiguity{"--s.", "show_cmdline", "sizes"},
@@ -271,18 +272,18 @@ TEST(RowArgument, isTheLastOneGiven) {
 
 // A small table with what the big one lacks.
 
-constexpr uint32_t k_Reds[] = {1, 0};
-constexpr uint32_t k_RedAndGreen[] = {1, 2, 0};
+constexpr uint32_t red[] = {1, 0};
+constexpr uint32_t redAndGreen[] = {1, 2, 0};
 // clang-format off
 constexpr MatchString specialRows[] = {
   {"",        0, Kind_Required, {},     nullptr,       0,   Flag_Public},
-  {"1st",     1, Kind_Implied,  k_True, nullptr,       ',', Flag_Public},
-  {"aged",    2, Kind_Implied,  k_True, nullptr,       ',', Flag_Public | Flag_Deprecated | Flag_OldSyntax},
-  {"hidden",  3, Kind_Implied,  k_True, k_Reds,        ',', Flag_Public},
-  {"hinted",  3, Kind_Implied,  k_True, k_RedAndGreen, ',', Flag_Public},
+  {"1st",     1, Kind_Implied,  on, nullptr,       ',', Flag_Public},
+  {"aged",    2, Kind_Implied,  on, nullptr,       ',', Flag_Public | Flag_Deprecated | Flag_OldSyntax},
+  {"hidden",  3, Kind_Implied,  on, red,        ',', Flag_Public},
+  {"hinted",  3, Kind_Implied,  on, redAndGreen, ',', Flag_Public},
   {"O",       4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
   {"other",   4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
-  {"private", 1, Kind_Implied,  k_True, nullptr,       ',', 0},
+  {"private", 1, Kind_Implied,  on, nullptr,       ',', 0},
   {"w",       0, Kind_Required, {},     nullptr,       '=', Flag_Public},
 };
 constexpr ValueDefinition specialDefinitions[] = {
@@ -397,8 +398,7 @@ TEST(FallbackHandling, mayDecline) {
   ParserSession session(open, definitions);
   session.parse({"--create=1"});
   EXPECT_THAT(fallback.m_Lines, ElementsAre("2create=1/<null>"));
-  EXPECT_THAT(session.reports(),
-              ElementsAre("fatal: Unexpected argument for option '--create'"));
+  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unexpected argument for option '--create'"));
 }
 
 TEST(Failure, endsAllParsing) {

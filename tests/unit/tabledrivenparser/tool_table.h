@@ -37,48 +37,48 @@ enum Id : uint32_t {
   Id_Count,
 };
 
-constexpr Value k_False{.integer = 0};
-constexpr Value k_True{.integer = 1};
-constexpr uint8_t k_Old = Flag_OldSyntax | Flag_Public;
-constexpr uint8_t k_New = Flag_Public;
+constexpr Value off{.integer = 0};
+constexpr Value on{.integer = 1};
+constexpr uint8_t oldRow = Flag_OldSyntax | Flag_Public;
+constexpr uint8_t newRow = Flag_Public;
 
 // clang-format off
 inline constexpr MatchString rows[] = {
-  {"",                  Id_Words,           Kind_Required, {},      nullptr, 0,   k_New},
-  {"a",                 Id_After,           Kind_Required, {},      nullptr, ',', k_Old},
-  {"b",                 Id_Before,          Kind_Required, {},      nullptr, ',', k_Old},
-  {"C",                 Id_KeepOld,         Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"c",                 Id_NoBanner,        Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"create",            Id_Create,          Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"d",                 Id_Delete,          Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"db_check",          Id_CheckLevel,      Kind_Required, {},      nullptr, ',', k_New},
-  {"debug_symbols",     Id_DebugSymbols,    Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"diag_error",        Id_DiagError,       Kind_Required, {},      nullptr, ',', k_New},
-  {"diag_style",        Id_DiagStyle,       Kind_Required, {},      nullptr, ',', k_New},
-  {"diag_warning",      Id_DiagWarning,     Kind_Required, {},      nullptr, ',', k_New},
-  {"h",                 Id_Help,            Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"help",              Id_Help,            Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"i",                 Id_Before,          Kind_Required, {},      nullptr, ',', k_Old},
-  {"libattrmap",        Id_Map,             Kind_Required, {},      nullptr, ',', k_New},
-  {"new_files_only",    Id_NewFilesOnly,    Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"no_debug_symbols",  Id_DebugSymbols,    Kind_Implied,  k_False, nullptr, ',', k_New},
-  {"no_normalise",      Id_Normalise,       Kind_Required, {},      nullptr, ',', k_New},
-  {"no_unique_symbols", Id_UniqueSymbols,   Kind_Implied,  k_False, nullptr, ',', k_New},
-  {"normalise",         Id_Normalise,       Kind_Required, {},      nullptr, ',', k_New},
-  {"q",                 Id_Replace,         Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"r",                 Id_Replace,         Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"show_cmdline",      Id_ShowCommandLine, Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"sizes",             Id_Sizes,           Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"T",                 Id_Truncate,        Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"t",                 Id_List,            Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"unique_symbols",    Id_UniqueSymbols,   Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"V",                 Id_Version,         Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"v",                 Id_Verbose,         Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"version",           Id_Version,         Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"version_number",    Id_VersionNumber,   Kind_Implied,  k_True,  nullptr, ',', k_New},
-  {"via",               Id_Via,             Kind_Required, {},      nullptr, ',', k_Old},
-  {"vsn",               Id_Version,         Kind_Implied,  k_True,  nullptr, ',', k_Old},
-  {"x",                 Id_Extract,         Kind_Implied,  k_True,  nullptr, ',', k_Old},
+  {"",                  Id_Words,           Kind_Required, {},      nullptr, 0,   newRow},
+  {"a",                 Id_After,           Kind_Required, {},      nullptr, ',', oldRow},
+  {"b",                 Id_Before,          Kind_Required, {},      nullptr, ',', oldRow},
+  {"C",                 Id_KeepOld,         Kind_Implied,  on,  nullptr, ',', newRow},
+  {"c",                 Id_NoBanner,        Kind_Implied,  on,  nullptr, ',', newRow},
+  {"create",            Id_Create,          Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"d",                 Id_Delete,          Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"db_check",          Id_CheckLevel,      Kind_Required, {},      nullptr, ',', newRow},
+  {"debug_symbols",     Id_DebugSymbols,    Kind_Implied,  on,  nullptr, ',', newRow},
+  {"diag_error",        Id_DiagError,       Kind_Required, {},      nullptr, ',', newRow},
+  {"diag_style",        Id_DiagStyle,       Kind_Required, {},      nullptr, ',', newRow},
+  {"diag_warning",      Id_DiagWarning,     Kind_Required, {},      nullptr, ',', newRow},
+  {"h",                 Id_Help,            Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"help",              Id_Help,            Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"i",                 Id_Before,          Kind_Required, {},      nullptr, ',', oldRow},
+  {"libattrmap",        Id_Map,             Kind_Required, {},      nullptr, ',', newRow},
+  {"new_files_only",    Id_NewFilesOnly,    Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"no_debug_symbols",  Id_DebugSymbols,    Kind_Implied,  off, nullptr, ',', newRow},
+  {"no_normalise",      Id_Normalise,       Kind_Required, {},      nullptr, ',', newRow},
+  {"no_unique_symbols", Id_UniqueSymbols,   Kind_Implied,  off, nullptr, ',', newRow},
+  {"normalise",         Id_Normalise,       Kind_Required, {},      nullptr, ',', newRow},
+  {"q",                 Id_Replace,         Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"r",                 Id_Replace,         Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"show_cmdline",      Id_ShowCommandLine, Kind_Implied,  on,  nullptr, ',', newRow},
+  {"sizes",             Id_Sizes,           Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"T",                 Id_Truncate,        Kind_Implied,  on,  nullptr, ',', newRow},
+  {"t",                 Id_List,            Kind_Implied,  on,  nullptr, ',', newRow},
+  {"unique_symbols",    Id_UniqueSymbols,   Kind_Implied,  on,  nullptr, ',', newRow},
+  {"V",                 Id_Version,         Kind_Implied,  on,  nullptr, ',', newRow},
+  {"v",                 Id_Verbose,         Kind_Implied,  on,  nullptr, ',', newRow},
+  {"version",           Id_Version,         Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"version_number",    Id_VersionNumber,   Kind_Implied,  on,  nullptr, ',', newRow},
+  {"via",               Id_Via,             Kind_Required, {},      nullptr, ',', oldRow},
+  {"vsn",               Id_Version,         Kind_Implied,  on,  nullptr, ',', oldRow},
+  {"x",                 Id_Extract,         Kind_Implied,  on,  nullptr, ',', oldRow},
 };
 
 inline constexpr MatchString styles[] = {
@@ -117,7 +117,7 @@ inline constexpr auto mapRows = rowsNamed(rows, "libattrmap");
 inline constexpr auto viaRows = rowsNamed(rows, "via");
 
 constexpr ValueDefinition flagOf(const MatchString* const* list) {
-  return {Type_Boolean, Default_Fixed, k_False, {}, list};
+  return {Type_Boolean, Default_Fixed, off, {}, list};
 }
 constexpr ValueDefinition textOf(const MatchString* const* list) {
   return {Type_String, Default_Fixed, {.text = nullptr}, {}, list};

@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: Apache-2.0
+// Options whose handler takes the words itself.
+#include "type_table.h"
+
+#include "tabledrivenparser/interface/call_back_handler.h"
+#include "tabledrivenparser/interface/text_sink.h"
+
+namespace tabledrivenparser::types {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+class Handler final : public CallBackHandler {
+public:
+  bool takeArgument(Parser&, const MatchString& row, const char* argument,
+                    uint32_t& wordsUsed) override {
+    m_Lines.push_back(std::string(row.name) + "/" + (argument != nullptr ? argument : "<null>") +
+                      "/" + std::to_string(wordsUsed));
+    if (m_WordsUsed) wordsUsed = *m_WordsUsed;
+    return m_Answer;
+  }
+  void printCommandLine(const Parser&, TextSink& sink) const override {
+    sink.startEntry();
+    sink.put("--call=taken");
+  }
+  void releaseValues() override { m_Lines.clear(); }
+
+  Lines m_Lines;
+  bool m_Answer = true;
+  std::optional<uint32_t> m_WordsUsed;
+};
+
+class CallBackOption : public testing::Test {
+protected:
+  CallBackOption() { m_Session.m_Definitions[Id_CallBack].defaultValue.handler = &m_Handler; }
+
+  Handler m_Handler;
+  Session m_Session;
+};
+
+TEST_F(CallBackOption, handsTheWordOver) {
+  m_Session.parse({"--call=a", "--call", "b", "-k"});
+  EXPECT_THAT(m_Handler.m_Lines, ElementsAre("call/a/1", "call/b/2", "k/<null>/1"));
+  EXPECT_EQ(m_Session.parser().record(Id_CallBack).firstSet, 1u);
+  EXPECT_EQ(m_Session.parser().record(Id_CallBack).lastSet, 3u);
+  EXPECT_THAT(m_Session.m_Listener.m_Lines, IsEmpty());
+}
+
+TEST_F(CallBackOption, mayUseFewerWords) {
+  m_Handler.m_WordsUsed = 1;
+  m_Session.parse({"--call", "b"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("b"));
+}
+
+TEST_F(CallBackOption, mayRefuseTheArgument) {
+  m_Handler.m_Answer = false;
+  m_Session.parse({"--call=a"});
+  EXPECT_THAT(m_Session.reports(),
+              ElementsAre("fatal: Argument 'a' not permitted for option 'call'."));
+  EXPECT_FALSE(m_Session.parser().isSet(Id_CallBack));
+}
+
+TEST_F(CallBackOption, mayMakeTheWordUnknown) {
+  m_Handler.m_Answer = false;
+  m_Handler.m_WordsUsed = 0;
+  m_Session.parse({"--call=a"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Unrecognized option '--call=a'."));
+}
+
+TEST_F(CallBackOption, mayStandInAConcatenation) {
+  m_Session.parse({"-kx"});
+  EXPECT_THAT(m_Handler.m_Lines, ElementsAre("k/<null>/1"));
+  EXPECT_TRUE(m_Session.parser().booleanValue(Id_Boolean));
+}
+
+TEST_F(CallBackOption, isRefusedWithoutAHandler) {
+  m_Session.m_Definitions[Id_CallBack].defaultValue.handler = nullptr;
+  m_Session.parse({"--call=a"});
+  EXPECT_THAT(m_Session.reports(),
+              ElementsAre("fatal: Argument 'a' not permitted for option 'call'."));
+}
+
+TEST_F(CallBackOption, printsItselfWhenSet) {
+  EXPECT_EQ(m_Session.commandLine(), "");
+  m_Session.parse({"-k", "-x"});
+  EXPECT_EQ(m_Session.commandLine(), "-x --call=taken");
+}
+
+TEST_F(CallBackOption, isReleased) {
+  m_Session.parse({"-k"});
+  m_Session.parser().releaseValues();
+  EXPECT_THAT(m_Handler.m_Lines, IsEmpty());
+}
+
+} // namespace tabledrivenparser::types

@@ -1,0 +1,67 @@
+// SPDX-License-Identifier: Apache-2.0
+// Parsing for some options only.
+#include "tool_table.h"
+
+namespace tabledrivenparser::tool {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+constexpr uint32_t onlyStyleAndVerbose[] = {Id_DiagStyle, Id_Verbose};
+
+uint32_t parseFiltered(Session& session, const char* word, const char* next = nullptr) {
+  return session.parser().parseWord(word, next, onlyStyleAndVerbose);
+}
+
+TEST(FilteredParse, storesTheListedOptions) {
+  Session session;
+  EXPECT_EQ(parseFiltered(session, "--diag_style", "gnu"), 2u);
+  EXPECT_EQ(parseFiltered(session, "-v"), 1u);
+  EXPECT_EQ(session.parser().enumeratorValue(Id_DiagStyle), 4u);
+  EXPECT_TRUE(session.parser().booleanValue(Id_Verbose));
+}
+
+TEST(FilteredParse, passesOverTheOthersWithoutTheirArguments) {
+  Session session;
+  EXPECT_EQ(parseFiltered(session, "-a", "pos"), 1u);
+  EXPECT_EQ(parseFiltered(session, "-a"), 1u);
+  EXPECT_EQ(parseFiltered(session, "--normalise=abc"), 1u);
+  EXPECT_EQ(parseFiltered(session, "word"), 1u);
+  EXPECT_EQ(session.parser().setCounter(), 0u);
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(FilteredParse, skipsWordsThatNoRowAccepts) {
+  Session session;
+  EXPECT_EQ(parseFiltered(session, "--nonsense"), 0u);
+  EXPECT_EQ(parseFiltered(session, "--create=1"), 0u);
+  EXPECT_EQ(parseFiltered(session, "-k"), 0u);
+  EXPECT_THAT(session.reports(), IsEmpty());
+}
+
+TEST(FilteredParse, stillReportsBadArgumentsOfListedOptions) {
+  Session session;
+  EXPECT_EQ(parseFiltered(session, "--diag_style=x"), 1u);
+  EXPECT_THAT(session.reports(),
+              ElementsAre("fatal: Argument 'x' not permitted for option 'diag_style'."));
+}
+
+TEST(FilteredParse, readsViaFilesThroughTheFilter) {
+  Session session;
+  session.m_Files.m_Contents["f"] = "-t --diag_style=ide word --via g";
+  session.m_Files.m_Contents["g"] = "-v";
+  EXPECT_EQ(parseFiltered(session, "--via", "f"), 2u);
+  EXPECT_EQ(session.parser().enumeratorValue(Id_DiagStyle), 2u);
+  EXPECT_TRUE(session.parser().booleanValue(Id_Verbose));
+  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_THAT(session.texts(Id_Words), IsEmpty());
+  EXPECT_THAT(session.texts(Id_Via), ElementsAre("f", "g"));
+}
+
+TEST(FilteredParse, setsTheEndOfOptions) {
+  Session session;
+  EXPECT_EQ(parseFiltered(session, "--"), 1u);
+  EXPECT_TRUE(session.parser().isEndOfOptions());
+}
+
+} // namespace tabledrivenparser::tool

@@ -1,0 +1,143 @@
+// SPDX-License-Identifier: Apache-2.0
+// Values: their defaults, their counters, who else may take them, and how they end.
+#include "type_table.h"
+
+namespace tabledrivenparser::types {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+TEST(ValueRecordTest, startsAsItsDefaultAndUnset) {
+  Session session;
+  session.m_Records[Id_Int].value.integer = 99;
+  session.m_Records[Id_Int].lastSet = 99;
+  EXPECT_EQ(session.parser().integerValue(Id_Int), -1);
+  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 1u);
+  EXPECT_EQ(session.parser().textsValue(Id_StringVector), nullptr);
+  EXPECT_FALSE(session.parser().isSet(Id_Int));
+  EXPECT_TRUE(session.parser().isDefault(Id_Int));
+}
+
+TEST(ValueRecordTest, countsTheFirstAndTheLastTimeItWasSet) {
+  Session session;
+  session.parse({"--int=1", "-x", "--int=2"});
+  EXPECT_EQ(session.parser().record(Id_Int).firstSet, 1u);
+  EXPECT_EQ(session.parser().record(Id_Int).lastSet, 3u);
+  EXPECT_EQ(session.parser().record(Id_Boolean).firstSet, 2u);
+  EXPECT_EQ(session.parser().record(Id_Boolean).lastSet, 2u);
+  EXPECT_EQ(session.parser().setCounter(), 3u);
+}
+
+TEST(ValueRecordTest, staysUnsetWhenTheStoreFails) {
+  Session session;
+  session.parse({"--int=x"});
+  EXPECT_FALSE(session.parser().isSet(Id_Int));
+  EXPECT_EQ(session.parser().setCounter(), 0u);
+}
+
+TEST(ValueRecordTest, countsAsSetWhenTheListenerTookTheValue) {
+  Session session;
+  session.m_Listener.m_Answer = [](Parser&, uint32_t id, const Value&) { return id == Id_Int; };
+  session.parse({"--int=5", "--text=t"});
+  EXPECT_EQ(session.parser().integerValue(Id_Int), -1);
+  EXPECT_TRUE(session.parser().isSet(Id_Int));
+  EXPECT_STREQ(session.parser().textValue(Id_String), "t");
+  EXPECT_THAT(session.m_Listener.m_Lines, ElementsAre("5=5", "8=t"));
+}
+
+TEST(ValueRecordTest, isRefusedByItsValidator) {
+  Session session;
+  session.m_Records[Id_String].validator = [](const Parser&, uint32_t, const Value&) {
+    return false;
+  };
+  session.parse({"--text=t"});
+  EXPECT_THAT(session.reports(),
+              ElementsAre("fatal: Argument 't' not permitted for option 'text'."));
+  EXPECT_THAT(session.m_Listener.m_Lines, IsEmpty());
+}
+
+TEST(BooleanOption, takesTheRowsValueWhateverTheText) {
+  Session session;
+  session.parse({"--bool", "false"});
+  EXPECT_EQ(session.parser().record(Id_Boolean).value.integer, 1);
+  EXPECT_TRUE(session.parser().booleanValue(Id_Boolean));
+}
+
+TEST(StringOption, takesItsImpliedValue) {
+  Session session;
+  session.parse({"--text_x"});
+  EXPECT_STREQ(session.parser().textValue(Id_String), "x");
+}
+
+TEST(StringOption, pointsIntoTheCommandLine) {
+  Session session;
+  const char word[] = "--text=abc";
+  session.parser().parseWord(word, nullptr);
+  EXPECT_EQ(session.parser().textValue(Id_String), word + 7);
+}
+
+TEST(BadType, isNeverStored) {
+  Session session;
+  session.parse({"--bad=1"});
+  EXPECT_THAT(session.reports(),
+              ElementsAre("fatal: Argument '1' not permitted for option 'bad'."));
+}
+
+TEST(DefaultOfAValue, mayBeNone) {
+  Session session;
+  EXPECT_EQ(session.parser().addressValue(Id_Address64), 0u);
+}
+
+TEST(DefaultOfAValue, isTheFirstUsableNode) {
+  static constexpr uint32_t both[] = {1, 2, 0};
+  const DefaultNode last{nullptr, {.integer = 30}, nullptr};
+  const DefaultNode middle{expertMask, {.integer = 20}, &last};
+  const DefaultNode head{both, {.integer = 10}, &middle};
+  const auto defaultUnder = [&](uint32_t tableMask) {
+    Session session;
+    session.m_Table.restrictionMask = tableMask;
+    session.m_Definitions[Id_Int].defaultKind = Default_List;
+    session.m_Definitions[Id_Int].defaultValue.defaults = &head;
+    return session.parser().integerValue(Id_Int);
+  };
+  EXPECT_EQ(defaultUnder(3), 10);
+  EXPECT_EQ(defaultUnder(2), 20);
+  EXPECT_EQ(defaultUnder(1), 30);
+}
+
+TEST(DefaultOfAValue, isNoneWithoutAUsableNode) {
+  const DefaultNode node{expertMask, {.text = "x"}, nullptr};
+  Session session;
+  session.m_Table.restrictionMask = 1;
+  session.m_Definitions[Id_String].defaultKind = Default_List;
+  session.m_Definitions[Id_String].defaultValue.defaults = &node;
+  EXPECT_EQ(session.parser().textValue(Id_String), nullptr);
+}
+
+TEST(DefaultOfAValue, mayBeComputed) {
+  Session session;
+  session.m_Definitions[Id_Int].defaultKind = Default_Computed;
+  session.m_Definitions[Id_String].defaultKind = Default_Computed;
+  session.m_Records[Id_Int].defaultCallBack = [](const Parser&, uint32_t id) {
+    return Value{.integer = 100 + id};
+  };
+  EXPECT_EQ(session.parser().integerValue(Id_Int), 100 + static_cast<int>(Id_Int));
+  EXPECT_EQ(session.parser().textValue(Id_String), nullptr);
+  session.parse({"--int=105"});
+  EXPECT_TRUE(session.parser().isDefault(Id_Int));
+}
+
+TEST(Release, emptiesVectorsAndLeavesOtherValues) {
+  Session session;
+  session.m_Files.m_Contents["f"] = "--texts=b --text=c";
+  session.parse({"--texts=a", "--many=1", "--long=2", "--int=3", "--via=f"});
+  session.parser().releaseValues();
+  EXPECT_THAT(session.texts(Id_StringVector), IsEmpty());
+  EXPECT_THAT(session.texts(Id_Via), IsEmpty());
+  EXPECT_THAT(session.numbers(Id_IntVector), IsEmpty());
+  EXPECT_THAT(session.numbers(Id_Int64Vector), IsEmpty());
+  EXPECT_EQ(session.parser().integerValue(Id_Int), 3);
+  EXPECT_STREQ(session.parser().textValue(Id_String), "c");
+}
+
+} // namespace tabledrivenparser::types

@@ -1,0 +1,272 @@
+// SPDX-License-Identifier: Apache-2.0
+// Via files as a part of the command line.
+#include "tool_table.h"
+
+#include "tabledrivenparser/interface/stdio_via_file_reader.h"
+
+#include <cstdio>
+#include <filesystem>
+
+namespace tabledrivenparser::tool {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+class ViaOption : public testing::Test {
+protected:
+  std::map<std::string, std::string>& files() { return m_Session.m_Files.m_Contents; }
+
+  Session m_Session;
+};
+
+TEST_F(ViaOption, readsWordsAtItsPlace) {
+  files()["f"] = "-t b\n--diag_style=gnu c";
+  m_Session.parse({"a", "--via", "f", "d"});
+  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("a", "b", "c", "d"));
+  EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("f"));
+  EXPECT_THAT(m_Session.reports(), IsEmpty());
+  EXPECT_THAT(m_Session.m_Listener.m_Lines,
+              ElementsAre("24=a", "9=1", "24=b", "20=4", "24=c", "24=d"));
+  EXPECT_EQ(m_Session.m_Files.m_OpenCount, 0);
+}
+
+TEST_F(ViaOption, addsNothingFromAnEmptyFile) {
+  files()["f"] = "";
+  m_Session.parse({"--via=f"});
+  EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("f"));
+  EXPECT_THAT(m_Session.reports(), IsEmpty());
+}
+
+TEST_F(ViaOption, worksWithOneDashAndAWarning) {
+  files()["f"] = "x";
+  m_Session.parse({"-via", "f"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("x"));
+  EXPECT_THAT(m_Session.reports(), ElementsAre("warning: Old syntax, please use '--via'."));
+}
+
+TEST_F(ViaOption, readsEachFileOfAList) {
+  files()["a"] = "1";
+  files()["b"] = "2";
+  m_Session.parse({"--via", "a,b", "--via=a"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("1", "2", "1"));
+  EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("a", "b", "a"));
+}
+
+TEST_F(ViaOption, stopsAtTheFirstBadFileOfAList) {
+  files()["b"] = "2";
+  m_Session.parse({"--via", "a,b"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Could not open via file 'a'."));
+  EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("a"));
+}
+
+TEST_F(ViaOption, takesArgumentsOfOptionsFromTheFile) {
+  files()["f"] = "-a\n pos --db_check \"\" x";
+  m_Session.parse({"--via", "f"});
+  EXPECT_STREQ(m_Session.parser().textValue(Id_After), "pos");
+  EXPECT_STREQ(m_Session.parser().textValue(Id_CheckLevel), "");
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("x"));
+}
+
+TEST_F(ViaOption, takesNoArgumentFromOutsideTheFile) {
+  files()["f"] = "x\n-a\n";
+  m_Session.parse({"--via", "f", "pos"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Missing argument for option 'a'."));
+}
+
+TEST_F(ViaOption, passesTheEndOfOptionsOn) {
+  files()["f"] = "-t -- -x";
+  m_Session.parse({"--via", "f", "-v"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("-x", "-v"));
+  EXPECT_TRUE(m_Session.parser().isEndOfOptions());
+}
+
+TEST_F(ViaOption, keepsEmptyWordsAndSingleDashes) {
+  files()["f"] = "\"\" - '=x'";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("", "-", "=x"));
+}
+
+TEST_F(ViaOption, copiesTextsThatOutliveTheBuffer) {
+  std::string contents = "-a pos --diag_error=L1,L2 --diag_error L3 --via inner -b=q";
+  for (int word = 0; word < 1000; ++word)
+    contents += " word" + std::to_string(word);
+  files()["f"] = contents;
+  files()["inner"] = "--libattrmap map";
+  m_Session.parse({"--via", "f"});
+  EXPECT_STREQ(m_Session.parser().textValue(Id_After), "pos");
+  EXPECT_STREQ(m_Session.parser().textValue(Id_Before), "q");
+  EXPECT_STREQ(m_Session.parser().textValue(Id_Map), "map");
+  EXPECT_THAT(m_Session.texts(Id_DiagError), ElementsAre("L1", "L2", "L3"));
+  EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("f", "inner"));
+  EXPECT_EQ(m_Session.texts(Id_Words).front(), "word0");
+  EXPECT_EQ(m_Session.texts(Id_Words).back(), "word999");
+  EXPECT_EQ(m_Session.parser().viaFileDepth(), 0u);
+}
+
+TEST_F(ViaOption, nestsNineLevels) {
+  for (int level = 1; level < 9; ++level) {
+    files()["f" + std::to_string(level)] =
+        "--via f" + std::to_string(level + 1) + " back" + std::to_string(level);
+  }
+  files()["f9"] = "deepest";
+  m_Session.parse({"--via", "f1"});
+  EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("deepest", "back8", "back7", "back6", "back5",
+                                                     "back4", "back3", "back2", "back1"));
+  EXPECT_THAT(m_Session.reports(), IsEmpty());
+}
+
+TEST_F(ViaOption, stopsAFileThatNamesItselfAtTheTenthLevel) {
+  files()["f"] = "--via f";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(),
+              ElementsAre("fatal: Recursive via file inclusion depth of 10 reached in file 'f'."));
+  EXPECT_EQ(m_Session.texts(Id_Via).size(), 9u);
+  EXPECT_EQ(m_Session.m_Files.m_OpenCount, 0);
+}
+
+TEST_F(ViaOption, countsTheSetBehindTheWordsOfTheFile) {
+  files()["f"] = "-t -v";
+  m_Session.parse({"--via", "f"});
+  EXPECT_EQ(m_Session.parser().record(Id_Via).firstSet, 3u);
+}
+
+TEST_F(ViaOption, reportsAFileThatCannotBeOpened) {
+  m_Session.parse({"--via", "no%s", "-t"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Could not open via file 'no%s'."));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+}
+
+TEST_F(ViaOption, reportsAnEmptyName) {
+  m_Session.parse({"--via="});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Could not open via file ''."));
+}
+
+TEST_F(ViaOption, reportsAReadError) {
+  files()["f"] = "-t word";
+  m_Session.m_Files.m_FailingRead = "f";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Error when reading from via file 'f'."));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+}
+
+TEST_F(ViaOption, actsOnEarlierPiecesBeforeAReadError) {
+  files()["f"] = "-t word" + std::string(2000, ' ') + "-v";
+  m_Session.m_Files.m_FailingRead = "f";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Error when reading from via file 'f'."));
+  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_Verbose));
+}
+
+TEST_F(ViaOption, warnsOfAFailingCloseAndGoesOn) {
+  files()["f"] = "-t";
+  m_Session.m_Files.m_FailingClose = "f";
+  m_Session.parse({"--via", "f", "-v"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("warning: Could not close via file 'f'."));
+  EXPECT_TRUE(m_Session.parser().booleanValue(Id_Verbose));
+}
+
+TEST_F(ViaOption, looksOneWordAheadBeforeItActs) {
+  files()["f"] = "-t \"open\n -v";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Malformed via file 'f'."));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+}
+
+TEST_F(ViaOption, hasActedOnAllButTheWordBeforeAMalformedOne) {
+  files()["f"] = "-t -v (open";
+  m_Session.parse({"--via", "f"});
+  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_Verbose));
+}
+
+TEST_F(ViaOption, reportsABadOptionOfTheFile) {
+  files()["f"] = "--nonsense -t";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Unrecognized option '--nonsense'."));
+  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+}
+
+TEST_F(ViaOption, takesNoPartInConcatenation) {
+  files()["f"] = "x";
+  m_Session.parse({"-tvia=f"});
+  EXPECT_THAT(m_Session.reports(),
+              ElementsAre("warning: Old syntax, please use '--via'.",
+                          "fatal: Concatenated options cannot have arguments: -via =f"));
+}
+
+TEST_F(ViaOption, takesAHundredThousandWords) {
+  constexpr size_t wordCount = 100 * 1000;
+  std::string contents;
+  for (size_t word = 0; word < wordCount; ++word)
+    contents += "w" + std::to_string(word) + "\r\n";
+  files()["f"] = contents;
+  m_Session.parse({"--via", "f"});
+  const Lines words = m_Session.texts(Id_Words);
+  ASSERT_EQ(words.size(), wordCount);
+  for (size_t word = 0; word < wordCount; ++word) {
+    ASSERT_EQ(words[word], "w" + std::to_string(word));
+  }
+}
+
+// The reader of real files.
+
+class StdioReader : public testing::Test {
+protected:
+  StdioReader() {
+    m_Folder = std::filesystem::temp_directory_path() /
+               ("via_" + std::to_string(::testing::UnitTest::GetInstance()->random_seed()) +
+                testing::UnitTest::GetInstance()->current_test_info()->name() +
+                std::to_string(reinterpret_cast<uintptr_t>(this)));
+    std::filesystem::create_directory(m_Folder);
+  }
+  ~StdioReader() override { std::filesystem::remove_all(m_Folder); }
+
+  Lines reportsOfReading(const std::string& path) {
+    Session session;
+    ValueRecord records[Id_Count];
+    const auto region = makeRegion();
+    Parser parser({table, definitions, records}, nullptr, session.m_Reporter, m_Reader, *region);
+    parser.parseWord("--via", path.c_str());
+    for (const StrList* words = parser.textsValue(Id_Words); words != nullptr; words = nullptr) {
+      for (const char* word : *words)
+        session.m_Reporter.m_Lines.push_back(word);
+    }
+    return session.reports();
+  }
+
+  std::filesystem::path m_Folder;
+  StdioViaFileReader m_Reader;
+};
+
+TEST_F(StdioReader, readsAFileInBinaryMode) {
+  const std::string path = m_Folder / "a file";
+  std::FILE* file = std::fopen(path.c_str(), "wb");
+  std::fputs("one\r\ntwo", file);
+  std::fclose(file);
+  EXPECT_THAT(reportsOfReading(path), ElementsAre("one", "two"));
+}
+
+TEST_F(StdioReader, cannotOpenWhatIsNotThere) {
+  const std::string path = m_Folder / "none";
+  EXPECT_THAT(reportsOfReading(path),
+              ElementsAre("fatal: Could not open via file '" + path + "'."));
+}
+
+TEST_F(StdioReader, cannotReadADirectory) {
+  const std::string path = m_Folder;
+  EXPECT_THAT(reportsOfReading(path),
+              ElementsAre("fatal: Error when reading from via file '" + path + "'."));
+}
+
+TEST_F(StdioReader, staysInErrorOnceAReadFailed) {
+  void* file = m_Reader.open(m_Folder.c_str());
+  ASSERT_NE(file, nullptr);
+  char buffer[8];
+  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::readError);
+  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::readError);
+  EXPECT_TRUE(m_Reader.close(file));
+}
+
+} // namespace tabledrivenparser::tool
