@@ -12,7 +12,9 @@
 #include "quarn/reporting.h"
 #include "support/interface/path.h"
 
+#include <span>
 #include <string>
+#include <vector>
 
 namespace quarn {
 
@@ -157,10 +159,10 @@ void Insertion::warnIfNotElf(const ArchiveMember& member) {
 }
 
 void Insertion::moveNewMembers() {
-  const auto count = static_cast<uint32_t>(m_Archive.getMembers().size()) - m_FirstNew;
   if (m_Run.position < 0) return;
-  m_Archive.moveLastMembers(count, static_cast<uint32_t>(m_Run.position));
-  m_Run.position += static_cast<int32_t>(count);
+  const std::span<ArchiveMember* const> added = m_Archive.getMembers().subspan(m_FirstNew);
+  m_Archive.moveMembers(std::vector(added.begin(), added.end()),
+                        static_cast<uint32_t>(m_Run.position));
 }
 
 } // namespace

@@ -1,10 +1,21 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Each move changes the order in which the next word is matched, so moves are done one by one.
+// Members move one after the other, each behind the one before it, and a word means the first
+// member that matches in the order reached so far. So at any time the list is
+//
+//   members in front of the position | those moved, by their last move | the other members
+//
+// (without a position the third part is empty). That picture is enough to find each word's member;
+// the list itself is put in order once, when all words are done.
 #include "quarn/actions.h"
 
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
+
+#include <algorithm>
+#include <unordered_map>
+#include <utility>
+#include <vector>
 
 namespace quarn {
 
@@ -12,34 +23,72 @@ using arlib::ArchiveMember;
 
 namespace {
 
-ArchiveMember* findFirst(const arlib::Archive& archive, const std::string& word) {
-  for (ArchiveMember* member : archive.getMembers()) {
-    if (!member->isAuxiliary() && memberMatches(*member, word)) return member;
+class Movement {
+public:
+  explicit Movement(Run& run) : m_Run(run), m_Selection(run.archive) {
+    const auto members = run.archive.getMembers();
+    m_Position = run.position < 0 ? members.size() : static_cast<size_t>(run.position);
+    for (size_t i = 0; i < members.size(); ++i) {
+      m_Places[members[i]] = {i < m_Position ? Part_Front : Part_Back, i};
+    }
   }
-  return nullptr;
+
+  // Null if the word matches nothing.
+  ArchiveMember* move(const std::string& word);
+  void reorder();
+
+private:
+  enum Part { Part_Front, Part_Moved, Part_Back };
+  using Place = std::pair<Part, size_t>; // then the old index, or the number of the move
+
+  Run& m_Run;
+  MemberSelection m_Selection;
+  size_t m_Position;
+  size_t m_Moves = 0;
+  std::unordered_map<const ArchiveMember*, Place> m_Places;
+};
+
+ArchiveMember* Movement::move(const std::string& word) {
+  const std::vector<ArchiveMember*> members = m_Selection.find(word);
+  const auto first =
+      std::min_element(members.begin(), members.end(),
+                       [this](const ArchiveMember* left, const ArchiveMember* right) {
+                         return m_Places.at(left) < m_Places.at(right);
+                       });
+  if (first == members.end()) return nullptr;
+  m_Places[*first] = {Part_Moved, m_Moves++};
+  return *first;
 }
 
-// Where the member goes, counted without it; the position moves on behind it.
-uint32_t takeTarget(Run& run, const ArchiveMember* member) {
-  if (run.position < 0) return static_cast<uint32_t>(run.archive.getMembers().size()) - 1;
-  const uint32_t old = run.archive.getMemberIndex(member);
-  if (old < static_cast<uint32_t>(run.position)) --run.position;
-  return static_cast<uint32_t>(run.position++);
+void Movement::reorder() {
+  std::vector<std::pair<size_t, ArchiveMember*>> moved;
+  size_t inFront = 0;
+  for (ArchiveMember* member : m_Run.archive.getMembers()) {
+    const auto [part, number] = m_Places.at(member);
+    if (part == Part_Moved) moved.emplace_back(number, member);
+    if (part == Part_Front) ++inFront;
+  }
+  std::sort(moved.begin(), moved.end());
+  std::vector<ArchiveMember*> block;
+  for (const auto& [number, member] : moved)
+    block.push_back(member);
+  m_Run.archive.moveMembers(block, static_cast<uint32_t>(inFront));
 }
 
 } // namespace
 
 void moveMembers(Run& run) {
   if (isMissing(run)) return;
+  Movement movement(run);
   for (const std::string& word : run.settings.fileList) {
-    ArchiveMember* member = findFirst(run.archive, word);
+    const ArchiveMember* member = movement.move(word);
     if (member == nullptr) {
       reportMessage(messages::ErrorWord, messages::NotPresentInArchive, word, run.archiveName());
       continue;
     }
-    run.archive.moveMember(member, takeTarget(run, member));
     verboseMessage(run.settings, messages::MovedMember, member->getName());
   }
+  movement.reorder();
 }
 
 } // namespace quarn

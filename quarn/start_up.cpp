@@ -41,10 +41,14 @@ void startUp(int argc, const char* const* argv, support::Host& host) {
   shutDown(messages::errorCount() != 0 ? 1 : 0);
 }
 
-// Objects of the work may still be alive where a message ends the run, so regions are left to the
-// host then.
+// Objects of the work may still be alive where a message ends the run, so what the regions hold is
+// left to the host.
 void shutDown(int code) {
   messages::closeStreams();
+  if (driverRegion != nullptr) {
+    driverRegion->Destroy(false);
+    alloclib::shutDown(false);
+  }
   std::exit(code);
 }
 

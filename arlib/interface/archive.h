@@ -21,6 +21,7 @@
 #include <span>
 #include <string_view>
 #include <utility>
+#include <vector>
 
 namespace elfext {
 class ErrorHandler;
@@ -113,8 +114,9 @@ public:
 
   // Takes the member out and puts it back at `newIndex`, which counts without it.
   void moveMember(ArchiveMember* archiveMember, uint32_t newIndex);
-  // Puts the last `count` members, in their order, in front of the one that stands at `newIndex`.
-  void moveLastMembers(uint32_t count, uint32_t newIndex);
+  // The same for many members at the cost of one pass: they then stand together, in the order
+  // given. No member twice.
+  void moveMembers(std::span<ArchiveMember* const> archiveMembers, uint32_t newIndex);
 
   // Position in the list, or NotFound.
   [[nodiscard]] uint32_t getMemberIndex(const ArchiveMember* archiveMember) const;
@@ -180,7 +182,11 @@ private:
   void sortMembers();
   void sortSymbols();
   void groupSymbols();
-  void forgetSymbolsOf(std::span<ArchiveMember* const> archiveMembers);
+  void takeOut(std::span<ArchiveMember* const> sortedMembers);
+  void forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers);
+  void markMoved();
+  // The members by address: only to find them fast, that order shows nowhere.
+  std::vector<ArchiveMember*> sortedByAddress(std::span<ArchiveMember* const> archiveMembers) const;
   const char* copyToRegion(std::string_view text);
   std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
                                      const ArchiveMember* archiveMember) const;

@@ -10,6 +10,7 @@
 #include <cstring>
 #include <functional>
 #include <type_traits>
+#include <vector>
 
 namespace arlib {
 
@@ -189,13 +190,35 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   return member;
 }
 
+std::vector<ArchiveMember*>
+Archive::sortedByAddress(std::span<ArchiveMember* const> archiveMembers) const {
+  std::vector<ArchiveMember*> sorted;
+  for (ArchiveMember* archiveMember : archiveMembers) {
+    QUARN_ASSERT(1, archiveMember->m_Archive == this);
+    QUARN_ASSERT(2, m_ArchiveMembers.contains(archiveMember));
+    sorted.push_back(archiveMember);
+  }
+  std::sort(sorted.begin(), sorted.end(), std::less<>());
+  return sorted;
+}
+
+void Archive::takeOut(std::span<ArchiveMember* const> sortedMembers) {
+  const auto end =
+      std::remove_if(m_ArchiveMembers.begin(), m_ArchiveMembers.end(), [&](ArchiveMember* member) {
+        return std::binary_search(sortedMembers.begin(), sortedMembers.end(), member,
+                                  std::less<>());
+      });
+  m_ArchiveMembers.setSize(static_cast<uint32_t>(end - m_ArchiveMembers.begin()));
+}
+
 void Archive::forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers) {
-  const auto isGone = [sortedMembers](const Symbol* symbol) {
+  const auto end = std::remove_if(m_Symbols.begin(), m_Symbols.end(), [&](const Symbol* symbol) {
     return std::binary_search(sortedMembers.begin(), sortedMembers.end(),
                               symbol->getDefiningMember(), std::less<>());
-  };
-  const auto end = std::remove_if(m_Symbols.begin(), m_Symbols.end(), isGone);
+  });
   m_Symbols.setSize(static_cast<uint32_t>(end - m_Symbols.begin()));
+  m_SortedSymbolsUpToDate = false;
+  m_DefinedSymbolsUpToDate = false;
 }
 
 void Archive::removeMember(ArchiveMember* archiveMember) {
@@ -205,28 +228,20 @@ void Archive::removeMember(ArchiveMember* archiveMember) {
 
 void Archive::removeMembers(std::span<ArchiveMember* const> archiveMembers) {
   QUARN_ASSERT(1, !m_ReadOnly);
-  for ([[maybe_unused]] ArchiveMember* archiveMember : archiveMembers) {
-    QUARN_ASSERT(1, archiveMember->m_Archive == this);
-    QUARN_ASSERT(2, m_ArchiveMembers.contains(archiveMember));
-  }
-  // Only to find them fast: the order by address shows nowhere.
-  elfext::FastArray<ArchiveMember*> gone(m_ContainerRegion.get());
-  for (ArchiveMember* archiveMember : archiveMembers)
-    gone.append(archiveMember);
-  std::sort(gone.begin(), gone.end(), std::less<>());
-  const auto isGone = [&gone](ArchiveMember* member) {
-    return std::binary_search(gone.begin(), gone.end(), member, std::less<>());
-  };
-  const auto end = std::remove_if(m_ArchiveMembers.begin(), m_ArchiveMembers.end(), isGone);
-  m_ArchiveMembers.setSize(static_cast<uint32_t>(end - m_ArchiveMembers.begin()));
-  forgetSymbolsOf({gone.begin(), gone.getSize()});
-  m_SortedSymbolsUpToDate = false;
-  m_DefinedSymbolsUpToDate = false;
+  const std::vector<ArchiveMember*> gone = sortedByAddress(archiveMembers);
+  takeOut(gone);
+  forgetSymbolsOf(gone);
   markEdited();
   for (ArchiveMember* archiveMember : archiveMembers) {
     archiveMember->releaseContentsLocation();
     archiveMember->freeContents();
   }
+}
+
+void Archive::markMoved() {
+  m_FileNameTableUpToDate = false;
+  m_SymbolTableUpToDate = false;
+  m_SortedArchiveMembersUpToDate = false;
 }
 
 void Archive::moveMember(ArchiveMember* archiveMember, uint32_t newIndex) {
@@ -238,20 +253,19 @@ void Archive::moveMember(ArchiveMember* archiveMember, uint32_t newIndex) {
   if (oldIndex == newIndex) return;
   m_ArchiveMembers.remove(oldIndex);
   m_ArchiveMembers.insert(std::min(newIndex, m_ArchiveMembers.getSize()), archiveMember);
-  m_FileNameTableUpToDate = false;
-  m_SymbolTableUpToDate = false;
-  m_SortedArchiveMembersUpToDate = false;
+  markMoved();
 }
 
-void Archive::moveLastMembers(uint32_t count, uint32_t newIndex) {
+void Archive::moveMembers(std::span<ArchiveMember* const> archiveMembers, uint32_t newIndex) {
   const uint32_t size = m_ArchiveMembers.getSize();
-  QUARN_ASSERT(1, count <= size && newIndex <= size - count);
-  if (count == 0 || newIndex == size - count) return;
-  std::rotate(m_ArchiveMembers.begin() + newIndex, m_ArchiveMembers.end() - count,
-              m_ArchiveMembers.end());
-  m_FileNameTableUpToDate = false;
-  m_SymbolTableUpToDate = false;
-  m_SortedArchiveMembersUpToDate = false;
+  QUARN_ASSERT(1, archiveMembers.size() <= size && newIndex <= size - archiveMembers.size());
+  const std::vector<ArchiveMember*> before(m_ArchiveMembers.begin(), m_ArchiveMembers.end());
+  takeOut(sortedByAddress(archiveMembers));
+  m_ArchiveMembers.setSize(size);
+  const auto place = m_ArchiveMembers.begin() + newIndex;
+  std::copy_backward(place, m_ArchiveMembers.end() - archiveMembers.size(), m_ArchiveMembers.end());
+  std::copy(archiveMembers.begin(), archiveMembers.end(), place);
+  if (!std::equal(before.begin(), before.end(), m_ArchiveMembers.begin())) markMoved();
 }
 
 uint32_t Archive::getMemberIndex(const ArchiveMember* archiveMember) const {

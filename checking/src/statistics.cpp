@@ -11,8 +11,11 @@
 #include <algorithm>
 #include <array>
 #include <compare>
+#include <cstddef>
+#include <iterator>
 #include <map>
-#include <string>
+#include <sstream>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -33,20 +36,12 @@ using SiteCount = std::pair<Site, uint64_t>;
 std::map<Site, uint64_t> siteCounts;
 bool counting = false;
 
-std::string classAndLevel(uint32_t temperature, uint32_t level) {
-  std::string text(temperatureNames[temperature]);
-  text += " ";
-  text += levelNames[level];
-  return text;
-}
-
 void showSite(const SiteCount& siteCount) {
-  const Site& site = siteCount.first;
-  std::string text(site.path);
-  text += " " + std::to_string(site.line);
-  text += " (" + classAndLevel(site.temperature, site.level) + ")";
-  text += ": " + std::to_string(siteCount.second) + "\n";
-  showText(text);
+  const auto& [site, count] = siteCount;
+  std::ostringstream text;
+  text << site.path << ' ' << site.line << " (" << temperatureNames[site.temperature] << ' '
+       << levelNames[site.level] << "): " << count << '\n';
+  showText(text.str());
 }
 
 void showTotals() {
@@ -54,11 +49,13 @@ void showTotals() {
   for (const auto& [site, count] : siteCounts)
     totals[site.temperature][site.level] += count;
 
-  showText("\nTotals:\n");
-  for (uint32_t temperature = 0; temperature < totals.size(); ++temperature)
-    for (uint32_t level = 0; level < totals[temperature].size(); ++level)
-      showText(classAndLevel(temperature, level) + ": " +
-               std::to_string(totals[temperature][level]) + "\n");
+  std::ostringstream text;
+  text << "\nTotals:\n";
+  for (size_t temperature = 0; temperature < totals.size(); ++temperature)
+    for (size_t level = 0; level < totals[temperature].size(); ++level)
+      text << temperatureNames[temperature] << ' ' << levelNames[level] << ": "
+           << totals[temperature][level] << '\n';
+  showText(text.str());
 }
 
 } // namespace

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Lists that a search fills for its caller: some slots inline, since most searches find few, and one
-// heap array for what goes beyond.
+// Lists that a search fills for its caller: some slots inline, since most searches find few, and
+// one heap array for what goes beyond.
 #pragma once
 
 #include "checking/interface/checking.h"

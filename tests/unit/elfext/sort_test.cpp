@@ -257,7 +257,8 @@ TEST(SmoothSortTest, StaysWithinItsItemsWhateverTheComparisonSays) {
       std::iota(items.begin(), items.end(), 0);
       const std::vector<int> before = items;
       smoothSort(std::span(items), [&](int, int) { return random() % odds == 0; });
-      ASSERT_TRUE(std::ranges::is_permutation(items, before));
+      std::sort(items.begin(), items.end());
+      ASSERT_EQ(items, before);
     }
   }
 }
