@@ -294,22 +294,35 @@ bool ArchiveFileReader::readSymbolTable() {
   m_Archive.m_DefinedSymbolsUpToDate = false;
   if (m_Archive.m_SymbolTable == nullptr) return true;
   const std::span<const uint8_t> bytes = m_Archive.m_SymbolTable->getContents();
+  uint32_t count = 0;
+  if (!readSymbolCount(bytes, count)) return false;
+  noteMemberOffsets();
+  // The table holds four bytes for each, so the reservation is in proportion to the file.
+  m_Archive.m_Symbols.reserve(count);
+  return readSymbols(bytes, count);
+}
+
+// Before anything is reserved, and in 64 bits: a count near 2^30 would wrap to a small size.
+bool ArchiveFileReader::readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count) {
   const auto size = static_cast<uint32_t>(bytes.size());
   if (size < 4) return m_Archive.fail(&ErrorHandler::reportSymbolTableTooShort, size);
-  const uint32_t count = getBigEndian32(bytes.data());
+  count = getBigEndian32(bytes.data());
   const uint64_t required = 4 + 4 * uint64_t{count};
-  if (size < required) {
-    return m_Archive.fail(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
-  }
+  if (size >= required) return true;
+  return m_Archive.fail(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
+}
+
+void ArchiveFileReader::noteMemberOffsets() {
   uint64_t offset = ArchiveMagic.size();
   for (const ArchiveMember* member : m_Archive.m_ArchiveMembers) {
     m_MemberOffsets.push_back(static_cast<uint32_t>(offset));
     offset = nextHeaderOffset(offset, member->m_Size);
   }
-  // A name takes at least its NUL, so that no more symbols than bytes are ever reserved for.
-  m_Archive.m_Symbols.reserve(std::min(count, size));
+}
+
+bool ArchiveFileReader::readSymbols(std::span<const uint8_t> bytes, uint32_t count) {
   const std::string_view text = asText(bytes);
-  size_t position = static_cast<size_t>(required);
+  size_t position = 4 + 4 * size_t{count};
   for (uint32_t i = 0; i < count; ++i) {
     const size_t end = text.find('\0', position);
     if (end == text.npos) {

@@ -47,6 +47,9 @@ private:
   bool closeFile(bool isRead);
 
   bool readSymbolTable();
+  bool readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count);
+  void noteMemberOffsets();
+  bool readSymbols(std::span<const uint8_t> bytes, uint32_t count);
   bool addSymbol(uint32_t index, std::string_view name, uint32_t offset);
   ArchiveMember* memberAt(uint32_t offset);
 

@@ -111,8 +111,12 @@ bool writeFile(const char* fileName, Archive& archive) {
 }
 
 bool ArchiveFileWriter::write() {
-  const bool isThere = m_Host.status(m_Target.c_str(), m_OldStatus) == 0;
-  if (isThere && !m_Host.isWritable(m_Target.c_str())) {
+  // A target that the host can't tell about (a circle of links) is not taken for a new file.
+  const int statusError = m_Host.status(m_Target.c_str(), m_OldStatus);
+  if (statusError != 0 && statusError != ENOENT) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, statusError);
+  }
+  if (statusError == 0 && !m_Host.isWritable(m_Target.c_str())) {
     return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
   }
   // A table that could not be rebuilt has been reported; it is written as it stands.
