@@ -165,13 +165,14 @@ rowsNamed(std::span<const MatchString> rows, Names... names) {
   return {rowNamed(rows, names)..., nullptr};
 }
 
-// Whether each definition lists rows of its own id only, and all lists together hold every row.
+// Whether each definition lists rows of its own id only, and all lists together hold every row. No
+// definition may be without a list.
 constexpr bool listEveryRow(std::span<const ValueDefinition> definitions,
                             std::span<const MatchString> rows) {
   size_t listed = 0;
   for (size_t id = 0; id < definitions.size(); ++id) {
     const MatchString* const* row = definitions[id].rows;
-    for (; row != nullptr && *row != nullptr; ++row, ++listed) {
+    for (; *row != nullptr; ++row, ++listed) {
       if ((*row)->id != id) return false;
     }
   }
