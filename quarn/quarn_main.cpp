@@ -149,6 +149,18 @@ void chooseSymbolTableMode(Run& run) {
   }
 }
 
+// An archive that wasn't there when it was opened must not take the place of one that is there now:
+// the host may have failed to tell, or somebody else may have been faster.
+bool hasAppeared(const Run& run) {
+  if (!run.openStatus.missing || run.settings.createArchive) return false;
+  if (support::fileKind(run.archive.getHost(), run.archiveName()) == support::FileKind::Nothing) {
+    return false;
+  }
+  reportMessage(messages::ErrorWord, messages::WritingArchive, run.archiveName(),
+                hostErrorText(EEXIST));
+  return true;
+}
+
 // The tables are rebuilt before the last look at the error count, so that a warning of the rebuild
 // that was raised to an error keeps the old file as well.
 void writeArchive(Run& run) {
@@ -158,7 +170,7 @@ void writeArchive(Run& run) {
     reportMessage(messages::RemarkWord, messages::CreatingArchive, run.archiveName());
   }
   run.archive.updateAuxiliaryMembers();
-  if (hasErrors()) return;
+  if (hasErrors() || hasAppeared(run)) return;
   arlib::writeFile(run.archiveName(), run.archive);
 }
 

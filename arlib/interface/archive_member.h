@@ -8,9 +8,15 @@
 #include "support/interface/host.h"
 
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <span>
 #include <string_view>
+
+namespace elfext {
+class DeferredContentsSelector;
+class ObjectModule;
+} // namespace elfext
 
 namespace arlib {
 
@@ -91,6 +97,12 @@ public:
   // Only while the type is not known.
   void determineType();
 
+  // Reads the member's bytes as an object, which reports to the archive's own object handler. The
+  // module must not outlive the archive's host. Null or false if the object can't be read.
+  std::unique_ptr<elfext::ObjectModule>
+  createObjectModule(elfext::DeferredContentsSelector* selector);
+  bool readObjectModule(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector);
+
   // Forgets where the bytes lie on disk, and deletes the file if it was a temporary one. False if
   // that failed, after a report; the location is gone all the same.
   bool releaseContentsLocation();
@@ -100,6 +112,7 @@ private:
   friend class ArchiveFileReader;
   friend class ArchiveFileWriter;
   friend class AuxiliaryMembers;
+  friend class ElfImageArchiveMemberType;
 
   struct Contents {
     uint8_t* bytes;
@@ -114,6 +127,8 @@ private:
   void setLocation(const char* regionFileName, uint32_t offset, bool isTemporary);
   void takeFile(const char* fileName, uint32_t offset, uint32_t size, const FileProbe& probe);
   bool readContents(std::span<uint8_t> bytes);
+  // From the location, which there must be, under the module's own handler.
+  bool readInto(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector) const;
 
   std::string_view m_Name;
   uint32_t m_FileNameTableOffset = NoFileNameTableOffset;

@@ -119,8 +119,8 @@ bool ArchiveFileWriter::write() {
   if (statusError == 0 && !m_Host.isWritable(m_Target.c_str())) {
     return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
   }
-  // A table that could not be rebuilt has been reported; it is written as it stands.
-  m_Archive.updateAuxiliaryMembers();
+  // A table that could not be rebuilt has been reported. The old one would lead to wrong members.
+  if (!m_Archive.updateAuxiliaryMembers()) return false;
   if (m_Archive.computeFileSize() > MaximumFileSize) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, EFBIG);
   }

@@ -3,7 +3,8 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
-#include "elfext/interface/format_recognizer.h"
+#include "elfext/interface/object_module.h"
+#include "elfext/interface/read_elf_file.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -160,7 +161,8 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
   QUARN_ASSERT(1, data != NULL);
   QUARN_ASSERT(1, !m_Archive->isReadOnly());
   QUARN_ASSERT(1, m_Type != NULL);
-  std::memcpy(replaceContents(size).data(), data, size);
+  // The data may be a part of the old contents.
+  std::memmove(replaceContents(size).data(), data, size);
   m_Size = size;
   m_Type = nullptr;
   determineType();
@@ -217,6 +219,27 @@ bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t off
   m_Type = nullptr;
   determineType();
   return true;
+}
+
+bool ArchiveMember::readInto(elfext::ObjectModule& module,
+                             elfext::DeferredContentsSelector* selector) const {
+  return elfext::readElfFile(m_Archive->getHost(), m_ContentsLocation->fileName,
+                             m_ContentsLocation->offset, m_Size, module, selector);
+}
+
+bool ArchiveMember::readObjectModule(elfext::ObjectModule& module,
+                                     elfext::DeferredContentsSelector* selector) {
+  QUARN_ASSERT(1, m_Type != NULL);
+  if (!flushContents()) return false;
+  module.setErrorHandler(m_Archive->getElfextErrorHandler());
+  return readInto(module, selector);
+}
+
+std::unique_ptr<elfext::ObjectModule>
+ArchiveMember::createObjectModule(elfext::DeferredContentsSelector* selector) {
+  auto module = std::make_unique<elfext::ObjectModule>();
+  if (!readObjectModule(*module, selector)) return nullptr;
+  return module;
 }
 
 bool ArchiveMember::clearType() {

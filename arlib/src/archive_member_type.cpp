@@ -4,7 +4,12 @@
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_member.h"
 #include "checking/interface/checking.h"
+#include "elfext/interface/debug_section_name.h"
+#include "elfext/interface/deferred_contents_selector.h"
+#include "elfext/interface/elf_constants.h"
+#include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/format_recognizer.h"
+#include "elfext/interface/object_module.h"
 
 namespace arlib {
 
@@ -48,10 +53,41 @@ bool ElfImageArchiveMemberType::isElfImage(const ArchiveMember* archiveMember) c
                            location.offset, archiveMember->getSize());
 }
 
-// Objects are told from other files, but not read: none publishes a symbol.
-bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember*, SymbolNameList& names,
-                                               std::string&) const {
+namespace {
+
+// Any definition that is not local; debug symbols only if the archive wants them.
+bool isPublished(const elfext::Symbol& symbol, bool includeDebugSymbols) {
+  if (symbol.getCategory() == elfext::Symbol::Category_Undefined) return false;
+  if (symbol.getBinding() == elfext::STB_LOCAL) return false;
+  if (!includeDebugSymbols && symbol.getCategory() == elfext::Symbol::Category_Hosted &&
+      elfext::isDebugSectionName(symbol.getHostedSymbolSection()->getName())) {
+    return false;
+  }
+  return symbol.getName() != nullptr && *symbol.getName() != '\0';
+}
+
+} // namespace
+
+bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
+                                               std::string& reason) const {
+  QUARN_ASSERT(1, archiveMember != NULL);
+  elfext::ElfextErrorStringCapture capture;
+  elfext::ObjectModule module;
+  module.setObjectName(std::string(archiveMember->getName()).c_str());
+  module.setErrorHandler(&capture);
+  elfext::BySizeDeferredContentsSelector selector;
+  reason.clear();
+  if (!archiveMember->flushContents()) return false;
+  if (!archiveMember->readInto(module, &selector)) {
+    reason = capture.getText();
+    return false;
+  }
+  archiveMember->discardContents();
   names.clear();
+  const bool includeDebugSymbols = archiveMember->getArchive()->getIncludeDebugSymbols();
+  for (const elfext::Symbol* symbol : module.getSymbols()) {
+    if (isPublished(*symbol, includeDebugSymbols)) names.add(symbol->getName());
+  }
   return true;
 }
 

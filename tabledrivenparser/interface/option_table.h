@@ -91,6 +91,7 @@ struct ValueDefinition {
 };
 
 using Validator = bool (*)(const Parser& parser, uint32_t id, const Value& value);
+// Is asked more than once: for a vector it gives the same list each time.
 using DefaultCallBack = Value (*)(const Parser& parser, uint32_t id);
 
 // The parser sets value and both counters at its start, the client the call backs before it.

@@ -86,8 +86,9 @@ void printEntry(const Parser& parser, TextSink& sink, const ValueDefinition& def
     sink.put(row->name);
     return;
   }
-  const std::string text = argumentText(definition, value);
-  sink.putValue(optionPrefix(parser.options(), *row, text), text);
+  const OptionTable& table = parser.options();
+  const std::string text = argumentText(definition, value, table.restrictionMask);
+  sink.putValue(optionPrefix(table, *row, text), text);
 }
 
 void printOption(const Parser& parser, TextSink& sink, uint32_t id) {
@@ -110,7 +111,7 @@ void printPositional(const Parser& parser, TextSink& sink, uint32_t id) {
   if (!parser.isSet(id)) return;
   const auto print = [&](const Value& element) {
     sink.startEntry();
-    sink.putValue("", argumentText(definition, element));
+    sink.putValue("", argumentText(definition, element, parser.options().restrictionMask));
   };
   sink.setQuoteEmpty(true);
   if (isVector(definition.type)) {

@@ -40,7 +40,8 @@ void dumpElement(TextSink& sink, const ValueDefinition& definition, const Value&
   const bool isText = definition.type == Type_String || isVector(definition.type);
   const bool isNumber = definition.type == Type_IntVector || definition.type == Type_Int64Vector;
   if (isText && !isNumber && value.text == nullptr) return sink.put("<null>");
-  sink.put(argumentText(definition, value));
+  constexpr uint32_t everyEntryIsUsable = 0xFFFFFFFF;
+  sink.put(argumentText(definition, value, everyEntryIsUsable));
 }
 
 void dumpValue(TextSink& sink, const ValueDefinition& definition, const Value& value) {

@@ -38,13 +38,14 @@ std::string hexadecimal(uint64_t number) {
   return text;
 }
 
-std::string enumeratorText(const Enumeration* enumeration, int64_t number) {
-  if (enumeration != nullptr) {
-    for (const MatchString& entry : enumeration->entries) {
-      if (entry.id == number) return std::string(entry.name);
-    }
+std::string enumeratorText(const Enumeration& enumeration, int64_t number, uint32_t tableMask) {
+  const MatchString* best = nullptr;
+  for (const MatchString& entry : enumeration.entries) {
+    if (entry.id != number || !restrictionsMet(entry.restrictions, tableMask)) continue;
+    if (entry.separator == 0) return std::string(entry.name);
+    if (best == nullptr) best = &entry;
   }
-  return std::to_string(number);
+  return best != nullptr ? std::string(best->name) : std::to_string(number);
 }
 
 } // namespace
@@ -87,13 +88,14 @@ bool areEqual(ValueType type, const Value& left, const Value& right) {
   }
 }
 
-std::string argumentText(const ValueDefinition& definition, const Value& value) {
+std::string argumentText(const ValueDefinition& definition, const Value& value,
+                         uint32_t tableMask) {
   if (isText(definition.type)) return value.text != nullptr ? value.text : "";
   switch (definition.type) {
   case Type_Boolean:
     return value.integer != 0 ? "true" : "false";
   case Type_Enum:
-    return enumeratorText(definition.constraint.enumeration, value.integer);
+    return enumeratorText(*definition.constraint.enumeration, value.integer, tableMask);
   case Type_Address:
   case Type_Address64:
     return hexadecimal(static_cast<uint64_t>(value.integer));

@@ -14,9 +14,10 @@ Value emptyValue(ValueType type);
 // Whether two values of the type say the same; an empty list is equal to a null one.
 bool areEqual(ValueType type, const Value& left, const Value& right);
 
-// A value that is no vector, or one element of one, as an argument that would give it again; an
-// enumerator by its name, a null text as an empty one.
-std::string argumentText(const ValueDefinition& definition, const Value& value);
+// A value that is no vector, or one element of one, as an argument that would give it again; a null
+// text as an empty one. An enumerator goes by a name that is usable under the table's mask and, if
+// it has one, not deprecated.
+std::string argumentText(const ValueDefinition& definition, const Value& value, uint32_t tableMask);
 
 // Calls visit with each element of a vector value, each as a Value.
 template <class Visit>

@@ -59,6 +59,30 @@ TEST(CommandLineReport, namesEnumerators) {
   EXPECT_EQ(reportOf({"--diag_style=list"}), "--diag_style=list");
 }
 
+TEST(CommandLineReport, namesAnEnumeratorAsItWouldBeTakenAgain) {
+  static constexpr MatchString entries[] = {
+      {"hidden", 4, Kind_Required, {}, types::expertMask, 0},
+      {"old", 4, Kind_Required, {}, nullptr, 1},
+      {"new", 4},
+      {"newer", 4},
+  };
+  static constexpr Enumeration enumeration{entries};
+  types::Session session;
+  session.m_Table.restrictionMask = 1;
+  session.m_Definitions[types::Id_Enum].constraint.enumeration = &enumeration;
+  session.parse({"--enum=newer"});
+  EXPECT_EQ(session.commandLine(), "--enum=new");
+}
+
+TEST(CommandLineReport, namesADeprecatedEnumeratorThatHasNoOtherName) {
+  static constexpr MatchString entries[] = {{"old", 4, Kind_Required, {}, nullptr, 1}};
+  static constexpr Enumeration enumeration{entries};
+  types::Session session;
+  session.m_Definitions[types::Id_Enum].constraint.enumeration = &enumeration;
+  session.parse({"--enum=old"});
+  EXPECT_EQ(session.commandLine(), "--enum=old");
+}
+
 TEST(CommandLineReport, showsEachElementOfAVector) {
   EXPECT_EQ(reportOf({"--diag_error=L1,L2", "--diag_warning=w", "--diag_error", ""}),
             "--diag_error=L1 --diag_error=L2 --diag_error= --diag_warning=w");

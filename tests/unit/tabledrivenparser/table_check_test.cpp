@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The checks that clients make at compile time.
 #include "tool_table.h"
+#include "type_table.h"
 
 namespace tabledrivenparser {
 
@@ -62,6 +63,12 @@ static_assert(isWhiteSpace(' ') && isWhiteSpace('\t') && isWhiteSpace('\v') && i
 static_assert(!isWhiteSpace('\b') && !isWhiteSpace('\x0e') && !isWhiteSpace('\x85'));
 static_assert(isLetter('A') && isLetter('z') && !isLetter('@') && !isLetter('\xe9'));
 static_assert(lowered('Z') == 'z' && lowered('[') == '[' && lowered('\xc0') == '\xc0');
+
+// The addresses of inline variables are no constants to every compiler under its sanitizers.
+TEST(TableCheck, holdsForTheTablesOfTheTests) {
+  EXPECT_TRUE(listEveryRow(tool::definitions, tool::rows));
+  EXPECT_TRUE(listEveryRow(types::definitions, types::rows));
+}
 
 TEST(TableCheck, alsoRunsAtRunTime) {
   const std::vector<MatchString> rows(std::begin(sorted), std::end(sorted));

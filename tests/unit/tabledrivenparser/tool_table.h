@@ -145,7 +145,6 @@ inline constexpr ValueDefinition definitions[] = {
 
 static_assert(std::size(definitions) == Id_Count);
 static_assert(areWellFormed(rows, Id_Count));
-static_assert(listEveryRow(definitions, rows));
 
 inline constexpr OptionTable table{rows, indexByFirstLetter(rows), Policy_Warn, Policy_Accept};
 

@@ -101,7 +101,6 @@ inline constexpr std::array<ValueDefinition, Id_Count> definitions = {{
 // clang-format on
 
 static_assert(areWellFormed(rows, Id_Count));
-static_assert(listEveryRow(definitions, rows));
 
 inline constexpr OptionTable table{rows, indexByFirstLetter(rows)};
 

@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tests/support/faulty_host.h"
+
+namespace testsupport {
+
+using support::FileHandle;
+using support::FileStatus;
+using support::HostError;
+
+HostError FaultyHost::fault(const char* operation, const std::string& name) {
+  if (++m_Calls != m_FailingCall) return 0;
+  m_FailedOperation = operation;
+  m_FailedName = name;
+  return m_FailingError;
+}
+
+HostError FaultyHost::remember(HostError error, const std::string& name, FileHandle file) {
+  if (error == 0) m_OpenNames[file.number] = name;
+  return error;
+}
+
+HostError FaultyHost::openForReading(const char* name, FileHandle& file) {
+  if (const HostError error = fault("openForReading", name)) return error;
+  const HostError error = m_Host.openForReading(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::createTemporary(const char* name, FileHandle& file) {
+  if (const HostError error = fault("createTemporary", name)) return error;
+  const HostError error = m_Host.createTemporary(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::createUnnamedTemporary(std::string& name, FileHandle& file) {
+  if (const HostError error = fault("createUnnamedTemporary", "")) return error;
+  const HostError error = m_Host.createUnnamedTemporary(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::openForWriting(const char* name, FileHandle& file) {
+  if (const HostError error = fault("openForWriting", name)) return error;
+  const HostError error = m_Host.openForWriting(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                             size_t& done) {
+  const HostError error = fault("readAt", m_OpenNames[file.number]);
+  if (error == 0) return m_Host.readAt(file, bytes, offset, done);
+  [[maybe_unused]] const HostError ignored =
+      m_Host.readAt(file, bytes.first(bytes.size() / 2), offset, done);
+  return error;
+}
+
+HostError FaultyHost::write(FileHandle file, std::span<const uint8_t> bytes) {
+  const HostError error = fault("write", m_OpenNames[file.number]);
+  if (error == 0) return m_Host.write(file, bytes);
+  [[maybe_unused]] const HostError ignored = m_Host.write(file, bytes.first(bytes.size() / 2));
+  return error;
+}
+
+HostError FaultyHost::flush(FileHandle file) {
+  const HostError error = fault("flush", m_OpenNames[file.number]);
+  return error != 0 ? error : m_Host.flush(file);
+}
+
+HostError FaultyHost::close(FileHandle file) {
+  const HostError error = fault("close", m_OpenNames[file.number]);
+  m_OpenNames.erase(file.number);
+  const HostError closeError = m_Host.close(file);
+  return error != 0 ? error : closeError;
+}
+
+HostError FaultyHost::rename(const char* from, const char* to) {
+  const HostError error = fault("rename", from);
+  return error != 0 ? error : m_Host.rename(from, to);
+}
+
+HostError FaultyHost::remove(const char* name) {
+  const HostError error = fault("remove", name);
+  return error != 0 ? error : m_Host.remove(name);
+}
+
+HostError FaultyHost::status(const char* name, FileStatus& status) {
+  status = FileStatus();
+  const HostError error = fault("status", name);
+  return error != 0 ? error : m_Host.status(name, status);
+}
+
+HostError FaultyHost::statusOf(FileHandle file, FileStatus& status) {
+  status = FileStatus();
+  const HostError error = fault("statusOf", m_OpenNames[file.number]);
+  return error != 0 ? error : m_Host.statusOf(file, status);
+}
+
+bool FaultyHost::isWritable(const char* name) {
+  return fault("isWritable", name) == 0 && m_Host.isWritable(name);
+}
+
+void FaultyHost::setPermissions(FileHandle file, uint32_t mode) {
+  if (fault("setPermissions", m_OpenNames[file.number]) == 0) m_Host.setPermissions(file, mode);
+}
+
+HostError FaultyHost::listDirectory(const char* name, std::vector<std::string>& names) {
+  names.clear();
+  const HostError error = fault("listDirectory", name);
+  return error != 0 ? error : m_Host.listDirectory(name, names);
+}
+
+} // namespace testsupport

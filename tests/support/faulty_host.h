@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A host on which one call goes wrong: the k-th, counted over all operations that can fail. All
+// others go to the host behind it.
+#pragma once
+
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <map>
+#include <string>
+
+namespace testsupport {
+
+class FaultyHost final : public support::Host {
+public:
+  explicit FaultyHost(support::Host& host) : m_Host(host) {}
+
+  // The call with this number, from 1, fails with the error number; 0: none. Counting starts anew.
+  void failCall(uint64_t number, support::HostError error) {
+    m_FailingCall = number;
+    m_FailingError = error;
+    m_Calls = 0;
+    m_FailedOperation.clear();
+  }
+
+  [[nodiscard]] uint64_t callCount() const { return m_Calls; }
+  // Which operation failed, as "rename"; empty if none did.
+  [[nodiscard]] const std::string& failedOperation() const { return m_FailedOperation; }
+  // The file that it was asked for.
+  [[nodiscard]] const std::string& failedName() const { return m_FailedName; }
+
+  support::HostError openForReading(const char* name, support::FileHandle& file) override;
+  support::HostError createTemporary(const char* name, support::FileHandle& file) override;
+  support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
+  support::HostError openForWriting(const char* name, support::FileHandle& file) override;
+  // Half of the bytes arrive before the failure.
+  support::HostError readAt(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                            size_t& done) override;
+  // Half of the bytes are written before the failure.
+  support::HostError write(support::FileHandle file, std::span<const uint8_t> bytes) override;
+  support::HostError flush(support::FileHandle file) override;
+  // The file is closed also when the call fails.
+  support::HostError close(support::FileHandle file) override;
+  support::HostError rename(const char* from, const char* to) override;
+  support::HostError remove(const char* name) override;
+  support::HostError status(const char* name, support::FileStatus& status) override;
+  support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
+  bool isWritable(const char* name) override;
+  void setPermissions(support::FileHandle file, uint32_t mode) override;
+  std::string followLinks(const char* name) override { return m_Host.followLinks(name); }
+  support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
+
+private:
+  // Counts a call; the error that it is to fail with, or 0.
+  support::HostError fault(const char* operation, const std::string& name);
+  support::HostError remember(support::HostError error, const std::string& name,
+                              support::FileHandle file);
+
+  support::Host& m_Host;
+  uint64_t m_FailingCall = 0;
+  support::HostError m_FailingError = 0;
+  uint64_t m_Calls = 0;
+  std::string m_FailedOperation;
+  std::string m_FailedName;
+  std::map<int, std::string> m_OpenNames; // by handle number
+};
+
+} // namespace testsupport

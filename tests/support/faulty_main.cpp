@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The tool on a host of which one call fails, told by the environment: QUARN_FAIL_CALL is the
+// number of the call from 1 (0 or unset: none), QUARN_FAIL_ERROR the error number it fails with.
+// At exit the number of calls that were made is written to the file QUARN_CALL_COUNT.
+#include "quarn/start_up.h"
+#include "support/interface/host.h"
+#include "tests/support/faulty_host.h"
+
+#include <cstdio>
+#include <cstdlib>
+
+namespace {
+
+testsupport::FaultyHost& faultyHost() {
+  static testsupport::FaultyHost host(support::posixHost());
+  return host;
+}
+
+unsigned long numberFrom(const char* variable) {
+  const char* text = std::getenv(variable);
+  return text == nullptr ? 0 : std::strtoul(text, nullptr, 10);
+}
+
+void writeCallCount() {
+  const char* name = std::getenv("QUARN_CALL_COUNT");
+  if (name == nullptr) return;
+  std::FILE* file = std::fopen(name, "w");
+  if (file == nullptr) return;
+  std::fprintf(file, "%llu\n", static_cast<unsigned long long>(faultyHost().callCount()));
+  std::fclose(file);
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+  support::installSignalCleanUp();
+  faultyHost().failCall(numberFrom("QUARN_FAIL_CALL"),
+                        static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
+  std::atexit(writeCallCount);
+  quarn::startUp(argc, argv, faultyHost());
+}

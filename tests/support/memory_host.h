@@ -1,0 +1,97 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A host whose files are a map in memory. Tests look at every byte of it, give it a disk that fills
+// up, and make it tell of files that no real disk should have to hold.
+#pragma once
+
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace testsupport {
+
+class MemoryHost final : public support::Host {
+public:
+  struct File {
+    support::FileKind kind = support::FileKind::RegularFile;
+    std::string bytes;
+    std::string link; // where a symbolic link leads; empty for what is no link
+    int64_t modificationTime = 1'000'000'000;
+    int64_t uid = 1;
+    int64_t gid = 2;
+    uint32_t mode = 0100644;
+    bool isReadOnly = false;
+    bool isUnreadable = false;
+    std::optional<int64_t> toldSize; // what `status` says instead of the size
+    uint64_t inode = 0;
+  };
+
+  // Puts a regular file in place, as it would be if somebody else had written it.
+  File& addFile(std::string_view name, std::string_view bytes);
+  File& addFile(std::string_view name, std::span<const uint8_t> bytes) {
+    return addFile(name,
+                   std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size()));
+  }
+  File& addDirectory(std::string_view name);
+  File& addSpecial(std::string_view name);
+  File& addLink(std::string_view name, std::string_view target);
+
+  [[nodiscard]] bool has(std::string_view name) const;
+  // The file must be there.
+  [[nodiscard]] File& at(std::string_view name) const;
+  [[nodiscard]] std::string read(std::string_view name) const { return at(name).bytes; }
+  // All names, sorted.
+  [[nodiscard]] std::vector<std::string> names() const;
+
+  // From now on the disk takes so many bytes and then fails with ENOSPC. What fits is written.
+  void setRoom(uint64_t bytes) { m_Room = bytes; }
+  void setEndlessRoom() { m_Room.reset(); }
+
+  // Handles that were opened and not closed.
+  [[nodiscard]] size_t openHandles() const;
+  // So many bytes have been asked for by readAt, and so many calls were made to it.
+  [[nodiscard]] uint64_t bytesRead() const { return m_BytesRead; }
+  [[nodiscard]] uint64_t readCalls() const { return m_ReadCalls; }
+
+  support::HostError openForReading(const char* name, support::FileHandle& file) override;
+  support::HostError createTemporary(const char* name, support::FileHandle& file) override;
+  support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
+  support::HostError openForWriting(const char* name, support::FileHandle& file) override;
+  support::HostError readAt(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                            size_t& done) override;
+  support::HostError write(support::FileHandle file, std::span<const uint8_t> bytes) override;
+  support::HostError flush(support::FileHandle file) override;
+  support::HostError close(support::FileHandle file) override;
+  support::HostError rename(const char* from, const char* to) override;
+  support::HostError remove(const char* name) override;
+  support::HostError status(const char* name, support::FileStatus& status) override;
+  support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
+  bool isWritable(const char* name) override;
+  void setPermissions(support::FileHandle file, uint32_t mode) override;
+  std::string followLinks(const char* name) override;
+  support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
+
+private:
+  std::shared_ptr<File> find(const std::string& name) const;
+  File& enter(std::string_view name, support::FileKind kind);
+  void open(std::shared_ptr<File> target, support::FileHandle& file);
+  static support::FileStatus statusFrom(const File& file);
+
+  // A file that is replaced or removed lives on for those who have it open.
+  std::map<std::string, std::shared_ptr<File>, std::less<>> m_Files;
+  std::vector<std::shared_ptr<File>> m_Open; // by handle number; null when closed
+  std::optional<uint64_t> m_Room;
+  uint64_t m_NextInode = 1;
+  uint64_t m_NextTemporary = 0;
+  uint64_t m_BytesRead = 0;
+  uint64_t m_ReadCalls = 0;
+};
+
+} // namespace testsupport

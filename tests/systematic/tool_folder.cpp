@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tests/systematic/tool_folder.h"
+
+#include "quarn/start_up.h"
+#include "support/interface/host.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <fcntl.h>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <sys/wait.h>
+#include <unistd.h>
+
+// Memory that is left to the host at the end of a run is no fault of it.
+extern "C" const char* __asan_default_options();
+extern "C" const char* __asan_default_options() {
+  return "detect_leaks=0";
+}
+
+namespace testsupport {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr unsigned LongestRun = 20; // seconds
+
+std::string makeFolder() {
+  std::string name = testing::TempDir() + "quarn-tool.XXXXXX";
+  return mkdtemp(name.data());
+}
+
+std::string readWhole(const std::string& name) {
+  std::ifstream stream(name, std::ios::binary);
+  return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+void redirect(int descriptor, const std::string& name) {
+  const int file = open(name.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
+  dup2(file, descriptor);
+  close(file);
+}
+
+std::vector<const char*> argumentsOf(const char* program, const std::vector<std::string>& words) {
+  std::vector<const char*> arguments = {program};
+  for (const std::string& word : words)
+    arguments.push_back(word.c_str());
+  arguments.push_back(nullptr);
+  return arguments;
+}
+
+} // namespace
+
+ToolFolder::ToolFolder() : m_Folder(makeFolder()), m_Notes(makeFolder()) {}
+
+ToolFolder::~ToolFolder() {
+  fs::remove_all(m_Folder);
+  fs::remove_all(m_Notes);
+}
+
+void ToolFolder::write(const std::string& leaf, const std::string& bytes) const {
+  std::ofstream(m_Folder + "/" + leaf, std::ios::binary) << bytes;
+}
+
+std::string ToolFolder::read(const std::string& leaf) const {
+  return readWhole(m_Folder + "/" + leaf);
+}
+
+std::vector<std::string> ToolFolder::leaves() const {
+  std::vector<std::string> names;
+  for (const auto& entry : fs::directory_iterator(m_Folder))
+    names.push_back(entry.path().filename().string());
+  std::sort(names.begin(), names.end());
+  return names;
+}
+
+void ToolFolder::removeAllBut(const std::vector<std::string>& kept) const {
+  for (const std::string& leaf : leaves()) {
+    if (std::find(kept.begin(), kept.end(), leaf) == kept.end()) {
+      fs::remove_all(m_Folder + "/" + leaf);
+    }
+  }
+}
+
+void ToolFolder::enter() const {
+  alarm(LongestRun);
+  if (chdir(m_Folder.c_str()) != 0) _exit(99);
+  setenv("TMPDIR", m_Folder.c_str(), 1);
+  redirect(STDOUT_FILENO, m_Notes + "/out");
+  redirect(STDERR_FILENO, m_Notes + "/err");
+}
+
+ToolRun ToolFolder::collect(int process) const {
+  int state = 0;
+  waitpid(process, &state, 0);
+  return {WIFEXITED(state) ? WEXITSTATUS(state) : -1, readWhole(m_Notes + "/out"),
+          readWhole(m_Notes + "/err")};
+}
+
+ToolRun ToolFolder::run(const std::vector<std::string>& words) const {
+  std::fflush(nullptr);
+  const pid_t process = fork();
+  if (process == 0) {
+    enter();
+    support::installSignalCleanUp();
+    const std::vector<const char*> arguments = argumentsOf("quarn", words);
+    quarn::startUp(static_cast<int>(arguments.size()) - 1, arguments.data(), support::posixHost());
+  }
+  return collect(process);
+}
+
+ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, uint64_t failingCall,
+                                    int error, uint64_t& callCount) const {
+  const std::string countName = m_Notes + "/count";
+  std::fflush(nullptr);
+  const pid_t process = fork();
+  if (process == 0) {
+    enter();
+    setenv("ASAN_OPTIONS", "detect_leaks=0", 1);
+    setenv("QUARN_FAIL_CALL", std::to_string(failingCall).c_str(), 1);
+    setenv("QUARN_FAIL_ERROR", std::to_string(error).c_str(), 1);
+    setenv("QUARN_CALL_COUNT", countName.c_str(), 1);
+    std::vector<const char*> arguments = argumentsOf("quarn", words);
+    execv(QUARN_ON_FAULTY_HOST, const_cast<char* const*>(arguments.data()));
+    _exit(98);
+  }
+  const ToolRun result = collect(process);
+  callCount = std::strtoull(readWhole(countName).c_str(), nullptr, 10);
+  return result;
+}
+
+} // namespace testsupport
