@@ -1,18 +1,29 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The reports of sizes and entry points. They always cover the whole archive, whatever the words
-// of the command line say.
+// of the command line say. An object that can't be read has no row and adds nothing.
 #include "quarn/actions.h"
 
+#include "arlib/interface/archive_member.h"
+#include "elfext/interface/deferred_contents_selector.h"
+#include "elfext/interface/elf_constants.h"
+#include "elfext/interface/object_module.h"
+#include "elfext/interface/sizes_statistics.h"
 #include "quarn/reporting.h"
 
 #include <cstdint>
+#include <string>
+#include <vector>
 
 namespace quarn {
 
+using arlib::ArchiveMember;
+
 namespace {
 
-// In bytes.
+constexpr uint32_t EntryFlag = 0x10000000; // of sections that the entry point is in
+
+// In bytes, cut to 32 bits.
 struct ObjectSizes {
   uint32_t code = 0;
   uint32_t readOnlyData = 0;
@@ -21,22 +32,95 @@ struct ObjectSizes {
   uint32_t debug = 0;
 };
 
-void printSizes(const ObjectSizes& sizes, std::string_view name) {
+struct EntryRecord {
+  uint32_t offset;
+  std::string sectionName; // a copy: the object is gone when it is printed
+  std::string_view objectName;
+};
+
+class ObjectReport {
+public:
+  ObjectReport(arlib::Archive& archive, uint32_t flags) : m_Archive(archive), m_Flags(flags) {}
+
+  void print();
+
+private:
+  [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
+  void addMember(ArchiveMember& member);
+  void addEntries(const elfext::ObjectModule& module, const ArchiveMember& member);
+  void addSizes(elfext::ObjectModule& module, const ArchiveMember& member);
+  void printEntries() const;
+
+  arlib::Archive& m_Archive;
+  uint32_t m_Flags;
+  ObjectSizes m_Totals;
+  std::vector<EntryRecord> m_Entries;
+};
+
+void printRow(const ObjectSizes& sizes, std::string_view name) {
   messages::listingMessage(messages::SizesRow, sizes.code, sizes.readOnlyData, sizes.readWriteData,
                            sizes.zeroInitialised, sizes.debug, name);
+}
+
+void ObjectReport::print() {
+  if (shows(Report_Sizes)) messages::listingMessage(messages::SizesHeader);
+  for (ArchiveMember* member : m_Archive.getMembers()) {
+    if (!member->isAuxiliary()) addMember(*member);
+  }
+  // The row is followed by an empty line.
+  if (shows(Report_Sizes)) printRow(m_Totals, "TOTAL\n");
+  if (shows(Report_Entries)) printEntries();
+}
+
+void ObjectReport::addMember(ArchiveMember& member) {
+  if (member.getType() != arlib::ElfImageArchiveMemberType::getInstance()) return;
+  elfext::ObjectModule module;
+  elfext::BySizeDeferredContentsSelector selector;
+  if (!member.readObjectModule(module, &selector)) return;
+  addEntries(module, member);
+  addSizes(module, member);
+}
+
+void ObjectReport::addEntries(const elfext::ObjectModule& module, const ArchiveMember& member) {
+  constexpr uint32_t EntryFlags = elfext::SHF_ALLOC | EntryFlag;
+  for (const elfext::Section* section : module.getSections()) {
+    if (section->getType() != elfext::SHT_PROGBITS) continue;
+    if ((section->getFlags() & EntryFlags) != EntryFlags) continue;
+    const char* name = section->getName();
+    m_Entries.push_back(
+        {static_cast<uint32_t>(module.getEntry()), name == nullptr ? "" : name, member.getName()});
+  }
+}
+
+void ObjectReport::addSizes(elfext::ObjectModule& module, const ArchiveMember& member) {
+  const elfext::SizesStatistics totals = elfext::computeSizesStatistics(&module);
+  ObjectSizes sizes;
+  sizes.code = static_cast<uint32_t>(totals.m_Code + totals.m_LiteralPools);
+  sizes.readOnlyData = static_cast<uint32_t>(totals.m_RoData + totals.m_InternalPadding);
+  sizes.readWriteData = static_cast<uint32_t>(totals.m_RwDataUncompressed);
+  sizes.zeroInitialised = static_cast<uint32_t>(totals.m_ZiData);
+  sizes.debug = static_cast<uint32_t>(totals.m_DebugInfo);
+  if (shows(Report_Sizes)) printRow(sizes, member.getName());
+  m_Totals.code += sizes.code;
+  m_Totals.readOnlyData += sizes.readOnlyData;
+  m_Totals.readWriteData += sizes.readWriteData;
+  m_Totals.zeroInitialised += sizes.zeroInitialised;
+  m_Totals.debug += sizes.debug;
+}
+
+void ObjectReport::printEntries() const {
+  for (const EntryRecord& entry : m_Entries) {
+    messages::listingMessage(messages::EntryPoint, entry.offset, entry.sectionName,
+                             entry.objectName);
+  }
+  if (m_Entries.empty()) messages::listingMessage(messages::NoEntryPoints);
 }
 
 } // namespace
 
 void reportObjects(Run& run, uint32_t flags) {
   if (isMissing(run)) return;
-  const ObjectSizes totals;
-  if ((flags & Report_Sizes) != 0) {
-    messages::listingMessage(messages::SizesHeader);
-    // The row is followed by an empty line.
-    printSizes(totals, "TOTAL\n");
-  }
-  if ((flags & Report_Entries) != 0) messages::listingMessage(messages::NoEntryPoints);
+  ObjectReport(run.archive, flags).print();
 }
 
 } // namespace quarn

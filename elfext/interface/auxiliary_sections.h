@@ -1,0 +1,170 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The sections whose bytes are bookkeeping: one class for each type, all made by the creators of
+// ObjectModule. What they know beside a plain section is how they hang together.
+#pragma once
+
+#include "elfext/interface/elf_constants.h"
+#include "elfext/interface/section.h"
+
+#include <cstdint>
+
+namespace elfext {
+
+class HashSection;
+class RelocationRows;
+class ShndxSection;
+
+// Whether sections of the type have a class of their own, one of those below.
+[[nodiscard]] bool hasOwnSectionClass(uint32_t type);
+// What sh_entsize should be in a table of fixed rows; 0 for all other types. Bytes.
+[[nodiscard]] uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass);
+
+class NullSection final : public Section {
+public:
+  NullSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_NULL, flags, {true, true, 0}) {}
+};
+
+class StringTableSection final : public Section {
+public:
+  StringTableSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_STRTAB, flags, {true, false, 0}) {}
+
+  // Who uses it.
+  [[nodiscard]] bool isSectionNameTable() const { return m_IsSectionNameTable; }
+  [[nodiscard]] bool isLinkedBySymtab() const { return m_IsLinkedBySymtab; }
+  [[nodiscard]] bool isLinkedByDynsym() const { return m_IsLinkedByDynsym; }
+  [[nodiscard]] bool isLinkedByOther() const { return m_IsLinkedByOther; }
+  void markSectionNameTable() { m_IsSectionNameTable = true; }
+  void markLinkedBySymtab() { m_IsLinkedBySymtab = true; }
+  void markLinkedByDynsym() { m_IsLinkedByDynsym = true; }
+  void markLinkedByOther() { m_IsLinkedByOther = true; }
+
+private:
+  bool m_IsSectionNameTable = false;
+  bool m_IsLinkedBySymtab = false;
+  bool m_IsLinkedByDynsym = false;
+  bool m_IsLinkedByOther = false;
+};
+
+class SymbolTableSection final : public Section {
+public:
+  // The type is SHT_SYMTAB or SHT_DYNSYM.
+  SymbolTableSection(ObjectModule* objectModule, const char* name, uint32_t type, uint32_t flags);
+
+  // Null for a table without.
+  [[nodiscard]] ShndxSection* getShndxSection() const { return m_ShndxSection; }
+  [[nodiscard]] HashSection* getHashSection() const { return m_HashSection; }
+  void setShndxSection(ShndxSection* section) { m_ShndxSection = section; }
+  void setHashSection(HashSection* section) { m_HashSection = section; }
+
+private:
+  friend class Pruner;
+
+  ShndxSection* m_ShndxSection = nullptr;
+  HashSection* m_HashSection = nullptr;
+};
+
+class RelocationSection final : public Section {
+public:
+  // The type is SHT_REL or SHT_RELA.
+  RelocationSection(ObjectModule* objectModule, const char* name, uint32_t type, uint32_t flags);
+
+  // The section that the relocations apply to; null until it is known.
+  [[nodiscard]] Section* getTarget() const { return m_Target; }
+  // Whether its symbols are the dynamic ones.
+  [[nodiscard]] bool isDynamic() const { return m_IsDynamic; }
+  [[nodiscard]] bool hasAddends() const { return getType() == SHT_RELA; }
+  // Joins the target's list of static or dynamic relocation sections.
+  void setTarget(Section* target, bool isDynamic);
+
+  // The rows that a reader has checked and whose relocations are still to be made. They live as
+  // long as the module. The target must be known.
+  void setRows(RelocationRows* rows, uint32_t rowCount);
+  // Rows that are not relocations yet.
+  [[nodiscard]] uint32_t getPendingRowCount() const { return m_RowCount; }
+
+  [[nodiscard]] RelocationSection* asRelocationSection() override { return this; }
+  [[nodiscard]] const RelocationSection* asRelocationSection() const override { return this; }
+
+private:
+  friend class Pruner;
+  friend class Section;
+
+  RelocationRows* takeRows();
+
+  Section* m_Target = nullptr;
+  RelocationRows* m_Rows = nullptr;
+  uint32_t m_RowCount = 0;
+  bool m_IsDynamic = false;
+};
+
+class GroupSection final : public Section {
+public:
+  GroupSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_GROUP, flags, {true, false, 4}) {}
+
+  // In the symbol table that the section links to.
+  [[nodiscard]] uint32_t getSignatureSymbolIndex() const { return m_SignatureSymbolIndex; }
+  void setSignatureSymbolIndex(uint32_t index) { m_SignatureSymbolIndex = index; }
+
+private:
+  uint32_t m_SignatureSymbolIndex = 0;
+};
+
+class ShndxSection final : public Section {
+public:
+  ShndxSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_SYMTAB_SHNDX, flags, {true, false, 4}) {}
+};
+
+class HashSection final : public Section {
+public:
+  HashSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_HASH, flags, {true, false, 0}) {}
+};
+
+class PreemptionMapSection final : public Section {
+public:
+  PreemptionMapSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_ZEV_PREEMPTMAP, flags, {true, false, 0}) {}
+};
+
+class VerdefSection final : public Section {
+public:
+  VerdefSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_GNU_verdef, flags, {true, false, 0}) {}
+};
+
+class VerneedSection final : public Section {
+public:
+  VerneedSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_GNU_verneed, flags, {true, false, 0}) {}
+};
+
+class VersymSection final : public Section {
+public:
+  VersymSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_GNU_versym, flags, {true, false, 0}) {}
+};
+
+class DynamicSection final : public Section {
+public:
+  DynamicSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_DYNAMIC, flags, {true, true, 0}) {}
+};
+
+class BuildAttributesSection final : public Section {
+public:
+  BuildAttributesSection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_ZEV_ATTRIBUTES, flags, {true, true, 0}) {}
+};
+
+class DebugOverlaySection final : public Section {
+public:
+  DebugOverlaySection(ObjectModule* objectModule, const char* name, uint32_t flags)
+      : Section(objectModule, name, SHT_ZEV_DEBUGOVERLAY, flags, {true, true, 0}) {}
+};
+
+} // namespace elfext

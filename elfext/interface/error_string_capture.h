@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Keeps the text of a report for a client that words its own message round it, and ends the read.
+#pragma once
+
+#include "elfext/interface/error_handler.h"
+
+#include <string>
+
+namespace elfext {
+
+class ElfextErrorStringCapture final : public ErrorHandler {
+public:
+  bool report(const ObjectModule&, uint32_t, const std::string& text) override {
+    m_Text = text;
+    return false;
+  }
+
+  // The last report's text; empty before the first.
+  [[nodiscard]] const std::string& getText() const { return m_Text; }
+
+private:
+  std::string m_Text;
+};
+
+} // namespace elfext

@@ -1,0 +1,20 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The bytes of an object file, wherever they are. A buffer that nobody looks into never asks for
+// its bytes, so that code and debug information need not even be read.
+#pragma once
+
+#include <cstdint>
+
+namespace elfext {
+
+class ImageSource {
+public:
+  virtual ~ImageSource() = default;
+
+  // `size` bytes at `offset` of the object, valid as long as the source; null if they can't be
+  // had. An object module owns the source that its buffers refer to.
+  [[nodiscard]] virtual const uint8_t* view(uint64_t offset, uint64_t size) = 0;
+};
+
+} // namespace elfext

@@ -1,0 +1,639 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// One ELF file in memory: not a wrapper round its bytes but a model, in which each section,
+// segment, symbol, relocation, group, needed library and preemption is an object. A module is made
+// on the stack, pointed at an error handler, handed to the reader, looked at and destroyed. All
+// objects and texts that it returns are its own and go with it, or when they are deleted.
+//
+// Texts that are handed in are copied, unless the module is told to keep names as they are.
+//
+// `getX(index)`, `getXCount()`, `getXIndex(x)` and `setXIndex(x, index)` come in families, one for
+// each list. Indexes count from 0, but for the two symbol tables: there the null symbol, which is
+// no object, has index 0 and is counted wherever there are symbols at all. `setXIndex` moves an
+// object among the others, whose order stays.
+#pragma once
+
+#include "elfext/interface/elf_header.h"
+#include "elfext/interface/fast_array.h"
+#include "elfext/interface/fast_hash_table.h"
+#include "elfext/interface/image_source.h"
+#include "elfext/interface/object_module_base.h"
+#include "elfext/interface/object_with_build_attributes.h"
+#include "elfext/interface/program_header_table.h"
+#include "elfext/interface/section.h"
+#include "elfext/interface/section_header_table.h"
+#include "elfext/interface/section_list.h"
+#include "elfext/interface/stringlett.h"
+#include "elfext/interface/symbol.h"
+#include "elfext/interface/symbol_list.h"
+
+#include <array>
+#include <cstdint>
+#include <memory>
+#include <span>
+
+namespace elfext {
+
+class BuildAttributesSection;
+class DebugOverlaySection;
+class DynamicSection;
+class ErrorHandler;
+class Group;
+class GroupSection;
+class HashSection;
+class LibrarySearchPath;
+class NeededLibrary;
+class NullSection;
+class Preemption;
+class PreemptionMapSection;
+class PruneCriterion;
+class RawDataBlock;
+class RelocationSection;
+class Segment;
+class ShndxSection;
+class StringTableSection;
+class SymbolTableSection;
+class VerdefSection;
+class VerneedSection;
+class VersymSection;
+struct FileVersionDefinition;
+
+// What the reader has seen; a set of bits.
+enum ReadCondition : uint32_t {
+  // The first PT_LOAD segment overlaps the header or the table.
+  ReadCondition_LoadOverlapsElfHeader = 0x1,
+  ReadCondition_LoadOverlapsSectionHeaderTable = 0x2,
+  ReadCondition_LoadOverlapsProgramHeaderTable = 0x4,
+  ReadCondition_HasBuildAttributesSymbol = 0x8,
+  ReadCondition_HasBuildAttributesSection = 0x10,
+  // Texts are copies, and do not point into the read buffer.
+  ReadCondition_HasCopiedStrings = 0x20,
+  // The dynamic section has tag 0x70000001.
+  ReadCondition_HasSymbolTableSizeTag = 0x40,
+  ReadCondition_ChecksRepeatedRelocations = 0x80,
+  ReadCondition_HasEmptySectionHeaderTable = 0x100,
+  ReadCondition_WasRead = 0x200,
+  // p_vaddr and p_offset of some segment differ by no multiple of its alignment.
+  ReadCondition_HasIncongruentSegment = 0x20000000,
+  // Some auxiliary section has a symbol, or a relocation, in it.
+  ReadCondition_HasSymbolInAuxiliarySection = 0x40000000,
+  ReadCondition_HasRelocationInAuxiliarySection = 0x80000000,
+};
+
+// Values of the dynamic section that the model keeps as they are.
+enum DynamicValue : uint32_t {
+  DynamicValue_Init,
+  DynamicValue_InitArray,
+  DynamicValue_InitArraySize,
+  DynamicValue_PreinitArray,
+  DynamicValue_PreinitArraySize,
+  DynamicValue_Fini,
+  DynamicValue_FiniArray,
+  DynamicValue_FiniArraySize,
+  DynamicValue_Count,
+};
+
+// A record of a debug overlay section.
+struct DebugOverlayRecord {
+  uint64_t word;
+  Section* debugSection;
+  Section* section;
+};
+
+class ObjectModule final : public ObjectModuleBase, public ObjectWithBuildAttributes {
+public:
+  // An empty module. Needs alloclib::initialise().
+  ObjectModule();
+  ~ObjectModule();
+
+  // ---- Set-up
+
+  // Not owned; may be null, which is as good as a handler that always refuses to go on.
+  [[nodiscard]] ErrorHandler* getErrorHandler() const { return m_ErrorHandler; }
+  void setErrorHandler(ErrorHandler* errorHandler) { m_ErrorHandler = errorHandler; }
+
+  // Null for none. A new name is not possible while contents are deferred, which are in the file
+  // of the old one.
+  [[nodiscard]] const char* getFileName() const { return m_FileName; }
+  void setFileName(const char* name);
+  // What messages call the module: a path, or an archive's name and in parentheses the member's.
+  // Null for none.
+  [[nodiscard]] const char* getObjectName() const { return m_ObjectName; }
+  void setObjectName(const char* name);
+  void setObjectName(const char* archiveName, const char* memberName);
+
+  // The file's bytes as long as the module needs them, where they are all in memory; null if not.
+  [[nodiscard]] const uint8_t* getReadBuffer() const { return m_ReadBuffer; }
+  void setReadBuffer(const uint8_t* readBuffer) { m_ReadBuffer = readBuffer; }
+  // While set, names that are handed in are kept as they are and not copied; they must live as
+  // long as the module's contents.
+  [[nodiscard]] bool areNamesInBuffer() const { return m_AreNamesInBuffer; }
+  void setNamesInBuffer(bool areNamesInBuffer) { m_AreNamesInBuffer = areNamesInBuffer; }
+  // The source that buffers of the module refer to. It goes with the module, or when it is cleared.
+  [[nodiscard]] ImageSource* getImageSource() const { return m_ImageSource.get(); }
+  void adoptImageSource(std::unique_ptr<ImageSource> imageSource) {
+    m_ImageSource = std::move(imageSource);
+  }
+  // The text, or a copy of it in the object region, as setNamesInBuffer says. Null stays null.
+  [[nodiscard]] const char* keepText(const char* text) const;
+
+  // ---- Header fields, under the ELF standard's names
+
+  // Sets the sizes of the headers and the alignment of their tables too.
+  void setElfClass(uint32_t elfClass);
+  [[nodiscard]] uint32_t getElfClass() const { return m_ElfClass; }
+  [[nodiscard]] bool isClass64() const { return m_ElfClass == 2; }
+  // e_ident[EI_DATA]. All but 1 reads as big-endian.
+  void setDataEncoding(uint32_t encoding);
+  [[nodiscard]] uint32_t getDataEncoding() const { return m_DataEncoding; }
+  // 1 is little-endian. Not possible while contents are deferred.
+  void setLittleEndian(uint32_t flag);
+  [[nodiscard]] uint32_t getLittleEndian() const { return m_LittleEndian; }
+  [[nodiscard]] bool isLittleEndian() const { return m_LittleEndian == 1; }
+
+  [[nodiscard]] uint32_t getMachine() const { return m_Machine; }
+  [[nodiscard]] uint32_t getFileType() const { return m_FileType; }
+  [[nodiscard]] uint64_t getEntry() const { return m_Entry; }
+  [[nodiscard]] uint32_t getElfFlags() const { return m_ElfFlags; }
+  [[nodiscard]] uint32_t getOsAbi() const { return m_OsAbi; }
+  [[nodiscard]] uint32_t getAbiVersion() const { return m_AbiVersion; }
+  [[nodiscard]] uint32_t getIdentVersion() const { return m_IdentVersion; }
+  [[nodiscard]] uint32_t getElfVersion() const { return m_ElfVersion; }
+  void setMachine(uint32_t machine) { change(m_Machine, machine); }
+  void setFileType(uint32_t type) { change(m_FileType, type); }
+  void setEntry(uint64_t entry) { change(m_Entry, entry); }
+  void setElfFlags(uint32_t flags) { change(m_ElfFlags, flags); }
+  void setOsAbi(uint32_t osAbi) { change(m_OsAbi, osAbi); }
+  void setAbiVersion(uint32_t version) { change(m_AbiVersion, version); }
+  void setIdentVersion(uint32_t version) { change(m_IdentVersion, version); }
+  void setElfVersion(uint32_t version) { change(m_ElfVersion, version); }
+  // Whether addresses are laid out: ET_EXEC, ET_DYN and ET_CORE.
+  [[nodiscard]] bool hasLaidOutAddresses() const;
+
+  // What the file's header says of the headers. The entry sizes also set those of the two regions;
+  // all in bytes.
+  [[nodiscard]] uint32_t getElfHeaderSize() const { return m_ElfHeaderSize; }
+  [[nodiscard]] uint64_t getSectionHeaderOffset() const { return m_SectionHeaderOffset; }
+  [[nodiscard]] uint64_t getProgramHeaderOffset() const { return m_ProgramHeaderOffset; }
+  [[nodiscard]] uint16_t getStoredSectionCount() const { return m_StoredSectionCount; }
+  [[nodiscard]] uint16_t getStoredProgramHeaderCount() const { return m_StoredProgramHeaderCount; }
+  [[nodiscard]] uint32_t getSectionHeaderEntrySize() const { return m_SectionHeaderEntrySize; }
+  [[nodiscard]] uint32_t getProgramHeaderEntrySize() const { return m_ProgramHeaderEntrySize; }
+  void setElfHeaderSize(uint32_t size);
+  void setSectionHeaderOffset(uint64_t offset) { change(m_SectionHeaderOffset, offset); }
+  void setProgramHeaderOffset(uint64_t offset) { change(m_ProgramHeaderOffset, offset); }
+  void setStoredSectionCount(uint16_t count) { change(m_StoredSectionCount, count); }
+  void setStoredProgramHeaderCount(uint16_t count) { change(m_StoredProgramHeaderCount, count); }
+  void setSectionHeaderEntrySize(uint32_t size);
+  void setProgramHeaderEntrySize(uint32_t size);
+
+  // The three fixed regions of the file.
+  [[nodiscard]] ELFHeader& getElfHeader() { return m_ElfHeader; }
+  [[nodiscard]] SectionHeaderTable& getSectionHeaderTable() { return m_SectionHeaderTable; }
+  [[nodiscard]] ProgramHeaderTable& getProgramHeaderTable() { return m_ProgramHeaderTable; }
+
+  // ReadCondition bits.
+  [[nodiscard]] uint32_t getReadConditions() const { return m_ReadConditions; }
+  void setReadConditions(uint32_t conditions) { m_ReadConditions = conditions; }
+
+  // ---- Dynamic data
+
+  // DT_SONAME; null for none.
+  [[nodiscard]] const char* getSoname() const { return m_Soname; }
+  void setSoname(const char* soname);
+  [[nodiscard]] bool hasDynamicValue(DynamicValue value) const {
+    return m_DynamicValues[value].exists;
+  }
+  // 0 for one that does not exist.
+  [[nodiscard]] uint64_t getDynamicValue(DynamicValue value) const {
+    return m_DynamicValues[value].value;
+  }
+  void setDynamicValue(DynamicValue which, uint64_t value);
+  // DF_... bits.
+  [[nodiscard]] bool hasDynamicFlags() const { return m_DynamicFlagsExists; }
+  [[nodiscard]] uint32_t getDynamicFlags() const { return m_DynamicFlags; }
+  // ORs the flags in, and makes them exist.
+  void addDynamicFlags(uint32_t flags);
+
+  // The file's own version; null for none.
+  [[nodiscard]] const FileVersionDefinition* getFileVersionDefinition() const {
+    return m_FileVersionDefinition;
+  }
+  void setFileVersionDefinition(const FileVersionDefinition* version);
+  // A version that the file defines, for its symbols or for the call above.
+  FileVersionDefinition* createFileVersionDefinition(const char* name, uint32_t index,
+                                                     uint32_t flags);
+
+  [[nodiscard]] std::span<const DebugOverlayRecord> getDebugOverlayRecords() const {
+    return m_DebugOverlayRecords.span();
+  }
+  void addDebugOverlayRecord(const DebugOverlayRecord& record);
+
+  // ---- State
+
+  // Nothing may add, remove or reorder what has an index while indexes are frozen.
+  [[nodiscard]] bool indexesAreFrozen() const { return m_IndexesFrozen; }
+  void setIndexesFrozen(bool areFrozen) { m_IndexesFrozen = areFrozen; }
+  // Whether the bytes of auxiliary sections say what the objects do. Any change clears it.
+  [[nodiscard]] bool areAuxiliarySectionsUpToDate() const { return m_AreAuxiliarySectionsUpToDate; }
+  void setAuxiliarySectionsUpToDate(bool areUpToDate) {
+    m_AreAuxiliarySectionsUpToDate = areUpToDate;
+  }
+  [[nodiscard]] bool areSortedViewsUpToDate() const { return m_AreSortedViewsUpToDate; }
+
+  // No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
+  [[nodiscard]] bool isEmpty() const;
+  [[nodiscard]] bool hasDeferredContents() const;
+  // Loads all that are deferred, in index order; false at the first failure.
+  [[nodiscard]] bool loadDeferredContents();
+
+  // The checks that go beyond reading; problems go to the error handler. False at the first
+  // answer not to go on.
+  [[nodiscard]] bool validate();
+
+  // ---- Sections
+
+  [[nodiscard]] uint32_t getSectionCount() const { return m_Sections.getSize(); }
+  [[nodiscard]] Section* getSection(uint32_t index) const { return m_Sections[index]; }
+  [[nodiscard]] uint32_t getSectionIndex(const Section* section) const;
+  void setSectionIndex(Section* section, uint32_t index);
+  [[nodiscard]] std::span<Section* const> getSections() const { return m_Sections.span(); }
+  // Room for so many more in all lists of that kind.
+  void reserveSections(uint32_t count);
+
+  // For a type without a class of its own.
+  Section* createSection(const char* name, uint32_t type, uint32_t flags);
+  NullSection* createNullSection(const char* name, uint32_t flags);
+  StringTableSection* createStringTableSection(const char* name, uint32_t flags);
+  // SHT_SYMTAB or SHT_DYNSYM.
+  SymbolTableSection* createSymbolTableSection(const char* name, uint32_t type, uint32_t flags);
+  // SHT_REL or SHT_RELA.
+  RelocationSection* createRelocationSection(const char* name, uint32_t type, uint32_t flags);
+  GroupSection* createGroupSection(const char* name, uint32_t flags);
+  ShndxSection* createShndxSection(const char* name, uint32_t flags);
+  HashSection* createHashSection(const char* name, uint32_t flags);
+  PreemptionMapSection* createPreemptionMapSection(const char* name, uint32_t flags);
+  VerdefSection* createVerdefSection(const char* name, uint32_t flags);
+  VerneedSection* createVerneedSection(const char* name, uint32_t flags);
+  VersymSection* createVersymSection(const char* name, uint32_t flags);
+  DynamicSection* createDynamicSection(const char* name, uint32_t flags);
+  BuildAttributesSection* createBuildAttributesSection(const char* name, uint32_t flags);
+  DebugOverlaySection* createDebugOverlaySection(const char* name, uint32_t flags);
+  // Of the class that the type has.
+  Section* createSectionOfType(const char* name, uint32_t type, uint32_t flags);
+  // A SHT_PROGBITS section named ".comment" of `first` and its terminator, `second` without one,
+  // the byte, and `third` with its terminator.
+  Section* createCommentSection(const char* first, const char* second, uint8_t byte,
+                                const char* third);
+
+  // The auxiliary sections of one type each, in the order in which they were made.
+  [[nodiscard]] std::span<StringTableSection* const> getStringTableSections() const {
+    return m_StringTableSections.span();
+  }
+  [[nodiscard]] std::span<SymbolTableSection* const> getSymtabSections() const {
+    return m_SymtabSections.span();
+  }
+  [[nodiscard]] std::span<SymbolTableSection* const> getDynsymSections() const {
+    return m_DynsymSections.span();
+  }
+  [[nodiscard]] std::span<GroupSection* const> getGroupSections() const {
+    return m_GroupSections.span();
+  }
+  [[nodiscard]] std::span<HashSection* const> getHashSections() const {
+    return m_HashSections.span();
+  }
+  [[nodiscard]] std::span<ShndxSection* const> getShndxSections() const {
+    return m_ShndxSections.span();
+  }
+  [[nodiscard]] std::span<PreemptionMapSection* const> getPreemptionMapSections() const {
+    return m_PreemptionMapSections.span();
+  }
+  [[nodiscard]] std::span<VerdefSection* const> getVerdefSections() const {
+    return m_VerdefSections.span();
+  }
+  [[nodiscard]] std::span<VerneedSection* const> getVerneedSections() const {
+    return m_VerneedSections.span();
+  }
+  [[nodiscard]] std::span<VersymSection* const> getVersymSections() const {
+    return m_VersymSections.span();
+  }
+  [[nodiscard]] std::span<DynamicSection* const> getDynamicSections() const {
+    return m_DynamicSections.span();
+  }
+  [[nodiscard]] std::span<DebugOverlaySection* const> getDebugOverlaySections() const {
+    return m_DebugOverlaySections.span();
+  }
+  [[nodiscard]] std::span<BuildAttributesSection* const> getBuildAttributesSections() const {
+    return m_BuildAttributesSections.span();
+  }
+
+  // ---- Symbols
+  //
+  // Four categories, each static and dynamic. The name may be null; type, binding and visibility
+  // are those of st_info and st_other.
+
+  Symbol* createHostedSymbol(const char* name, uint64_t offset, uint32_t type, uint32_t binding,
+                             uint32_t visibility, Section* section);
+  Symbol* createAbsoluteSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
+                               uint32_t visibility);
+  // The value is the alignment.
+  Symbol* createCommonSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
+                             uint32_t visibility);
+  Symbol* createUndefinedSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
+                                uint32_t visibility);
+  Symbol* createHostedDynamicSymbol(const char* name, uint64_t offset, uint32_t type,
+                                    uint32_t binding, uint32_t visibility, Section* section);
+  Symbol* createAbsoluteDynamicSymbol(const char* name, uint64_t value, uint32_t type,
+                                      uint32_t binding, uint32_t visibility);
+  Symbol* createCommonDynamicSymbol(const char* name, uint64_t value, uint32_t type,
+                                    uint32_t binding, uint32_t visibility);
+  Symbol* createUndefinedDynamicSymbol(const char* name, uint64_t value, uint32_t type,
+                                       uint32_t binding, uint32_t visibility);
+  // Room for so many more.
+  void reserveSymbols(uint32_t count);
+  void reserveDynamicSymbols(uint32_t count);
+
+  [[nodiscard]] uint32_t getSymbolCount() const;
+  [[nodiscard]] Symbol* getSymbol(uint32_t index) const;
+  [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
+  void setSymbolIndex(Symbol* symbol, uint32_t index);
+  // Without the null symbol.
+  [[nodiscard]] std::span<Symbol* const> getSymbols() const { return m_Symbols.span(); }
+
+  [[nodiscard]] uint32_t getDynamicSymbolCount() const;
+  [[nodiscard]] Symbol* getDynamicSymbol(uint32_t index) const;
+  [[nodiscard]] uint32_t getDynamicSymbolIndex(const Symbol* symbol) const;
+  void setDynamicSymbolIndex(Symbol* symbol, uint32_t index);
+  [[nodiscard]] std::span<Symbol* const> getDynamicSymbols() const {
+    return m_DynamicSymbols.span();
+  }
+
+  [[nodiscard]] uint32_t getAbsoluteSymbolCount() const { return m_AbsoluteSymbols.getSize(); }
+  [[nodiscard]] Symbol* getAbsoluteSymbol(uint32_t index) const { return m_AbsoluteSymbols[index]; }
+  [[nodiscard]] uint32_t getAbsoluteSymbolIndex(const Symbol* symbol) const;
+  void setAbsoluteSymbolIndex(Symbol* symbol, uint32_t index);
+  [[nodiscard]] uint32_t getCommonSymbolCount() const { return m_CommonSymbols.getSize(); }
+  [[nodiscard]] Symbol* getCommonSymbol(uint32_t index) const { return m_CommonSymbols[index]; }
+  [[nodiscard]] uint32_t getCommonSymbolIndex(const Symbol* symbol) const;
+  void setCommonSymbolIndex(Symbol* symbol, uint32_t index);
+  [[nodiscard]] uint32_t getUndefinedSymbolCount() const { return m_UndefinedSymbols.getSize(); }
+  [[nodiscard]] Symbol* getUndefinedSymbol(uint32_t index) const {
+    return m_UndefinedSymbols[index];
+  }
+  [[nodiscard]] uint32_t getUndefinedSymbolIndex(const Symbol* symbol) const;
+  void setUndefinedSymbolIndex(Symbol* symbol, uint32_t index);
+
+  [[nodiscard]] uint32_t getAbsoluteDynamicSymbolCount() const {
+    return m_AbsoluteDynamicSymbols.getSize();
+  }
+  [[nodiscard]] Symbol* getAbsoluteDynamicSymbol(uint32_t index) const {
+    return m_AbsoluteDynamicSymbols[index];
+  }
+  [[nodiscard]] uint32_t getAbsoluteDynamicSymbolIndex(const Symbol* symbol) const;
+  void setAbsoluteDynamicSymbolIndex(Symbol* symbol, uint32_t index);
+  [[nodiscard]] uint32_t getCommonDynamicSymbolCount() const {
+    return m_CommonDynamicSymbols.getSize();
+  }
+  [[nodiscard]] Symbol* getCommonDynamicSymbol(uint32_t index) const {
+    return m_CommonDynamicSymbols[index];
+  }
+  [[nodiscard]] uint32_t getCommonDynamicSymbolIndex(const Symbol* symbol) const;
+  void setCommonDynamicSymbolIndex(Symbol* symbol, uint32_t index);
+  [[nodiscard]] uint32_t getUndefinedDynamicSymbolCount() const {
+    return m_UndefinedDynamicSymbols.getSize();
+  }
+  [[nodiscard]] Symbol* getUndefinedDynamicSymbol(uint32_t index) const {
+    return m_UndefinedDynamicSymbols[index];
+  }
+  [[nodiscard]] uint32_t getUndefinedDynamicSymbolIndex(const Symbol* symbol) const;
+  void setUndefinedDynamicSymbolIndex(Symbol* symbol, uint32_t index);
+
+  // ---- The other lists
+
+  [[nodiscard]] uint32_t getGroupCount() const { return m_Groups.getSize(); }
+  [[nodiscard]] Group* getGroup(uint32_t index) const { return m_Groups[index]; }
+  [[nodiscard]] uint32_t getGroupIndex(const Group* group) const;
+  void setGroupIndex(Group* group, uint32_t index);
+  // The name, which may be null, is that of the group's section.
+  Group* createGroup(const char* signature, const char* name, uint32_t flags);
+  // The first comdat group of that signature; null if there is none.
+  [[nodiscard]] Group* findComdatGroup(const char* signature) const;
+
+  [[nodiscard]] uint32_t getSegmentCount() const { return m_Segments.getSize(); }
+  [[nodiscard]] Segment* getSegment(uint32_t index) const { return m_Segments[index]; }
+  [[nodiscard]] uint32_t getSegmentIndex(const Segment* segment) const;
+  void setSegmentIndex(Segment* segment, uint32_t index);
+  [[nodiscard]] std::span<Segment* const> getSegments() const { return m_Segments.span(); }
+  Segment* createSegment(uint32_t type, uint64_t offset, uint64_t vaddr, uint64_t paddr,
+                         uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align);
+
+  [[nodiscard]] uint32_t getNeededLibraryCount() const { return m_NeededLibraries.getSize(); }
+  [[nodiscard]] NeededLibrary* getNeededLibrary(uint32_t index) const {
+    return m_NeededLibraries[index];
+  }
+  [[nodiscard]] uint32_t getNeededLibraryIndex(const NeededLibrary* neededLibrary) const;
+  void setNeededLibraryIndex(NeededLibrary* neededLibrary, uint32_t index);
+  NeededLibrary* createNeededLibrary(const char* name);
+
+  [[nodiscard]] uint32_t getLibrarySearchPathCount() const {
+    return m_LibrarySearchPaths.getSize();
+  }
+  [[nodiscard]] LibrarySearchPath* getLibrarySearchPath(uint32_t index) const {
+    return m_LibrarySearchPaths[index];
+  }
+  [[nodiscard]] uint32_t getLibrarySearchPathIndex(const LibrarySearchPath* path) const;
+  void setLibrarySearchPathIndex(LibrarySearchPath* librarySearchPath, uint32_t index);
+  LibrarySearchPath* createLibrarySearchPath(const char* path, uint32_t tag);
+
+  [[nodiscard]] uint32_t getPreemptionCount() const { return m_Preemptions.getSize(); }
+  [[nodiscard]] Preemption* getPreemption(uint32_t index) const { return m_Preemptions[index]; }
+  [[nodiscard]] uint32_t getPreemptionIndex(const Preemption* preemption) const;
+  void setPreemptionIndex(Preemption* preemption, uint32_t index);
+  Preemption* createPreemption(const char* symbolName, const char* preemptingDllName);
+
+  [[nodiscard]] std::span<RawDataBlock* const> getRawDataBlocks() const {
+    return m_RawDataBlocks.span();
+  }
+  // `size` bytes of the segment; the caller gives them.
+  RawDataBlock* createRawDataBlock(Segment* segment, uint64_t size);
+
+  // ---- Deletion
+  //
+  // Each takes along what hangs on the object: with a section go its symbols, its relocations and
+  // the relocation sections for it; with a symbol the relocations to it; with a group its section;
+  // with a segment its raw data blocks. Links to what went become null; all indexes stay dense.
+
+  void deleteSection(Section* section);
+  void deleteGroup(Group* group);
+  void deleteSegment(Segment* segment);
+  void deleteSymbol(Symbol* symbol);
+  void deleteNeededLibrary(NeededLibrary* neededLibrary);
+  void deleteLibrarySearchPath(LibrarySearchPath* librarySearchPath);
+  void deletePreemption(Preemption* preemption);
+  // All that the criterion says, in one pass over the module.
+  void prune(const PruneCriterion& criterion);
+  // Leaves an empty module, which keeps its names, its handler and what its header says.
+  void clear();
+
+  // ---- Look-ups
+  //
+  // Each fills the list and answers whether it found something. What is found by name comes in
+  // index order, what is found by address in the order of addresses, then of indexes; addresses
+  // are those of Symbol::getAddress.
+
+  bool getSectionsByName(const char* name, SectionList* sections) const;
+  bool getSymbolsByName(const char* name, SymbolList* symbols);
+  bool getDynamicSymbolsByName(const char* name, SymbolList* symbols);
+  // Static symbols of the classes in the mask, a set of Symbol::Class: at addresses from the first
+  // to the last, both included; at one address; at the highest address not above the given one at
+  // which there is one; at the lowest address not below it at which there is one.
+  bool getSymbolsInRange(uint64_t fromAddress, uint64_t toAddress, uint32_t mask,
+                         SymbolList* symbols);
+  bool getSymbolsAtAddress(uint64_t address, uint32_t mask, SymbolList* symbols);
+  bool getPrecedingSymbols(uint64_t address, uint32_t mask, SymbolList* symbols);
+  bool getFollowingSymbols(uint64_t address, uint32_t mask, SymbolList* symbols);
+
+  [[nodiscard]] bool inheritsBuildAttributes() const override { return false; }
+  [[nodiscard]] const BuildAttributes* getInheritedBuildAttributes() const override {
+    return nullptr;
+  }
+
+private:
+  friend class Group;
+  friend class Pruner;
+  friend class Relocation;
+  friend class Section;
+  friend class Symbol;
+
+  struct SymbolInfo {
+    const char* name;
+    uint32_t type;
+    uint32_t binding;
+    uint32_t visibility;
+    bool isDynamic;
+  };
+  struct OptionalValue {
+    uint64_t value = 0;
+    bool exists = false;
+  };
+
+  template <class Field, class Value>
+  void change(Field& field, Value value) {
+    field = value;
+    markChanged();
+  }
+  void markChanged() { m_AreAuxiliarySectionsUpToDate = false; }
+  void markSymbolsChanged() {
+    m_AreSortedViewsUpToDate = false;
+    markChanged();
+  }
+
+  template <class SectionClass, class... Arguments>
+  SectionClass* makeSection(const char* name, Arguments... arguments);
+  Symbol* makeSymbol(const SymbolInfo& info, Symbol::Category category, Section* section,
+                     uint64_t word);
+  Symbol* makeHostedSymbol(const SymbolInfo& info, uint64_t offset, Section* section);
+  template <class Object, class... Arguments>
+  Object* makeListed(FastArray<Object*>& list, Arguments... arguments);
+  void noteComdatGroup(Group* group);
+
+  template <class Object>
+  void move(FastArray<Object*>& list, Object* object, uint32_t index, uint32_t firstIndex);
+  // Hosted symbols are in lists of their sections.
+  [[nodiscard]] FastArray<Symbol*>& getCategoryList(Symbol::Category category, bool isDynamic);
+  void materializeAllRelocations();
+  [[nodiscard]] uint32_t findInCategory(const FastArray<Symbol*>& list, const Symbol* symbol) const;
+  void moveInCategory(FastArray<Symbol*>& list, Symbol* symbol, uint32_t index);
+
+  template <class Object>
+  void deleteOne(const Object* object);
+  void clearDynamicData();
+  void clearHeaderTables();
+  void forgetPlacement();
+
+  void updateSortedViews();
+  bool collectByAddress(uint32_t fromIndex, uint32_t toIndex, uint32_t mask,
+                        SymbolList* symbols) const;
+
+  const uint8_t* m_ReadBuffer = nullptr;
+  bool m_AreNamesInBuffer = false;
+  std::unique_ptr<ImageSource> m_ImageSource;
+  ErrorHandler* m_ErrorHandler = nullptr;
+  const char* m_FileName = nullptr;
+  const char* m_ObjectName = nullptr;
+
+  uint32_t m_Machine = 40;
+  uint32_t m_ElfClass = 1;
+  uint32_t m_DataEncoding = 1;
+  uint32_t m_LittleEndian = 1;
+  uint32_t m_OsAbi = 0;
+  uint32_t m_AbiVersion = 0;
+  uint32_t m_FileType = 0;
+  uint64_t m_Entry = 0;
+  uint32_t m_ElfFlags = 0;
+  uint32_t m_ReadConditions = 0;
+  uint32_t m_IdentVersion = 1;
+  uint32_t m_ElfVersion = 1;
+
+  const char* m_Soname = nullptr;
+  std::array<OptionalValue, DynamicValue_Count> m_DynamicValues = {};
+  uint32_t m_DynamicFlags = 0;
+  bool m_DynamicFlagsExists = false;
+
+  uint32_t m_ElfHeaderSize = NewElfHeaderSize32;
+  uint64_t m_SectionHeaderOffset = 0;
+  uint64_t m_ProgramHeaderOffset = 0;
+  uint16_t m_StoredSectionCount = 0;
+  uint16_t m_StoredProgramHeaderCount = 0;
+  uint32_t m_SectionHeaderEntrySize = SectionHeaderSize32;
+  uint32_t m_ProgramHeaderEntrySize = ProgramHeaderSize32;
+
+  bool m_IndexesFrozen = false;
+  bool m_AreAuxiliarySectionsUpToDate = false;
+  bool m_AreSortedViewsUpToDate = true;
+
+  ELFHeader m_ElfHeader;
+  SectionHeaderTable m_SectionHeaderTable;
+  ProgramHeaderTable m_ProgramHeaderTable;
+
+  FastArray<Section*> m_Sections;
+  FastArray<Group*> m_Groups;
+  FastArray<Segment*> m_Segments;
+  FastArray<Symbol*> m_Symbols;
+  FastArray<Symbol*> m_DynamicSymbols;
+  FastArray<NeededLibrary*> m_NeededLibraries;
+  FastArray<LibrarySearchPath*> m_LibrarySearchPaths;
+  FastArray<Preemption*> m_Preemptions;
+  FastArray<RawDataBlock*> m_RawDataBlocks;
+  const FileVersionDefinition* m_FileVersionDefinition = nullptr;
+  FastArray<DebugOverlayRecord> m_DebugOverlayRecords;
+
+  FastArray<Symbol*> m_AbsoluteSymbols;
+  FastArray<Symbol*> m_CommonSymbols;
+  FastArray<Symbol*> m_UndefinedSymbols;
+  FastArray<Symbol*> m_AbsoluteDynamicSymbols;
+  FastArray<Symbol*> m_CommonDynamicSymbols;
+  FastArray<Symbol*> m_UndefinedDynamicSymbols;
+
+  FastArray<StringTableSection*> m_StringTableSections;
+  FastArray<SymbolTableSection*> m_SymtabSections;
+  FastArray<SymbolTableSection*> m_DynsymSections;
+  FastArray<GroupSection*> m_GroupSections;
+  FastArray<HashSection*> m_HashSections;
+  FastArray<ShndxSection*> m_ShndxSections;
+  FastArray<PreemptionMapSection*> m_PreemptionMapSections;
+  FastArray<VerdefSection*> m_VerdefSections;
+  FastArray<VerneedSection*> m_VerneedSections;
+  FastArray<VersymSection*> m_VersymSections;
+  FastArray<DynamicSection*> m_DynamicSections;
+  FastArray<DebugOverlaySection*> m_DebugOverlaySections;
+  FastArray<BuildAttributesSection*> m_BuildAttributesSections;
+
+  FastArray<Symbol*> m_SymbolsSortedByAddress;
+  FastArray<Symbol*> m_DynamicSymbolsSortedByAddress;
+  FastArray<Symbol*> m_SymbolsSortedByName;
+  FastArray<Symbol*> m_DynamicSymbolsSortedByName;
+  FastHashTable<Stringlett, Group*> m_MapSignaturesToComdatGroups;
+};
+
+} // namespace elfext

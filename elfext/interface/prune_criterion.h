@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What goes when a module is pruned: one question for each kind of object.
+#pragma once
+
+namespace elfext {
+
+class Group;
+class LibrarySearchPath;
+class NeededLibrary;
+class Preemption;
+class Section;
+class Segment;
+class Symbol;
+
+// Each operation is asked once for each object and answers whether it goes; by default nothing
+// does.
+class PruneCriterion {
+public:
+  virtual bool goes(const Section&) const { return false; }
+  virtual bool goes(const Group&) const { return false; }
+  virtual bool goes(const Segment&) const { return false; }
+  // Static and dynamic symbols.
+  virtual bool goes(const Symbol&) const { return false; }
+  virtual bool goes(const NeededLibrary&) const { return false; }
+  virtual bool goes(const LibrarySearchPath&) const { return false; }
+  virtual bool goes(const Preemption&) const { return false; }
+
+protected:
+  ~PruneCriterion() = default;
+};
+
+} // namespace elfext

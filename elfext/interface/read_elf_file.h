@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Reads an ELF file into an object module. All forms return true on success; the module is then
+// filled, and what it held before is gone. On failure the module is empty, and what was wrong has
+// been told to its error handler, except that a handler which lets a foreign machine pass gets true
+// and the module as it was.
+//
+// Section contents that nobody looks at are not read. In the forms that read from a file the
+// module therefore holds on to the file, its own or the caller's, until it is cleared or destroyed.
+// The host must live as long.
+//
+// The selector may be null. It is asked only in the first and the fourth form, for files larger
+// than 0x100000 bytes.
+#pragma once
+
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <span>
+
+namespace elfext {
+
+class DeferredContentsSelector;
+class ObjectModule;
+
+// A whole file, whose name becomes the module's file name.
+[[nodiscard]] bool readElfFile(support::Host& host, const char* fileName, ObjectModule& module,
+                               DeferredContentsSelector* selector);
+
+// `size` bytes at `offset` of a file: a member of an archive. Offsets inside are relative to it.
+[[nodiscard]] bool readElfFile(support::Host& host, const char* fileName, uint64_t offset,
+                               uint64_t size, ObjectModule& module,
+                               DeferredContentsSelector* selector);
+
+// Bytes in memory, which must outlive the module's contents: nothing of them is copied. The name
+// becomes the module's file name.
+[[nodiscard]] bool readElfFile(support::Host& host, const char* fileName,
+                               std::span<const uint8_t> readBuffer, ObjectModule& module,
+                               DeferredContentsSelector* selector);
+
+// A whole open file. With deferred contents the module closes the file when the last of them is
+// loaded or dropped; without, it remains the caller's to close, after the module has been cleared.
+[[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile,
+                               ObjectModule& module, DeferredContentsSelector* selector);
+
+// The second form for an open file, which remains the caller's to close, after the module has been
+// cleared.
+[[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile, uint64_t offset,
+                               uint64_t size, ObjectModule& module,
+                               DeferredContentsSelector* selector);
+
+} // namespace elfext

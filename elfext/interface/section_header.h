@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// A row of the section header table in the wide form that both classes are read into; the fields
+// are those of the ELF standard, without their sh_.
+#pragma once
+
+#include <cstdint>
+
+namespace elfext {
+
+struct SectionHeader {
+  uint32_t name = 0;
+  uint32_t type = 0;
+  uint64_t flags = 0;
+  uint64_t addr = 0;
+  uint64_t offset = 0;
+  uint64_t size = 0;
+  uint32_t link = 0;
+  uint32_t info = 0;
+  uint64_t addralign = 0;
+  uint64_t entsize = 0;
+};
+
+} // namespace elfext

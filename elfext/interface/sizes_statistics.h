@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What the bytes of an object are for. Sections tell where a file has some, program headers where
+// it has none.
+#pragma once
+
+#include <cstdint>
+#include <cstdio>
+
+namespace elfext {
+
+class ObjectModule;
+
+// Bytes.
+struct SizesStatistics {
+  uint64_t m_Code = 0;
+  uint64_t m_LiteralPools = 0;
+  uint64_t m_RwDataUncompressed = 0;
+  uint64_t m_RwDataCompressed = 0;
+  uint64_t m_RoData = 0;
+  uint64_t m_ZiData = 0;
+  uint64_t m_DebugInfo = 0;
+  uint64_t m_InternalPadding = 0;
+};
+
+// Changes nothing of the module but its views of symbols, which are made on demand. A module that
+// was read can always be counted.
+[[nodiscard]] SizesStatistics computeSizesStatistics(ObjectModule* objectModule);
+
+// The eight totals, each cut to 32 bits, between two rules.
+void printSizesStatistics(const SizesStatistics& statistics, std::FILE* f);
+
+} // namespace elfext

@@ -1,0 +1,226 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Each check comes in an order in which no sum can wrap before it is looked at.
+#include "elfext/interface/buffer.h"
+
+#include "checking/interface/checking.h"
+#include "elfext/interface/object_module.h"
+
+#include <array>
+#include <cstddef>
+#include <cstring>
+
+namespace elfext {
+namespace {
+
+template <class Word>
+Word assemble(const uint8_t* bytes, bool isLittleEndian) {
+  uint64_t value = 0;
+  for (size_t index = 0; index < sizeof(Word); ++index)
+    value = value << 8 | bytes[isLittleEndian ? sizeof(Word) - 1 - index : index];
+  return static_cast<Word>(value);
+}
+
+template <class Word>
+void disassemble(uint8_t* bytes, uint64_t value, bool isLittleEndian) {
+  for (size_t index = 0; index < sizeof(Word); ++index) {
+    bytes[isLittleEndian ? index : sizeof(Word) - 1 - index] = static_cast<uint8_t>(value);
+    value >>= 8;
+  }
+}
+
+} // namespace
+
+Buffer::Buffer(ObjectModule* objectModule)
+    : m_Contents(objectModule->getContainerRegion()), m_ObjectModule(objectModule) {}
+
+void Buffer::setExternalData(ExternalDataFunction function, void* handle, uint64_t size) {
+  m_ExternalDataFunction = function;
+  m_ExternalDataHandle = handle;
+  m_ExternalDataSize = size;
+}
+
+const uint8_t* Buffer::getContents() const {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  return m_Contents.view();
+}
+
+uint8_t* Buffer::getModifiableContents() {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  return m_Contents.modify();
+}
+
+uint64_t Buffer::getSize() const {
+  return isExternal() ? m_ExternalDataSize : m_Contents.getSize();
+}
+
+void Buffer::setSize(uint64_t size) {
+  if (isExternal()) {
+    m_ExternalDataSize = size;
+    return;
+  }
+  QUARN_ASSERT(1, size <= UINT32_MAX);
+  m_Contents.setSize(size);
+}
+
+void Buffer::reserve(uint64_t size) {
+  if (isExternal()) return;
+  QUARN_ASSERT(1, size <= UINT32_MAX);
+  m_Contents.reserve(size);
+}
+
+template <class Word>
+Word Buffer::loadWord(uint64_t offset) const {
+  if (!isExternal())
+    return assemble<Word>(m_Contents.view() + offset, m_ObjectModule->isLittleEndian());
+  std::array<uint8_t, sizeof(Word)> bytes;
+  read(offset, bytes.data(), bytes.size());
+  return assemble<Word>(bytes.data(), m_ObjectModule->isLittleEndian());
+}
+
+template <class Word>
+void Buffer::storeWord(uint64_t offset, Word value) {
+  disassemble<Word>(m_Contents.modify() + offset, value, m_ObjectModule->isLittleEndian());
+}
+
+template <class Word>
+uint64_t Buffer::appendWord(Word value) {
+  const uint64_t oldSize = m_Contents.getSize();
+  setSize(oldSize + sizeof(Word));
+  storeWord(oldSize, value);
+  return oldSize;
+}
+
+uint8_t Buffer::getByte(uint64_t offset) const {
+  if (isExternal()) return loadWord<uint8_t>(offset);
+  QUARN_ASSERT(1, offset < m_Contents.getSize());
+  return m_Contents.view()[offset];
+}
+
+uint16_t Buffer::get16(uint64_t offset) const {
+  QUARN_ASSERT(1, offset % 2 == 0);
+  return getUnaligned16(offset);
+}
+
+uint32_t Buffer::get32(uint64_t offset) const {
+  QUARN_ASSERT(1, offset % 4 == 0);
+  return getUnaligned32(offset);
+}
+
+uint64_t Buffer::get64(uint64_t offset) const {
+  QUARN_ASSERT(1, offset % 8 == 0);
+  return getUnaligned64(offset);
+}
+
+uint16_t Buffer::getUnaligned16(uint64_t offset) const {
+  if (isExternal()) return loadWord<uint16_t>(offset);
+  QUARN_ASSERT(1, offset <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset + 2 <= m_Contents.getSize());
+  return loadWord<uint16_t>(offset);
+}
+
+uint32_t Buffer::getUnaligned32(uint64_t offset) const {
+  if (isExternal()) return loadWord<uint32_t>(offset);
+  QUARN_ASSERT(1, offset <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset + 4 <= m_Contents.getSize());
+  return loadWord<uint32_t>(offset);
+}
+
+uint64_t Buffer::getUnaligned64(uint64_t offset) const {
+  if (isExternal()) return loadWord<uint64_t>(offset);
+  QUARN_ASSERT(1, offset <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset + 8 <= m_Contents.getSize());
+  return loadWord<uint64_t>(offset);
+}
+
+void Buffer::setByte(uint64_t offset, uint8_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, offset <= UINT32_MAX);
+  QUARN_ASSERT(1, offset < m_Contents.getSize());
+  m_Contents.modify()[offset] = value;
+}
+
+void Buffer::set16(uint64_t offset, uint16_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, offset <= UINT32_MAX);
+  QUARN_ASSERT(1, offset + 2 <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset % 2 == 0);
+  storeWord(offset, value);
+}
+
+void Buffer::set32(uint64_t offset, uint32_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, offset <= UINT32_MAX);
+  QUARN_ASSERT(1, offset + 4 <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset % 4 == 0);
+  storeWord(offset, value);
+}
+
+void Buffer::set64(uint64_t offset, uint64_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, offset <= UINT32_MAX);
+  QUARN_ASSERT(1, offset + 8 <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset % 8 == 0);
+  storeWord(offset, value);
+}
+
+void Buffer::readExternal(uint64_t offset, void* buffer, uint64_t count) const {
+  QUARN_ASSERT(1, count <= m_ExternalDataSize);
+  QUARN_ASSERT(1, offset + count <= m_ExternalDataSize);
+  auto* destination = static_cast<uint8_t*>(buffer);
+  while (count != 0) {
+    const uint64_t ret = m_ExternalDataFunction(m_ExternalDataHandle, offset, destination, count);
+    QUARN_ASSERT(1, ret > 0);
+    QUARN_ASSERT(1, ret <= count);
+    offset += ret;
+    destination += ret;
+    count -= ret;
+  }
+}
+
+void Buffer::read(uint64_t offset, void* buffer, uint64_t count) const {
+  QUARN_ASSERT(1, offset + count >= offset);
+  QUARN_ASSERT(1, offset + count >= count);
+  QUARN_ASSERT(1, buffer != NULL);
+  if (isExternal()) return readExternal(offset, buffer, count);
+  QUARN_ASSERT(1, offset <= m_Contents.getSize());
+  QUARN_ASSERT(1, count <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset + count <= m_Contents.getSize());
+  if (count != 0) std::memcpy(buffer, m_Contents.view() + offset, count);
+}
+
+void Buffer::write(uint64_t offset, const void* buffer, uint64_t count) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, buffer != NULL);
+  QUARN_ASSERT(1, offset <= UINT32_MAX);
+  QUARN_ASSERT(1, count <= UINT32_MAX);
+  QUARN_ASSERT(1, offset <= m_Contents.getSize());
+  QUARN_ASSERT(1, count <= m_Contents.getSize());
+  QUARN_ASSERT(1, offset + count <= m_Contents.getSize());
+  if (count != 0) std::memcpy(m_Contents.modify() + offset, buffer, count);
+}
+
+uint64_t Buffer::appendByte(uint8_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  return appendWord(value);
+}
+
+uint64_t Buffer::append16(uint16_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, m_Contents.getSize() % 2 == 0);
+  return appendWord(value);
+}
+
+uint64_t Buffer::append32(uint32_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, m_Contents.getSize() % 4 == 0);
+  return appendWord(value);
+}
+
+uint64_t Buffer::append64(uint64_t value) {
+  QUARN_ASSERT(1, !m_ExternalDataFunction);
+  QUARN_ASSERT(1, m_Contents.getSize() % 8 == 0);
+  return appendWord(value);
+}
+
+} // namespace elfext

@@ -1,0 +1,125 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The records of the ELF standard, in the wide form of class 2, with the standard's field names
+// without their prefixes. Class 1 values are widened when got and cut when put. Nothing is laid
+// over the file's bytes: each record is taken apart field by field, so it may stand at any address
+// and in either byte order. The caller has made sure that the record's bytes are there.
+#pragma once
+
+#include "elfext/interface/section_header.h"
+
+#include <array>
+#include <bit>
+#include <cstdint>
+#include <cstring>
+#include <type_traits>
+
+namespace elfext {
+
+struct RecordFormat {
+  bool isWide = false; // class 2
+  bool isLittle = true;
+
+  [[nodiscard]] bool operator==(const RecordFormat&) const = default;
+};
+
+struct FileHeader {
+  std::array<uint8_t, 16> ident = {};
+  uint16_t type = 0;
+  uint16_t machine = 0;
+  uint32_t version = 0;
+  uint64_t entry = 0;
+  uint64_t phoff = 0;
+  uint64_t shoff = 0;
+  uint32_t flags = 0;
+  uint16_t ehsize = 0;
+  uint16_t phentsize = 0;
+  uint16_t phnum = 0;
+  uint16_t shentsize = 0;
+  uint16_t shnum = 0;
+  uint16_t shstrndx = 0;
+};
+
+struct ProgramHeader {
+  uint32_t type = 0;
+  uint32_t flags = 0;
+  uint64_t offset = 0;
+  uint64_t vaddr = 0;
+  uint64_t paddr = 0;
+  uint64_t filesz = 0;
+  uint64_t memsz = 0;
+  uint64_t align = 0;
+};
+
+struct SymbolRow {
+  uint32_t name = 0;
+  uint8_t info = 0;
+  uint8_t other = 0;
+  uint16_t shndx = 0;
+  uint64_t value = 0;
+  uint64_t size = 0;
+};
+
+// r_info, taken apart as the class says. Of a row without addend the addend is 0.
+struct RelocationRow {
+  uint64_t offset = 0;
+  uint32_t symbol = 0;
+  uint32_t type = 0;
+  int64_t addend = 0;
+};
+
+// Bytes that each record takes in the file.
+[[nodiscard]] constexpr uint32_t fileHeaderSize(bool isWide) {
+  return isWide ? 64 : 52;
+}
+[[nodiscard]] constexpr uint32_t sectionHeaderSize(bool isWide) {
+  return isWide ? 64 : 40;
+}
+[[nodiscard]] constexpr uint32_t programHeaderSize(bool isWide) {
+  return isWide ? 56 : 32;
+}
+[[nodiscard]] constexpr uint32_t symbolRowSize(bool isWide) {
+  return isWide ? 24 : 16;
+}
+[[nodiscard]] constexpr uint32_t relocationRowSize(bool isWide, bool hasAddend) {
+  return (isWide ? 8U : 4U) * (hasAddend ? 3U : 2U);
+}
+
+[[nodiscard]] inline uint16_t swapBytes(uint16_t word) {
+  return static_cast<uint16_t>(word << 8 | word >> 8);
+}
+[[nodiscard]] inline uint32_t swapBytes(uint32_t word) {
+  return word << 24 | (word & 0xFF00) << 8 | (word >> 8 & 0xFF00) | word >> 24;
+}
+[[nodiscard]] inline uint64_t swapBytes(uint64_t word) {
+  return uint64_t{swapBytes(static_cast<uint32_t>(word))} << 32 |
+         swapBytes(static_cast<uint32_t>(word >> 32));
+}
+
+// A word in the file's byte order, at any address.
+template <class Word>
+[[nodiscard]] Word getWord(const uint8_t* bytes, bool isLittle) {
+  Word word;
+  std::memcpy(&word, bytes, sizeof word);
+  return isLittle == (std::endian::native == std::endian::little) ? word : swapBytes(word);
+}
+
+template <class Word>
+void putWord(Word word, bool isLittle, uint8_t* bytes) {
+  if (isLittle != (std::endian::native == std::endian::little)) word = swapBytes(word);
+  std::memcpy(bytes, &word, sizeof word);
+}
+
+// The record at the bytes, or the bytes of the record.
+void getRecord(RecordFormat format, const uint8_t* bytes, FileHeader& record);
+void putRecord(RecordFormat format, const FileHeader& record, uint8_t* bytes);
+void getRecord(RecordFormat format, const uint8_t* bytes, SectionHeader& record);
+void putRecord(RecordFormat format, const SectionHeader& record, uint8_t* bytes);
+void getRecord(RecordFormat format, const uint8_t* bytes, ProgramHeader& record);
+void putRecord(RecordFormat format, const ProgramHeader& record, uint8_t* bytes);
+void getRecord(RecordFormat format, const uint8_t* bytes, SymbolRow& record);
+void putRecord(RecordFormat format, const SymbolRow& record, uint8_t* bytes);
+void getRecord(RecordFormat format, bool hasAddend, const uint8_t* bytes, RelocationRow& record);
+void putRecord(RecordFormat format, bool hasAddend, const RelocationRow& record, uint8_t* bytes);
+
+} // namespace elfext

@@ -1,0 +1,88 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The bytes of one object file: in memory that somebody lends, or in a range of an open file, of
+// which only those blocks are read that somebody looks at. A small image is read whole, in one
+// host call.
+//
+// The bytes of a file keep one address, in one array as large as the image whose untouched pages
+// cost nothing. So a thousand overlapping views need no more memory than one.
+#pragma once
+
+#include "elfext/interface/image_source.h"
+#include "support/interface/host.h"
+
+#include <cstdint>
+#include <memory>
+#include <span>
+#include <vector>
+
+namespace elfext {
+
+// Why a view was not to be had.
+enum class ImageFailure : uint8_t {
+  None,
+  Outside,    // beyond the end of the image
+  Unreadable, // the host failed, or its file has become shorter
+  NoMemory,
+};
+
+class ImageBytes final : public ImageSource {
+public:
+  // Images up to this size, in bytes, are read whole.
+  static constexpr uint64_t WholeReadLimit = 0x10000;
+
+  // Bytes that outlive this object.
+  explicit ImageBytes(std::span<const uint8_t> bytes);
+  // `size` bytes at `offset` of the file, which must stay open as long as somebody looks for bytes;
+  // with `closesFile` it is this object that closes it.
+  ImageBytes(support::Host& host, support::FileHandle file, uint64_t offset, uint64_t size,
+             bool closesFile);
+  ~ImageBytes() override;
+  ImageBytes(const ImageBytes&) = delete;
+  ImageBytes& operator=(const ImageBytes&) = delete;
+
+  // Gets the memory for a file's bytes, and those of a small image; once is enough. False for a
+  // failure.
+  [[nodiscard]] bool prepare();
+
+  // From now on the file is this object's to close.
+  void takeOverFile() { m_ClosesFile = true; }
+  // Somebody else closes the file now: what was not read can't be had any more.
+  void forgetFile() { m_File = {}; }
+  // Closes the file if it is this object's to close; the host's answer.
+  [[nodiscard]] support::HostError closeFile();
+  [[nodiscard]] bool isReadWhole() const { return m_MissingBlocks == 0; }
+
+  // Bytes.
+  [[nodiscard]] uint64_t getSize() const { return m_Size; }
+  // Whether the range lies in the image, whatever the two numbers are.
+  [[nodiscard]] bool contains(uint64_t offset, uint64_t size) const {
+    return offset <= m_Size && size <= m_Size - offset;
+  }
+
+  [[nodiscard]] const uint8_t* view(uint64_t offset, uint64_t size) override;
+
+  // What the last failed operation failed for, with the host's error number; 0 where it has none.
+  [[nodiscard]] ImageFailure getFailure() const { return m_Failure; }
+  [[nodiscard]] support::HostError getHostError() const { return m_HostError; }
+
+private:
+  [[nodiscard]] bool fail(ImageFailure failure, support::HostError error = 0);
+  [[nodiscard]] bool load(uint64_t offset, uint64_t size);
+  [[nodiscard]] bool loadBlocks(size_t first, size_t end);
+  [[nodiscard]] size_t endOfMissing(size_t first, size_t end) const;
+
+  const uint8_t* m_Bytes = nullptr;
+  uint64_t m_Size;
+  support::Host* m_Host = nullptr;
+  support::FileHandle m_File;
+  uint64_t m_FileOffset = 0;
+  bool m_ClosesFile = false;
+  std::unique_ptr<uint8_t[]> m_Loaded;
+  std::vector<bool> m_IsBlockLoaded;
+  size_t m_MissingBlocks = 0;
+  ImageFailure m_Failure = ImageFailure::None;
+  support::HostError m_HostError = 0;
+};
+
+} // namespace elfext

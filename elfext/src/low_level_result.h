@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What the lowest layer of reading answers, and which report each answer becomes.
+#pragma once
+
+#include <cstdint>
+
+namespace elfext {
+
+class ObjectModule;
+
+enum class LowLevelResult : uint8_t {
+  Success = 0,
+  // Bytes that are not in the image. Reported as an error in writing, which is what users know.
+  OutsideImage = 1,
+  // The host failed while the image was read.
+  LayerFailure = 2,
+  WrongMagic = 3,
+  WrongClass = 5,
+  NoMemory = 6,
+};
+
+// Reports the failure, if it is one, to the module's handler. True for success only.
+[[nodiscard]] bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result);
+
+} // namespace elfext

@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "elfext/interface/raw_data_block.h"
+
+#include "checking/interface/checking.h"
+
+namespace elfext {
+
+RawDataBlock::RawDataBlock(ObjectModule* objectModule, Segment* segment, uint64_t size)
+    : m_Size(size), m_Segment(segment), m_Contents(objectModule) {}
+
+void RawDataBlock::getAlignment(uint64_t* remainder, uint64_t* alignment) const {
+  *remainder = 0;
+  *alignment = 1;
+}
+
+DataStructure* RawDataBlock::createDataStructure(alloclib::RegionGeneral&, uint64_t) {
+  QUARN_ASSERT(1, !"We shouldn't be here");
+  return nullptr;
+}
+
+bool RawDataBlock::read(uint64_t offset, void* destination, uint64_t count) const {
+  m_Contents.read(offset, destination, count);
+  return true;
+}
+
+bool RawDataBlock::write(uint64_t offset, const void* source, uint64_t count) {
+  // A block that nobody has given bytes yet has room for them now.
+  if (m_Contents.getSize() != m_Size) m_Contents.setSize(m_Size);
+  m_Contents.write(offset, source, count);
+  return true;
+}
+
+} // namespace elfext
