@@ -48,11 +48,13 @@ std::string Extraction::outputName(std::string_view name) const {
   return std::string(name.substr(0, LongestFileName).substr(0, LongestHostName));
 }
 
-// A member that is called like the archive would be written over it before its bytes are read.
+// A member that is called like the archive would be written over it before its bytes are read. If
+// the host doesn't tell which file the archive is, no file that is there is safe.
 bool Extraction::mayWrite(const std::string& name) const {
   support::FileStatus status;
   if (m_Host.status(name.c_str(), status) != 0) return true;
-  return m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus);
+  const bool isArchiveKnown = m_ArchiveStatus.kind != support::FileKind::Nothing;
+  return m_Settings.overwriteOnExtract && isArchiveKnown && !status.isSameFile(m_ArchiveStatus);
 }
 
 void Extraction::operator()(ArchiveMember& member) {

@@ -83,6 +83,7 @@ size_t ImageBytes::endOfMissing(size_t first, size_t end) const {
 }
 
 bool ImageBytes::loadBlocks(size_t first, size_t end) {
+  if (!m_File.isOpen()) return fail(ImageFailure::Unreadable);
   const uint64_t offset = first * BlockSize;
   const uint64_t size = std::min(end * BlockSize, m_Size) - offset;
   size_t done = 0;

@@ -18,10 +18,14 @@ std::string_view dashText(uint32_t dashes) {
   return std::string_view("--").substr(0, dashes);
 }
 
-// The word can't be an option's if its row stays hidden, or refuses the text behind its name.
+// Whether text stands behind the name of a row that takes none.
+bool hasUnexpectedArgument(const Match& match) {
+  return match.row != nullptr && match.longName && match.row->kind == Kind_Implied &&
+         !match.rest.empty();
+}
+
 bool isUnknown(const Match& match) {
-  if (match.row == nullptr || match.restricted) return true;
-  return match.longName && match.row->kind == Kind_Implied && !match.rest.empty();
+  return match.row == nullptr || match.restricted || hasUnexpectedArgument(match);
 }
 
 bool isPassedOver(const Parser& parser, const MatchString& row, std::span<const uint32_t> filter) {
@@ -133,11 +137,9 @@ uint32_t Parser::refuse(const WordInHand& hand) {
     const uint32_t used = fallback->takeWord(*this, hand.word.data(), hand.next, hand.dashes);
     if (used != 0) return used;
   }
-  const Match& match = hand.match;
-  const bool hasUnexpected = match.row != nullptr && !match.restricted && isUnknown(match);
-  if (hasUnexpected) {
+  if (hasUnexpectedArgument(hand.match)) {
     report(ReportLevel::Fatal, OptionMessage::UnexpectedArgument,
-           {dashText(hand.dashes), match.row->name});
+           {dashText(hand.dashes), hand.row().name});
   } else {
     report(ReportLevel::Fatal, OptionMessage::UnrecognizedOption,
            {dashText(hand.dashes), hand.word});

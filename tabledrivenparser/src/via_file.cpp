@@ -119,7 +119,6 @@ void ViaFile::scanEscaped(char character, const ScanState& state) {
 const char* ViaFile::finishWord(char end, const ScanState& state) {
   if (state.isEnclosed()) return fail(OptionMessage::MalformedViaFile);
   if (state.isEscapePending) m_Words[m_Current] += '\\';
-  if (end != '\0') ++m_Position;
   m_LastChar = end;
   return m_Words[m_Current].c_str();
 }

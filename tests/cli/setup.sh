@@ -75,3 +75,81 @@ table() {
   printf "$names"
   if (( size % 2 )); then echo; fi
 }
+
+# patch FILE OFFSET HEXBYTES: these bytes in the place of those that stand there.
+patch() {
+  printf '%b' "$(sed 's/../\\x&/g' <<< "${3// /}")" | dd of="$1" bs=64K oflag=seek_bytes seek=$(( $2 )) \
+    conv=notrunc status=none
+}
+
+# little SIZE NUMBER...: the numbers as hex bytes, the low byte first.
+little() {
+  local size=$1 number left
+  shift
+  for number in "$@"; do
+    for (( left = size; left > 0; --left )); do
+      printf '%02x' $(( number & 255 ))
+      number=$(( number >> 8 ))
+    done
+  done
+}
+
+# The places of fields, as offset and size, in the header and in the rows of a little-endian object of
+# class 1. The helpers below are for such objects only.
+declare -A elfFields=([class]='4 1' [data]='5 1' [type]='16 2' [machine]='18 2' [version]='20 4'
+  [entry]='24 4' [phoff]='28 4' [shoff]='32 4' [ehsize]='40 2' [phentsize]='42 2' [phnum]='44 2'
+  [shentsize]='46 2' [shnum]='48 2' [shstrndx]='50 2')
+declare -A sectionFields=([name]='0 4' [type]='4 4' [flags]='8 4' [addr]='12 4' [offset]='16 4' [size]='20 4'
+  [link]='24 4' [info]='28 4' [addralign]='32 4' [entsize]='36 4')
+declare -A symbolFields=([name]='0 4' [value]='4 4' [size]='8 4' [info]='12 1' [other]='13 1' [shndx]='14 2')
+
+# field FILE BASE PLACE [NUMBER]: says a number, or sets it.
+field() {
+  local place=($3)
+  if [ $# = 4 ]; then patch "$1" $(( $2 + place )) "$(little "${place[1]}" "$4")"; return; fi
+  od -A n -v -t "u${place[1]}" --endian=little -j $(( $2 + place )) -N "${place[1]}" "$1" | tr -d ' '
+}
+
+# elf FILE FIELD [NUMBER]: a field of the header.
+elf() {
+  field "$1" 0 "${elfFields[$2]}" ${3:+"$3"}
+}
+
+# section FILE INDEX FIELD [NUMBER]: a field of a section's row.
+section() {
+  field "$1" $(( $(elf "$1" shoff) + 40 * $2 )) "${sectionFields[$3]}" ${4:+"$4"}
+}
+
+# symbol FILE INDEX FIELD [NUMBER]: a field of a row of the first symbol table.
+symbol() {
+  local table=0
+  while [ "$(section "$1" $table type)" != 2 ]; do table=$(( table + 1 )); done
+  field "$1" $(( $(section "$1" $table offset) + 16 * $2 )) "${symbolFields[$3]}" ${4:+"$4"}
+}
+
+# addSection FILE TYPE HEXBYTES [FIELD NUMBER]...: one more section, the last. The rows move to the end.
+addSection() {
+  local file=$1 type=$2 bytes=${3// /} count rows end
+  shift 3
+  count=$(elf "$file" shnum)
+  rows=$(od -A n -v -t x1 -j "$(elf "$file" shoff)" -N $(( 40 * count )) "$file" | tr -d ' \n')
+  end=$(stat -c %s "$file")
+  patch "$file" "$end" "$bytes$rows$(little 4 0 "$type" 0 0 "$end" $(( ${#bytes} / 2 )) 0 0 0 0)"
+  elf "$file" shoff $(( end + ${#bytes} / 2 ))
+  elf "$file" shnum $(( count + 1 ))
+  while (( $# )); do
+    section "$file" "$count" "$1" "$2"
+    shift 2
+  done
+}
+
+# addSegment FILE TYPE OFFSET FILE_SIZE MEMORY_SIZE FLAGS: one more program header. The rows move to the end.
+addSegment() {
+  local file=$1 count rows end
+  count=$(elf "$file" phnum)
+  rows=$(od -A n -v -t x1 -j "$(elf "$file" phoff)" -N $(( 32 * count )) "$file" | tr -d ' \n')
+  end=$(stat -c %s "$file")
+  patch "$file" "$end" "$rows$(little 4 "$2" "$3" 0 0 "$4" "$5" "$6" 0)"
+  elf "$file" phoff "$end"
+  elf "$file" phnum $(( count + 1 ))
+}

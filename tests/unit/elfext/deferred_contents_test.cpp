@@ -121,7 +121,7 @@ TEST_F(DeferredContentsTest, AreLoadedAllTogether) {
 }
 
 TEST_F(DeferredContentsTest, ReportAFailureAndCloseTheFile) {
-  ErrorStringCapture capture;
+  ElfextErrorStringCapture capture;
   module.setErrorHandler(&capture);
   Section* good = makeDeferred(0, 1);
   Section* bad = makeDeferred(8, 3);

@@ -108,8 +108,8 @@ TEST_F(FileRegionTest, TakesASegmentWithoutAlignment) {
 }
 
 TEST_F(FileRegionTest, AlignsBookkeepingSectionsTo4) {
-  for (uint32_t type : {SHT_SYMTAB, SHT_RELA, SHT_HASH, SHT_REL, SHT_DYNSYM, SHT_GROUP,
-                        SHT_SYMTAB_SHNDX}) {
+  for (uint32_t type :
+       {SHT_SYMTAB, SHT_RELA, SHT_HASH, SHT_REL, SHT_DYNSYM, SHT_GROUP, SHT_SYMTAB_SHNDX}) {
     Section* section = module.createSectionOfType(nullptr, type, 0);
     section->setAlignment(1);
     EXPECT_EQ(alignmentOf(*section), Alignment(0, 4)) << type;

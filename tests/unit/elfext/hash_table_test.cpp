@@ -108,6 +108,14 @@ TYPED_TEST(HashTableTest, GrowsAboveALoadOfThreeQuarters) {
   EXPECT_EQ(this->m_Table.getBucketCount(), 26u);
 }
 
+// In 17 or 26 buckets the load is never three quarters to the point.
+TYPED_TEST(HashTableTest, DoesNotGrowAtExactlyThreeQuarters) {
+  this->putUpTo(31);
+  EXPECT_EQ(this->m_Table.getBucketCount(), 40u);
+  this->m_Table.put(31, 0);
+  EXPECT_EQ(this->m_Table.getBucketCount(), 61u);
+}
+
 TYPED_TEST(HashTableTest, GrowsEvenForAKeyThatIsThere) {
   this->putUpTo(13);
   this->m_Table.put(0, 5);

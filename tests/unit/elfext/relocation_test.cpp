@@ -63,9 +63,8 @@ TEST_F(RelocationTest, TargetsSymbolsOfItsModuleOnly) {
   ObjectModule other;
   Symbol* foreign = other.createAbsoluteSymbol("f", 0, 0, 0, 0);
   Relocation* relocation = section->addRelocation(0, 0, symbol);
-  EXPECT_ASSERTION(
-      relocation->setTarget(foreign),
-      "(target == NULL) || (m_Section->m_ObjectModule == target->m_ObjectModule)");
+  EXPECT_ASSERTION(relocation->setTarget(foreign),
+                   "(target == NULL) || (m_Section->m_ObjectModule == target->m_ObjectModule)");
   EXPECT_ASSERTION(section->addRelocation(0, 0, foreign),
                    "(target == NULL) || (target->m_ObjectModule == m_ObjectModule)");
   EXPECT_ASSERTION(Relocation(section, 0, 0, foreign),

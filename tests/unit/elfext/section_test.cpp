@@ -66,10 +66,11 @@ TEST_F(SectionTest, IsOfTheClassThatItsTypeHas) {
 }
 
 TEST_F(SectionTest, IsPlainOnlyForTypesWithoutAClass) {
-  for (const ClassRow& row : ClassRows)
-    if (row.isAuxiliary)
-      EXPECT_EXIT(module.createSection("name", row.type, 0), testing::ExitedWithCode(1),
-                  "type != SHT_NULL && type != SHT_STRTAB");
+  for (const ClassRow& row : ClassRows) {
+    if (!row.isAuxiliary) continue;
+    EXPECT_EXIT(module.createSection("name", row.type, 0), testing::ExitedWithCode(1),
+                "type != SHT_NULL && type != SHT_STRTAB");
+  }
 }
 
 TEST_F(SectionTest, JoinsTheListOfItsType) {
@@ -235,8 +236,7 @@ TEST_F(SectionTest, TakesPowersOfTwoAsAlignment) {
     section->setAlignment(alignment);
     EXPECT_EQ(section->getAlignment(), alignment);
   }
-  EXPECT_ASSERTION(section->setAlignment(12),
-                   "(alignment & ~(alignment & (0 - alignment))) == 0");
+  EXPECT_ASSERTION(section->setAlignment(12), "(alignment & ~(alignment & (0 - alignment))) == 0");
   EXPECT_ASSERTION(section->increaseAlignment(12),
                    "(alignment & ~(alignment & (0 - alignment))) == 0");
 }

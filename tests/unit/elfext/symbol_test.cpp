@@ -14,12 +14,26 @@ namespace {
 class SymbolTest : public ModuleTest {
 protected:
   // The symbols of each list in which one is.
-  std::vector<Symbol*> absolute() { return list(&ObjectModule::getAbsoluteSymbolCount, &ObjectModule::getAbsoluteSymbol); }
-  std::vector<Symbol*> common() { return list(&ObjectModule::getCommonSymbolCount, &ObjectModule::getCommonSymbol); }
-  std::vector<Symbol*> undefined() { return list(&ObjectModule::getUndefinedSymbolCount, &ObjectModule::getUndefinedSymbol); }
-  std::vector<Symbol*> absoluteDynamic() { return list(&ObjectModule::getAbsoluteDynamicSymbolCount, &ObjectModule::getAbsoluteDynamicSymbol); }
-  std::vector<Symbol*> commonDynamic() { return list(&ObjectModule::getCommonDynamicSymbolCount, &ObjectModule::getCommonDynamicSymbol); }
-  std::vector<Symbol*> undefinedDynamic() { return list(&ObjectModule::getUndefinedDynamicSymbolCount, &ObjectModule::getUndefinedDynamicSymbol); }
+  std::vector<Symbol*> absolute() {
+    return list(&ObjectModule::getAbsoluteSymbolCount, &ObjectModule::getAbsoluteSymbol);
+  }
+  std::vector<Symbol*> common() {
+    return list(&ObjectModule::getCommonSymbolCount, &ObjectModule::getCommonSymbol);
+  }
+  std::vector<Symbol*> undefined() {
+    return list(&ObjectModule::getUndefinedSymbolCount, &ObjectModule::getUndefinedSymbol);
+  }
+  std::vector<Symbol*> absoluteDynamic() {
+    return list(&ObjectModule::getAbsoluteDynamicSymbolCount,
+                &ObjectModule::getAbsoluteDynamicSymbol);
+  }
+  std::vector<Symbol*> commonDynamic() {
+    return list(&ObjectModule::getCommonDynamicSymbolCount, &ObjectModule::getCommonDynamicSymbol);
+  }
+  std::vector<Symbol*> undefinedDynamic() {
+    return list(&ObjectModule::getUndefinedDynamicSymbolCount,
+                &ObjectModule::getUndefinedDynamicSymbol);
+  }
 
 private:
   std::vector<Symbol*> list(uint32_t (ObjectModule::*count)() const,

@@ -167,6 +167,14 @@ TEST_F(ViaOption, warnsOfAFailingCloseAndGoesOn) {
   EXPECT_TRUE(m_Session.parser().booleanValue(Id_Verbose));
 }
 
+TEST_F(ViaOption, saysNothingOfTheCloseOnceAllHasFailed) {
+  files()["f"] = "--nonsense";
+  m_Session.m_Files.m_FailingClose = "f";
+  m_Session.parse({"--via", "f"});
+  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Unrecognized option '--nonsense'."));
+  EXPECT_EQ(m_Session.m_Files.m_OpenCount, 0);
+}
+
 TEST_F(ViaOption, looksOneWordAheadBeforeItActs) {
   files()["f"] = "-t \"open\n -v";
   m_Session.parse({"--via", "f"});

@@ -1,0 +1,80 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Any bytes read as an object, from memory and as a member of a file, under a handler that refuses
+// and one that goes on. What was read is counted, validated and looked at.
+#include "alloclib/interface/region.h"
+#include "elfext/interface/deferred_contents_selector.h"
+#include "elfext/interface/error_string_capture.h"
+#include "elfext/interface/object_module.h"
+#include "elfext/interface/read_elf_file.h"
+#include "elfext/interface/section.h"
+#include "elfext/interface/sizes_statistics.h"
+#include "tests/support/memory_host.h"
+
+#include <cstdlib>
+#include <string>
+#include <string_view>
+
+namespace {
+
+using namespace elfext;
+
+// Goes on wherever there is something to go on with.
+class AcceptingHandler final : public ErrorHandler {
+public:
+  bool report(const ObjectModule&, uint32_t, const std::string&) override { return true; }
+  bool outOfMemory(const ObjectModule&) override { return false; }
+  bool ioErrorReading(const ObjectModule&, int) override { return false; }
+  bool ioErrorWriting(const ObjectModule&, int) override { return false; }
+  bool unrecognisedFileType(const ObjectModule&, uint32_t) override { return false; }
+  bool invalidDataEncoding(const ObjectModule&, uint32_t) override { return false; }
+  bool unsupportedVersion(const ObjectModule&, uint32_t) override { return false; }
+  bool wrongMagic(const ObjectModule&) override { return false; }
+  bool wrongClass(const ObjectModule&) override { return false; }
+};
+
+void lookAt(ObjectModule& module) {
+  [[maybe_unused]] const SizesStatistics sizes = computeSizesStatistics(&module);
+  for (Section* section : module.getSections())
+    section->materializeRelocations();
+  SymbolList symbols;
+  for (const Symbol* symbol : module.getSymbols()) {
+    if (symbol->isBuildAttributesSymbol() && symbol->getName() == nullptr) std::abort();
+  }
+  [[maybe_unused]] const bool isValid = module.validate();
+  module.clear();
+  if (!module.isEmpty()) std::abort();
+}
+
+void readFromMemory(std::span<const uint8_t> bytes, ErrorHandler& handler) {
+  testsupport::MemoryHost host;
+  ObjectModule module;
+  module.setErrorHandler(&handler);
+  if (readElfFile(host, "object", bytes, module, nullptr)) lookAt(module);
+}
+
+void readAsMember(std::span<const uint8_t> bytes, ErrorHandler& handler) {
+  constexpr size_t Before = 100;
+  testsupport::MemoryHost host;
+  const std::string_view text(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+  host.addFile("archive", std::string(Before, 'x') + std::string(text) + "behind");
+  BySizeDeferredContentsSelector selector;
+  ObjectModule module;
+  module.setErrorHandler(&handler);
+  if (readElfFile(host, "archive", Before, bytes.size(), module, &selector)) lookAt(module);
+}
+
+} // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
+  static const bool isInitialised = (alloclib::initialise(), true);
+  if (!isInitialised || size == 0) return 0;
+  ElfextErrorStringCapture refusing;
+  AcceptingHandler accepting;
+  for (ErrorHandler* handler :
+       {static_cast<ErrorHandler*>(&refusing), static_cast<ErrorHandler*>(&accepting)}) {
+    readFromMemory({data, size}, *handler);
+    readAsMember({data, size}, *handler);
+  }
+  return 0;
+}
