@@ -10,6 +10,7 @@
 #include "tests/support/object_builder.h"
 #include "tests/support/recording_handler.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <memory>
@@ -40,7 +41,8 @@ public:
     }
     save();
     reload();
-    EXPECT_TRUE(m_Handler.reports.empty()) << m_Handler.reports.front();
+    // Random bytes may look like an object, and be none that can be read.
+    EXPECT_THAT(m_Handler.reports, testing::Each(testing::HasSubstr("Unable to read symbols")));
     EXPECT_EQ(m_Host.openHandles(), 0u);
   }
 

@@ -329,7 +329,7 @@ TEST(SpecialRow, isHiddenUnlessEveryMaskMeetsTheTables) {
   EXPECT_THAT(specialReports(special, {"--hi."}), IsEmpty());
   special.restrictionMask = 2;
   EXPECT_THAT(specialReports(special, {"--hidden=1"}),
-              ElementsAre("fatal: Unrecognized option '--hidden=1'."));
+              ElementsAre("fatal: Unexpected argument for option '--hidden'"));
   special.restrictionMask = 3;
   EXPECT_THAT(specialReports(special, {"--hinted"}), IsEmpty());
 }
