@@ -74,29 +74,34 @@ TEST_F(SectionTest, IsPlainOnlyForTypesWithoutAClass) {
 }
 
 TEST_F(SectionTest, JoinsTheListOfItsType) {
-  const auto isIn = [](const auto& list, const Section* section) {
-    return std::find(list.begin(), list.end(), section) != list.end();
-  };
-  EXPECT_TRUE(isIn(module.getStringTableSections(), module.createStringTableSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getStringTableSections(), module.createStringTableSection("b", 0)));
-  EXPECT_EQ(module.getStringTableSections().size(), 2u);
-  EXPECT_TRUE(
-      isIn(module.getSymtabSections(), module.createSymbolTableSection("a", SHT_SYMTAB, 0)));
-  EXPECT_TRUE(
-      isIn(module.getDynsymSections(), module.createSymbolTableSection("a", SHT_DYNSYM, 0)));
-  EXPECT_EQ(module.getSymtabSections().size(), 1u);
-  EXPECT_EQ(module.getDynsymSections().size(), 1u);
-  EXPECT_TRUE(isIn(module.getGroupSections(), module.createGroupSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getHashSections(), module.createHashSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getShndxSections(), module.createShndxSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getPreemptionMapSections(), module.createPreemptionMapSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getVerdefSections(), module.createVerdefSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getVerneedSections(), module.createVerneedSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getVersymSections(), module.createVersymSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getDynamicSections(), module.createDynamicSection("a", 0)));
-  EXPECT_TRUE(isIn(module.getDebugOverlaySections(), module.createDebugOverlaySection("a", 0)));
-  EXPECT_TRUE(
-      isIn(module.getBuildAttributesSections(), module.createBuildAttributesSection("a", 0)));
+  StringTableSection* strings = module.createStringTableSection("a", 0);
+  StringTableSection* moreStrings = module.createStringTableSection("b", 0);
+  EXPECT_THAT(elements(module.getStringTableSections()),
+              testing::ElementsAre(strings, moreStrings));
+  SymbolTableSection* symtab = module.createSymbolTableSection("a", SHT_SYMTAB, 0);
+  SymbolTableSection* dynsym = module.createSymbolTableSection("a", SHT_DYNSYM, 0);
+  EXPECT_THAT(elements(module.getSymtabSections()), testing::ElementsAre(symtab));
+  EXPECT_THAT(elements(module.getDynsymSections()), testing::ElementsAre(dynsym));
+  GroupSection* group = module.createGroupSection("a", 0);
+  EXPECT_THAT(elements(module.getGroupSections()), testing::ElementsAre(group));
+  HashSection* hash = module.createHashSection("a", 0);
+  EXPECT_THAT(elements(module.getHashSections()), testing::ElementsAre(hash));
+  ShndxSection* shndx = module.createShndxSection("a", 0);
+  EXPECT_THAT(elements(module.getShndxSections()), testing::ElementsAre(shndx));
+  PreemptionMapSection* map = module.createPreemptionMapSection("a", 0);
+  EXPECT_THAT(elements(module.getPreemptionMapSections()), testing::ElementsAre(map));
+  VerdefSection* verdef = module.createVerdefSection("a", 0);
+  EXPECT_THAT(elements(module.getVerdefSections()), testing::ElementsAre(verdef));
+  VerneedSection* verneed = module.createVerneedSection("a", 0);
+  EXPECT_THAT(elements(module.getVerneedSections()), testing::ElementsAre(verneed));
+  VersymSection* versym = module.createVersymSection("a", 0);
+  EXPECT_THAT(elements(module.getVersymSections()), testing::ElementsAre(versym));
+  DynamicSection* dynamic = module.createDynamicSection("a", 0);
+  EXPECT_THAT(elements(module.getDynamicSections()), testing::ElementsAre(dynamic));
+  DebugOverlaySection* overlay = module.createDebugOverlaySection("a", 0);
+  EXPECT_THAT(elements(module.getDebugOverlaySections()), testing::ElementsAre(overlay));
+  BuildAttributesSection* attributes = module.createBuildAttributesSection("a", 0);
+  EXPECT_THAT(elements(module.getBuildAttributesSections()), testing::ElementsAre(attributes));
 }
 
 TEST_F(SectionTest, OnlyRelocationSectionsAreRelocationSections) {
