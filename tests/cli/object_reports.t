@@ -134,6 +134,9 @@ The program headers lie in the file, and so does every segment with bytes, neede
          912         80          0          0          0   x.o
   $ x; elf x.o phoff 2448; elf x.o phnum 65535; truncate -s $(( 2448 + 32 * 65535 )) x.o; refused
   Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': I/O error writing file 'x.o': Unknown error -1
+  $ x; elf x.o phoff 2448; elf x.o phnum 65534; truncate -s $(( 2448 + 32 * 65534 )) x.o; taken
+  10
+         912         80          0          0          0   x.o
   $ x; addSegment x.o 1 52 4096 4096 5; refused
   Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': I/O error writing file 'x.o': Unknown error -1
   $ x; addSegment x.o 4 0 2481 0 4; refused
@@ -650,6 +653,15 @@ Class 2 has wider rows and counts.
   Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': Relocation #0 in relocation section #3 refers to symbol #16 but its associated symbol table section #8 only contains 16 symbols
   $ x; patch x.o 18 0300; refused
   Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': ELF file has unsupported machine code 3 (we only handle EM_ZEV = 40)
+  $ overlay64() { x; row64 5 4 04000070; row64 5 24 "$(little 8 616 29)"; row64 5 56 "$(little 8 "$1")"; patch x.o 616 "$2"; }
+  $ cp "$QUARN_OBJECTS"/183-little/wide_plain.o whole.o
+  $ overlay64 12 "$(little 8 0)$(little 2 2 0)"; row64 3 32 "$(little 8 0)"; refused
+  Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': Record #0 in debug overlay section #5 refers to section #2 which is not a debug section
+  $ overlay64 16 "$(little 8 0)$(little 4 70000 0)"; row64 3 32 "$(little 8 0)"; refused
+  Warning: L6974W: 'lib.a': malformed archive: Unable to read symbols defined in archive member #2 'x.o': Record #0 in debug overlay section #5 refers to section #70000 which is not a section
+  $ overlay64 11 "$(little 8 -1 -1)"; row64 3 32 "$(little 8 0)"; taken
+  10
+         552          0          0          0          0   x.o
 
 The other byte order is turned.
 

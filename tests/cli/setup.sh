@@ -123,7 +123,10 @@ section() {
 # symbol FILE INDEX FIELD [NUMBER]: a field of a row of the first symbol table.
 symbol() {
   local table=0
-  while [ "$(section "$1" $table type)" != 2 ]; do table=$(( table + 1 )); done
+  while [ "$(section "$1" $table type)" != 2 ]; do
+    table=$(( table + 1 ))
+    if (( table == $(elf "$1" shnum) )); then echo "$1 has no symbol table"; return 1; fi
+  done
   field "$1" $(( $(section "$1" $table offset) + 16 * $2 )) "${symbolFields[$3]}" ${4:+"$4"}
 }
 
