@@ -3,6 +3,8 @@
 // The order of member names: byte by byte as unsigned values, with ASCII letters in lower case.
 #pragma once
 
+#include "support/interface/letters.h"
+
 #include <algorithm>
 #include <cstddef>
 #include <string_view>
@@ -10,8 +12,7 @@
 namespace arlib {
 
 constexpr unsigned char foldCase(char character) {
-  const auto byte = static_cast<unsigned char>(character);
-  return byte >= 'A' && byte <= 'Z' ? static_cast<unsigned char>(byte + ('a' - 'A')) : byte;
+  return static_cast<unsigned char>(support::lowered(character));
 }
 
 // Below, above or equal to 0.

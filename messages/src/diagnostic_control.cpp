@@ -3,26 +3,13 @@
 #include "messages/interface/diagnostic_control.h"
 
 #include "messages/src/message_state.h"
+#include "support/interface/letters.h"
 
 #include <algorithm>
 
 namespace messages {
 
 namespace {
-
-char lowerCase(char character) {
-  return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
-                                              : character;
-}
-
-bool isLetter(char character) {
-  return lowerCase(character) >= 'a' && lowerCase(character) <= 'z';
-}
-
-bool equalsIgnoringCase(std::string_view text, std::string_view lowerCaseWord) {
-  return std::equal(text.begin(), text.end(), lowerCaseWord.begin(), lowerCaseWord.end(),
-                    [](char left, char right) { return lowerCase(left) == right; });
-}
 
 // Reads up to the first character that is no digit, and stops growing at OverridableNumbers, so
 // that no number can wrap round into the table. 0 if there is no digit.
@@ -60,10 +47,12 @@ bool overrideNumber(std::string_view digits, uint32_t target, std::string_view t
 bool applyDiagnosticOption(uint32_t severityWord, std::string_view text) {
   const uint32_t target = severityOf(severityWord);
   if (text.empty()) return false;
-  if (equalsIgnoringCase(text, "warning")) return moveWholeSeverity(Severity_Warning, target, text);
-  if (equalsIgnoringCase(text, "error")) return moveWholeSeverity(Severity_Error, target, text);
-  if (!isLetter(text.front())) return overrideNumber(text, target, text);
-  if (lowerCase(text.front()) != lowerCase(CodeLetter)) return false;
+  if (support::equalIgnoringCase(text, "warning"))
+    return moveWholeSeverity(Severity_Warning, target, text);
+  if (support::equalIgnoringCase(text, "error"))
+    return moveWholeSeverity(Severity_Error, target, text);
+  if (!support::isLetter(text.front())) return overrideNumber(text, target, text);
+  if (support::lowered(text.front()) != support::lowered(CodeLetter)) return false;
   return overrideNumber(text.substr(1), target, text);
 }
 

@@ -4,18 +4,15 @@
 // many stars costs at most its length times that of the text.
 #include "support/interface/pattern.h"
 
+#include "support/interface/letters.h"
+
 namespace support {
 
 namespace {
 
-char lowerCase(char character) {
-  return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
-                                              : character;
-}
-
 bool characterFits(char wanted, char character, bool caseSensitive) {
   if (wanted == '?' || wanted == character) return true;
-  return !caseSensitive && lowerCase(wanted) == lowerCase(character);
+  return !caseSensitive && lowered(wanted) == lowered(character);
 }
 
 } // namespace

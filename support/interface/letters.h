@@ -1,12 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
-// What counts as a letter and as white space in command lines, whatever the locale: bytes above
-// 127 are plain characters.
+//
+// What counts as a letter and as white space, whatever the locale: bytes above 127 are plain
+// characters.
 #pragma once
 
 #include <cstddef>
 #include <string_view>
 
-namespace tabledrivenparser {
+namespace support {
 
 constexpr char lowered(char character) {
   return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
@@ -30,4 +31,4 @@ constexpr bool equalIgnoringCase(std::string_view left, std::string_view right) 
   return true;
 }
 
-} // namespace tabledrivenparser
+} // namespace support
