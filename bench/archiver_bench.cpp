@@ -5,6 +5,7 @@
 //
 //   archiver_bench QUARN [Google Benchmark's own flags]
 #include "bench/sample_library.h"
+#include "bench/sample_objects.h"
 
 #include <benchmark/benchmark.h>
 
@@ -100,26 +101,9 @@ void addCases(const Archiver& archiver, const bench::SampleFolder& folder, const
   addCase("write_again/" + what, archiver, makeCopy, joined(archiver, archiver.index, copy));
 }
 
-} // namespace
+using Archivers = std::vector<Archiver>;
 
-int main(int argc, char** argv) {
-  if (argc < 2) {
-    std::fprintf(stderr, "usage: %s QUARN [flags]\n", argv[0]);
-    return 2;
-  }
-  const std::vector<Archiver> archivers = {
-      {"quarn",
-       argv[1],
-       {"-t"},
-       {"--create", "--diag_suppress=warning"},
-       {"-r", "--diag_suppress=warning"},
-       {"-s"},
-       {"-d"}},
-      {"ar", "ar", {"t"}, {"rcD"}, {"rD"}, {"sD"}, {"dD"}},
-      {"llvm-ar", "llvm-ar", {"t"}, {"rcD"}, {"rD"}, {"sD"}, {"dD"}},
-  };
-  benchmark::Initialize(&argc, argv);
-  const bench::SampleFolder folder;
+void addLibrariesOfAnyFile(const Archivers& archivers, const bench::SampleFolder& folder) {
   const struct {
     const char* name;
     uint32_t count;
@@ -135,6 +119,52 @@ int main(int argc, char** argv) {
     for (const Archiver& archiver : archivers)
       addCases(archiver, folder, library.name, files);
   }
+}
+
+// Only quarn reports what is in the members.
+void addReports(const Archiver& quarn, const bench::SampleFolder& folder, const std::string& what) {
+  const std::string master = folder.path(what + "." + quarn.name + ".a");
+  for (const char* option : {"--sizes", "--entries", "--zs"})
+    addCase(option + ("/" + what), quarn, [] {}, {quarn.program, option, master});
+}
+
+void addLibrariesOfObjects(const Archivers& archivers, const bench::SampleFolder& folder) {
+  const bench::ObjectShape shapes[] = {
+      {"10000_small_objects", 10000, 1, 3, 64, 0},
+      {"300_objects_of_1000_to_3000_sections", 300, 1000, 3000, 16, 0},
+      {"1_object_of_20000_sections", 1, 20000, 20000, 16, 0},
+      {"200_objects_of_2_megabytes", 200, 1, 4, 500000, 100000},
+  };
+  for (const bench::ObjectShape& shape : shapes) {
+    const Words files = bench::makeObjects(folder, shape);
+    for (const Archiver& archiver : archivers)
+      addCases(archiver, folder, shape.name, files);
+    addReports(archivers.front(), folder, shape.name);
+  }
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+  if (argc < 2) {
+    std::fprintf(stderr, "usage: %s QUARN [flags]\n", argv[0]);
+    return 2;
+  }
+  const Archivers archivers = {
+      {"quarn",
+       argv[1],
+       {"-t"},
+       {"--create", "--diag_suppress=warning"},
+       {"-r", "--diag_suppress=warning"},
+       {"-s"},
+       {"-d"}},
+      {"ar", "ar", {"t"}, {"rcD"}, {"rD"}, {"sD"}, {"dD"}},
+      {"llvm-ar", "llvm-ar", {"t"}, {"rcD"}, {"rD"}, {"sD"}, {"dD"}},
+  };
+  benchmark::Initialize(&argc, argv);
+  const bench::SampleFolder folder;
+  addLibrariesOfAnyFile(archivers, folder);
+  addLibrariesOfObjects(archivers, folder);
   benchmark::RunSpecifiedBenchmarks();
   return 0;
 }
