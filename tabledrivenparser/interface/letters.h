@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+// What counts as a letter and as white space in command lines, whatever the locale: bytes above
+// 127 are plain characters.
+#pragma once
+
+#include <cstddef>
+#include <string_view>
+
+namespace tabledrivenparser {
+
+constexpr char lowered(char character) {
+  return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
+                                              : character;
+}
+
+constexpr bool isLetter(char character) {
+  return lowered(character) >= 'a' && lowered(character) <= 'z';
+}
+
+// Blank, tab, line feed, vertical tab, form feed, carriage return.
+constexpr bool isWhiteSpace(char character) {
+  return character == ' ' || (character >= '\t' && character <= '\r');
+}
+
+constexpr bool equalIgnoringCase(std::string_view left, std::string_view right) {
+  if (left.size() != right.size()) return false;
+  for (size_t at = 0; at < left.size(); ++at) {
+    if (lowered(left[at]) != lowered(right[at])) return false;
+  }
+  return true;
+}
+
+} // namespace tabledrivenparser
