@@ -2,6 +2,7 @@
 #include "quarn/arlib_error_handler.h"
 
 #include "arlib/interface/archive.h"
+#include "elfext/interface/attribute_relations.h"
 #include "messages/interface/catalogue.h"
 #include "quarn/reporting.h"
 
@@ -87,6 +88,29 @@ bool ArlibErrorHandler::reportUndecoratableDifference(const Archive&, const Arch
                 group.front()->getName());
   showGroup(group);
   return true;
+}
+
+bool ArlibErrorHandler::reportCommonAttributesClash(const Archive&, MinorVariantGroup group,
+                                                    const elfext::FullAttr& attributes) {
+  reportMessage(WarningWord, messages::CommonAttributesIncompatible, group.front()->getName());
+  showClashes(attributes);
+  return true;
+}
+
+bool ArlibErrorHandler::reportMemberAttributesClash(const Archive&, const ArchiveMember& member,
+                                                    const elfext::FullAttr& attributes) {
+  reportMessage(WarningWord, messages::MemberAttributesIncompatible, member.getName());
+  showClashes(attributes);
+  return true;
+}
+
+void ArlibErrorHandler::showClashes(const elfext::FullAttr& attributes) const {
+  if (!m_ShowDetails) return;
+  const std::string_view format = messages::messageText(messages::AttributeClash);
+  elfext::FullAttr remaining = attributes;
+  elfext::Clash clash;
+  while (elfext::takeClash(remaining, clash))
+    messages::reportFormat(RemarkWord, nullptr, format, clash.first, clash.second);
 }
 
 // The lines have a severity of their own, so that they also come when the warning is silenced.

@@ -37,8 +37,17 @@ public:
   bool reportUndecoratableDifference(const arlib::Archive& archive,
                                      const arlib::ArchiveMember& member,
                                      arlib::MinorVariantGroup group) override;
+  // What excludes each other in the attributes follows with -v. The library itself reports less of
+  // the same, through the base class's operations.
+  virtual bool reportCommonAttributesClash(const arlib::Archive& archive,
+                                           arlib::MinorVariantGroup group,
+                                           const elfext::FullAttr& attributes);
+  virtual bool reportMemberAttributesClash(const arlib::Archive& archive,
+                                           const arlib::ArchiveMember& member,
+                                           const elfext::FullAttr& attributes);
 
 private:
+  void showClashes(const elfext::FullAttr& attributes) const;
   void showGroup(arlib::MinorVariantGroup group) const;
 
   bool m_ShowDetails;

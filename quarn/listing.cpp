@@ -5,6 +5,7 @@
 
 #include "arlib/interface/archive_format.h"
 #include "checking/interface/checking.h"
+#include "elfext/interface/attribute_string.h"
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
 
@@ -57,6 +58,23 @@ private:
   bool m_IsLong;
 };
 
+// Attributes in their own order and spelling, whatever those of the table. Neighbours mostly have
+// the same ones.
+class AttributePrinter {
+public:
+  const std::string& print(const arlib::Symbol& symbol) {
+    if (m_Text.data() == nullptr || symbol.getAttributeText() != m_Text) {
+      m_Text = symbol.getAttributeText();
+      m_Printed = elfext::printAttributeString(symbol.getBuildAttributes());
+    }
+    return m_Printed;
+  }
+
+private:
+  std::string_view m_Text; // what was printed last
+  std::string m_Printed;
+};
+
 } // namespace
 
 void listMembers(Run& run) {
@@ -72,12 +90,13 @@ void listSymbolTable(Run& run) {
     reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.archiveName());
     return;
   }
+  AttributePrinter attributes;
   std::string shownName;
   for (const arlib::Symbol* symbol : run.archive.getSymbols()) {
     shownName = symbol->getName();
     if (symbol->hasBuildAttributes()) {
       shownName += arlib::AttributeMarker;
-      shownName += symbol->getAttributeText();
+      shownName += attributes.print(*symbol);
     }
     const ArchiveMember* member = symbol->getDefiningMember();
     messages::listingMessage(messages::ListedSymbol, shownName, member->getName(),

@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "quarn/quarn_main.h"
+#include "elfext/interface/library_attribute_map.h"
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"
 #include "checking/interface/checking.h"
+#include "elfext/interface/library_attribute_map.h"
 #include "quarn/actions.h"
 #include "quarn/arlib_error_handler.h"
 #include "quarn/banner.h"
@@ -187,6 +189,18 @@ void runAction(Run& run, const char* archiveName) {
   writeArchive(run);
 }
 
+// A map says by a library's name what all of its members may need. One that can't be read gives way
+// to the built-in one.
+void setLibraryAttributes(arlib::Archive& archive, const char* archiveName, const char* mapName) {
+  if (mapName == nullptr) return;
+  bool usedDefault = false;
+  const elfext::LibraryAttributeMap map =
+      elfext::readLibraryAttributeMap(archive.getHost(), mapName, usedDefault);
+  elfext::FullAttr attributes = elfext::LibraryFullAttr;
+  elfext::getLibraryAttributes(attributes, archiveName, map);
+  archive.setLibraryAttributes(attributes);
+}
+
 } // namespace
 
 bool isMissing(const Run& run) {
@@ -214,6 +228,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
     archive.setIncludeDebugSymbols(settings.includeDebugSymbols);
     archive.setUniqueSymbolsOnly(settings.uniqueSymbolsOnly);
     archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
+    setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
     ArchiveOpenStatus openStatus;
     Run run = {archive, settings, openStatus};
     runAction(run, archiveName);

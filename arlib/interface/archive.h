@@ -14,6 +14,7 @@
 #include "arlib/interface/symbol.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/fast_array.h"
+#include "elfext/interface/full_attr.h"
 #include "support/interface/host.h"
 
 #include <cstdint>
@@ -28,6 +29,8 @@ class ErrorHandler;
 }
 
 namespace arlib {
+
+class KeptFile;
 
 enum class SymbolTableMode : uint32_t {
   Always = 0,    // keep a symbol table, even an empty one
@@ -61,6 +64,13 @@ public:
   [[nodiscard]] bool getUniqueSymbolsOnly() const { return m_UniqueSymbolsOnly; }
   void setUseObjectBuildAttributes(bool use) { m_UseObjectBuildAttributes = use; }
   [[nodiscard]] bool getUseObjectBuildAttributes() const { return m_UseObjectBuildAttributes; }
+
+  // What the library as a whole needs of its target; null for nothing. It stays when the archive is
+  // cleared. Set it before a read: it makes the symbol table stale, until one is read.
+  void setLibraryAttributes(const elfext::FullAttr& attributes);
+  [[nodiscard]] const elfext::FullAttr* getLibraryAttributes() const {
+    return m_LibraryAttributes ? &*m_LibraryAttributes : nullptr;
+  }
 
   // Only on an archive that may be written. Marks the symbol table as stale.
   void setSymbolTableMode(SymbolTableMode mode);
@@ -128,6 +138,10 @@ public:
 
   // All symbols of a name, in table order, letter case counting.
   bool findSymbols(std::string_view name, SymbolList& list);
+
+  // Of the symbols of a name those that fit code with the required attributes best: of the builds
+  // that need no more, the one that uses most. False if none fits.
+  bool findBestSymbols(std::string_view name, const elfext::FullAttr& required, SymbolList& list);
 
   // The symbols that the table as read ascribes to a member: in table order, or sorted by name. The
   // view holds until the archive changes.
@@ -205,6 +219,10 @@ private:
   bool m_IncludeDebugSymbols = false;
   bool m_UniqueSymbolsOnly = false;
   bool m_UseObjectBuildAttributes = false;
+  std::optional<elfext::FullAttr> m_LibraryAttributes;
+
+  // Set while a rebuild reads one object after the other.
+  KeptFile* m_ObjectFile = nullptr;
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
   elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;

@@ -11,6 +11,10 @@
 #include <span>
 #include <string>
 
+namespace elfext {
+struct FullAttr;
+}
+
 namespace arlib {
 
 class ArchiveMember;
@@ -63,6 +67,12 @@ public:
   // can't be read; `reason` then says why, or is empty if that has been reported already.
   virtual bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                               std::string& reason) const = 0;
+
+  // What the member needs of its target: as its decoration symbols say, or with
+  // `useObjectAttributes` what the object as a whole has. False if the object can't be read, or
+  // says nothing.
+  virtual bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
+                                  bool useObjectAttributes) const = 0;
 };
 
 class ElfImageArchiveMemberType final : public ObjectModuleArchiveMemberType {
@@ -71,6 +81,8 @@ public:
   [[nodiscard]] bool isElfImage(const ArchiveMember* archiveMember) const override;
   bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                       std::string& reason) const override;
+  bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
+                          bool useObjectAttributes) const override;
 };
 
 } // namespace arlib

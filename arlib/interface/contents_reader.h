@@ -6,22 +6,20 @@
 #pragma once
 
 #include "arlib/interface/archive.h"
-#include "support/interface/host.h"
 
 #include <cstdint>
 #include <memory>
 #include <span>
-#include <string>
 
 namespace arlib {
 
+class KeptFile;
 class ReadWindow;
 
 class ContentsReader {
 public:
   // Failures are reported through the archive's handler.
   explicit ContentsReader(Archive& archive);
-  // Closes without a report what `finish` has not closed.
   ~ContentsReader();
   ContentsReader(const ContentsReader&) = delete;
   ContentsReader& operator=(const ContentsReader&) = delete;
@@ -33,7 +31,7 @@ public:
   // report.
   bool read(std::span<const uint8_t>& piece);
 
-  // Closes what is open. False after a report.
+  // Closes what is open. False after a report. Without it that is done too, but not reported.
   bool finish();
 
   // The host's error number of the last failure; 0 if a file ended too early.
@@ -48,9 +46,7 @@ private:
   bool failToRead(int error);
 
   Archive& m_Archive;
-  support::Host& m_Host;
-  support::FileHandle m_File;
-  std::string m_FileName; // of the open file
+  std::unique_ptr<KeptFile> m_File;
   std::unique_ptr<ReadWindow> m_Window;
   const uint8_t* m_Memory = nullptr; // the rest of a member that is in memory
   uint64_t m_Offset = 0;             // of the rest of a member that is on disk

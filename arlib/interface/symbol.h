@@ -4,6 +4,7 @@
 #pragma once
 
 #include "checking/interface/checking.h"
+#include "elfext/interface/attribute_string.h"
 
 #include <string_view>
 
@@ -30,8 +31,12 @@ public:
   // Whether the entry stands for a build of a module that is not the base one.
   [[nodiscard]] bool hasBuildAttributes() const { return m_AttributeText.data() != nullptr; }
 
-  // The text of the attribute set, as it stands in the table.
+  // The text of the attributes, as it stands in the table.
   [[nodiscard]] std::string_view getAttributeText() const { return m_AttributeText; }
+  // What it says; for an entry without a text, what the empty one says.
+  [[nodiscard]] elfext::FullAttr getBuildAttributes() const {
+    return elfext::parseAttributeString(m_AttributeText);
+  }
 
   [[nodiscard]] const Archive* getArchive() const { return m_Archive; }
   [[nodiscard]] ArchiveMember* getDefiningMember() const { return m_DefiningMember; }

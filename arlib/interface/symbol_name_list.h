@@ -24,9 +24,14 @@ public:
     QUARN_ASSERT(1, name != NULL);
     add(std::string_view(name));
   }
-  void add(std::string_view name) {
-    m_Names.append(std::string_view(alloclib::copyString(*m_Region, name), name.size()));
+  void add(std::string_view name) { m_Names.append(copy(name)); }
+
+  // The same in two steps, for names that share a copy: a text of as long a life as the list, and a
+  // name that is a part of one.
+  [[nodiscard]] std::string_view copy(std::string_view text) {
+    return {alloclib::copyString(*m_Region, text), text.size()};
   }
+  void addCopied(std::string_view name) { m_Names.append(name); }
 
   [[nodiscard]] uint32_t getSize() const { return m_Names.getSize(); }
   [[nodiscard]] std::string_view operator[](uint32_t index) const { return m_Names[index]; }

@@ -61,6 +61,11 @@ const char* Archive::copyToRegion(std::string_view text) {
   return alloclib::copyString(*m_ObjectRegion, text);
 }
 
+void Archive::setLibraryAttributes(const elfext::FullAttr& attributes) {
+  m_LibraryAttributes = attributes;
+  m_SymbolTableUpToDate = false;
+}
+
 void Archive::setSymbolTableMode(SymbolTableMode mode) {
   QUARN_ASSERT(1, !isReadOnly());
   m_SymbolTableMode = mode;

@@ -3,6 +3,8 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
+#include "arlib/src/kept_file.h"
+#include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/read_elf_file.h"
 
@@ -223,8 +225,17 @@ bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t off
 
 bool ArchiveMember::readInto(elfext::ObjectModule& module,
                              elfext::DeferredContentsSelector* selector) const {
-  return elfext::readElfFile(m_Archive->getHost(), m_ContentsLocation->fileName,
-                             m_ContentsLocation->offset, m_Size, module, selector);
+  const auto& [fileName, offset, isTemporary] = *m_ContentsLocation;
+  KeptFile* file = m_Archive->m_ObjectFile;
+  if (file == nullptr) {
+    return elfext::readElfFile(m_Archive->getHost(), fileName, offset, m_Size, module, selector);
+  }
+  if (const int error = file->turnTo(fileName); error != 0) {
+    elfext::ErrorHandler* handler = module.getErrorHandler();
+    return handler != nullptr && handler->ioErrorReading(module, error);
+  }
+  return elfext::readElfFile(m_Archive->getHost(), file->getFile(), offset, m_Size, module,
+                             selector);
 }
 
 bool ArchiveMember::readObjectModule(elfext::ObjectModule& module,

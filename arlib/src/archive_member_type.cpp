@@ -4,12 +4,21 @@
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_member.h"
 #include "checking/interface/checking.h"
+#include "elfext/interface/attribute_relations.h"
+#include "elfext/interface/attribute_string.h"
+#include "elfext/interface/build_attributes.h"
 #include "elfext/interface/debug_section_name.h"
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/format_recognizer.h"
 #include "elfext/interface/object_module.h"
+
+#include <algorithm>
+#include <cstring>
+#include <functional>
+#include <span>
+#include <vector>
 
 namespace arlib {
 
@@ -66,6 +75,67 @@ bool isPublished(const elfext::Symbol& symbol, bool includeDebugSymbols) {
   return symbol.getName() != nullptr && *symbol.getName() != '\0';
 }
 
+// Copies each text once for all names that are ends of it; all texts together are no longer than
+// the object.
+void addSharedNames(std::span<const char* const> published, SymbolNameList& names) {
+  std::vector<const char*> sorted(published.begin(), published.end());
+  std::sort(sorted.begin(), sorted.end(), std::less<>());
+  // By place. A name that starts within the text before it, or at its end, is an end of that.
+  std::vector<std::string_view> texts;
+  std::vector<std::string_view> copies;
+  for (const char* name : sorted) {
+    if (!texts.empty() && !std::less<>()(texts.back().data() + texts.back().size(), name)) continue;
+    texts.emplace_back(name);
+    copies.push_back(names.copy(texts.back()));
+  }
+  const auto startsBehind = [](const char* name, std::string_view text) {
+    return std::less<>()(name, text.data());
+  };
+  for (const char* name : published) {
+    const auto next = std::upper_bound(texts.begin(), texts.end(), name, startsBehind);
+    const size_t index = static_cast<size_t>(next - texts.begin()) - 1;
+    names.addCopied(copies[index].substr(static_cast<size_t>(name - texts[index].data())));
+  }
+}
+
+// Names that are more bytes than their object has in all must have bytes in common.
+void addNames(std::span<const char* const> published, uint64_t objectSize, SymbolNameList& names) {
+  uint64_t bytes = 0;
+  for (const char* name : published) {
+    const std::string_view text = name;
+    bytes += text.size();
+    if (bytes > objectSize) {
+      names.clear();
+      return addSharedNames(published, names);
+    }
+    names.add(text);
+  }
+}
+
+// All that the object's decoration symbols say, whatever else the symbols are. False if there are
+// none. Texts of a good object are no longer than the object; of those that share their bytes
+// thousands of times over, only the first ones are read.
+bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
+                      elfext::FullAttr& attributes) {
+  constexpr std::string_view Prefix = elfext::DecorationPrefix;
+  uint64_t left = 4 * objectSize;
+  bool isFirst = true;
+  for (const elfext::Symbol* symbol : module.getSymbols()) {
+    const char* name = symbol->getName();
+    if (name == nullptr || std::strncmp(name, Prefix.data(), Prefix.size()) != 0) continue;
+    const std::string_view text(name + Prefix.size(), strnlen(name + Prefix.size(), left + 1));
+    if (text.size() > left) break;
+    left -= text.size();
+    const elfext::FullAttr stated = elfext::parseAttributeString(text);
+    if (isFirst)
+      attributes = stated;
+    else
+      elfext::mergeFullAttr(attributes, attributes, stated);
+    isFirst = false;
+  }
+  return !isFirst;
+}
+
 } // namespace
 
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
@@ -85,9 +155,29 @@ bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, Sym
   archiveMember->discardContents();
   names.clear();
   const bool includeDebugSymbols = archiveMember->getArchive()->getIncludeDebugSymbols();
+  std::vector<const char*> published;
   for (const elfext::Symbol* symbol : module.getSymbols()) {
-    if (isPublished(*symbol, includeDebugSymbols)) names.add(symbol->getName());
+    if (isPublished(*symbol, includeDebugSymbols)) published.push_back(symbol->getName());
   }
+  addNames(published, archiveMember->getSize(), names);
+  return true;
+}
+
+bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
+                                                   elfext::FullAttr& attributes,
+                                                   bool useObjectAttributes) const {
+  QUARN_ASSERT(1, archiveMember != NULL);
+  elfext::ObjectModule module;
+  elfext::BySizeDeferredContentsSelector selector;
+  if (!archiveMember->flushContents()) return false;
+  module.setErrorHandler(archiveMember->getArchive()->getElfextErrorHandler());
+  if (!archiveMember->readInto(module, &selector)) return false;
+  archiveMember->discardContents();
+  if (!useObjectAttributes) return mergeDecorations(module, archiveMember->getSize(), attributes);
+  elfext::BuildAttributes ofModule;
+  if (const elfext::BuildAttributes* own = module.getOwnBuildAttributes(); own != nullptr)
+    ofModule = *own;
+  attributes = ofModule.getFullAttr();
   return true;
 }
 

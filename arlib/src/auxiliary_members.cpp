@@ -2,6 +2,7 @@
 #include "arlib/src/auxiliary_members.h"
 
 #include "arlib/interface/archive_format.h"
+#include "arlib/src/kept_file.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -20,6 +21,21 @@ bool hasLongName(const ArchiveMember* member) {
 }
 
 } // namespace
+
+// While it lasts, objects of the archive are read through one open file as far as they are in one.
+class AuxiliaryMembers::ObjectFileScope {
+public:
+  explicit ObjectFileScope(Archive& archive) : m_Archive(archive), m_File(archive.getHost()) {
+    m_Archive.m_ObjectFile = &m_File;
+  }
+  ~ObjectFileScope() { m_Archive.m_ObjectFile = nullptr; }
+  ObjectFileScope(const ObjectFileScope&) = delete;
+  ObjectFileScope& operator=(const ObjectFileScope&) = delete;
+
+private:
+  Archive& m_Archive;
+  KeptFile m_File;
+};
 
 bool Archive::updateAuxiliaryMembers() {
   return AuxiliaryMembers(*this).update();
@@ -142,6 +158,7 @@ bool AuxiliaryMembers::updateSymbolTable() {
     removeSymbolTable();
     return true;
   }
+  const ObjectFileScope objectFile(m_Archive);
   collectSymbolHostingMembers();
   if (m_SymbolHostingMembers.getSize() == 0 &&
       m_Archive.m_SymbolTableMode == SymbolTableMode::IfSymbols) {
@@ -149,9 +166,9 @@ bool AuxiliaryMembers::updateSymbolTable() {
     return true;
   }
   m_Output.reserve(m_SymbolCount);
-  uint64_t tableSize = 4;
-  addPlainSymbols(tableSize);
-  return makeSymbolTable(tableSize);
+  if (!addVariantSymbols()) return false;
+  addPlainSymbols();
+  return makeSymbolTable(computeTableSize());
 }
 
 // A member that can't be read is told of and has no entries. A handler that says to stop there
@@ -173,16 +190,41 @@ void AuxiliaryMembers::collectSymbolHostingMembers() {
   }
 }
 
-void AuxiliaryMembers::addPlainSymbols(uint64_t& tableSize) {
+// They come before all others. A name of theirs may stand in the table more than once, also where
+// other names may not.
+bool AuxiliaryMembers::addVariantSymbols() {
+  m_IsMinorVariant.resize(m_SymbolHostingMembers.getSize());
+  MinorVariants variants(m_Archive, *m_Region);
+  std::vector<HostingMember> members;
+  for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.span())) {
+    members.clear();
+    for (const uint32_t index : group) {
+      m_IsMinorVariant[index] = true;
+      members.push_back(m_SymbolHostingMembers[index]);
+    }
+    if (!variants.addSymbols(members, m_Output)) return false;
+  }
+  return true;
+}
+
+void AuxiliaryMembers::addPlainSymbols() {
   std::unordered_set<std::string_view> seenNames;
-  for (const HostingMember& hosting : m_SymbolHostingMembers) {
+  for (uint32_t index = 0; index < m_SymbolHostingMembers.getSize(); ++index) {
+    if (m_IsMinorVariant[index]) continue;
+    const HostingMember& hosting = m_SymbolHostingMembers[index];
     for (uint32_t i = 0; i < hosting.names->getSize(); ++i) {
       const std::string_view name = (*hosting.names)[i];
       if (m_Archive.m_UniqueSymbolsOnly && !seenNames.insert(name).second) continue;
       m_Output.append({name, hosting.member});
-      tableSize += 4 + name.size() + 1;
     }
   }
+}
+
+uint64_t AuxiliaryMembers::computeTableSize() const {
+  uint64_t size = 4;
+  for (const SymbolTableEntry& entry : m_Output)
+    size += 4 + entry.name.size() + 1;
+  return size;
 }
 
 bool AuxiliaryMembers::makeSymbolTable(uint64_t tableSize) {
@@ -219,7 +261,7 @@ void AuxiliaryMembers::fillSymbolTable(std::span<uint8_t> bytes) const {
   putBigEndian32(bytes.data(), m_Output.getSize());
   size_t offsetPosition = 4;
   size_t symbolTablePosition = 4 + 4 * size_t{m_Output.getSize()};
-  for (const OutputEntry& entry : m_Output) {
+  for (const SymbolTableEntry& entry : m_Output) {
     putBigEndian32(bytes.data() + offsetPosition, entry.member->m_Offset);
     offsetPosition += 4;
     std::memcpy(bytes.data() + symbolTablePosition, entry.name.data(), entry.name.size());

@@ -7,12 +7,11 @@
 #include "alloclib/interface/region_objects.h"
 #include "arlib/interface/archive.h"
 #include "arlib/interface/symbol_name_list.h"
+#include "arlib/src/minor_variants.h"
 #include "elfext/interface/fast_array.h"
-#include "elfext/interface/fast_hash_set.h"
-#include "elfext/interface/fast_hash_table.h"
 
 #include <cstdint>
-#include <string_view>
+#include <vector>
 
 namespace arlib {
 
@@ -25,22 +24,15 @@ public:
   bool update();
 
 private:
-  // Entry i of the table to come: the text of its name, and the member that defines it.
-  struct OutputEntry {
-    std::string_view name;
-    const ArchiveMember* member;
-  };
-
-  struct HostingMember {
-    ArchiveMember* member;
-    SymbolNameList* names;
-  };
+  class ObjectFileScope;
 
   bool updateFileNameTable();
   bool updateSymbolTable();
   void removeSymbolTable();
   void collectSymbolHostingMembers();
-  void addPlainSymbols(uint64_t& tableSize);
+  bool addVariantSymbols();
+  void addPlainSymbols();
+  [[nodiscard]] uint64_t computeTableSize() const;
   bool makeSymbolTable(uint64_t tableSize);
   void computeMemberOffsets(uint64_t tableSize);
   void fillSymbolTable(std::span<uint8_t> bytes) const;
@@ -54,7 +46,9 @@ private:
   alloclib::RegionOwner m_Region;
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
   uint32_t m_SymbolCount = 0;
-  elfext::FastArray<OutputEntry> m_Output;
+  // By hosting member: whether it is in a group of minor variants.
+  std::vector<bool> m_IsMinorVariant;
+  elfext::FastArray<SymbolTableEntry> m_Output;
 };
 
 } // namespace arlib

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "arlib/interface/contents_reader.h"
 
+#include "arlib/src/kept_file.h"
 #include "arlib/src/read_window.h"
 
 #include <algorithm>
@@ -8,37 +9,28 @@
 namespace arlib {
 
 ContentsReader::ContentsReader(Archive& archive)
-    : m_Archive(archive), m_Host(archive.getHost()),
-      m_Window(std::make_unique<ReadWindow>(m_Host)) {}
+    : m_Archive(archive), m_File(std::make_unique<KeptFile>(archive.getHost())),
+      m_Window(std::make_unique<ReadWindow>(archive.getHost())) {}
 
-ContentsReader::~ContentsReader() {
-  if (m_File.isOpen()) [[maybe_unused]]
-    const int error = m_Host.close(m_File);
-}
+ContentsReader::~ContentsReader() = default;
 
 bool ContentsReader::finish() {
-  if (!m_File.isOpen()) return true;
-  m_Error = m_Host.close(m_File);
-  m_File = {};
+  m_Error = m_File->close();
   if (m_Error == 0) return true;
-  return m_Archive.fail(&ErrorHandler::reportCloseError, m_FileName.c_str(), m_Error);
+  return m_Archive.fail(&ErrorHandler::reportCloseError, m_File->getFileName(), m_Error);
 }
 
 bool ContentsReader::openFile(const char* fileName) {
-  if (m_File.isOpen() && m_FileName == fileName) return true;
+  if (m_File->isOpen(fileName)) return true;
   if (!finish()) return false;
-  m_FileName = fileName;
-  if (const int error = m_Host.openForReading(fileName, m_File); error != 0) {
-    m_File = {};
-    return failToRead(error);
-  }
-  m_Window->setFile(m_File);
+  if (const int error = m_File->open(fileName); error != 0) return failToRead(error);
+  m_Window->setFile(m_File->getFile());
   return true;
 }
 
 bool ContentsReader::failToRead(int error) {
   m_Error = error;
-  return m_Archive.fail(&ErrorHandler::reportReadError, m_FileName.c_str(), error);
+  return m_Archive.fail(&ErrorHandler::reportReadError, m_File->getFileName(), error);
 }
 
 bool ContentsReader::begin(const ArchiveMember& member) {

@@ -27,6 +27,7 @@
 #include "elfext/interface/symbol.h"
 #include "elfext/interface/symbol_list.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <memory>
@@ -34,6 +35,7 @@
 
 namespace elfext {
 
+class BuildAttributesCache;
 class BuildAttributesSection;
 class DebugOverlaySection;
 class DynamicSection;
@@ -240,6 +242,14 @@ public:
     m_AreAuxiliarySectionsUpToDate = areUpToDate;
   }
   [[nodiscard]] bool areSortedViewsUpToDate() const { return m_AreSortedViewsUpToDate; }
+  // Whether the attribute section's bytes say what the blocks and attributes of all objects do. Any
+  // change of these clears it.
+  [[nodiscard]] bool isBuildAttributesSectionUpToDate() const {
+    return m_IsBuildAttributesSectionUpToDate;
+  }
+  void setBuildAttributesSectionUpToDate(bool isUpToDate) {
+    m_IsBuildAttributesSectionUpToDate = isUpToDate;
+  }
 
   // No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
   [[nodiscard]] bool isEmpty() const;
@@ -250,6 +260,17 @@ public:
   // The checks that go beyond reading; problems go to the error handler. False at the first
   // answer not to go on.
   [[nodiscard]] bool validate();
+
+  // ---- Build attributes
+
+  [[nodiscard]] BuildAttributesCache& getBuildAttributesCache();
+  // The highest Tag_ZV_version of all objects' attributes; 0 for none.
+  [[nodiscard]] uint32_t getHighestTagsVersion() const { return m_HighestTagsVersion; }
+  void raiseHighestTagsVersion(uint32_t version) {
+    m_HighestTagsVersion = std::max(m_HighestTagsVersion, version);
+  }
+  // No object has attributes of its own any more; blocks stay.
+  void dropBuildAttributes();
 
   // ---- Sections
 
@@ -417,7 +438,7 @@ public:
   // The name, which may be null, is that of the group's section.
   Group* createGroup(const char* signature, const char* name, uint32_t flags);
   // The first comdat group of that signature; null if there is none.
-  [[nodiscard]] Group* findComdatGroup(const char* signature) const;
+  [[nodiscard]] Group* findComdatGroup(const char* signature);
 
   [[nodiscard]] uint32_t getSegmentCount() const { return m_Segments.getSize(); }
   [[nodiscard]] Segment* getSegment(uint32_t index) const { return m_Segments[index]; }
@@ -494,9 +515,7 @@ public:
   bool getFollowingSymbols(uint64_t address, uint32_t mask, SymbolList* symbols);
 
   [[nodiscard]] bool inheritsBuildAttributes() const override { return false; }
-  [[nodiscard]] const BuildAttributes* getInheritedBuildAttributes() const override {
-    return nullptr;
-  }
+  void getInheritedBuildAttributes(BuildAttributes& result) const override;
 
 private:
   friend class Group;
@@ -536,6 +555,7 @@ private:
   template <class Object, class... Arguments>
   Object* makeListed(FastArray<Object*>& list, Arguments... arguments);
   void noteComdatGroup(Group* group);
+  void noteComdatGroups();
 
   template <class Object>
   void move(FastArray<Object*>& list, Object* object, uint32_t index, uint32_t firstIndex);
@@ -549,6 +569,7 @@ private:
   void deleteOne(const Object* object);
   void clearDynamicData();
   void clearHeaderTables();
+  void clearBuildAttributes();
   void forgetPlacement();
 
   void updateSortedViews();
@@ -591,6 +612,10 @@ private:
   bool m_IndexesFrozen = false;
   bool m_AreAuxiliarySectionsUpToDate = false;
   bool m_AreSortedViewsUpToDate = true;
+  bool m_IsBuildAttributesSectionUpToDate = false;
+  uint32_t m_HighestTagsVersion = 0;
+  // Made when it is first asked for.
+  std::unique_ptr<BuildAttributesCache> m_BuildAttributesCache;
 
   ELFHeader m_ElfHeader;
   SectionHeaderTable m_SectionHeaderTable;
@@ -634,6 +659,8 @@ private:
   FastArray<Symbol*> m_SymbolsSortedByName;
   FastArray<Symbol*> m_DynamicSymbolsSortedByName;
   FastHashTable<Stringlett, Group*> m_MapSignaturesToComdatGroups;
+  // Groups that came after the last look into the map.
+  FastArray<Group*> m_UnnotedGroups;
 };
 
 } // namespace elfext

@@ -35,11 +35,12 @@ class ObjectModule;
 // Bytes in memory, which must outlive the module's contents: nothing of them is copied. The name
 // becomes the module's file name.
 [[nodiscard]] bool readElfFile(support::Host& host, const char* fileName,
-                               std::span<const uint8_t> readBuffer, ObjectModule& module,
+                               std::span<const uint8_t> bytes, ObjectModule& module,
                                DeferredContentsSelector* selector);
 
 // A whole open file. With deferred contents the module closes the file when the last of them is
-// loaded or dropped; without, it remains the caller's to close, after the module has been cleared.
+// loaded or dropped. Without, and after a failure, it remains the caller's to close, once the
+// module has been cleared.
 [[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile,
                                ObjectModule& module, DeferredContentsSelector* selector);
 

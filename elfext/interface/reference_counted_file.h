@@ -21,6 +21,8 @@ public:
   support::HostError release();
   // Closes the file now, whatever the count; nothing can be read any more.
   support::HostError close();
+  // Gives the file back to who opened it; nothing can be read any more.
+  void leaveFileOpen() { m_File = {}; }
 
   [[nodiscard]] uint32_t getCount() const { return m_Count; }
   [[nodiscard]] bool isOpen() const { return m_File.isOpen(); }

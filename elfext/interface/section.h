@@ -224,7 +224,7 @@ public:
   [[nodiscard]] virtual const RelocationSection* asRelocationSection() const { return nullptr; }
 
   [[nodiscard]] bool inheritsBuildAttributes() const override { return true; }
-  [[nodiscard]] const BuildAttributes* getInheritedBuildAttributes() const override;
+  void getInheritedBuildAttributes(BuildAttributes& result) const override;
 
   // The file offset is always a multiple of something; 16 in sh_addralign still means 4 here.
   void getAlignment(uint64_t* remainder, uint64_t* alignment) const override;
@@ -259,7 +259,9 @@ private:
   [[nodiscard]] LazyArray<Symbol*, 4>& getHostedList(bool isDynamic) {
     return isDynamic ? m_HostedDynamicSymbols : m_HostedSymbols;
   }
-  const HostedViews& getHostedViews();
+  HostedViews& getHostedViews();
+  const HostedViews& getHostedViewsByOffset();
+  const HostedViews& getHostedViewsByName();
 
   const char* m_Name = nullptr;
   uint64_t m_Address = 0;
@@ -274,7 +276,8 @@ private:
   bool m_IsAuxiliary;
   bool m_IsRelocatable;
   bool m_HasExternalContents = false;
-  bool m_AreHostedViewsUpToDate = true;
+  bool m_AreHostedByOffsetUpToDate = false;
+  bool m_AreHostedByNameUpToDate = false;
   bool m_AreRelocationsSorted = true;
   bool m_Goes = false;
   Buffer m_Contents;

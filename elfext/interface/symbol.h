@@ -92,6 +92,8 @@ public:
   [[nodiscard]] uint64_t getAbiValue() const;
   // Whether the name carries build attributes.
   [[nodiscard]] bool isBuildAttributesSymbol() const;
+  // Whether it does so from its start on, as that of any symbol but an absolute one must.
+  [[nodiscard]] bool startsAsBuildAttributes() const;
 
   void setName(const char* name);
   void setSize(uint64_t size);
@@ -123,7 +125,7 @@ public:
   void setAssociatedSymbol(Symbol* symbol);
 
   [[nodiscard]] bool inheritsBuildAttributes() const override { return true; }
-  [[nodiscard]] const BuildAttributes* getInheritedBuildAttributes() const override;
+  void getInheritedBuildAttributes(BuildAttributes& result) const override;
 
 private:
   friend class ObjectModule;

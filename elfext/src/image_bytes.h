@@ -45,8 +45,8 @@ public:
   // failure.
   [[nodiscard]] bool prepare();
 
-  // From now on the file is this object's to close.
-  void takeOverFile() { m_ClosesFile = true; }
+  // From now on the file is somebody else's to close.
+  void leaveFileOpen() { m_ClosesFile = false; }
   // Somebody else closes the file now: what was not read can't be had any more.
   void forgetFile() { m_File = {}; }
   // Closes the file if it is this object's to close; the host's answer.

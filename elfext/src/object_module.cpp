@@ -4,6 +4,7 @@
 #include "elfext/interface/object_module.h"
 
 #include "elfext/interface/auxiliary_sections.h"
+#include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/file_version_definition.h"
 #include "elfext/interface/group.h"
@@ -51,7 +52,8 @@ ObjectModule::ObjectModule()
       m_DynamicSymbolsSortedByAddress(&getContainerRegion()),
       m_SymbolsSortedByName(&getContainerRegion()),
       m_DynamicSymbolsSortedByName(&getContainerRegion()),
-      m_MapSignaturesToComdatGroups(&getContainerRegion()) {}
+      m_MapSignaturesToComdatGroups(&getContainerRegion()), m_UnnotedGroups(&getContainerRegion()) {
+}
 
 // Most modules have nothing that must end before their regions do; deferred contents hold a file
 // open.
@@ -202,6 +204,27 @@ void ObjectModule::materializeAllRelocations() {
     section->materializeRelocations();
 }
 
+// ---- Build attributes
+
+BuildAttributesCache& ObjectModule::getBuildAttributesCache() {
+  if (m_BuildAttributesCache == nullptr)
+    m_BuildAttributesCache = std::make_unique<BuildAttributesCache>();
+  return *m_BuildAttributesCache;
+}
+
+void ObjectModule::getInheritedBuildAttributes(BuildAttributes& result) const {
+  result = BuildAttributes();
+}
+
+void ObjectModule::dropBuildAttributes() {
+  setOwnBuildAttributes(nullptr);
+  for (Section* section : m_Sections)
+    section->setOwnBuildAttributes(nullptr);
+  for (Symbol* symbol : m_Symbols)
+    symbol->setOwnBuildAttributes(nullptr);
+  m_HighestTagsVersion = 0;
+}
+
 // ---- Deletion
 
 void ObjectModule::prune(const PruneCriterion& criterion) {
@@ -222,6 +245,7 @@ void ObjectModule::clear() {
   prune(Everything());
   clearDynamicData();
   clearHeaderTables();
+  clearBuildAttributes();
   m_ReadConditions = 0;
   m_ReadBuffer = nullptr;
   m_AreNamesInBuffer = false;
@@ -235,6 +259,13 @@ void ObjectModule::clearDynamicData() {
   m_DynamicFlagsExists = false;
   m_FileVersionDefinition = nullptr;
   m_DebugOverlayRecords.setSize(0);
+}
+
+void ObjectModule::clearBuildAttributes() {
+  forgetBuildAttributes();
+  m_HighestTagsVersion = 0;
+  m_IsBuildAttributesSectionUpToDate = false;
+  m_BuildAttributesCache.reset();
 }
 
 void ObjectModule::clearHeaderTables() {

@@ -277,7 +277,7 @@ Object* ObjectModule::makeListed(FastArray<Object*>& list, Arguments... argument
 Group* ObjectModule::createGroup(const char* signature, const char* name, uint32_t flags) {
   QUARN_ASSERT(1, signature != NULL);
   Group* group = makeListed(m_Groups, keepText(signature), keepText(name), flags);
-  noteComdatGroup(group);
+  m_UnnotedGroups.append(group);
   return group;
 }
 

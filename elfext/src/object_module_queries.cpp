@@ -97,8 +97,16 @@ bool ObjectModule::getFollowingSymbols(uint64_t address, uint32_t mask, SymbolLi
   return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
 }
 
-Group* ObjectModule::findComdatGroup(const char* signature) const {
+// Signatures may be long and all the same text: nobody should pay for them who does not ask.
+void ObjectModule::noteComdatGroups() {
+  for (Group* group : m_UnnotedGroups)
+    noteComdatGroup(group);
+  m_UnnotedGroups.setSize(0);
+}
+
+Group* ObjectModule::findComdatGroup(const char* signature) {
   QUARN_ASSERT(1, signature != NULL);
+  noteComdatGroups();
   Group* const* group = m_MapSignaturesToComdatGroups.find(Stringlett(signature));
   return group == nullptr ? nullptr : *group;
 }

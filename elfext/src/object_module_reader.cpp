@@ -71,7 +71,7 @@ bool readModule(ReadContext& context) {
   return createSections(context) && readContents(context) && readSectionNames(context) &&
          readLinks(context) && readSymbols(context) && readRelocations(context) &&
          readGroups(context) && placeRegions(context) && readDynamicSections(context) &&
-         readDebugOverlays(context) && readSegmentMaps(context);
+         readDebugOverlays(context) && readSegmentMaps(context) && readBuildAttributes(context);
 }
 
 } // namespace
@@ -124,9 +124,13 @@ const uint8_t* ReadContext::view(uint64_t offset, uint64_t size) {
 
 const uint8_t* ReadContext::viewSection(uint32_t section) {
   const SectionHeader& header = sectionHeaders[section];
+  const Section* holder = module.getSection(section);
   // The model gives zeros for bytes that it can't get; the read has to know.
-  if (hasFileBytes(header) && view(header.offset, header.size) == nullptr) return nullptr;
-  return module.getSection(section)->getBuffer().getContents();
+  if (hasFileBytes(header)) {
+    const uint8_t* bytes = view(header.offset, header.size);
+    if (bytes == nullptr || holder->isContentsDeferred()) return bytes;
+  }
+  return holder->getBuffer().getContents();
 }
 
 bool ReadContext::failRead() const {

@@ -59,7 +59,6 @@ struct ReadContext {
   std::vector<std::span<Symbol*>> symbols = {};
   // The first two sections that overlap in the file; none for all good files.
   std::optional<std::pair<uint32_t, uint32_t>> overlap = {};
-  bool hasBuildAttributesSymbol = false;
   bool hasSymbolTableSizeTag = false;
 
   [[nodiscard]] uint32_t sectionCount() const {
@@ -123,6 +122,8 @@ struct VersionCounts {
                                 bool& areVersionsRead);
 [[nodiscard]] bool readDebugOverlays(ReadContext& context);
 [[nodiscard]] bool readSegmentMaps(ReadContext& context);
+// From attribute sections, then from decoration symbols.
+[[nodiscard]] bool readBuildAttributes(ReadContext& context);
 [[nodiscard]] uint32_t computeReadConditions(const ReadContext& context);
 
 } // namespace elfext

@@ -7,6 +7,10 @@
 #include "elfext/src/object_module_reader.h"
 
 #include <algorithm>
+#include <cstring>
+#include <functional>
+#include <utility>
+#include <vector>
 
 namespace elfext {
 
@@ -40,9 +44,33 @@ bool isIncongruent(const ProgramHeader& header) {
   return header.align != 0 && (header.vaddr - header.offset) % header.align != 0;
 }
 
+// Absolute symbols are searched for it all over their names, of which there may be thousands that
+// are ends of one long text. Only the longest of these is searched.
+bool hasAbsoluteBuildAttributesSymbol(std::vector<const Symbol*> symbols) {
+  std::sort(symbols.begin(), symbols.end(), [](const Symbol* left, const Symbol* right) {
+    return std::less<>()(left->getName(), right->getName());
+  });
+  const char* searchedEnd = nullptr;
+  for (const Symbol* symbol : symbols) {
+    const char* name = symbol->getName();
+    if (name == nullptr) continue;
+    const bool isSearched = searchedEnd != nullptr && !std::less<>()(searchedEnd, name);
+    if (isSearched ? symbol->startsAsBuildAttributes() : symbol->isBuildAttributesSymbol())
+      return true;
+    if (!isSearched) searchedEnd = name + std::strlen(name);
+  }
+  return false;
+}
+
 bool hasBuildAttributesSymbol(const ObjectModule& module) {
-  return std::any_of(module.getSymbols().begin(), module.getSymbols().end(),
-                     [](const Symbol* symbol) { return symbol->isBuildAttributesSymbol(); });
+  std::vector<const Symbol*> absoluteSymbols;
+  for (const Symbol* symbol : module.getSymbols()) {
+    if (symbol->getCategory() == Symbol::Category_Absolute)
+      absoluteSymbols.push_back(symbol);
+    else if (symbol->startsAsBuildAttributes())
+      return true;
+  }
+  return hasAbsoluteBuildAttributesSymbol(std::move(absoluteSymbols));
 }
 
 uint32_t conditionsOfSegments(const ReadContext& context) {
@@ -51,7 +79,7 @@ uint32_t conditionsOfSegments(const ReadContext& context) {
   if (hasBuildAttributesSymbol(module)) conditions |= ReadCondition_HasBuildAttributesSymbol;
   if (!module.getBuildAttributesSections().empty())
     conditions |= ReadCondition_HasBuildAttributesSection;
-  if (module.getReadBuffer() == nullptr || !module.areNamesInBuffer())
+  if (module.getReadBuffer() == nullptr)
     conditions |= ReadCondition_HasCopiedStrings;
   if (context.hasSymbolTableSizeTag) conditions |= ReadCondition_HasSymbolTableSizeTag;
   if (std::any_of(context.programHeaders.begin(), context.programHeaders.end(), isIncongruent))

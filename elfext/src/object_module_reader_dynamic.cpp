@@ -130,7 +130,6 @@ private:
   bool readAt(uint32_t index, const MapPlace& place) {
     const SectionHeader& header = m_Context.sectionHeaders[index];
     if (!hasFileBytes(header)) return true;
-    if (m_Context.module.getSection(index)->isContentsDeferred()) return true;
     const uint8_t* bytes = m_Context.viewSection(index);
     const Section* dynamic = m_Context.module.getSection(place.dynamicSection);
     m_Strings = {};

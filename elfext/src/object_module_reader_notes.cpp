@@ -9,6 +9,8 @@
 
 #include <algorithm>
 #include <cstring>
+#include <span>
+#include <vector>
 
 namespace elfext {
 
@@ -70,26 +72,34 @@ uint64_t roundUpToWord(uint64_t size) {
   return (size + 3) & ~uint64_t{3};
 }
 
-// One word for each SHF_ALLOC section, in index order: the number of its segment. A word that is
-// missing counts as 0.
-bool readSegmentMap(ReadContext& context, uint32_t noteSection, const uint8_t* words,
-                    uint64_t count) {
-  uint32_t allocated = 0;
+// The indexes of the SHF_ALLOC sections. They are looked for once: there may be maps by the
+// thousand.
+std::vector<uint32_t> findAllocatedSections(const ReadContext& context) {
+  std::vector<uint32_t> sections;
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
-    if ((context.sectionHeaders[i].flags & SHF_ALLOC) == 0) continue;
-    const uint32_t segment =
-        allocated < count ? context.get<uint32_t>(words + uint64_t{allocated} * 4) : 0;
-    ++allocated;
-    if (segment < context.segmentCount())
-      context.module.getSection(i)->setSegment(context.module.getSegment(segment));
-    else if (!goOn(context.module, &ErrorHandler::segmentMapOutOfRange, noteSection, i, segment))
-      return false;
+    if ((context.sectionHeaders[i].flags & SHF_ALLOC) != 0) sections.push_back(i);
   }
-  return count == allocated ||
-         goOn(context.module, &ErrorHandler::segmentMapCountDiffers, noteSection, count, allocated);
+  return sections;
 }
 
-bool readNotes(ReadContext& context, uint32_t index) {
+// One word for each SHF_ALLOC section, in index order: the number of its segment. A word that is
+// missing counts as 0.
+bool readSegmentMap(ReadContext& context, uint32_t noteSection, std::span<const uint32_t> allocated,
+                    const uint8_t* words, uint64_t count) {
+  const auto sectionCount = static_cast<uint32_t>(allocated.size());
+  for (uint32_t i = 0; i < sectionCount; ++i) {
+    const uint32_t segment = i < count ? context.get<uint32_t>(words + uint64_t{i} * 4) : 0;
+    if (segment < context.segmentCount())
+      context.module.getSection(allocated[i])->setSegment(context.module.getSegment(segment));
+    else if (!goOn(context.module, &ErrorHandler::segmentMapOutOfRange, noteSection, allocated[i],
+                   segment))
+      return false;
+  }
+  return count == sectionCount || goOn(context.module, &ErrorHandler::segmentMapCountDiffers,
+                                       noteSection, count, sectionCount);
+}
+
+bool readNotes(ReadContext& context, uint32_t index, std::span<const uint32_t> allocated) {
   const uint64_t size = context.sectionHeaders[index].size;
   const uint8_t* bytes = context.viewSection(index);
   if (bytes == nullptr) return false;
@@ -104,7 +114,7 @@ bool readNotes(ReadContext& context, uint32_t index) {
     const uint64_t length = std::min<uint64_t>(descriptorSize, size - descriptor);
     const bool isSegmentMap = nameSize == sizeof SegmentMapOwner && type == SegmentMapNote &&
                               std::memcmp(name, SegmentMapOwner, nameSize) == 0;
-    if (isSegmentMap && !readSegmentMap(context, index, bytes + descriptor, length / 4))
+    if (isSegmentMap && !readSegmentMap(context, index, allocated, bytes + descriptor, length / 4))
       return false;
     const uint64_t padded = roundUpToWord(descriptorSize);
     if (padded > size - descriptor) return true;
@@ -123,10 +133,11 @@ bool readDebugOverlays(ReadContext& context) {
 }
 
 bool readSegmentMaps(ReadContext& context) {
+  const std::vector<uint32_t> allocated = findAllocatedSections(context);
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
     const bool hasNotes =
         context.typeOf(i) == SHT_NOTE && context.sectionHeaders[i].size >= SmallestNote;
-    if (hasNotes && !readNotes(context, i)) return false;
+    if (hasNotes && !readNotes(context, i, allocated)) return false;
   }
   return true;
 }

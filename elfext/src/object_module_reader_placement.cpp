@@ -123,40 +123,60 @@ bool takesRangeTest(const ReadContext& context, uint32_t segmentType) {
   }
 }
 
-bool isInFileRange(const SectionHeader& section, const ProgramHeader& segment) {
-  return section.offset >= segment.offset && section.offset - segment.offset <= segment.filesz &&
-         section.size <= segment.memsz;
-}
-
-bool isInMemoryRange(const SectionHeader& section, const ProgramHeader& segment) {
-  return section.addr >= segment.vaddr && section.addr - segment.vaddr <= segment.memsz &&
-         section.size <= segment.memsz - (section.addr - segment.vaddr);
-}
-
-bool isAtEnd(const SectionHeader& section, const ProgramHeader& segment) {
-  return section.offset >= segment.offset && section.offset - segment.offset == segment.filesz &&
-         segment.memsz >= segment.filesz && section.size <= segment.memsz - segment.filesz;
-}
-
-// The segment that a section without bytes in the file belongs to, or NoExtent.
-uint32_t findSegment(const ReadContext& context, const std::vector<bool>& takesRange,
-                     const SectionHeader& section) {
-  uint32_t candidate = NoExtent;
-  bool isCandidateRight = false;
-  for (uint32_t i = 0; i < context.segmentCount(); ++i) {
-    const ProgramHeader& segment = context.programHeaders[i];
-    if (!takesRange[i]) {
-      if (isAtEnd(section, segment)) return i;
-      continue;
+// Finds the segments of sections without bytes in the file. Each section has to be held against
+// each segment, and both may be many, so what counts of the segments stands close together.
+class SegmentFinder {
+public:
+  explicit SegmentFinder(const ReadContext& context) {
+    for (uint32_t i = 0; i < context.segmentCount(); ++i) {
+      const ProgramHeader& header = context.programHeaders[i];
+      const Place place = {header.offset, header.filesz, header.vaddr, header.memsz, i};
+      (takesRangeTest(context, header.type) ? m_RangePlaces : m_EndPlaces).push_back(place);
     }
-    if (isCandidateRight || !isInFileRange(section, segment)) continue;
-    const bool isInMemory = isInMemoryRange(section, segment);
-    if (candidate != NoExtent && !isInMemory) continue;
-    candidate = i;
-    isCandidateRight = isInMemory;
   }
-  return candidate;
-}
+
+  // NoExtent for a section of no segment.
+  [[nodiscard]] uint32_t find(const SectionHeader& section) const {
+    for (const Place& place : m_EndPlaces) {
+      if (isAtEnd(section, place)) return place.segment;
+    }
+    uint32_t candidate = NoExtent;
+    for (const Place& place : m_RangePlaces) {
+      if (!isInFileRange(section, place)) continue;
+      if (isInMemoryRange(section, place)) return place.segment;
+      if (candidate == NoExtent) candidate = place.segment;
+    }
+    return candidate;
+  }
+
+private:
+  struct Place {
+    uint64_t offset;
+    uint64_t filesz;
+    uint64_t vaddr;
+    uint64_t memsz;
+    uint32_t segment;
+  };
+
+  static bool isInFileRange(const SectionHeader& section, const Place& place) {
+    return section.offset >= place.offset && section.offset - place.offset <= place.filesz &&
+           section.size <= place.memsz;
+  }
+
+  static bool isInMemoryRange(const SectionHeader& section, const Place& place) {
+    return section.addr >= place.vaddr && section.addr - place.vaddr <= place.memsz &&
+           section.size <= place.memsz - (section.addr - place.vaddr);
+  }
+
+  static bool isAtEnd(const SectionHeader& section, const Place& place) {
+    return section.offset >= place.offset && section.offset - place.offset == place.filesz &&
+           place.memsz >= place.filesz && section.size <= place.memsz - place.filesz;
+  }
+
+  std::vector<Place> m_RangePlaces;
+  // Of segments that hold such sections only behind their bytes; they come first.
+  std::vector<Place> m_EndPlaces;
+};
 
 bool needsSegment(const SectionHeader& header) {
   return header.type == SHT_NOBITS ? header.size != 0 : header.type != SHT_NULL && header.size == 0;
@@ -164,13 +184,11 @@ bool needsSegment(const SectionHeader& header) {
 
 void tieSectionsWithoutBytes(ReadContext& context) {
   if (context.programHeaders.empty()) return;
-  std::vector<bool> takesRange;
-  for (const ProgramHeader& header : context.programHeaders)
-    takesRange.push_back(takesRangeTest(context, header.type));
+  const SegmentFinder finder(context);
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
     const SectionHeader& header = context.sectionHeaders[i];
     if (!needsSegment(header)) continue;
-    const uint32_t segment = findSegment(context, takesRange, header);
+    const uint32_t segment = finder.find(header);
     if (segment == NoExtent) continue;
     [[maybe_unused]] const bool ret =
         FileRegion::link(*context.module.getSegment(segment), *context.module.getSection(i),

@@ -117,11 +117,13 @@ bool mayBeDeferred(uint32_t type) {
   }
 }
 
-void deferSection(DeferralFile& deferral, Section& section, const SectionHeader& header) {
+void deferSection(ReadContext& context, Section& section, const SectionHeader& header) {
+  DeferralFile& deferral = *context.deferral;
   alloclib::RegionGeneral& region = section.getObjectModule()->getObjectRegion();
   if (deferral.shared == nullptr) {
     deferral.shared = alloclib::create<ReferenceCountedFile>(region, deferral.host, deferral.file);
     deferral.shared->addReference();
+    context.image.leaveFileOpen();
   }
   section.deferContents(alloclib::create<DeferredContents>(region, deferral.shared, true, header));
 }
@@ -172,7 +174,7 @@ bool readSectionBytes(ReadContext& context, uint32_t index, uint32_t loadSegment
     return mapLowLevelResult(context.module, LowLevelResult::OutsideImage);
   if (context.deferral != nullptr && mayBeDeferred(header.type) &&
       context.deferral->selector.isDeferred(*section, header.size))
-    deferSection(*context.deferral, *section, header);
+    deferSection(context, *section, header);
   else
     section->getBuffer().defer(context.image, header.offset, header.size);
   return true;

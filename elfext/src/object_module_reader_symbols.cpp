@@ -5,6 +5,7 @@
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/object_module_reader.h"
+#include "elfext/src/row_marks.h"
 #include "elfext/src/row_maximum.h"
 
 #include <limits>
@@ -154,8 +155,11 @@ public:
                                return getRow(bytes).shndx == SHN_XINDEX ? AlwaysSuspicious
                                                                         : suspicion(bytes);
                              }),
-        m_Indexes(image, 4,
-                  [this](const uint8_t* bytes) { return m_Context.get<uint32_t>(bytes); }) {}
+        m_UsesIndex(image, symbolRowSize(context.format.isWide),
+                    [this](const uint8_t* bytes) { return getRow(bytes).shndx == SHN_XINDEX; }),
+        m_IsBadIndex(image, 4, [this](const uint8_t* bytes) {
+          return m_Context.get<uint32_t>(bytes) >= m_Context.sectionCount();
+        }) {}
   OverlappingTables(const OverlappingTables&) = delete;
   OverlappingTables& operator=(const OverlappingTables&) = delete;
 
@@ -167,7 +171,7 @@ public:
     const uint32_t greatest = rows.find(first, table.rowCount - 1);
     if (greatest != 0 && greatest >= table.stringSize) return true;
     return table.indexes != nullptr &&
-           m_Indexes.find(indexOffset + 4, table.rowCount - 1) >= m_Context.sectionCount();
+           haveCommon(m_UsesIndex, first, m_IsBadIndex, indexOffset + 4, table.rowCount - 1);
   }
 
 private:
@@ -191,7 +195,8 @@ private:
   ReadContext& m_Context;
   RowMaximum m_Rows;
   RowMaximum m_RowsWithoutIndexes;
-  RowMaximum m_Indexes;
+  RowMarks m_UsesIndex;
+  RowMarks m_IsBadIndex;
 };
 
 bool openTable(ReadContext& context, uint32_t index, SymbolTable& table) {

@@ -153,6 +153,8 @@ void Pruner::sweepSymbols() {
 }
 
 void Pruner::sweepGroups() {
+  auto& noted = m_ObjectModule.m_MapSignaturesToComdatGroups;
+  const bool areAnyNoted = noted.getSize() != 0;
   for (Group* group : m_ObjectModule.m_Groups) {
     if (group->m_GroupSection != nullptr && group->m_GroupSection->m_Goes)
       group->m_GroupSection = nullptr;
@@ -160,9 +162,11 @@ void Pruner::sweepGroups() {
     if (!group->m_Goes) continue;
     for (Section* section : group->m_Members.span())
       section->m_Group = nullptr;
-    m_ObjectModule.m_MapSignaturesToComdatGroups.remove(Stringlett(group->m_Signature));
+    if (areAnyNoted) noted.remove(Stringlett(group->m_Signature));
   }
   sweepAndNumber(m_ObjectModule.m_Groups, 0);
+  sweep(m_ObjectModule.m_UnnotedGroups);
+  if (!areAnyNoted) return;
   // Another group of the same signature may be the first one now.
   for (Group* group : m_ObjectModule.m_Groups)
     m_ObjectModule.noteComdatGroup(group);

@@ -61,20 +61,18 @@ bool loadWhatIsNotDeferred(const ObjectModule& module, const ImageBytes& image) 
 }
 
 // A large file whose sections may be deferred. The first deferred section makes the record that
-// closes the file; a file without one is closed by whoever opened it.
+// closes the file from then on, in place of the image; a failed read leaves the caller's file open.
 bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, ObjectModule& module) {
-  auto image =
-      std::make_unique<ImageBytes>(deferral.host, deferral.file, 0, size, /*closesFile=*/false);
+  auto image = std::make_unique<ImageBytes>(deferral.host, deferral.file, 0, size, isOwnFile);
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
-  if (deferral.shared == nullptr) {
-    if (isRead && isOwnFile) bytes.takeOverFile();
-    if (!isRead && isOwnFile) static_cast<void>(deferral.host.close(deferral.file));
-    return isRead;
-  }
+  if (deferral.shared == nullptr) return isRead;
   if (isRead && !loadWhatIsNotDeferred(module, bytes))
     isRead = reportReadError(module, bytes.getHostError());
-  if (isRead) bytes.forgetFile();
+  if (isRead)
+    bytes.forgetFile();
+  else if (!isOwnFile)
+    deferral.shared->leaveFileOpen();
   const support::HostError error = deferral.shared->release();
   return error == 0 || !isRead ? isRead : reportReadError(module, error);
 }
@@ -117,11 +115,12 @@ bool readElfFile(support::Host& host, const char* fileName, uint64_t offset, uin
   return readOwnFile(host, file, offset, size, module);
 }
 
-bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> readBuffer,
+bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> bytes,
                  ObjectModule& module, DeferredContentsSelector*) {
-  QUARN_ASSERT(1, fileName != NULL && readBuffer.data() != NULL);
+  const uint8_t* readBuffer = bytes.data();
+  QUARN_ASSERT(1, fileName != NULL && readBuffer != NULL);
   module.setFileName(fileName);
-  return readImage(module, std::make_unique<ImageBytes>(readBuffer), nullptr, readBuffer.data());
+  return readImage(module, std::make_unique<ImageBytes>(bytes), nullptr, readBuffer);
 }
 
 bool readElfFile(support::Host& host, support::FileHandle elfFile, ObjectModule& module,

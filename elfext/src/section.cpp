@@ -129,8 +129,8 @@ bool Section::isInSegment(uint32_t* segmentIndex) {
   return false;
 }
 
-const BuildAttributes* Section::getInheritedBuildAttributes() const {
-  return m_ObjectModule->getBuildAttributesInForce();
+void Section::getInheritedBuildAttributes(BuildAttributes& result) const {
+  m_ObjectModule->getEffectiveBuildAttributes(result);
 }
 
 void Section::getAlignment(uint64_t* remainder, uint64_t* alignment) const {

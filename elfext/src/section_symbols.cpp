@@ -9,6 +9,7 @@
 #include "elfext/src/sorted_symbols.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace elfext {
 
@@ -47,7 +48,8 @@ void move(FastArray<Symbol*>& symbols, Symbol* symbol, uint32_t index) {
 } // namespace
 
 void Section::markHostedChanged() {
-  m_AreHostedViewsUpToDate = false;
+  m_AreHostedByOffsetUpToDate = false;
+  m_AreHostedByNameUpToDate = false;
 }
 
 uint32_t Section::getHostedSymbolIndex(const Symbol* symbol) const {
@@ -88,26 +90,36 @@ void Section::setHostedDynamicSymbolIndex(Symbol* symbol, uint32_t index) {
   markChanged();
 }
 
-const HostedViews& Section::getHostedViews() {
+HostedViews& Section::getHostedViews() {
   alloclib::RegionGeneral& region = m_ObjectModule->getContainerRegion();
   if (m_HostedViews == nullptr) m_HostedViews = alloclib::create<HostedViews>(region, &region);
-  HostedViews& views = *m_HostedViews;
-  if (m_AreHostedViewsUpToDate) return views;
+  return *m_HostedViews;
+}
+
+const HostedViews& Section::getHostedViewsByOffset() {
+  HostedViews& views = getHostedViews();
+  if (std::exchange(m_AreHostedByOffsetUpToDate, true)) return views;
   copy(m_HostedSymbols.span(), views.m_HostedSymbolsSortedByOffset);
   copy(m_HostedDynamicSymbols.span(), views.m_HostedDynamicSymbolsSortedByOffset);
-  copy(m_HostedSymbols.span(), views.m_HostedSymbolsSortedByName);
-  copy(m_HostedDynamicSymbols.span(), views.m_HostedDynamicSymbolsSortedByName);
   sortByKey(views.m_HostedSymbolsSortedByOffset.span(), getOffset);
   sortByKey(views.m_HostedDynamicSymbolsSortedByOffset.span(), getOffset);
+  return views;
+}
+
+// Apart from those by offset: long names that start alike take long to compare.
+const HostedViews& Section::getHostedViewsByName() {
+  HostedViews& views = getHostedViews();
+  if (std::exchange(m_AreHostedByNameUpToDate, true)) return views;
+  copy(m_HostedSymbols.span(), views.m_HostedSymbolsSortedByName);
+  copy(m_HostedDynamicSymbols.span(), views.m_HostedDynamicSymbolsSortedByName);
   sortByName(views.m_HostedSymbolsSortedByName.span());
   sortByName(views.m_HostedDynamicSymbolsSortedByName.span());
-  m_AreHostedViewsUpToDate = true;
   return views;
 }
 
 bool Section::getSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
   return collect(view, findRange(view, getOffset, fromOffset, toOffset), Symbol::Class_Mapping,
                  symbols);
 }
@@ -115,20 +127,20 @@ bool Section::getSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolLi
 bool Section::getDynamicSymbolsInRange(uint64_t fromOffset, uint64_t toOffset,
                                        SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedDynamicSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedDynamicSymbolsSortedByOffset.span();
   return collect(view, findRange(view, getOffset, fromOffset, toOffset), Symbol::Class_All,
                  symbols);
 }
 
 bool Section::getPrecedingSymbols(uint64_t offset, uint32_t mask, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
   return collect(view, findPreceding(view, getOffset, offset, mask), mask, symbols);
 }
 
 bool Section::getFollowingMappingSymbols(uint64_t offset, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
   return collect(view, findFollowing(view, getOffset, offset, Symbol::Class_Mapping),
                  Symbol::Class_Mapping, symbols);
 }
@@ -136,14 +148,14 @@ bool Section::getFollowingMappingSymbols(uint64_t offset, SymbolList* symbols) {
 bool Section::getSymbolsByName(const char* name, SymbolList* symbols) {
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedSymbolsSortedByName.span();
+  const SymbolView view = getHostedViewsByName().m_HostedSymbolsSortedByName.span();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 
 bool Section::getDynamicSymbolsByName(const char* name, SymbolList* symbols) {
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViews().m_HostedDynamicSymbolsSortedByName.span();
+  const SymbolView view = getHostedViewsByName().m_HostedDynamicSymbolsSortedByName.span();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 

@@ -40,12 +40,15 @@ uint64_t Symbol::getAbiValue() const {
 }
 
 bool Symbol::isBuildAttributesSymbol() const {
-  if (m_Name == nullptr) return false;
-  const std::string_view name = m_Name;
-  const bool isWhole = name.starts_with("BuildAttributes$");
-  if (m_Category == Category_Hosted) return isWhole;
-  if (m_Category != Category_Absolute) return false;
-  return isWhole || name.find("$$BuildAttributes$") != name.npos;
+  if (startsAsBuildAttributes()) return true;
+  return m_Category == Category_Absolute && m_Name != nullptr &&
+         std::strstr(m_Name, "$$BuildAttributes$") != nullptr;
+}
+
+bool Symbol::startsAsBuildAttributes() const {
+  constexpr std::string_view start = "BuildAttributes$";
+  if (m_Category != Category_Hosted && m_Category != Category_Absolute) return false;
+  return m_Name != nullptr && std::strncmp(m_Name, start.data(), start.size()) == 0;
 }
 
 void Symbol::markChanged() {
@@ -162,9 +165,11 @@ void Symbol::setAssociatedSymbol(Symbol* symbol) {
   m_AssociatedSymbol = symbol;
 }
 
-const BuildAttributes* Symbol::getInheritedBuildAttributes() const {
-  return m_Category == Category_Hosted ? m_Section->getBuildAttributesInForce()
-                                       : m_ObjectModule->getBuildAttributesInForce();
+void Symbol::getInheritedBuildAttributes(BuildAttributes& result) const {
+  if (m_Category == Category_Hosted)
+    m_Section->getEffectiveBuildAttributes(result);
+  else
+    m_ObjectModule->getEffectiveBuildAttributes(result);
 }
 
 } // namespace elfext

@@ -2,6 +2,7 @@
 //
 // The checks of how sections and segments lie in the file and in memory.
 #include "elfext/interface/elf_constants.h"
+#include "elfext/interface/hash_table.h"
 #include "elfext/interface/segment.h"
 #include "elfext/interface/sort.h"
 #include "elfext/src/go_on.h"
@@ -72,19 +73,26 @@ bool validateMemoryOrder(const ObjectModule& module, const Segments& loads) {
   return true;
 }
 
-bool shareMemory(const Segment& low, const Segment& high) {
-  return high.getMemorySize() != 0 &&
-         high.getVirtualAddress() - low.getVirtualAddress() < low.getMemorySize();
+// Whether something that starts so far behind the start of another also ends behind it.
+bool endsBehind(uint64_t distance, uint64_t size, uint64_t otherSize) {
+  return distance >= otherSize || size > otherSize - distance;
 }
 
+// Going up by address, it is enough to look at the segment that reaches farthest.
 bool validateMemoryOverlap(const ObjectModule& module, Segments loads) {
+  std::erase_if(loads, [](const Segment* load) { return load->getMemorySize() == 0; });
   std::stable_sort(loads.begin(), loads.end(), [](const Segment* left, const Segment* right) {
     return left->getVirtualAddress() < right->getVirtualAddress();
   });
-  for (size_t i = 1; i < loads.size(); ++i) {
-    if (!shareMemory(*loads[i - 1], *loads[i])) continue;
-    const auto [first, second] = std::minmax(loads[i - 1]->getIndex(), loads[i]->getIndex());
-    if (!goOn(module, &ErrorHandler::loadableSegmentsOverlap, first, second)) return false;
+  const Segment* farthest = nullptr;
+  for (const Segment* load : loads) {
+    if (farthest == nullptr) farthest = load;
+    const uint64_t distance = load->getVirtualAddress() - farthest->getVirtualAddress();
+    const auto [first, second] = std::minmax({farthest->getIndex(), load->getIndex()});
+    if (load != farthest && distance < farthest->getMemorySize() &&
+        !goOn(module, &ErrorHandler::loadableSegmentsOverlap, first, second))
+      return false;
+    if (endsBehind(distance, load->getMemorySize(), farthest->getMemorySize())) farthest = load;
   }
   return true;
 }
@@ -110,22 +118,28 @@ std::vector<PlacedSection> getPlacedSections(const ObjectModule& module) {
   return placed;
 }
 
+bool validateApart(const ObjectModule& module, Section& left, Section& right) {
+  if (!FileRegion::overlap(left, right, nullptr, nullptr, nullptr)) return true;
+  const auto [first, second] = std::minmax({left.getIndex(), right.getIndex()});
+  return goOn(module, &ErrorHandler::sectionsOverlap, first, second);
+}
+
 // Sections whose distance is fixed must not share bytes. Going up by place, it is enough to look
-// at the section that reaches farthest.
+// at the section of each tree that reaches farthest.
 bool validateSectionOverlap(const ObjectModule& module) {
   const std::vector<PlacedSection> placed = getPlacedSections(module);
-  const PlacedSection* farthest = nullptr;
+  HashTable<PlacementNode*, const PlacedSection*> farthestOfTree;
   for (const PlacedSection& record : placed) {
-    if (farthest != nullptr &&
-        FileRegion::overlap(*farthest->section, *record.section, nullptr, nullptr, nullptr)) {
-      const auto [first, second] =
-          std::minmax(farthest->section->getIndex(), record.section->getIndex());
-      if (!goOn(module, &ErrorHandler::sectionsOverlap, first, second)) return false;
+    uint64_t offsetInTree = 0;
+    PlacementNode* tree = record.section->getPlacement().find(&offsetInTree);
+    const PlacedSection** farthest = farthestOfTree.find(tree);
+    if (farthest == nullptr) {
+      farthestOfTree.put(tree, &record);
+      continue;
     }
-    const bool reachesFarther = farthest == nullptr ||
-                                record.offset - farthest->offset >= farthest->size ||
-                                record.size > farthest->size - (record.offset - farthest->offset);
-    if (reachesFarther) farthest = &record;
+    if (!validateApart(module, *(*farthest)->section, *record.section)) return false;
+    if (endsBehind(record.offset - (*farthest)->offset, record.size, (*farthest)->size))
+      *farthest = &record;
   }
   return true;
 }

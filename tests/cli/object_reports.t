@@ -499,7 +499,7 @@ may lie anywhere. (The 300 bytes that the second segment shares with the first a
   $ x; section x.o 6 type 8; section x.o 6 offset 52; section x.o 7 offset 60; taken
   10
          912         80          0          0          0   x.o
-  $ x; section x.o 6 offset 0; section x.o 8 offset 2100; addSegment x.o 1 0 100 100 4; addSegment x.o 1 50 300 300 4; taken
+  $ x; section x.o 6 offset 0; section x.o 8 type 1; section x.o 8 offset 2100; addSegment x.o 1 0 100 100 4; addSegment x.o 1 50 300 300 4; taken
   10
          912        380          0          0          0   x.o
 

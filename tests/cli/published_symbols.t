@@ -4,12 +4,6 @@ The symbol table names what the objects define.
   $ plain() { cp "$QUARN_EXAMPLES/$1"_plain.o .; }
   $ for name in matrix wide calendar; do plain $name; done
 
-published FILE: the names in the table, as they stand in the file. The count and the offsets are in front.
-
-  $ published() {
-  >   local size=$(head -c 66 "$1" | tail -c 10) count=$(od -A n -t u4 --endian=big -j 68 -N 4 "$1")
-  >   tail -c +$(( 73 + 4 * count )) "$1" | head -c $(( size - 4 - 4 * count )) | tr '\0\n' '\n~'
-  > }
   $ x() { cp wide_plain.o x.o; }
   $ names() { quarn --create "$@" x.a x.o || return; published x.a | sed 's/wide_//' | paste -s -d ' '; }
   $ x; names

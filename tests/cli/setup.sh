@@ -156,3 +156,25 @@ addSegment() {
   elf "$file" phoff "$end"
   elf "$file" phnum $(( count + 1 ))
 }
+
+# variant FILE [TEXT...]: an object that defines "gcd" alone, with these attribute texts in symbols of its own.
+variant() {
+  local file=$1 symbols=() text
+  shift
+  for text; do symbols+=(--add-symbol "BuildAttributes\$$text=0,local"); done
+  llvm-objcopy --keep-global-symbol=wide_gcd --redefine-sym wide_gcd=gcd --remove-section .ZEV.attributes \
+    --remove-section .ARM.attributes "${symbols[@]}" "$QUARN_EXAMPLES/wide_plain.o" "$file"
+}
+
+# published FILE: the names in the symbol table, as they stand in the file. The count and the offsets are in front.
+published() {
+  local size count
+  size=$(head -c 66 "$1" | tail -c 10)
+  count=$(od -A n -t u4 --endian=big -j 68 -N 4 "$1")
+  tail -c +$(( 73 + 4 * count )) "$1" | head -c $(( size - 4 - 4 * count )) | tr '\0\n' '\n~'
+}
+
+# listed FILE: what the tool says of the names and their members.
+listed() {
+  quarn --zs "$1" | awk '{ print $1, $3 }'
+}

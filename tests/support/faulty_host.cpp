@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/support/faulty_host.h"
 
+#include <csignal>
+
 namespace testsupport {
 
 using support::FileHandle;
@@ -11,6 +13,7 @@ HostError FaultyHost::fault(const char* operation, const std::string& name) {
   if (++m_Calls != m_FailingCall) return 0;
   m_FailedOperation = operation;
   m_FailedName = name;
+  if (m_FailingSignal != 0) std::raise(m_FailingSignal);
   return m_FailingError;
 }
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A host on which one call goes wrong: the k-th, counted over all operations that can fail. All
-// others go to the host behind it.
+// A host on which one call goes wrong: the k-th, counted over all operations that can fail. Or a
+// signal comes in front of it. All others go to the host behind it.
 #pragma once
 
 #include "support/interface/host.h"
@@ -21,7 +21,14 @@ public:
     m_FailingCall = number;
     m_FailingError = error;
     m_Calls = 0;
+    m_FailingSignal = 0;
     m_FailedOperation.clear();
+  }
+  // A signal comes when the call with this number is made, which then goes on as always if the
+  // process still lives. Counting starts anew.
+  void raiseAtCall(uint64_t number, int signal) {
+    failCall(number, 0);
+    m_FailingSignal = signal;
   }
 
   [[nodiscard]] uint64_t callCount() const { return m_Calls; }
@@ -60,6 +67,7 @@ private:
   support::Host& m_Host;
   uint64_t m_FailingCall = 0;
   support::HostError m_FailingError = 0;
+  int m_FailingSignal = 0;
   uint64_t m_Calls = 0;
   std::string m_FailedOperation;
   std::string m_FailedName;

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The tool on a host of which one call fails, told by the environment: QUARN_FAIL_CALL is the
-// number of the call from 1 (0 or unset: none), QUARN_FAIL_ERROR the error number it fails with.
+// number of the call from 1 (0 or unset: none), QUARN_FAIL_ERROR the error number it fails with, or
+// QUARN_FAIL_SIGNAL the signal that comes with it instead.
 // At exit the number of calls that were made is written to the file QUARN_CALL_COUNT.
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
@@ -35,8 +36,12 @@ void writeCallCount() {
 
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
-  faultyHost().failCall(numberFrom("QUARN_FAIL_CALL"),
-                        static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
+  const unsigned long call = numberFrom("QUARN_FAIL_CALL");
+  const auto signal = static_cast<int>(numberFrom("QUARN_FAIL_SIGNAL"));
+  if (signal != 0)
+    faultyHost().raiseAtCall(call, signal);
+  else
+    faultyHost().failCall(call, static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
   std::atexit(writeCallCount);
   quarn::startUp(argc, argv, faultyHost());
 }

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-// The tool with each of its host calls failing in turn: the old archive whole or the new one
-// complete, extracted files whole or absent, no temporary left, and an error told whenever what was
-// asked for was not done.
+// The tool with each of its host calls failing in turn, or interrupted by a signal: the old archive
+// whole or the new one complete, extracted files whole or absent, no temporary left, and an error
+// told whenever what was asked for was not done.
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
 #include "tests/systematic/tool_folder.h"
@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <cerrno>
+#include <csignal>
 #include <cstring>
 
 namespace testsupport {
@@ -65,14 +66,14 @@ using FaultInAReading = FaultInTheTool;
 TEST_P(FaultInAnEdit, KeepsTheOldArchiveOrMakesTheNewOne) {
   uint64_t calls = 0;
   fill();
-  ASSERT_EQ(m_Folder.runOnFaultyHost(GetParam(), 0, 0, calls).status, 0);
+  ASSERT_EQ(m_Folder.runOnFaultyHost(GetParam(), {}, calls).status, 0);
   const std::string newArchive = m_Folder.read("lib.a");
   const uint64_t needed = calls;
   ASSERT_GT(needed, 5u);
   for (uint64_t call = 1; call <= needed + 1; ++call) {
     SCOPED_TRACE("call " + std::to_string(call) + " of " + std::to_string(needed));
     fill();
-    const ToolRun run = m_Folder.runOnFaultyHost(GetParam(), call, EIO, calls);
+    const ToolRun run = m_Folder.runOnFaultyHost(GetParam(), {call, EIO}, calls);
     const std::string now = m_Folder.read("lib.a");
     EXPECT_THAT(m_Folder.leaves(), ElementsAre("a.o", "lib.a", "other.a"));
     if (run.status == 1) {
@@ -83,6 +84,33 @@ TEST_P(FaultInAnEdit, KeepsTheOldArchiveOrMakesTheNewOne) {
     EXPECT_EQ(run.status, 0) << run.errors;
     EXPECT_EQ(run.errors.find("Error: "), std::string::npos) << run.errors;
     if (now != newArchive) expectPlainFile(now, run.errors);
+  }
+}
+
+// A signal that can be caught leaves nothing behind; one that can't leaves at most the new archive
+// beside the old one.
+TEST_P(FaultInAnEdit, KeepsTheOldArchiveOrTheNewOneAtASignal) {
+  uint64_t needed = 0;
+  fill();
+  ASSERT_EQ(m_Folder.runOnFaultyHost(GetParam(), {}, needed).status, 0);
+  const std::string newArchive = m_Folder.read("lib.a");
+  for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE, SIGKILL}) {
+    bool isOldKept = false;
+    for (uint64_t call = 1; call <= needed; ++call) {
+      SCOPED_TRACE("signal " + std::to_string(signal) + " at call " + std::to_string(call) +
+                   " of " + std::to_string(needed));
+      fill();
+      uint64_t calls = 0;
+      const ToolRun run =
+          m_Folder.runOnFaultyHost(GetParam(), {.call = call, .signal = signal}, calls);
+      EXPECT_EQ(run.signal, signal);
+      const std::string now = m_Folder.read("lib.a");
+      isOldKept |= now == oldArchive();
+      EXPECT_TRUE(now == oldArchive() || now == newArchive);
+      if (signal == SIGKILL) m_Folder.removeAllBut({"a.o", "lib.a", "other.a"});
+      EXPECT_THAT(m_Folder.leaves(), ElementsAre("a.o", "lib.a", "other.a"));
+    }
+    EXPECT_TRUE(isOldKept);
   }
 }
 
@@ -99,7 +127,7 @@ TEST_P(FaultInAReading, LeavesTheArchiveAndOnlyWholeFiles) {
   uint64_t needed = 0;
   fill();
   m_Folder.removeAllBut({"lib.a"});
-  ASSERT_EQ(m_Folder.runOnFaultyHost(GetParam(), 0, 0, needed).status, 0);
+  ASSERT_EQ(m_Folder.runOnFaultyHost(GetParam(), {}, needed).status, 0);
   const Words wholeLeaves = m_Folder.leaves();
   ASSERT_GT(needed, 3u);
   for (uint64_t call = 1; call <= needed; ++call) {
@@ -107,7 +135,7 @@ TEST_P(FaultInAReading, LeavesTheArchiveAndOnlyWholeFiles) {
     fill();
     m_Folder.removeAllBut({"lib.a"});
     uint64_t calls = 0;
-    const ToolRun run = m_Folder.runOnFaultyHost(GetParam(), call, EIO, calls);
+    const ToolRun run = m_Folder.runOnFaultyHost(GetParam(), {call, EIO}, calls);
     EXPECT_EQ(m_Folder.read("lib.a"), oldArchive());
     EXPECT_TRUE(run.status == 0 || run.status == 1) << run.status;
     EXPECT_EQ(run.status == 1, run.errors.find("Error: ") != std::string::npos) << run.errors;

@@ -7,12 +7,14 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <fcntl.h>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -46,12 +48,23 @@ void redirect(int descriptor, const std::string& name) {
   close(file);
 }
 
+double secondsOf(const timeval& time) {
+  return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
+}
+
 std::vector<const char*> argumentsOf(const char* program, const std::vector<std::string>& words) {
   std::vector<const char*> arguments = {program};
   for (const std::string& word : words)
     arguments.push_back(word.c_str());
   arguments.push_back(nullptr);
   return arguments;
+}
+
+[[noreturn]] void startProgram(const char* program, const std::vector<std::string>& words) {
+  setenv("ASAN_OPTIONS", "detect_leaks=0", 1);
+  std::vector<const char*> arguments = argumentsOf("quarn", words);
+  execv(program, const_cast<char* const*>(arguments.data()));
+  _exit(98);
 }
 
 } // namespace
@@ -97,9 +110,14 @@ void ToolFolder::enter() const {
 
 ToolRun ToolFolder::collect(int process) const {
   int state = 0;
-  waitpid(process, &state, 0);
-  return {WIFEXITED(state) ? WEXITSTATUS(state) : -1, readWhole(m_Notes + "/out"),
-          readWhole(m_Notes + "/err")};
+  rusage usage = {};
+  wait4(process, &state, 0, &usage);
+  return {WIFEXITED(state) ? WEXITSTATUS(state) : -1,
+          WIFSIGNALED(state) ? WTERMSIG(state) : 0,
+          readWhole(m_Notes + "/out"),
+          readWhole(m_Notes + "/err"),
+          secondsOf(usage.ru_utime) + secondsOf(usage.ru_stime),
+          static_cast<uint64_t>(usage.ru_maxrss) * 1024};
 }
 
 ToolRun ToolFolder::run(const std::vector<std::string>& words) const {
@@ -114,20 +132,31 @@ ToolRun ToolFolder::run(const std::vector<std::string>& words) const {
   return collect(process);
 }
 
-ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, uint64_t failingCall,
-                                    int error, uint64_t& callCount) const {
-  const std::string countName = m_Notes + "/count";
+ToolRun ToolFolder::runProgram(const std::vector<std::string>& words) const {
   std::fflush(nullptr);
   const pid_t process = fork();
   if (process == 0) {
     enter();
-    setenv("ASAN_OPTIONS", "detect_leaks=0", 1);
-    setenv("QUARN_FAIL_CALL", std::to_string(failingCall).c_str(), 1);
-    setenv("QUARN_FAIL_ERROR", std::to_string(error).c_str(), 1);
+    startProgram(QUARN_PROGRAM, words);
+  }
+  return collect(process);
+}
+
+ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
+                                    uint64_t& callCount) const {
+  const std::string countName = m_Notes + "/count";
+  fs::remove(countName);
+  std::fflush(nullptr);
+  const pid_t process = fork();
+  if (process == 0) {
+    enter();
+    setenv("QUARN_FAIL_CALL", std::to_string(fault.call).c_str(), 1);
+    setenv("QUARN_FAIL_ERROR", std::to_string(fault.error).c_str(), 1);
+    setenv("QUARN_FAIL_SIGNAL", std::to_string(fault.signal).c_str(), 1);
+    // A signal that was ignored when the tests were started would stay so.
+    if (fault.signal != 0) std::signal(fault.signal, SIG_DFL);
     setenv("QUARN_CALL_COUNT", countName.c_str(), 1);
-    std::vector<const char*> arguments = argumentsOf("quarn", words);
-    execv(QUARN_ON_FAULTY_HOST, const_cast<char* const*>(arguments.data()));
-    _exit(98);
+    startProgram(QUARN_ON_FAULTY_HOST, words);
   }
   const ToolRun result = collect(process);
   callCount = std::strtoull(readWhole(countName).c_str(), nullptr, 10);

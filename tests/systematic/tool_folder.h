@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A folder on disk in which the tool is run. `run` runs the driver in a process of its own, made by
-// fork alone, so that thousands of runs take seconds; `runOnFaultyHost` starts the real program.
+// fork alone, so that thousands of runs take seconds; `runProgram` starts the real program, and
+// `runOnFaultyHost` the one with the faulty host.
 #pragma once
 
 #include <cstdint>
@@ -12,8 +13,18 @@ namespace testsupport {
 
 struct ToolRun {
   int status = -1; // exit status; -1 if a signal ended the process
+  int signal = 0;  // the one that did
   std::string output;
   std::string errors;
+  double seconds = 0;      // of the processor, the system's share included
+  uint64_t peakMemory = 0; // bytes; not below what this process has when it starts the other one
+};
+
+// What happens to a run on the faulty host.
+struct Fault {
+  uint64_t call = 0; // which of the host calls fails; 0: none
+  int error = 0;     // the error number it fails with
+  int signal = 0;    // if there is one, it comes with the call, which does not fail
 };
 
 class ToolFolder {
@@ -31,11 +42,13 @@ public:
 
   // The words behind the tool's name. A run that takes long is ended.
   [[nodiscard]] ToolRun run(const std::vector<std::string>& words) const;
+  // The same by the real program, as users start it.
+  [[nodiscard]] ToolRun runProgram(const std::vector<std::string>& words) const;
 
-  // The same with the host call of this number failing; 0: none. `callCount` becomes the number of
-  // calls that were made.
-  [[nodiscard]] ToolRun runOnFaultyHost(const std::vector<std::string>& words, uint64_t failingCall,
-                                        int error, uint64_t& callCount) const;
+  // The same with a fault. `callCount` becomes the number of calls that were made; 0 if a signal
+  // ended the process.
+  [[nodiscard]] ToolRun runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
+                                        uint64_t& callCount) const;
 
 private:
   [[nodiscard]] ToolRun collect(int process) const;

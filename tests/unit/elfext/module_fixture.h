@@ -5,6 +5,7 @@
 
 #include "alloclib/interface/process.h"
 #include "elfext/interface/auxiliary_sections.h"
+#include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
@@ -58,6 +59,18 @@ protected:
   }
   Symbol* makeUndefinedDynamic(const char* name) {
     return module.createUndefinedDynamicSymbol(name, 0, STT_NOTYPE, STB_GLOBAL, STV_DEFAULT);
+  }
+
+  // Of the module's cache.
+  const BuildAttributes* attributesWithArchitecture(uint32_t number) {
+    BuildAttributes attributes;
+    attributes.setNumericTag(Tag_CPU_arch, number);
+    return module.getBuildAttributesCache().getBuildAttributes(attributes);
+  }
+  static uint32_t inheritedArchitecture(const ObjectWithBuildAttributes& object) {
+    BuildAttributes inherited;
+    object.getInheritedBuildAttributes(inherited);
+    return inherited.getNumericTag(Tag_CPU_arch);
   }
 
   // Whether the change clears the flag of the auxiliary sections.

@@ -71,7 +71,9 @@ TEST_F(ObjectModuleTest, StartsEmpty) {
   EXPECT_EQ(module.getDynamicSymbolCount(), 0u);
   EXPECT_EQ(module.getSegmentCount(), 0u);
   EXPECT_EQ(module.getObjectModule(), &module);
-  EXPECT_EQ(module.getInheritedBuildAttributes(), nullptr);
+  BuildAttributes inherited;
+  module.getInheritedBuildAttributes(inherited);
+  EXPECT_TRUE(inherited == BuildAttributes());
 }
 
 TEST(ObjectModuleRegionsTest, AreTwoThatGoWithTheModule) {

@@ -427,18 +427,19 @@ TEST_F(SectionTest, ReadsExternalContentsAndDoesNotChangeThem) {
 }
 
 TEST_F(SectionTest, HasTheAttributesOfItsModuleUnlessItHasItsOwn) {
-  const auto* ofModule = reinterpret_cast<const BuildAttributes*>(&module);
   Section* section = makeSection();
-  const auto* itsOwn = reinterpret_cast<const BuildAttributes*>(section);
   EXPECT_FALSE(module.inheritsBuildAttributes());
   EXPECT_TRUE(section->inheritsBuildAttributes());
-  EXPECT_EQ(section->getBuildAttributesInForce(), nullptr);
-  module.setOwnBuildAttributes(ofModule);
-  EXPECT_EQ(section->getBuildAttributesInForce(), ofModule);
-  section->setOwnBuildAttributes(itsOwn);
-  EXPECT_EQ(section->getBuildAttributesInForce(), itsOwn);
-  EXPECT_EQ(section->getInheritedBuildAttributes(), ofModule);
-  EXPECT_EQ(section->getOwnBuildAttributes(), itsOwn);
+  BuildAttributes inForce;
+  section->getEffectiveBuildAttributes(inForce);
+  EXPECT_TRUE(inForce == BuildAttributes());
+  module.setOwnBuildAttributes(attributesWithArchitecture(4));
+  section->getEffectiveBuildAttributes(inForce);
+  EXPECT_EQ(inForce.getNumericTag(Tag_CPU_arch), 4u);
+  section->setOwnBuildAttributes(attributesWithArchitecture(10));
+  section->getEffectiveBuildAttributes(inForce);
+  EXPECT_EQ(inForce.getNumericTag(Tag_CPU_arch), 10u);
+  EXPECT_EQ(inheritedArchitecture(*section), 4u);
 }
 
 // ---- Groups

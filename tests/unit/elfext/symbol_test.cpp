@@ -366,14 +366,12 @@ TEST_F(SymbolTest, HasTheAttributesOfItsSectionOrModule) {
   Section* section = makeSection();
   Symbol* hosted = makeHosted("h", section);
   Symbol* absolute = makeAbsolute("a");
-  const auto* ofModule = reinterpret_cast<const BuildAttributes*>(&module);
-  const auto* ofSection = reinterpret_cast<const BuildAttributes*>(section);
-  module.setOwnBuildAttributes(ofModule);
+  module.setOwnBuildAttributes(attributesWithArchitecture(4));
   EXPECT_TRUE(hosted->inheritsBuildAttributes());
-  EXPECT_EQ(hosted->getInheritedBuildAttributes(), ofModule);
-  section->setOwnBuildAttributes(ofSection);
-  EXPECT_EQ(hosted->getInheritedBuildAttributes(), ofSection);
-  EXPECT_EQ(absolute->getInheritedBuildAttributes(), ofModule);
+  EXPECT_EQ(inheritedArchitecture(*hosted), 4u);
+  section->setOwnBuildAttributes(attributesWithArchitecture(10));
+  EXPECT_EQ(inheritedArchitecture(*hosted), 10u);
+  EXPECT_EQ(inheritedArchitecture(*absolute), 4u);
 }
 
 // ---- Classes by name

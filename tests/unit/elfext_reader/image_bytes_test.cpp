@@ -158,12 +158,12 @@ TEST_F(ImageBytesTest, ClosesWhatIsItsOwn) {
   EXPECT_EQ(m_Memory.openHandles(), 0U);
 }
 
-TEST_F(ImageBytesTest, MayTakeAFileOverOrForgetIt) {
+TEST_F(ImageBytesTest, MayLeaveAFileOpenOrForgetIt) {
   {
-    ImageBytes image(m_Host, open("abc"), 2, 3, false);
-    image.takeOverFile();
+    ImageBytes image(m_Host, open("abc"), 2, 3, true);
+    image.leaveFileOpen();
   }
-  EXPECT_EQ(m_Memory.openHandles(), 0U);
+  EXPECT_EQ(m_Memory.openHandles(), 1U);
   const support::FileHandle file = open(pattern(Large));
   ImageBytes image(m_Host, file, 2, Large, true);
   EXPECT_TRUE(image.prepare());
@@ -172,7 +172,7 @@ TEST_F(ImageBytesTest, MayTakeAFileOverOrForgetIt) {
   expectBytes(image, 0, 16);
   EXPECT_EQ(image.view(0x20000, 1), nullptr);
   EXPECT_EQ(image.closeFile(), 0);
-  EXPECT_EQ(m_Memory.openHandles(), 1U);
+  EXPECT_EQ(m_Memory.openHandles(), 2U);
 }
 
 } // namespace elfext

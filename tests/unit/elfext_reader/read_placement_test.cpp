@@ -468,7 +468,7 @@ TEST_F(ReadPlacementTest, ConditionsTellOfBuildAttributesInFilesWithSegments) {
   ObjectBuilder file = object();
   file.section(".symtab", SHT_SYMTAB).link(2).symbol({.name = "BuildAttributes$x", .section = 1});
   file.section(".strtab", SHT_STRTAB);
-  file.section(".attributes", SHT_ZEV_ATTRIBUTES);
+  file.section(".attributes", SHT_ZEV_ATTRIBUTES).bytes("A");
   const uint32_t both =
       ReadCondition_HasBuildAttributesSymbol | ReadCondition_HasBuildAttributesSection;
   EXPECT_EQ(readGood(file).module->getReadConditions() & both, 0U);

@@ -72,7 +72,7 @@ TEST_F(ReadSectionsTest, HaveTheClassOfTheirType) {
   file.section(".verdef", SHT_GNU_verdef);
   file.section(".verneed", SHT_GNU_verneed);
   file.section(".versym", SHT_GNU_versym);
-  file.section(".attributes", SHT_ZEV_ATTRIBUTES);
+  file.section(".attributes", SHT_ZEV_ATTRIBUTES).bytes("A");
   file.section(".overlay", SHT_ZEV_DEBUGOVERLAY);
   file.section(".exidx", SHT_ZEV_EXIDX);
   const ReadResult result = readGood(file);

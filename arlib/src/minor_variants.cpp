@@ -1,0 +1,178 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/src/minor_variants.h"
+
+#include "arlib/interface/archive_format.h"
+#include "elfext/interface/attribute_relations.h"
+#include "elfext/interface/attribute_string.h"
+
+#include <algorithm>
+#include <cstring>
+#include <functional>
+#include <map>
+#include <unordered_map>
+
+namespace arlib {
+
+namespace {
+
+// A few bytes of a name that tell most names apart, however long it is.
+uint64_t quickHash(std::string_view name) {
+  constexpr size_t EndSize = 32;
+  const std::string_view start = name.substr(0, EndSize);
+  const std::string_view end = name.substr(name.size() - std::min(name.size(), EndSize));
+  const std::hash<std::string_view> hash;
+  return (hash(start) * 31 + hash(end)) * 31 + name.size();
+}
+
+// What members with the same names agree in: many others don't, and need not be compared.
+struct NamesKey {
+  uint64_t hash = 0; // in no order
+  uint32_t count;
+  uint64_t size = 0; // of all names, in bytes
+
+  explicit NamesKey(const SymbolNameList& names) : count(names.getSize()) {
+    for (uint32_t i = 0; i < count; ++i) {
+      hash += quickHash(names[i]);
+      size += names[i].size();
+    }
+  }
+  bool operator==(const NamesKey&) const = default;
+};
+
+struct NamesKeyHash {
+  size_t operator()(const NamesKey& key) const { return key.hash ^ key.count; }
+};
+
+// Names of a good object are about as long as the object, at most. Those that share their bytes a
+// thousand times over are a trap for whoever compares them.
+bool isComparable(const HostingMember& hosting, const NamesKey& key) {
+  constexpr uint64_t LargestExcess = 4;
+  constexpr uint64_t AlwaysFine = 0x100000;
+  return key.size <= AlwaysFine || key.size / LargestExcess <= hosting.member->getSize();
+}
+
+using SortedNames = std::vector<std::string_view>;
+
+SortedNames sortedNames(const SymbolNameList& names) {
+  SortedNames sorted;
+  sorted.reserve(names.getSize());
+  for (uint32_t i = 0; i < names.getSize(); ++i)
+    sorted.push_back(names[i]);
+  std::sort(sorted.begin(), sorted.end());
+  return sorted;
+}
+
+// Adds the groups among members of one key.
+void splitByNames(std::span<const HostingMember> hostingMembers,
+                  const std::vector<uint32_t>& candidates, std::vector<VariantGroup>& groups) {
+  std::map<SortedNames, VariantGroup> byNames;
+  for (const uint32_t candidate : candidates)
+    byNames[sortedNames(*hostingMembers[candidate].names)].push_back(candidate);
+  for (auto& [names, group] : byNames) {
+    if (group.size() > 1) groups.push_back(std::move(group));
+  }
+}
+
+} // namespace
+
+std::vector<VariantGroup> findMinorVariants(std::span<const HostingMember> hostingMembers) {
+  std::unordered_map<NamesKey, std::vector<uint32_t>, NamesKeyHash> byKey;
+  for (uint32_t i = 0; i < hostingMembers.size(); ++i) {
+    const NamesKey key(*hostingMembers[i].names);
+    if (isComparable(hostingMembers[i], key)) byKey[key].push_back(i);
+  }
+  std::vector<VariantGroup> groups;
+  for (const auto& [key, candidates] : byKey) {
+    if (candidates.size() > 1) splitByNames(hostingMembers, candidates, groups);
+  }
+  std::sort(groups.begin(), groups.end(), [](const VariantGroup& left, const VariantGroup& right) {
+    return left.front() < right.front();
+  });
+  return groups;
+}
+
+bool MinorVariants::addSymbols(std::span<const HostingMember> group,
+                               elfext::FastArray<SymbolTableEntry>& output) {
+  m_Members.clear();
+  m_Attributes.clear();
+  for (const HostingMember& hosting : group) {
+    m_Members.push_back(hosting.member);
+    m_Attributes.push_back(attributesOf(hosting));
+  }
+  if (!findCommon()) return false;
+  std::vector<const ArchiveMember*> baseVariants;
+  std::string decoration;
+  for (size_t i = 0; i < group.size(); ++i) {
+    elfext::FullAttr& attributes = m_Attributes[i];
+    if (!addLibraryAttributes(*group[i].member, attributes)) return false;
+    decoration.clear();
+    if (elfext::isSameBuild(attributes, m_Common))
+      baseVariants.push_back(group[i].member);
+    else if (!decorate(*group[i].member, attributes, decoration))
+      return false;
+    publish(group[i], decoration, output);
+  }
+  return reportBases(baseVariants);
+}
+
+elfext::FullAttr MinorVariants::attributesOf(const HostingMember& hosting) const {
+  QUARN_ASSERT(1, hosting.member->getType()->isObjectModule());
+  const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(hosting.member->getType());
+  elfext::FullAttr attributes;
+  if (type->getBuildAttributes(hosting.member, attributes, m_Archive.getUseObjectBuildAttributes()))
+    return attributes;
+  return elfext::parseAttributeString("");
+}
+
+// What all members need, with what the library needs as a whole.
+bool MinorVariants::findCommon() {
+  m_Common = m_Attributes.front();
+  for (const elfext::FullAttr& attributes : m_Attributes)
+    m_Common = elfext::intersectFullAttr(m_Common, attributes);
+  const elfext::FullAttr* library = m_Archive.getLibraryAttributes();
+  if (library == nullptr || elfext::mergeFullAttr(m_Common, m_Common, *library)) return true;
+  return m_Archive.goOn(&ErrorHandler::reportCommonAttributesIncompatible, m_Members, m_Common);
+}
+
+bool MinorVariants::addLibraryAttributes(const ArchiveMember& member,
+                                         elfext::FullAttr& attributes) const {
+  const elfext::FullAttr* library = m_Archive.getLibraryAttributes();
+  if (library == nullptr || elfext::mergeFullAttr(attributes, attributes, *library)) return true;
+  return m_Archive.goOn(&ErrorHandler::reportMemberAttributesIncompatible, member, attributes);
+}
+
+// The decoration stands also where it can't say all of the difference, which is only told of.
+bool MinorVariants::decorate(const ArchiveMember& member, const elfext::FullAttr& attributes,
+                             std::string& decoration) const {
+  elfext::FullAttr difference;
+  elfext::differenceFullAttr(difference, attributes, m_Common);
+  const std::string text = elfext::printAttributeString(difference);
+  decoration = std::string(AttributeMarker) + text;
+  elfext::FullAttr restored;
+  elfext::mergeFullAttr(restored, elfext::parseAttributeString(text), m_Common);
+  if (elfext::isSameBuild(restored, attributes)) return true;
+  return m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, member, m_Members);
+}
+
+void MinorVariants::publish(const HostingMember& hosting, std::string_view decoration,
+                            elfext::FastArray<SymbolTableEntry>& output) const {
+  for (uint32_t i = 0; i < hosting.names->getSize(); ++i) {
+    std::string_view name = (*hosting.names)[i];
+    if (!decoration.empty()) {
+      const size_t size = name.size() + decoration.size();
+      auto* bytes = static_cast<char*>(m_Region.allocate(size, 1));
+      std::memcpy(bytes, name.data(), name.size());
+      std::memcpy(bytes + name.size(), decoration.data(), decoration.size());
+      name = {bytes, size};
+    }
+    output.append({name, hosting.member});
+  }
+}
+
+bool MinorVariants::reportBases(const std::vector<const ArchiveMember*>& baseVariants) const {
+  if (baseVariants.empty()) return m_Archive.goOn(&ErrorHandler::reportNoBaseVariant, m_Members);
+  if (baseVariants.size() == 1) return true;
+  return m_Archive.goOn(&ErrorHandler::reportMultipleBaseVariants, baseVariants);
+}
+
+} // namespace arlib

@@ -1,0 +1,257 @@
+// SPDX-License-Identifier: Apache-2.0
+// Builds of one module: which members they are, where their attributes come from, and which of
+// their symbols fit best.
+#include "tests/unit/arlib/archive_fixture.h"
+
+#include "arlib/src/minor_variants.h"
+#include "elfext/interface/attribute_string.h"
+#include "elfext/interface/elf_constants.h"
+
+#include <algorithm>
+#include <deque>
+#include <random>
+
+namespace arlib {
+
+namespace {
+
+using elfext::FullAttr;
+using elfext::parseAttributeString;
+using Names = std::vector<std::string>;
+
+// The groups that these members form; a member is its names.
+class GroupsOf {
+public:
+  explicit GroupsOf(const std::vector<Names>& members) {
+    for (const Names& names : members) {
+      SymbolNameList& list = m_Lists.emplace_back(m_Region.get());
+      for (const std::string& name : names)
+        list.add(std::string_view(name));
+      m_Members.push_back({nullptr, &list});
+    }
+  }
+
+  [[nodiscard]] std::vector<VariantGroup> find() const { return findMinorVariants(m_Members); }
+
+private:
+  alloclib::RegionOwner m_Region{alloclib::RegionGeneral::Create(1024, "names of a test")};
+  std::deque<SymbolNameList> m_Lists;
+  std::vector<HostingMember> m_Members;
+};
+
+std::vector<VariantGroup> groupsOf(const std::vector<Names>& members) {
+  return GroupsOf(members).find();
+}
+
+// What comparing each with each gives.
+std::vector<VariantGroup> groupsByComparison(std::vector<Names> members) {
+  for (Names& names : members)
+    std::sort(names.begin(), names.end());
+  std::vector<VariantGroup> groups;
+  std::vector<bool> isClaimed(members.size());
+  for (uint32_t i = 0; i < members.size(); ++i) {
+    VariantGroup group;
+    for (uint32_t j = i; j < members.size(); ++j) {
+      if (isClaimed[j] || members[j] != members[i]) continue;
+      isClaimed[j] = true;
+      group.push_back(j);
+    }
+    if (group.size() > 1) groups.push_back(group);
+  }
+  return groups;
+}
+
+using MinorVariantsTest = ArchiveTest;
+
+struct Definition {
+  std::string name;
+  uint8_t binding = elfext::STB_LOCAL;
+  uint16_t section = elfext::SHN_ABS;
+};
+
+std::string objectWith(const std::vector<Definition>& definitions) {
+  testsupport::ObjectBuilder file = object();
+  file.section(".text", elfext::SHT_PROGBITS).flags(elfext::SHF_ALLOC).zeros(4);
+  auto& symbols = file.section(".symtab", elfext::SHT_SYMTAB).link(3);
+  for (const Definition& definition : definitions) {
+    symbols.symbol(
+        {.name = definition.name, .section = definition.section, .binding = definition.binding});
+  }
+  file.section(".strtab", elfext::SHT_STRTAB);
+  return file.bytes();
+}
+
+class AttributesOfMemberTest : public ArchiveTest {
+protected:
+  bool ask(ArchiveMember* asked, bool useObjectAttributes) {
+    return ElfImageArchiveMemberType::getInstance()->getBuildAttributes(asked, m_Attributes,
+                                                                        useObjectAttributes);
+  }
+
+  FullAttr m_Attributes;
+};
+
+class BestSymbolsTest : public ArchiveTest {
+protected:
+  // A library whose members define "f" with these attribute texts; "-" for none.
+  void publish(const std::vector<std::string>& texts) {
+    std::vector<ArchiveBuilder::Symbol> symbols = {{"g", "m0"}};
+    for (size_t i = 0; i < texts.size(); ++i) {
+      symbols.emplace_back(texts[i] == "-" ? "f" : "f$$BuildAttributes$" + texts[i],
+                           "m" + std::to_string(i));
+    }
+    ArchiveBuilder builder = archive().symbolTable(symbols);
+    for (size_t i = 0; i < texts.size(); ++i)
+      builder.member("m" + std::to_string(i), object().bytes());
+    read(builder);
+  }
+
+  // The members of the symbols that were found, as "m0 m1".
+  std::string best(std::string_view required, std::string_view name = "f") {
+    SymbolList list;
+    const bool isFound = m_Archive.findBestSymbols(name, parseAttributeString(required), list);
+    std::string members;
+    for (uint32_t i = 0; i < list.getSize(); ++i)
+      members += (i == 0 ? "" : " ") + std::string(list[i]->getDefiningMember()->getName());
+    return isFound ? members : "none";
+  }
+};
+
+} // namespace
+
+TEST_F(MinorVariantsTest, HaveTheSameNamesInAnyOrder) {
+  EXPECT_THAT(groupsOf({{"a", "b"}, {"b", "a"}}), ElementsAre(VariantGroup{0, 1}));
+  EXPECT_THAT(groupsOf({{"a", "b"}, {"a", "c"}}), IsEmpty());
+  EXPECT_THAT(groupsOf({{"a"}, {"a", "b"}}), IsEmpty());
+}
+
+TEST_F(MinorVariantsTest, HaveThemWithTheSameMultiplicities) {
+  EXPECT_THAT(groupsOf({{"a", "a", "b"}, {"a", "b", "b"}}), IsEmpty());
+  EXPECT_THAT(groupsOf({{"a", "a", "b"}, {"a", "b", "a"}}), ElementsAre(VariantGroup{0, 1}));
+}
+
+TEST_F(MinorVariantsTest, FormGroupsInTheOrderOfTheirFirstMembers) {
+  EXPECT_THAT(groupsOf({{"x"}, {"b"}, {"a"}, {"a"}, {"b"}, {"y"}, {"b"}}),
+              ElementsAre(VariantGroup{1, 4, 6}, VariantGroup{2, 3}));
+}
+
+TEST_F(MinorVariantsTest, AreWhatComparingEachWithEachFinds) {
+  std::mt19937 random(20);
+  for (int round = 0; round < 200; ++round) {
+    std::vector<Names> members(random() % 12);
+    for (Names& names : members) {
+      for (uint32_t left = random() % 4; left > 0; --left)
+        names.push_back(std::string(1, static_cast<char>('a' + random() % 3)));
+    }
+    EXPECT_EQ(groupsOf(members), groupsByComparison(members));
+  }
+}
+
+TEST_F(MinorVariantsTest, AreFoundAmongManyMembersOfOneName) {
+  std::vector<Names> members;
+  for (int i = 0; i < 20000; ++i)
+    members.push_back({"name" + std::to_string(i % 10000)});
+  EXPECT_EQ(groupsOf(members).size(), 10000u);
+}
+
+TEST_F(MinorVariantsTest, AreNotPublishedWithoutAHandlerWhereTheyCollide) {
+  add("a.o", objectWith({{"f", elfext::STB_GLOBAL}}));
+  add("b.o", objectWith({{"f", elfext::STB_GLOBAL}}));
+  m_Archive.setErrorHandler(nullptr);
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  m_Archive.setErrorHandler(&m_Handler);
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(reports(), ElementsAre("1 Minor variant group containing archive member #0 'a.o' "
+                                     "includes multiple base variants"));
+}
+
+TEST_F(MinorVariantsTest, AreToldOfInTheLibrarysOwnWords) {
+  add("a.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$J$IEEE1"}}));
+  add("b.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$R:L22$IEEE1"}}));
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(reports(),
+              ElementsAre("1 Member #1 'b.o' of minor variant group beginning witharchive member "
+                          "#0 'a.o' includes attribute(s) with nosymbol decoration representation",
+                          "1 Minor variant group containing archive member #0 'a.o' includes no "
+                          "base variant"));
+}
+
+TEST_F(MinorVariantsTest, StopAtTheFirstReportThatIsAnsweredSo) {
+  RecordingHandler handler(Answer::GiveUp);
+  m_Archive.setErrorHandler(&handler);
+  add("a.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$IEEE1$STKCKD"}}));
+  add("b.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$IEEE1$STKCKD"}}));
+  m_Archive.setLibraryAttributes(parseAttributeString("$IEEE1$~STKCKD"));
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
+  EXPECT_EQ(handler.take().size(), 1u);
+}
+
+TEST_F(MinorVariantsTest, LibraryAttributesStayAndMakeTheTableStale) {
+  read(archive().symbolTable({}).member("a.o", "text"));
+  EXPECT_EQ(m_Archive.getLibraryAttributes(), nullptr);
+  m_Archive.setLibraryAttributes(parseAttributeString("$J"));
+  m_Archive.clear();
+  ASSERT_NE(m_Archive.getLibraryAttributes(), nullptr);
+  EXPECT_EQ(*m_Archive.getLibraryAttributes(), parseAttributeString("$J"));
+}
+
+TEST_F(AttributesOfMemberTest, AreTheMergeOfItsDecorationSymbols) {
+  ArchiveMember* decorated =
+      add("a.o", objectWith({{"BuildAttributes$$J$IEEE1$PRES8$EABIv2"},
+                             {"f$$BuildAttributes$$X$IEEE1"},
+                             {"BuildAttributes$$E$IEEE1$IW$REQ8", elfext::STB_GLOBAL},
+                             {"BuildAttributes$$D$IEEE1", elfext::STB_GLOBAL, 0},
+                             {"BuildAttributes$$P$IEEE1", elfext::STB_LOCAL, 1}}));
+  EXPECT_TRUE(ask(decorated, false));
+  EXPECT_EQ(elfext::printAttributeString(m_Attributes), "$E$P$J$D$IEEE1$IW$REQ8");
+}
+
+TEST_F(AttributesOfMemberTest, AreNotToldByOtherObjects) {
+  EXPECT_FALSE(ask(add("a.o", objectWith({{"f"}, {"xBuildAttributes$$J"}})), false));
+  ArchiveMember* broken = add("b.o", objectWith({{"BuildAttributes$$J"}}).substr(0, 100));
+  EXPECT_FALSE(ask(broken, false));
+  EXPECT_FALSE(ask(broken, true));
+  EXPECT_THAT(reports(), IsEmpty());
+}
+
+TEST_F(AttributesOfMemberTest, AreThoseOfTheWholeObjectIfAsked) {
+  EXPECT_TRUE(ask(add("a.o", objectWith({})), true));
+  EXPECT_EQ(m_Attributes, elfext::DefaultFullAttr);
+  EXPECT_TRUE(ask(add("b.o", objectWith({{"BuildAttributes$$J$IEEE1"}})), true));
+  EXPECT_TRUE(m_Attributes.m_Features.contains(elfext::features::JAVA_STATE));
+}
+
+TEST_F(BestSymbolsTest, AreAllWhereNoneIsDecorated) {
+  publish({"-", "-"});
+  EXPECT_EQ(best("$IEEE1"), "m0 m1");
+  EXPECT_EQ(best("$IEEE1", "g"), "m0");
+  EXPECT_EQ(best("$IEEE1", "h"), "none");
+}
+
+TEST_F(BestSymbolsTest, AreThoseThatUseMostOfWhatIsThere) {
+  publish({"-", "$J$IEEE1", "$E$IEEE1", "$E$J$IEEE1"});
+  EXPECT_EQ(best("$IEEE1"), "m0");
+  EXPECT_EQ(best("$J$IEEE1"), "m1");
+  EXPECT_EQ(best("$E$J$IEEE1"), "m3");
+  EXPECT_EQ(best("$E$J$X$IEEE1"), "m3");
+}
+
+TEST_F(BestSymbolsTest, AreTheFirstAmongEqualsAndAllOfItsKind) {
+  publish({"$J$IEEE1", "$E$IEEE1", "$J$IEEE1", "-"});
+  EXPECT_EQ(best("$E$J$IEEE1"), "m0 m2");
+}
+
+TEST_F(BestSymbolsTest, AreNoneWhereAllNeedMore) {
+  publish({"$J$IEEE1", "$E$IEEE1"});
+  EXPECT_EQ(best("$IEEE1"), "none");
+}
+
+TEST_F(BestSymbolsTest, CountFlagsAndAccessesToo) {
+  publish({"-", "$IEEE1$IW", "$A:L22$IEEE1$IW"});
+  EXPECT_EQ(best("$IEEE1$IW"), "m1");
+  EXPECT_EQ(best("$A:L22$IEEE1"), "m0");
+  EXPECT_EQ(best("$A:L22$IEEE1$IW"), "m2");
+}
+
+} // namespace arlib
