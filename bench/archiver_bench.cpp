@@ -132,6 +132,8 @@ void addLibrariesOfObjects(const Archivers& archivers, const bench::SampleFolder
   const bench::ObjectShape shapes[] = {
       {"10000_small_objects", 10000, 1, 3, 64, 0},
       {"300_objects_of_1000_to_3000_sections", 300, 1000, 3000, 16, 0},
+      {"6000_unrelated_objects", 6000, 10, 10, 64, 0},
+      {"6000_builds_of_2000_modules", 6000, 10, 10, 64, 0, 3},
       {"1_object_of_20000_sections", 1, 20000, 20000, 16, 0},
       {"200_objects_of_2_megabytes", 200, 1, 4, 500000, 100000},
   };

@@ -15,18 +15,24 @@ using testsupport::ElfClass;
 using testsupport::ElfData;
 
 std::string objectBytes(const ObjectShape& shape, uint32_t number) {
+  const uint32_t module = number / shape.builds;
   const uint32_t spread = shape.mostSections - shape.fewestSections + 1;
-  const uint32_t sections = shape.fewestSections + number * 7 % spread;
+  const uint32_t sections = shape.fewestSections + module * 7 % spread;
   const uint32_t symbolTable = sections + 1;
   testsupport::ObjectBuilder object(ElfClass::Class32, ElfData::Little);
-  const std::string prefix = "function_" + std::to_string(number) + "_";
+  const std::string prefix = "function_" + std::to_string(module) + "_";
   for (uint32_t i = 0; i < sections; ++i) {
     object.section(".text." + prefix + std::to_string(i), SHT_PROGBITS)
         .flags(SHF_ALLOC | SHF_EXECINSTR)
         .alignment(4)
         .zeros(shape.bytesPerSection);
   }
-  auto& symbols = object.section(".symtab", SHT_SYMTAB).link(symbolTable + 1).info(1);
+  constexpr const char* Attributes[] = {"$ZEV_ISAv4$IEEE1", "$ZEV_ISAv5$IEEE1",
+                                        "$ZEV_ISAv4$IEEE1$IW"};
+  auto& symbols = object.section(".symtab", SHT_SYMTAB).link(symbolTable + 1).info(2);
+  symbols.symbol({.name = "BuildAttributes$" + std::string(Attributes[number % shape.builds]),
+                  .section = SHN_ABS,
+                  .binding = STB_LOCAL});
   for (uint32_t i = 0; i < sections; ++i) {
     symbols.symbol({.name = prefix + std::to_string(i),
                     .section = static_cast<uint16_t>(i + 1),
@@ -37,7 +43,7 @@ std::string objectBytes(const ObjectShape& shape, uint32_t number) {
   if (shape.relocations != 0) {
     auto& rows = object.section(".rel.text", SHT_REL).link(symbolTable).info(1);
     for (uint32_t i = 0; i < shape.relocations; ++i)
-      rows.relocation({.offset = i * 4 % shape.bytesPerSection, .symbol = 1, .type = 2});
+      rows.relocation({.offset = i * 4 % shape.bytesPerSection, .symbol = 2, .type = 2});
   }
   return object.bytes();
 }

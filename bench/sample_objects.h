@@ -19,10 +19,11 @@ struct ObjectShape {
   uint32_t mostSections;    // likewise; what is between is spread evenly
   uint32_t bytesPerSection; // of code
   uint32_t relocations;     // of all sections together
+  uint32_t builds = 1;      // of each module: that many objects define the same functions
 };
 
-// Makes the objects of a shape in the folder, and returns their names. Every function has a name of
-// its own.
+// Makes the objects of a shape in the folder, and returns their names. Every function of a module
+// has a name of its own; its builds differ in their attributes.
 std::vector<std::string> makeObjects(const SampleFolder& folder, const ObjectShape& shape);
 
 } // namespace bench

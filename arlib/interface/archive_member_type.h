@@ -6,14 +6,12 @@
 #pragma once
 
 #include "arlib/interface/symbol_name_list.h"
+#include "elfext/interface/full_attr.h"
 
 #include <cstdint>
+#include <optional>
 #include <span>
 #include <string>
-
-namespace elfext {
-struct FullAttr;
-}
 
 namespace arlib {
 
@@ -73,6 +71,12 @@ public:
   // says nothing.
   virtual bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                                   bool useObjectAttributes) const = 0;
+
+  // Both at the cost of one read, as the archive wants its objects' attributes. Without attributes
+  // the object says nothing.
+  virtual bool getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
+                            std::optional<elfext::FullAttr>& attributes,
+                            std::string& reason) const = 0;
 };
 
 class ElfImageArchiveMemberType final : public ObjectModuleArchiveMemberType {
@@ -83,6 +87,9 @@ public:
                       std::string& reason) const override;
   bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                           bool useObjectAttributes) const override;
+  bool getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
+                    std::optional<elfext::FullAttr>& attributes,
+                    std::string& reason) const override;
 };
 
 } // namespace arlib

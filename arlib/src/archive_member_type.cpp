@@ -136,10 +136,38 @@ bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
   return !isFirst;
 }
 
+// What the object says of itself: in its decoration symbols, or as a whole. Then an object that
+// says nothing is of the default kind.
+bool findAttributes(const elfext::ObjectModule& module, uint64_t objectSize,
+                    bool useObjectAttributes, elfext::FullAttr& attributes) {
+  if (!useObjectAttributes) return mergeDecorations(module, objectSize, attributes);
+  const elfext::BuildAttributes* own = module.getOwnBuildAttributes();
+  attributes = own == nullptr ? elfext::DefaultFullAttr : own->getFullAttr();
+  return true;
+}
+
+void findNames(const elfext::ObjectModule& module, const ArchiveMember& archiveMember,
+               SymbolNameList& names) {
+  const bool includeDebugSymbols = archiveMember.getArchive()->getIncludeDebugSymbols();
+  std::vector<const char*> published;
+  for (const elfext::Symbol* symbol : module.getSymbols()) {
+    if (isPublished(*symbol, includeDebugSymbols)) published.push_back(symbol->getName());
+  }
+  names.clear();
+  addNames(published, archiveMember.getSize(), names);
+}
+
 } // namespace
 
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                                                std::string& reason) const {
+  std::optional<elfext::FullAttr> attributes;
+  return getPublished(archiveMember, names, attributes, reason);
+}
+
+bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
+                                             std::optional<elfext::FullAttr>& attributes,
+                                             std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   elfext::ElfextErrorStringCapture capture;
   elfext::ObjectModule module;
@@ -147,19 +175,18 @@ bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, Sym
   module.setErrorHandler(&capture);
   elfext::BySizeDeferredContentsSelector selector;
   reason.clear();
+  attributes.reset();
   if (!archiveMember->flushContents()) return false;
   if (!archiveMember->readInto(module, &selector)) {
     reason = capture.getText();
     return false;
   }
   archiveMember->discardContents();
-  names.clear();
-  const bool includeDebugSymbols = archiveMember->getArchive()->getIncludeDebugSymbols();
-  std::vector<const char*> published;
-  for (const elfext::Symbol* symbol : module.getSymbols()) {
-    if (isPublished(*symbol, includeDebugSymbols)) published.push_back(symbol->getName());
-  }
-  addNames(published, archiveMember->getSize(), names);
+  findNames(module, *archiveMember, names);
+  elfext::FullAttr stated;
+  if (findAttributes(module, archiveMember->getSize(),
+                     archiveMember->getArchive()->getUseObjectBuildAttributes(), stated))
+    attributes = stated;
   return true;
 }
 
@@ -173,12 +200,7 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
   module.setErrorHandler(archiveMember->getArchive()->getElfextErrorHandler());
   if (!archiveMember->readInto(module, &selector)) return false;
   archiveMember->discardContents();
-  if (!useObjectAttributes) return mergeDecorations(module, archiveMember->getSize(), attributes);
-  elfext::BuildAttributes ofModule;
-  if (const elfext::BuildAttributes* own = module.getOwnBuildAttributes(); own != nullptr)
-    ofModule = *own;
-  attributes = ofModule.getFullAttr();
-  return true;
+  return findAttributes(module, archiveMember->getSize(), useObjectAttributes, attributes);
 }
 
 } // namespace arlib

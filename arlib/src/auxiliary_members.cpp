@@ -3,6 +3,7 @@
 
 #include "arlib/interface/archive_format.h"
 #include "arlib/src/kept_file.h"
+#include "elfext/interface/attribute_string.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -174,18 +175,20 @@ bool AuxiliaryMembers::updateSymbolTable() {
 // A member that can't be read is told of and has no entries. A handler that says to stop there
 // leaves the table with the members collected so far.
 void AuxiliaryMembers::collectSymbolHostingMembers() {
+  const elfext::FullAttr nothingStated = elfext::parseAttributeString("");
   QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
     if (!member->m_Type->isObjectModule()) continue;
     const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(member->m_Type);
     auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+    std::optional<elfext::FullAttr> attributes;
     std::string reason;
-    if (!type->getSymbolNames(member, *names, reason) &&
+    if (!type->getPublished(member, *names, attributes, reason) &&
         !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
       return;
     }
     if (names->getSize() == 0) continue;
-    m_SymbolHostingMembers.append({member, names});
+    m_SymbolHostingMembers.append({member, names, attributes.value_or(nothingStated)});
     m_SymbolCount += names->getSize();
   }
 }

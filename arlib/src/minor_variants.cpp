@@ -97,7 +97,7 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
   m_Attributes.clear();
   for (const HostingMember& hosting : group) {
     m_Members.push_back(hosting.member);
-    m_Attributes.push_back(attributesOf(hosting));
+    m_Attributes.push_back(hosting.attributes);
   }
   if (!findCommon()) return false;
   std::vector<const ArchiveMember*> baseVariants;
@@ -113,15 +113,6 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
     publish(group[i], decoration, output);
   }
   return reportBases(baseVariants);
-}
-
-elfext::FullAttr MinorVariants::attributesOf(const HostingMember& hosting) const {
-  QUARN_ASSERT(1, hosting.member->getType()->isObjectModule());
-  const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(hosting.member->getType());
-  elfext::FullAttr attributes;
-  if (type->getBuildAttributes(hosting.member, attributes, m_Archive.getUseObjectBuildAttributes()))
-    return attributes;
-  return elfext::parseAttributeString("");
 }
 
 // What all members need, with what the library needs as a whole.

@@ -22,6 +22,7 @@ namespace arlib {
 struct HostingMember {
   ArchiveMember* member;
   const SymbolNameList* names;
+  elfext::FullAttr attributes = {};
 };
 
 // Entry i of the table to come: the text of its name, and the member that defines it.
@@ -51,7 +52,6 @@ public:
                   elfext::FastArray<SymbolTableEntry>& output);
 
 private:
-  [[nodiscard]] elfext::FullAttr attributesOf(const HostingMember& hosting) const;
   [[nodiscard]] bool findCommon();
   [[nodiscard]] bool addLibraryAttributes(const ArchiveMember& member,
                                           elfext::FullAttr& attributes) const;
