@@ -2,7 +2,7 @@
 // The list of catalogues, the look-up of a text, and the choice of a language.
 #include "messages/interface/catalogue.h"
 
-#include "messages/src/english_catalogue.h"
+#include "messages/src/catalogues.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -16,10 +16,9 @@ struct Catalogue {
   std::span<const CatalogueRow> (*rows)();
 };
 
-// Until it has texts of its own, "ja_JP" is a known language that shows the English ones.
 constexpr Catalogue Catalogues[CatalogueCount] = {
     {"en_US", englishCatalogue},
-    {"ja_JP", englishCatalogue},
+    {"ja_JP", japaneseCatalogue},
 };
 
 struct CodePage {

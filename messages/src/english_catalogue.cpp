@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The English texts, in the order of the keys. A text that is a format gets its arguments in the
 // order in which it names them.
-#include "messages/src/english_catalogue.h"
+#include "messages/src/catalogues.h"
 
 #include "messages/interface/message_keys.h"
 #include "messages/src/catalogue_checks.h"

@@ -77,6 +77,111 @@ The last language counts, from its place on; a code alone does not change it.
   out: 1000001
   status 0
 
+Every message has Japanese words; codes, names and the words in front of them stay as they are.
+
+in_japanese ARGUMENT...: the status of a run, and how its output differs from what is expected.
+
+  $ in_japanese() { cat > expected; quarn --message_locale=ja_JP.UTF-8 "$@" > actual 2>&1; echo $?; diff expected actual; }
+  $ in_japanese -t missing.a <<'E'
+  > Error: L6832E: アーカイブ 'missing.a' が見つかりません : No such file or directory
+  > E
+  1
+  $ in_japanese -t lib.a none <<'E'
+  > Error: L6831E: 'none' はアーカイブ 'lib.a' に存在しません
+  > E
+  1
+  $ in_japanese -r --diag_style=ide new.a a.o <<'E'
+  > quarn : warning L6875:  ELF ではないオブジェクト 'a.o' をアーカイブ 'new.a' に追加しています
+  > quarn : アーカイブ 'new.a' を作成しています
+  > E
+  0
+  $ in_japanese -tt lib.a <<'E'
+  > Warning: L3920W: 連結されたオプション '-tt' でオプション '-t' が繰り返されています。
+  > a.o
+  > E
+  0
+  $ in_japanese --normalise=x lib.a <<'E'
+  > Fatal error: L3903U: 引数 'x' はオプション 'normalise' では使用できません。
+  > E
+  1
+  $ in_japanese --via none <<'E'
+  > Fatal error: L3904U: via ファイル 'none' を開けませんでした。
+  > E
+  1
+  $ variant 1.o; variant 2.o '$R:L22'
+  $ in_japanese --create variants.a 1.o 2.o <<'E'
+  > Warning: L6877W: '1.o' で始まるマイナーバリアントグループのアーカイブメンバ '2.o' の属性の差に、シンボル装飾で表現できない属性が含まれています
+  > E
+  0
+  $ in_japanese --sizes variants.a <<'E'
+  > 
+  >     コード   ROデータ   RWデータ   ZIデータ   デバッグ   オブジェクト名
+  >        912         80          0          0          0   1.o
+  >        912         80          0          0          0   2.o
+  >       1824        160          0          0          0   TOTAL
+  > 
+  > E
+  0
+  $ in_japanese --zs variants.a <<'E'
+  > gcd                  定義元 1.o        オフセット    124
+  > gcd$$BuildAttributes$$A:L22$IEEE1 定義元 2.o        オフセット   2512
+  > E
+  0
+  $ elf 1.o entry 16; section 1.o 2 flags 0x10000006; quarn -r lib.a 1.o
+  $ in_japanese --entries lib.a <<'E'
+  > ENTRY: 1.o のセクション .text のオフセット 16
+  > E
+  0
+  $ in_japanese --help <<'E'
+  > Product: Quarn Object Tools 1.0
+  > Component: Quarn Object Tools 1.0
+  > Tool: quarn [01000001]
+  > 
+  > アーカイブ作成・保守ツール
+  > 
+  > コマンド形式:
+  > 
+  > quarn options archive [ file_list ]
+  > 
+  > file_list ではワイルドカード '?' と '*' を使用できます
+  > 
+  > オプション:-
+  > 
+  >  -r         <file_list> のファイルを挿入し、同名の既存メンバを置き換えます。
+  >  -d         <file_list> のメンバを削除します。
+  >  -x         <file_list> のメンバを抽出し、同名のファイルに保存します。
+  >  -m         <file_list> のファイルを移動します。
+  >  -p         ファイルを標準出力に出力します。
+  >  -a pos     <pos> という名前のファイルの後ろに挿入または移動します。
+  >  -b pos     <pos> という名前のファイルの前に挿入または移動します。
+  >  -u         古いファイルだけを更新します。-r と共に使用します。
+  > 
+  >  -n         オブジェクトアーカイブにシンボルテーブルを追加しません。
+  >  -s         アーカイブのシンボルテーブルを強制的に再生成します。
+  >  -t         アーカイブの内容一覧を出力します。
+  > --zs        シンボルテーブルを表示します。
+  > --zt        アーカイブの内容を要約します (サイズ + エントリ)。
+  >  -c         新しいアーカイブを作成するときの警告を抑止します。
+  >  -C         抽出時に既存のファイルを上書きしません。
+  >  -T         ファイル名をシステムの最大長に切り詰めます。
+  >  -v         詳細な出力を行います。
+  > --create    新しいアーカイブを強制的に作成します。
+  > --via file  via ファイルから追加の引数を読み込みます。
+  > --sizes     各メンバのサイズとライブラリの合計を一覧表示します。
+  > --entries   ENTRY ポイントを含むセクションを一覧表示します。
+  > --vsn       現在の Quarn のバージョンを出力します。 
+  > --help      このメッセージを出力します。 
+  > 
+  > 例:-
+  > 
+  >         quarn -r  mylib.a obj1 obj2 obj3...
+  >         quarn -x  mylib.a ?sort*
+  >         quarn -d  mylib.a hash.o
+  >         quarn -tv ansilib.a
+  > 
+  > E
+  0
+
 The environment has no say.
 
   $ LANG=ja_JP.UTF-8 LC_ALL=ja_JP.UTF-8 LC_MESSAGES=ja_JP.UTF-8 quarn -t lib.a none

@@ -6,16 +6,50 @@
 
 #include <gmock/gmock.h>
 
+#include <map>
+#include <string>
+#include <vector>
+
 namespace messages {
 
 namespace {
 
 using testing::ElementsAre;
+using testing::Pair;
 
 struct CatalogueTest : MessagesTest {};
 
 std::string textOf(Key key) {
   return std::string(KeyText(key).text());
+}
+
+// What a format does with each of its arguments, counted from 1.
+std::map<unsigned, std::string> argumentsOf(std::string_view format) {
+  std::map<unsigned, std::string> arguments;
+  unsigned next = 1;
+  for (size_t at = format.find('%'); at != format.npos; at = format.find('%', at)) {
+    const size_t end = format.find_first_of("%cdsu", at + 1);
+    std::string conversion(format.substr(at + 1, end - at));
+    at = end + 1;
+    if (conversion == "%") continue;
+    unsigned position = next++;
+    if (const size_t dollar = conversion.find('$'); dollar != conversion.npos) {
+      position = static_cast<unsigned>(std::stoul(conversion));
+      conversion.erase(0, dollar + 1);
+    }
+    arguments[position] = conversion;
+  }
+  return arguments;
+}
+
+std::vector<std::string_view> linesOf(std::string_view text) {
+  std::vector<std::string_view> lines;
+  for (size_t end = text.find('\n'); end != text.npos; end = text.find('\n')) {
+    lines.push_back(text.substr(0, end));
+    text.remove_prefix(end + 1);
+  }
+  lines.push_back(text);
+  return lines;
 }
 
 } // namespace
@@ -55,6 +89,34 @@ TEST(Catalogue, AscendsByKeyInEveryLanguageWithTheSameKeys) {
       EXPECT_EQ(rows[i].key, english[i].key);
     for (size_t i = 1; i < rows.size(); ++i)
       EXPECT_LT(rows[i - 1].key, rows[i].key);
+  }
+}
+
+TEST(Catalogue, HasTheSameArgumentsInEveryLanguage) {
+  EXPECT_THAT(argumentsOf("%s: %2d of %%"), ElementsAre(Pair(1, "s"), Pair(2, "2d")));
+  EXPECT_THAT(argumentsOf("%2$-5u %1$s"), ElementsAre(Pair(1, "s"), Pair(2, "-5u")));
+  const auto english = catalogueRows(EnglishCatalogue);
+  const auto japanese = catalogueRows(JapaneseCatalogue);
+  ASSERT_EQ(japanese.size(), english.size());
+  for (size_t i = 0; i < english.size(); ++i)
+    EXPECT_EQ(argumentsOf(japanese[i].text), argumentsOf(english[i].text))
+        << textOf(english[i].key);
+}
+
+// What a program that reads the output looks for stays, and so do the ends of lines.
+TEST(Catalogue, HasTheSameLinesAndOptionsInEveryLanguage) {
+  const auto english = catalogueRows(EnglishCatalogue);
+  const auto japanese = catalogueRows(JapaneseCatalogue);
+  for (size_t i = 0; i < english.size(); ++i) {
+    const std::vector<std::string_view> lines = linesOf(english[i].text);
+    const std::vector<std::string_view> translated = linesOf(japanese[i].text);
+    ASSERT_EQ(translated.size(), lines.size()) << textOf(english[i].key);
+    for (size_t line = 0; line < lines.size(); ++line) {
+      EXPECT_EQ(translated[line].empty(), lines[line].empty());
+      if (lines[line].starts_with('-') || lines[line].starts_with(" -")) {
+        EXPECT_EQ(translated[line].substr(0, 12), lines[line].substr(0, 12));
+      }
+    }
   }
 }
 
