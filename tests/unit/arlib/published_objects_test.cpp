@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// Builds of one module: which members they are, where their attributes come from, and which of
-// their symbols fit best.
+// What the rebuild of the symbol table makes of objects: builds of one module, members that can't
+// be read, attributes, and which of the symbols then fit best.
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include "arlib/src/minor_variants.h"
@@ -80,6 +80,23 @@ std::string objectWith(const std::vector<Definition>& definitions) {
   file.section(".strtab", elfext::SHT_STRTAB);
   return file.bytes();
 }
+
+// Members a.o, b.o and c.o, of which the second can't be read.
+class UnreadableMemberTest : public ArchiveTest {
+protected:
+  UnreadableMemberTest() {
+    add("a.o", objectWith({{"f", elfext::STB_GLOBAL}}));
+    const std::string broken = objectWith({{"g", elfext::STB_GLOBAL}});
+    add("b.o", broken.substr(0, broken.size() - 1));
+    add("c.o", objectWith({{"h", elfext::STB_GLOBAL}}));
+  }
+
+  // The names that the table holds.
+  std::string publishedNames() {
+    const std::string table = asString(m_Archive.getSymbolTable()->getContents());
+    return table.substr(4 + 4 * static_cast<unsigned char>(table[3]));
+  }
+};
 
 class AttributesOfMemberTest : public ArchiveTest {
 protected:
@@ -194,6 +211,29 @@ TEST_F(MinorVariantsTest, LibraryAttributesStayAndMakeTheTableStale) {
   m_Archive.clear();
   ASSERT_NE(m_Archive.getLibraryAttributes(), nullptr);
   EXPECT_EQ(*m_Archive.getLibraryAttributes(), parseAttributeString("$J"));
+}
+
+TEST_F(UnreadableMemberTest, IsToldOfAndHasNoEntries) {
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(publishedNames(), std::string("f\0h\0", 4));
+  EXPECT_THAT(reports(), ElementsAre("2 Unable to read symbols defined in archive member #1 'b.o': "
+                                     "I/O error writing file 'b.o': Unknown error -1"));
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(reports(), IsEmpty());
+}
+
+TEST_F(UnreadableMemberTest, EndsTheCollectionWhereTheAnswerIsToStop) {
+  RecordingHandler handler(Answer::GiveUp);
+  m_Archive.setErrorHandler(&handler);
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(publishedNames(), std::string("f\0", 2));
+  EXPECT_EQ(handler.take().size(), 1u);
+}
+
+TEST_F(UnreadableMemberTest, EndsTheCollectionWhereNobodyAnswers) {
+  m_Archive.setErrorHandler(nullptr);
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(publishedNames(), std::string("f\0", 2));
 }
 
 TEST_F(AttributesOfMemberTest, AreTheMergeOfItsDecorationSymbols) {
