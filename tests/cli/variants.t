@@ -33,6 +33,26 @@ The first of these is the base: it needs what all of them do.
   0000144 65 73 24 24 5a 45 56 5f 49 53 41 76 33 24 49 45  >es$$ZEV_ISAv3$IE<
   0000160 45 45 31 24 49 57 00 0a 31 2e 6f 2f 20 20 20 20  >EE1$IW..1.o/    <
 
+Ten builds of one module, each with one thing more or another.
+
+  $ variants '$ZEV_ISAv4$IEEE1' '$ZEV_ISAv4$IEEE1$OTIME' '$ZEV_ISAv5$IEEE1' '$ZEV_ISAv5$E$P$IEEE1' \
+  >   '$ZEV_ISAv6$J$IEEE1' '$ZEV_ISAv7$HFUv3$N$IEEE1' '$ZEV_ISAv4$KRL_ISAv1$IEEE1' '$ZEV_ISAv4$IEEE1$RWPI$ROPI' \
+  >   '$ZEV_ISAv4$IEEE1$STKCKD' > ten
+  $ cat ten
+  gcd 1.o
+  gcd$$BuildAttributes$$ZEV_ISAv3$IEEE1$OTIME 2.o
+  gcd$$BuildAttributes$$ZEV_ISAv5$IEEE1 3.o
+  gcd$$BuildAttributes$$ZEV_ISAv5$E$P$IEEE1 4.o
+  gcd$$BuildAttributes$$ZEV_ISAv6$J$IEEE1 5.o
+  gcd$$BuildAttributes$$ZEV_ISAv7$N$HFUv3$PE$IEEE1 6.o
+  gcd$$BuildAttributes$$KRL_ISAv1$ZEV_ISAv3$IEEE1 7.o
+  gcd$$BuildAttributes$$ZEV_ISAv3$IEEE1$RWPI$ROPI 8.o
+  gcd$$BuildAttributes$$ZEV_ISAv3$IEEE1$STKCKD 9.o
+  $ mv lib.a nine.a; variant 0.o '$ZEV_ISAv8$DE$FP_ZEVv8$KRL_ISAv5$IEEE1'; quarn -r nine.a 0.o; listed nine.a | diff ten -
+  9a10
+  > gcd$$BuildAttributes$$KRL_ISAv5$ZEV_ISAv8$DE$FP_ZEVv8$PE$IEEE1 0.o
+  [1]
+
 The order of the members is that of the table, whichever is the base. Without a level of the ZEV instruction set in the
 base, none is added.
 
