@@ -19,6 +19,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace elfext {
@@ -34,7 +35,13 @@ struct CompatibilityTag {
 // An instance of Tag_also_compatible_with: another attribute, under which the code could be used
 // too.
 struct AlsoCompatibilityTag {
-  uint32_t tag = 0; // its low seven bits
+  AlsoCompatibilityTag() = default;
+  // Of the tag, the low seven bits are kept.
+  AlsoCompatibilityTag(uint32_t wholeTag, std::optional<uint32_t> itsNumber,
+                       std::optional<std::string> itsText)
+      : tag(wholeTag & 0x7F), number(itsNumber), text(std::move(itsText)) {}
+
+  uint32_t tag = 0;
   std::optional<uint32_t> number;
   std::optional<std::string> text;
 

@@ -81,11 +81,11 @@ void BuildAttributes::markFed(uint32_t place) {
 }
 
 bool BuildAttributes::hasTag(uint32_t tag) const {
+  QUARN_ASSERT(1, tag >= FirstAttributeTag);
   if (tag == Tag_compatibility) return countOf(m_CompatibilityTags) != 0;
   if (tag == Tag_also_compatible_with) return countOf(m_AlsoCompatibilityTags) != 0;
   if (const uint8_t place = placeOf(tag); place != NoPlace) return hasNumber(place);
   if (const uint8_t place = textPlaceOf(tag); place != NoPlace) return m_Texts[place].has_value();
-  QUARN_ASSERT(1, tag > LastIrregularTag);
   return (m_OtherNumericTags && m_OtherNumericTags->contains(tag)) ||
          (m_OtherStringTags && m_OtherStringTags->contains(tag));
 }
@@ -118,11 +118,13 @@ void BuildAttributes::setNumericTag(uint32_t tag, uint32_t value) {
   putNumber(place, value);
   markFed(place);
   if (tag != Tag_ABI_optimization_goals) return;
-  applyFlagString(m_FullAttr.m_Flags, value == 1 || value == 2 ? "-otime" : "-ospace");
+  const uint32_t goals = getNumber(place);
+  applyFlagString(m_FullAttr.m_Flags, goals == 1 || goals == 2 ? "-otime" : "-ospace");
 }
 
 void BuildAttributes::setStringTag(uint32_t tag, std::string_view text) {
   QUARN_ASSERT(1, BuildAttributesTagClassifier::isQobixStringTag(tag));
+  QUARN_ASSERT(1, tag != Tag_also_compatible_with);
   const uint8_t place = textPlaceOf(tag);
   if (tag == Tag_conformance)
     setConformance(text);
@@ -133,6 +135,7 @@ void BuildAttributes::setStringTag(uint32_t tag, std::string_view text) {
 }
 
 void BuildAttributes::removeTag(uint32_t tag) {
+  QUARN_ASSERT(1, tag >= FirstAttributeTag);
   if (tag == Tag_compatibility && m_CompatibilityTags) m_CompatibilityTags->clear();
   if (tag == Tag_also_compatible_with && m_AlsoCompatibilityTags) m_AlsoCompatibilityTags->clear();
   if (const uint8_t place = placeOf(tag); place != NoPlace) {
@@ -288,7 +291,12 @@ size_t BuildAttributes::getHash() const {
     for (const CompatibilityTag& entry : *m_CompatibilityTags)
       addToHash(hash, entry.flag ^ std::hash<std::string>{}(entry.vendor));
   }
-  addToHash(hash, countOf(m_AlsoCompatibilityTags));
+  if (m_AlsoCompatibilityTags) {
+    for (const AlsoCompatibilityTag& entry : *m_AlsoCompatibilityTags) {
+      addToHash(hash, size_t{entry.tag} << 32 | entry.number.value_or(0));
+      addToHash(hash, std::hash<std::string_view>{}(entry.text ? *entry.text : std::string_view()));
+    }
+  }
   return hash;
 }
 
@@ -316,12 +324,12 @@ void BuildAttributes::copyMissingOthers(const BuildAttributes& other) {
     }
   }
   if (other.m_OtherNumericTags) {
-    m_OtherNumericTags.make().insert(other.m_OtherNumericTags->begin(),
-                                     other.m_OtherNumericTags->end());
+    for (const auto& entry : *other.m_OtherNumericTags)
+      m_OtherNumericTags.make().insert(entry);
   }
   if (other.m_OtherStringTags) {
-    m_OtherStringTags.make().insert(other.m_OtherStringTags->begin(),
-                                    other.m_OtherStringTags->end());
+    for (const auto& entry : *other.m_OtherStringTags)
+      m_OtherStringTags.make().insert(entry);
   }
 }
 

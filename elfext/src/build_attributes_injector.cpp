@@ -8,12 +8,14 @@ namespace elfext {
 
 namespace {
 
-// Lists can be as long as the section.
-size_t costOfCopy(const BuildAttributes* attributes) {
-  constexpr size_t PerEntry = 4;
-  if (attributes == nullptr) return 0;
-  return PerEntry * (size_t{attributes->getCompatibilityTagCount()} +
-                     attributes->getAlsoCompatibilityTagCount());
+// What it takes to decode a run on top of other attributes. Their lists can be as long as the
+// section: they are copied, and each number of vendor "ZEV" may look all through one of them.
+size_t costOfDecoding(size_t runSize, bool isZev, const BuildAttributes* start) {
+  constexpr size_t PerEntry = 8;
+  if (start == nullptr) return runSize;
+  const size_t compatible = start->getCompatibilityTagCount();
+  const size_t entries = compatible + start->getAlsoCompatibilityTagCount();
+  return runSize + PerEntry * entries + (isZev ? runSize * compatible : 0);
 }
 
 } // namespace
@@ -75,7 +77,7 @@ bool BuildAttributesInjector::inject(ObjectWithBuildAttributes& object, Run& run
   const BuildAttributes* start = object.getOwnBuildAttributes();
   const auto [result, isNew] = run.results.try_emplace(start, nullptr);
   if (isNew) {
-    if (!m_Budget.take(run.block->getData().size() + costOfCopy(start))) return false;
+    if (!m_Budget.take(costOfDecoding(run.block->getData().size(), run.isZev, start))) return false;
     result->second = decode(start, run);
   }
   object.setOwnBuildAttributes(result->second);

@@ -16,25 +16,25 @@ class BuildAttributesBlock;
 class ObjectModule;
 class ObjectWithBuildAttributes;
 
-// Steps that all walks over one section may take beyond reading it. A run that is for many sections
-// is decoded again for each set of attributes that they have already; that must not grow with the
-// square of the section.
+// Steps that all walks over an object's attribute sections may take beyond reading them. A run that
+// is for many sections is decoded again for each set of attributes that they have already; that
+// must not grow with the square of the object.
 class InjectionBudget {
 public:
-  explicit InjectionBudget(size_t sectionSize) : m_Left(Base + PerByte * sectionSize) {}
+  explicit InjectionBudget(uint64_t objectSize) : m_Left(Base + PerByte * objectSize) {}
 
   // False if there are not so many left.
-  [[nodiscard]] bool take(size_t steps) {
+  [[nodiscard]] bool take(uint64_t steps) {
     if (steps > m_Left) return false;
     m_Left -= steps;
     return true;
   }
 
 private:
-  static constexpr size_t Base = size_t{2} << 20;
-  static constexpr size_t PerByte = 4;
+  static constexpr uint64_t Base = 2 << 20;
+  static constexpr uint64_t PerByte = 4;
 
-  size_t m_Left;
+  uint64_t m_Left;
 };
 
 class BuildAttributesInjector final : public BuildAttributesSectionParser {

@@ -199,7 +199,6 @@ bool QobixBuildAttributesDecodingParser::numericAndStringTag(uint32_t, uint32_t 
 }
 
 bool QobixBuildAttributesDecodingParser::addAlsoCompatible(AlsoCompatibilityTag entry) {
-  entry.tag &= 0x7F;
   if (m_AlsoCompatible.insert(entry).second) m_Attributes.addAlsoCompatibilityTag(std::move(entry));
   return true;
 }

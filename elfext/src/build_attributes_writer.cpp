@@ -69,7 +69,7 @@ private:
   // In the order in which they are met, but the public ABI's first.
   void collectVendors() {
     collectVendors(m_Module);
-    for (const Section* section : m_Module.getSections())
+    for (const Section* section : listedSections())
       collectVendors(*section);
     for (const Symbol* symbol : m_Module.getSymbols())
       collectVendors(*symbol);
@@ -95,15 +95,21 @@ private:
       appendWord(static_cast<uint32_t>(block->getData().size() + 5));
       appendData(*block);
     }
-    appendScope(Tag_Section, vendor, m_Module.getSections(), 0);
-    appendScope(Tag_Symbol, vendor, m_Module.getSymbols(), 1);
+    appendScope(Tag_Section, vendor, listedSections());
+    appendScope(Tag_Symbol, vendor, m_Module.getSymbols());
     patchSize(start, start);
   }
 
-  // A sub-subsection for each block, with the indices of all that have it.
+  // All but the null section: in a list, its index would be the end.
+  [[nodiscard]] std::span<Section* const> listedSections() const {
+    const std::span<Section* const> sections = m_Module.getSections();
+    return sections.empty() ? sections : sections.subspan(1);
+  }
+
+  // A sub-subsection for each block, with the indices, from 1, of all that have it.
   template <class Object>
-  void appendScope(AttributeScope scope, std::string_view vendor, std::span<Object* const> objects,
-                   uint32_t firstIndex) {
+  void appendScope(AttributeScope scope, std::string_view vendor,
+                   std::span<Object* const> objects) {
     std::vector<const BuildAttributesBlock*> blocks;
     std::unordered_map<const BuildAttributesBlock*, std::vector<uint32_t>> indices;
     for (uint32_t i = 0; i < objects.size(); ++i) {
@@ -111,7 +117,7 @@ private:
       if (block == nullptr) continue;
       std::vector<uint32_t>& ofBlock = indices[block];
       if (ofBlock.empty()) blocks.push_back(block);
-      ofBlock.push_back(firstIndex + i);
+      ofBlock.push_back(i + 1);
     }
     for (const BuildAttributesBlock* block : blocks) {
       const size_t start = m_Bytes.size();

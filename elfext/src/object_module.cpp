@@ -243,6 +243,8 @@ void ObjectModule::clear() {
     bool goes(const Preemption&) const override { return true; }
   };
   prune(Everything());
+  // The headers stay, but not where they were.
+  forgetPlacement();
   clearDynamicData();
   clearHeaderTables();
   clearBuildAttributes();

@@ -38,11 +38,13 @@ uint32_t ObjectModule::getSectionIndex(const Section* section) const {
 }
 
 // The new order is written beside the old one, in memory that does not stay with the module.
+// Relocations that are still rows come in the order that their sections had in the file.
 void ObjectModule::setSectionIndex(Section* section, uint32_t index) {
   QUARN_ASSERT(1, section != NULL);
   QUARN_ASSERT(1, section->m_ObjectModule == this);
   QUARN_ASSERT(1, index < m_Sections.getSize());
   QUARN_ASSERT(1, !m_IndexesFrozen);
+  materializeAllRelocations();
   const alloclib::RegionOwner region(
       alloclib::RegionGeneral::Create(0, "setSectionIndex() temp region"));
   FastArray<Section*> sections(region.get());

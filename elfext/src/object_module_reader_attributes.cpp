@@ -8,6 +8,7 @@
 #include "elfext/src/build_attributes_injector.h"
 #include "elfext/src/object_module_reader.h"
 
+#include <algorithm>
 #include <cstring>
 #include <string_view>
 #include <unordered_map>
@@ -17,10 +18,17 @@ namespace elfext {
 
 namespace {
 
-bool parseSection(ReadContext& context, const Section& section) {
+// False ends the read.
+bool viewContents(ReadContext& context, const Section& section, AttributeBytes& bytes) {
+  bytes = {};
+  if (section.getSize() == 0) return true;
   const uint8_t* contents = context.viewSection(section.getIndex());
-  const AttributeBytes bytes(contents, contents == nullptr ? 0 : section.getSize());
-  InjectionBudget budget(bytes.size());
+  if (contents == nullptr) return false;
+  bytes = {contents, section.getSize()};
+  return true;
+}
+
+bool parseSection(ReadContext& context, AttributeBytes bytes, InjectionBudget& budget) {
   for (const AttributeScope scope : {Tag_File, Tag_Section, Tag_Symbol}) {
     BuildAttributesInjector injector(context.module, scope, budget);
     if (!injector.parse(bytes, context.format.isLittle)) return false;
@@ -32,8 +40,11 @@ bool parseSection(ReadContext& context, const Section& section) {
 bool readAttributeSections(ReadContext& context, bool& areSectionsRead) {
   ObjectModule& module = context.module;
   areSectionsRead = false;
+  InjectionBudget budget(context.image.getSize());
   for (const Section* section : module.getBuildAttributesSections()) {
-    if (parseSection(context, *section)) continue;
+    AttributeBytes bytes;
+    if (!viewContents(context, *section, bytes)) return false;
+    if (parseSection(context, bytes, budget)) continue;
     const uint32_t index = section->getIndex();
     if (!goOn(module, &ErrorHandler::corruptBuildAttributes, index)) return false;
     module.dropBuildAttributes();
@@ -56,12 +67,12 @@ class NameReader {
 public:
   explicit NameReader(uint64_t imageSize) : m_Left(imageSize * PerByte + Base) {}
 
-  // Empty when too much has been read, as for a symbol without a name.
+  // Empty once too much has been read, as for a symbol without a name.
   [[nodiscard]] std::string_view read(const char* name) {
     const size_t length = name == nullptr ? 0 : strnlen(name, m_Left + 1);
-    if (length > m_Left) return {};
-    m_Left -= length;
-    return {name, length};
+    const bool isTooLong = length > m_Left;
+    m_Left -= std::min<uint64_t>(length, m_Left);
+    return isTooLong ? std::string_view() : std::string_view(name, length);
   }
 
 private:

@@ -121,7 +121,7 @@ private:
     std::vector<Extent> extents;
     for (uint32_t i = 0; i < m_Context.sectionCount(); ++i) {
       const SectionHeader& header = m_Context.sectionHeaders[i];
-      if (m_AreFileOffsets && header.type == SHT_NOBITS) continue;
+      if (header.type == SHT_NULL || (m_AreFileOffsets && header.type == SHT_NOBITS)) continue;
       extents.push_back({startOf(header), endOf(startOf(header), header.size), i});
     }
     return extents;

@@ -179,7 +179,7 @@ private:
 };
 
 bool needsSegment(const SectionHeader& header) {
-  return header.type == SHT_NOBITS ? header.size != 0 : header.type != SHT_NULL && header.size == 0;
+  return header.type != SHT_NULL && !hasFileBytes(header);
 }
 
 void tieSectionsWithoutBytes(ReadContext& context) {

@@ -15,6 +15,11 @@ namespace {
 // Only what is larger may have contents that stay in the file.
 constexpr uint64_t LargestEagerFile = 0x100000;
 
+void mustBeOpen(const support::FileHandle& file) {
+  const support::FileHandle* elfFile = file.isOpen() ? &file : nullptr;
+  QUARN_ASSERT(1, elfFile != NULL);
+}
+
 bool reportReadError(ObjectModule& module, support::HostError error) {
   module.clear();
   return refuse(module, &ErrorHandler::ioErrorReading, error);
@@ -125,13 +130,13 @@ bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> 
 
 bool readElfFile(support::Host& host, support::FileHandle elfFile, ObjectModule& module,
                  DeferredContentsSelector* selector) {
-  QUARN_ASSERT(1, elfFile.isOpen());
+  mustBeOpen(elfFile);
   return readWholeFile(host, elfFile, /*isOwnFile=*/false, module, selector);
 }
 
 bool readElfFile(support::Host& host, support::FileHandle elfFile, uint64_t offset, uint64_t size,
                  ObjectModule& module, DeferredContentsSelector*) {
-  QUARN_ASSERT(1, elfFile.isOpen());
+  mustBeOpen(elfFile);
   return readImage(module, std::make_unique<ImageBytes>(host, elfFile, offset, size, false),
                    nullptr);
 }

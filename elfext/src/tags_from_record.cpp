@@ -221,7 +221,7 @@ void TagsFromRecord::deriveDataSizes() {
 }
 
 AlsoCompatibilityTag alsoForArchitecture(uint32_t number) {
-  return {.tag = Tag_CPU_arch, .number = number, .text = {}};
+  return {Tag_CPU_arch, number, {}};
 }
 
 void BuildAttributes::deriveStandardTags() {

@@ -393,6 +393,14 @@ TEST_F(PrunerTest, ClearsEverything) {
   EXPECT_FALSE(module.getSectionHeaderTable().getFileExtent(nullptr, nullptr));
 }
 
+TEST_F(PrunerTest, ForgetsTheDistancesOfHeadersWhenCleared) {
+  Segment* segment = makeSegment();
+  ASSERT_TRUE(FileRegion::link(module.getElfHeader(), *segment, 0));
+  ASSERT_TRUE(FileRegion::link(*segment, module.getProgramHeaderTable(), 52));
+  module.clear();
+  EXPECT_TRUE(FileRegion::link(module.getElfHeader(), module.getProgramHeaderTable(), 64));
+}
+
 TEST_F(PrunerTest, KeepsNamesAndHeaderWhenCleared) {
   module.setFileName("lib.a");
   module.setObjectName("lib.a", "a.o");

@@ -282,6 +282,11 @@ TEST_F(PendingRowsTest, BecomeObjectsBeforeSymbolsMove) {
   EXPECT_EQ(section->getRelocation(2)->getTarget(), symbol);
 }
 
+TEST_F(PendingRowsTest, BecomeObjectsBeforeSectionsMove) {
+  module.setSectionIndex(secondRel, 0);
+  EXPECT_THAT(offsets(), testing::ElementsAre(10, 11, 20, 30, 31));
+}
+
 TEST_F(PendingRowsTest, BecomeObjectsBeforeSymbolsGo) {
   Symbol* other = makeUndefined("c");
   Relocation* kept = section->addRelocation(99, 1, other);

@@ -227,6 +227,15 @@ TEST_F(ReadDynamicTest, TheFirstSectionAtTheAddressHasTheMap) {
   EXPECT_THAT(preemptionsOf(readGood(file)), IsEmpty());
 }
 
+// The size of section 0 is the number of sections, and no stretch of addresses.
+TEST_F(ReadDynamicTest, SectionZeroIsAtNoAddress) {
+  ObjectBuilder file = object().extendedNumbering();
+  file.section(".map", SHT_ZEV_PREEMPTMAP).link(2).word(1).textOffset("f").word(0).word(0);
+  file.section(".dynstr", SHT_STRTAB);
+  file.section(".dynamic", SHT_DYNAMIC).link(2).dynamic(DT_ZEV_PREEMPTMAP, 0);
+  EXPECT_THAT(preemptionsOf(readGood(file)), ElementsAre("f<-:,"));
+}
+
 TEST_F(ReadDynamicTest, OnTheZevSystemTheMapIsFoundByItsPlaceInTheFile) {
   ObjectBuilder file = withMap(0x1000);
   file.osAbi(64);

@@ -322,8 +322,8 @@ TEST_F(ReadElfFileTest, EachFormNeedsWhatItReads) {
   EXPECT_DEATH(read(readElfFile(m_Host, "a.o", std::span<const uint8_t>(), *m_Module, nullptr)),
                "fileName != NULL && readBuffer != NULL");
   const support::FileHandle closed;
-  EXPECT_DEATH(read(readElfFile(m_Host, closed, *m_Module, nullptr)), "elfFile");
-  EXPECT_DEATH(read(readElfFile(m_Host, closed, 0, 1, *m_Module, nullptr)), "elfFile");
+  EXPECT_DEATH(read(readElfFile(m_Host, closed, *m_Module, nullptr)), "elfFile != NULL");
+  EXPECT_DEATH(read(readElfFile(m_Host, closed, 0, 1, *m_Module, nullptr)), "elfFile != NULL");
 }
 
 // ---- Memory that is lent

@@ -215,6 +215,19 @@ TEST_F(ReadPlacementTest, WhatIsTiedThroughOthersIsOneTree) {
   EXPECT_TRUE(areTied(*result.module->getSegment(1), result.module->getProgramHeaderTable(), 52));
 }
 
+TEST_F(ReadPlacementTest, NothingOfAnEarlierReadIsTied) {
+  const SegmentSpec segment = {.type = PT_NOTE, .offset = 0, .filesz = 116};
+  ObjectModule module;
+  for (const uint64_t offset : {52U, 84U}) {
+    ObjectBuilder file = object().type(ET_EXEC).segment(segment).segment(segment);
+    file.header(HeaderField::PhNum, 1).header(HeaderField::PhOff, offset);
+    const std::string bytes = file.bytes();
+    m_Host.addFile("a.out", bytes);
+    ASSERT_TRUE(readElfFile(m_Host, "a.out", 0, bytes.size(), module, nullptr));
+    EXPECT_TRUE(areTied(module.getElfHeader(), module.getProgramHeaderTable(), offset));
+  }
+}
+
 namespace {
 
 // A file with these segments and a section without bytes at offset 1000, address 5000.
@@ -272,7 +285,7 @@ TEST_F(ReadPlacementTest, AnEmptySectionGoesToASegmentToo) {
   const ReadResult result = readGood(file);
   EXPECT_EQ(holderOf(result, 1), 0);
   EXPECT_EQ(holderOf(result, 2), -1);
-  EXPECT_EQ(holderOf(result, 3), -1);
+  EXPECT_EQ(holderOf(result, 3), 0);
 }
 
 TEST_F(ReadPlacementTest, ABetterSegmentAlsoHoldsTheAddress) {

@@ -1,0 +1,119 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The bytes of attribute sections, piece by piece:
+//
+//   attributeSection({vendorPart("qobix", {filePart(tag(6, 10)), sectionPart({1, 4}, tag(30,
+//   2))})})
+#pragma once
+
+#include "elfext/interface/build_attributes_tags.h"
+
+#include <cstdint>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace elfext {
+
+inline std::string uleb(uint32_t value) {
+  std::string bytes;
+  for (; value >= 0x80; value >>= 7)
+    bytes += static_cast<char>(0x80 | value);
+  return bytes + static_cast<char>(value);
+}
+
+inline std::string ntbs(std::string_view text) {
+  return std::string(text) + '\0';
+}
+
+inline std::string lengthField(size_t value, bool isLittle) {
+  std::string bytes;
+  for (uint32_t i = 0; i < 4; ++i)
+    bytes += static_cast<char>(value >> 8 * (isLittle ? i : 3 - i));
+  return bytes;
+}
+
+// ---- Attributes
+
+inline std::string tag(uint32_t number, uint32_t value) {
+  return uleb(number) + uleb(value);
+}
+
+inline std::string tag(uint32_t number, std::string_view text) {
+  return uleb(number) + ntbs(text);
+}
+
+inline std::string tag(uint32_t number, uint32_t value, std::string_view text) {
+  return uleb(number) + uleb(value) + ntbs(text);
+}
+
+// ---- Parts of a section
+
+struct AttributePart {
+  uint32_t kind;
+  std::string payload;
+};
+
+inline AttributePart filePart(std::string attributes) {
+  return {Tag_File, std::move(attributes)};
+}
+
+inline AttributePart indexedPart(uint32_t kind, const std::vector<uint32_t>& indices,
+                                 std::string_view attributes) {
+  std::string payload;
+  for (const uint32_t index : indices)
+    payload += uleb(index);
+  payload += '\0';
+  payload += attributes;
+  return {kind, payload};
+}
+
+inline AttributePart sectionPart(const std::vector<uint32_t>& indices,
+                                 std::string_view attributes) {
+  return indexedPart(Tag_Section, indices, attributes);
+}
+
+inline AttributePart symbolPart(const std::vector<uint32_t>& indices, std::string_view attributes) {
+  return indexedPart(Tag_Symbol, indices, attributes);
+}
+
+inline std::string subSubsection(const AttributePart& part, bool isLittle) {
+  const std::string kind = uleb(part.kind);
+  return kind + lengthField(kind.size() + 4 + part.payload.size(), isLittle) + part.payload;
+}
+
+struct VendorPart {
+  std::string vendor;
+  std::vector<AttributePart> parts;
+};
+
+inline VendorPart vendorPart(std::string vendor, std::vector<AttributePart> parts) {
+  return {std::move(vendor), std::move(parts)};
+}
+
+// A subsection of these bytes.
+inline std::string subsection(std::string_view bytes, bool isLittle = true) {
+  return lengthField(4 + bytes.size(), isLittle) + std::string(bytes);
+}
+
+inline std::string attributeSection(const std::vector<VendorPart>& vendors, bool isLittle = true) {
+  std::string bytes = "A";
+  for (const VendorPart& vendor : vendors) {
+    std::string content = ntbs(vendor.vendor);
+    for (const AttributePart& part : vendor.parts)
+      content += subSubsection(part, isLittle);
+    bytes += subsection(content, isLittle);
+  }
+  return bytes;
+}
+
+inline std::span<const uint8_t> bytesOf(std::string_view text) {
+  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
+}
+
+inline std::string textOf(std::span<const uint8_t> bytes) {
+  return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+}
+
+} // namespace elfext
