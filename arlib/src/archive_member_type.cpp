@@ -118,7 +118,7 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
 bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
                       elfext::FullAttr& attributes) {
   constexpr std::string_view Prefix = elfext::DecorationPrefix;
-  uint64_t left = 4 * objectSize;
+  uint64_t left = 2 * objectSize;
   bool isFirst = true;
   for (const elfext::Symbol* symbol : module.getSymbols()) {
     const char* name = symbol->getName();

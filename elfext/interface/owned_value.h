@@ -16,9 +16,9 @@ public:
   OwnedValue() = default;
   OwnedValue(const OwnedValue& other)
       : m_Value(other ? std::make_unique<T>(*other) : std::unique_ptr<T>()) {}
-  OwnedValue(OwnedValue&&) = default;
+  OwnedValue(OwnedValue&&) noexcept = default;
   OwnedValue& operator=(const OwnedValue& other) { return *this = OwnedValue(other); }
-  OwnedValue& operator=(OwnedValue&&) = default;
+  OwnedValue& operator=(OwnedValue&&) noexcept = default;
   ~OwnedValue() = default;
 
   explicit operator bool() const { return m_Value != nullptr; }
