@@ -10,9 +10,12 @@
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/sizes_statistics.h"
 #include "quarn/reporting.h"
+#include "support/interface/shared_texts.h"
 
 #include <cstdint>
+#include <deque>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace quarn {
@@ -34,7 +37,7 @@ struct ObjectSizes {
 
 struct EntryRecord {
   uint32_t offset;
-  std::string sectionName; // a copy: the object is gone when it is printed
+  std::string_view sectionName; // a copy: the object is gone when it is printed
   std::string_view objectName;
 };
 
@@ -55,6 +58,7 @@ private:
   uint32_t m_Flags;
   ObjectSizes m_Totals;
   std::vector<EntryRecord> m_Entries;
+  std::deque<std::string> m_SectionNames;
 };
 
 void printRow(const ObjectSizes& sizes, std::string_view name) {
@@ -83,13 +87,18 @@ void ObjectReport::addMember(ArchiveMember& member) {
 
 void ObjectReport::addEntries(const elfext::ObjectModule& module, const ArchiveMember& member) {
   constexpr uint32_t EntryFlags = elfext::SHF_ALLOC | EntryFlag;
+  std::vector<const char*> names;
   for (const elfext::Section* section : module.getSections()) {
     if (section->getType() != elfext::SHT_PROGBITS) continue;
     if ((section->getFlags() & EntryFlags) != EntryFlags) continue;
     const char* name = section->getName();
-    m_Entries.push_back(
-        {static_cast<uint32_t>(module.getEntry()), name == nullptr ? "" : name, member.getName()});
+    names.push_back(name == nullptr ? "" : name);
   }
+  const auto copy = [this](std::string_view whole) -> std::string_view {
+    return m_SectionNames.emplace_back(whole);
+  };
+  for (const std::string_view name : support::copyShared(names, copy))
+    m_Entries.push_back({static_cast<uint32_t>(module.getEntry()), name, member.getName()});
 }
 
 void ObjectReport::addSizes(elfext::ObjectModule& module, const ArchiveMember& member) {

@@ -13,10 +13,9 @@
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/format_recognizer.h"
 #include "elfext/interface/object_module.h"
+#include "support/interface/shared_texts.h"
 
-#include <algorithm>
 #include <cstring>
-#include <functional>
 #include <span>
 #include <vector>
 
@@ -75,29 +74,6 @@ bool isPublished(const elfext::Symbol& symbol, bool includeDebugSymbols) {
   return symbol.getName() != nullptr && *symbol.getName() != '\0';
 }
 
-// Copies each text once for all names that are ends of it; all texts together are no longer than
-// the object.
-void addSharedNames(std::span<const char* const> published, SymbolNameList& names) {
-  std::vector<const char*> sorted(published.begin(), published.end());
-  std::sort(sorted.begin(), sorted.end(), std::less<>());
-  // By place. A name that starts within the text before it, or at its end, is an end of that.
-  std::vector<std::string_view> texts;
-  std::vector<std::string_view> copies;
-  for (const char* name : sorted) {
-    if (!texts.empty() && !std::less<>()(texts.back().data() + texts.back().size(), name)) continue;
-    texts.emplace_back(name);
-    copies.push_back(names.copy(texts.back()));
-  }
-  const auto startsBehind = [](const char* name, std::string_view text) {
-    return std::less<>()(name, text.data());
-  };
-  for (const char* name : published) {
-    const auto next = std::upper_bound(texts.begin(), texts.end(), name, startsBehind);
-    const size_t index = static_cast<size_t>(next - texts.begin()) - 1;
-    names.addCopied(copies[index].substr(static_cast<size_t>(name - texts[index].data())));
-  }
-}
-
 // Names that are more bytes than their object has in all must have bytes in common.
 void addNames(std::span<const char* const> published, uint64_t objectSize, SymbolNameList& names) {
   uint64_t bytes = 0;
@@ -106,7 +82,10 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
     bytes += text.size();
     if (bytes > objectSize) {
       names.clear();
-      return addSharedNames(published, names);
+      const auto copy = [&names](std::string_view whole) { return names.copy(whole); };
+      for (const std::string_view shared : support::copyShared(published, copy))
+        names.addCopied(shared);
+      return;
     }
     names.add(text);
   }

@@ -5,6 +5,7 @@
 
 #include "elfext/interface/full_attr.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <string_view>
 
@@ -166,5 +167,30 @@ constexpr std::string_view AccessNames[] = {
     "S21",  "S11",  "US84", "US82", "US81", "US42", "US41", "US21",
 };
 // clang-format on
+
+// A set that stood behind a part of it would lose that part to it. One does: "FPiv8" is only read.
+consteval bool standBeforeTheirParts() {
+  for (const FeatureToken& token : FeatureTokens) {
+    if (token.use == TokenUse::Read || token.token == "FPiv8") continue;
+    for (const FeatureToken* before = FeatureTokens; before != &token; ++before) {
+      const bool isPart = token.set.contains(before->set) && token.set != before->set;
+      if (before->use != TokenUse::Read && isPart) return false;
+    }
+  }
+  return true;
+}
+static_assert(standBeforeTheirParts());
+
+template <size_t Count>
+consteval bool standBeforeTheirParts(const FlagToken (&tokens)[Count]) {
+  for (const FlagToken& token : tokens) {
+    for (const FlagToken* before = tokens; before != &token; ++before) {
+      if ((token.bits & before->bits) == before->bits) return false;
+    }
+  }
+  return true;
+}
+static_assert(standBeforeTheirParts(FlagTokens));
+static_assert(standBeforeTheirParts(Stack8Tokens));
 
 } // namespace elfext
