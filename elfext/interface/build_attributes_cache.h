@@ -24,8 +24,8 @@ public:
   // The block of that vendor and those bytes, which are copied if it is new.
   const BuildAttributesBlock* getBlock(std::string_view vendor, std::span<const uint8_t> data);
 
-  // The set that equals the given one, with its record brought up to date if it is new. Of sets
-  // that compare equal, though they differ in what comparison leaves out, the first one stays.
+  // The set that equals the given one. Of sets that compare equal, though they differ in what
+  // comparison leaves out, the first one stays.
   const BuildAttributes* getBuildAttributes(const BuildAttributes& attributes);
 
   // The set that an attribute text stands for.

@@ -26,8 +26,8 @@ public:
   // large enough.
   void setSize(uint32_t size) {
     const uint32_t overflow = size > InlineSlots ? size - InlineSlots : 0;
-    if (overflow == 0 || overflow > m_OverflowCapacity) {
-      m_Overflow = overflow == 0 ? nullptr : std::make_unique<T*[]>(overflow);
+    if (overflow > m_OverflowCapacity) {
+      m_Overflow = std::make_unique<T*[]>(overflow);
       m_OverflowCapacity = overflow;
     }
     m_InlineUsed = std::min(size, InlineSlots);

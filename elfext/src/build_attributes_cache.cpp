@@ -25,9 +25,7 @@ const BuildAttributesBlock* BuildAttributesCache::getBlock(std::string_view vend
 }
 
 const BuildAttributes* BuildAttributesCache::getBuildAttributes(const BuildAttributes& attributes) {
-  const BuildAttributes& kept = *m_Attributes.insert(attributes).first;
-  static_cast<void>(kept.getFullAttr());
-  return &kept;
+  return &*m_Attributes.insert(attributes).first;
 }
 
 const BuildAttributes& BuildAttributesCache::getBuildAttributesOf(std::string_view text) {
