@@ -79,8 +79,7 @@ uint32_t conditionsOfSegments(const ReadContext& context) {
   if (hasBuildAttributesSymbol(module)) conditions |= ReadCondition_HasBuildAttributesSymbol;
   if (!module.getBuildAttributesSections().empty())
     conditions |= ReadCondition_HasBuildAttributesSection;
-  if (module.getReadBuffer() == nullptr)
-    conditions |= ReadCondition_HasCopiedStrings;
+  if (module.getReadBuffer() == nullptr) conditions |= ReadCondition_HasCopiedStrings;
   if (context.hasSymbolTableSizeTag) conditions |= ReadCondition_HasSymbolTableSizeTag;
   if (std::any_of(context.programHeaders.begin(), context.programHeaders.end(), isIncongruent))
     conditions |= ReadCondition_HasIncongruentSegment;

@@ -14,26 +14,26 @@ constexpr CatalogueRow Rows[] = {
     {OutOfMemory,                  "メモリが不足しています"},
     {NotInArchiveFormat,           "'%s' はアーカイブ形式ではありません"},
     {MalformedArchive,             "'%s': アーカイブの形式が不正です: %s"},
-    {WritingArchive,               "ファイル '%s' の書き込み : %s"},
+    {WritingArchive,               "ファイル '%s' への書き込みに失敗しました : %s"},
     {NotPresentInArchive,          "'%s' はアーカイブ '%s' に存在しません"},
     {ArchiveNotFound,              "アーカイブ '%s' が見つかりません : %s"},
     {FileDoesNotExist,             "ファイル '%s' が存在しません"},
-    {ReadingFile,                  "ファイル '%s' の読み込み : %s"},
-    {AlreadyExists,                "'%s' は既に存在するため、抽出されません"},
+    {ReadingFile,                  "ファイル '%s' の読み込みに失敗しました : %s"},
+    {AlreadyExists,                "'%s' は既に存在するため、抽出しません"},
     {NoArchiveSpecified,           "アーカイブが指定されていません"},
     {NoActionSpecified,            "操作 -[%s] のいずれかを指定する必要があります"},
     {OnlyOneAction,                "操作オプションは 1 つしか指定できません"},
     {PositionNotFound,             "位置 '%s' が見つかりません"},
-    {FilenameTooLong,              "ファイル名 '%s' はファイルシステムに対して長すぎます"},
-    {WritingExtractedFile,         "ファイル '%s' の書き込み : %s"},
+    {FilenameTooLong,              "ファイル名 '%s' はこのファイルシステムには長すぎます"},
+    {WritingExtractedFile,         "ファイル '%s' への書き込みに失敗しました : %s"},
     {NoSymbolTable,                "アーカイブ '%s' にはシンボルテーブルがありません"},
     {CreatingArchive,              "アーカイブ '%s' を作成しています"},
     {NoBaseVariant,                "アーカイブメンバ '%s' のマイナーバリアントに基本バリアントが含まれていません"},
     {AddingNonElfObject,           "ELF ではないオブジェクト '%s' をアーカイブ '%s' に追加しています"},
     {MultipleBaseVariants,         "アーカイブメンバ '%s' のマイナーバリアントに複数の基本バリアントが含まれています"},
-    {UndecoratableDifference,      "'%2$s' で始まるマイナーバリアントグループのアーカイブメンバ '%1$s' の属性の差に、シンボル装飾で表現できない属性が含まれています"},
-    {CommonAttributesIncompatible, "'%s' で始まるマイナーバリアントグループの共通属性がライブラリの属性と互換ではありません。"},
-    {MemberAttributesIncompatible, "マイナーバリアントのメンバオブジェクト '%s' の属性がライブラリの属性と互換ではありません。"},
+    {UndecoratableDifference,      "'%2$s' で始まるマイナーバリアントグループのアーカイブメンバ '%1$s' の属性の差異に、シンボル装飾で表現できない属性が含まれています"},
+    {CommonAttributesIncompatible, "'%s' で始まるマイナーバリアントグループの共通属性は、ライブラリの属性と互換性がありません。"},
+    {MemberAttributesIncompatible, "マイナーバリアントのメンバオブジェクト '%s' の属性は、ライブラリの属性と互換性がありません。"},
     {HelpCommandFormat,            "\n"
                                    "アーカイブ作成・保守ツール\n"
                                    "\n"
@@ -56,19 +56,19 @@ constexpr CatalogueRow Rows[] = {
                                    "\n"},
     {HelpOtherOptions,             " -n         オブジェクトアーカイブにシンボルテーブルを追加しません。\n"
                                    " -s         アーカイブのシンボルテーブルを強制的に再生成します。\n"
-                                   " -t         アーカイブの内容一覧を出力します。\n"
+                                   " -t         アーカイブの内容一覧を表示します。\n"
                                    "--zs        シンボルテーブルを表示します。\n"
                                    "--zt        アーカイブの内容を要約します (サイズ + エントリ)。\n"
-                                   " -c         新しいアーカイブを作成するときの警告を抑止します。\n"
+                                   " -c         新しいアーカイブを作成するときの警告を抑制します。\n"
                                    " -C         抽出時に既存のファイルを上書きしません。\n"
                                    " -T         ファイル名をシステムの最大長に切り詰めます。\n"
-                                   " -v         詳細な出力を行います。\n"
+                                   " -v         詳細な情報を出力します。\n"
                                    "--create    新しいアーカイブを強制的に作成します。\n"
                                    "--via file  via ファイルから追加の引数を読み込みます。\n"
                                    "--sizes     各メンバのサイズとライブラリの合計を一覧表示します。\n"
                                    "--entries   ENTRY ポイントを含むセクションを一覧表示します。\n"
-                                   "--vsn       現在の Quarn のバージョンを出力します。 \n"
-                                   "--help      このメッセージを出力します。 \n"
+                                   "--vsn       Quarn の現在のバージョンを表示します。\n"
+                                   "--help      このメッセージを表示します。\n"
                                    "\n"},
     {HelpExamples,                 "例:-\n"
                                    "\n"
@@ -94,32 +94,32 @@ constexpr CatalogueRow Rows[] = {
     {VariantGroupMember,           " * %s [%u] : %s"},
     {AttributeClash,               " * %s は %s と競合しています\n"},
     {MalformedArchiveWarning,      "'%s': アーカイブの形式が不正です: %s"},
-    {SeekingFile,                  "ファイル '%s' のシーク : %s"},
-    {ClosingFile,                  "ファイル '%s' のクローズ : %s"},
-    {DeletingFile,                 "ファイル '%s' の削除 : %s"},
+    {SeekingFile,                  "ファイル '%s' のシークに失敗しました : %s"},
+    {ClosingFile,                  "ファイル '%s' のクローズに失敗しました : %s"},
+    {DeletingFile,                 "ファイル '%s' の削除に失敗しました : %s"},
     {OutputReadOnly,               "出力ファイル '%s' は読み取り専用です"},
     {NoMembersForCreate,           "--create にアーカイブメンバが指定されていません"},
-    {UnrecognizedOption,           "オプション '%s%s' は認識されません。"},
+    {UnrecognizedOption,           "オプション '%s%s' は認識できません。"},
     {MissingArgument,              "オプション '%s' の引数がありません。"},
     {RecursiveViaFile,             "via ファイルの再帰的な取り込みが、ファイル '%2$s' で深さ %1$d に達しました。"},
     {ArgumentNotPermitted,         "引数 '%s' はオプション '%s' では使用できません。"},
     {ViaFileNotOpened,             "via ファイル '%s' を開けませんでした。"},
     {ViaFileReadError,             "via ファイル '%s' の読み込み中にエラーが発生しました。"},
     {MalformedViaFile,             "via ファイル '%s' の形式が不正です。"},
-    {ViaFileCommandTooLong,        "via ファイル '%s' のコマンドがバッファに対して長すぎます。"},
+    {ViaFileCommandTooLong,        "via ファイル '%s' のコマンドが長すぎてバッファに収まりません。"},
     {IntegerOverflow,              "オーバーフロー: '%s' は整数に収まりません。"},
     {OldSyntax,                    "古い構文です。'%s%s%s%s' を使用してください。"},
-    {DeprecatedOption,             "オプション '%s' は推奨されません。"},
-    {ViaFileNotClosed,             "via ファイル '%s' を閉じることができませんでした。"},
-    {SelectableArguments,          "オプション '%s' には次の引数を選択できます:\n %s"},
-    {DeprecatedArgument,           "オプション '%2$s' の引数 '%1$s' は推奨されません"},
+    {DeprecatedOption,             "オプション '%s' は非推奨です。"},
+    {ViaFileNotClosed,             "via ファイル '%s' を閉じられませんでした。"},
+    {SelectableArguments,          "オプション '%s' には次の引数を指定できます:\n %s"},
+    {DeprecatedArgument,           "オプション '%2$s' の引数 '%1$s' は非推奨です"},
     {UnexpectedArgument,           "オプション '%s%s' に予期しない引数があります"},
-    {ConcatenatedOptionArgument,   "連結されたオプションに引数を指定することはできません: -%s %s"},
+    {ConcatenatedOptionArgument,   "連結されたオプションには引数を指定できません: -%s %s"},
     {NulInViaFile,                 "via ファイル '%s' に文字 '\\0' が見つかりました。バイナリファイルの可能性があります。via ファイルの解析を中止します。"},
     {PossibleMatches,              "'%s' に一致する可能性があるのは '%s' や '%s' などです。"},
     {RepeatedOption,               "連結されたオプション '-%2$s%3$s%4$s' でオプション '-%1$s' が繰り返されています。"},
     {LocaleNotInitialised,         "メッセージロケール %s を初期化できませんでした"},
-    {UnknownDiagnosticNumber,      "不明な診断番号 %s"},
+    {UnknownDiagnosticNumber,      "不明な診断番号です: %s"},
 };
 // clang-format on
 
