@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "quarn/quarn_main.h"
-#include "elfext/interface/library_attribute_map.h"
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"

@@ -291,6 +291,18 @@ A hundred thousand words are no trouble, wherever the pieces of the file end.
   $ { echo -t lib.a; yes a.txt | head -100000; } > many
   $ quarn --via many | sort | uniq -c | sed 's/^ *//'
   100000 a.txt
+  $ { echo --show_cmdline -h; yes "a.txt \"a b\" 'a b' no\\x \"q\\\\\\\"\"" | head -20000 | sed 's/$/\r/'; } | head -c -2 > many
+  $ quarn --via many 2>&1 > help | tr ' ' '\n' | sort | uniq -c | sed 's/^ *//'
+  40000 "a
+  1 --help
+  1 --show_cmdline
+  1 --via=many
+  1 [quarn
+  20000 a.txt
+  40000 b"
+  20000 no\x
+  19999 q\"
+  1 q\"]
   $ for blanks in $(seq 1015 1030); do
   >   { printf -- "-t%${blanks}slib.a %s %s" '' a.txt '"a b"'; } > via
   >   quarn --via via

@@ -9,10 +9,9 @@
 #include "tabledrivenparser/interface/option_report.h"
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/text_sink.h"
-#include "tabledrivenparser/interface/via_file_reader.h"
+#include "tests/fuzz/one_file.h"
 
-#include <algorithm>
-#include <cstring>
+#include <cstdlib>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -25,29 +24,6 @@ class SilentReporter final : public Reporter {
 public:
   void reportOptionMessage(ReportLevel, OptionMessage,
                            std::span<const OptionMessageArgument>) override {}
-};
-
-// Every name is the same file, so that a via file may read itself.
-class OneFile final : public ViaFileReader {
-public:
-  OneFile(std::string_view text, size_t pieceSize) : m_Text(text), m_PieceSize(pieceSize) {}
-
-  void* open(const char*) override { return new size_t(0); }
-  ptrdiff_t read(void* file, char* buffer, size_t size) override {
-    size_t& position = *static_cast<size_t*>(file);
-    const size_t count = std::min({size, m_PieceSize, m_Text.size() - position});
-    if (count > 0) std::memcpy(buffer, m_Text.data() + position, count);
-    position += count;
-    return static_cast<ptrdiff_t>(count);
-  }
-  bool close(void* file) override {
-    delete static_cast<size_t*>(file);
-    return true;
-  }
-
-private:
-  std::string_view m_Text;
-  size_t m_PieceSize;
 };
 
 void writeAgain(const Parser& parser) {

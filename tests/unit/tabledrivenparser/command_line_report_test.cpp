@@ -246,7 +246,7 @@ private:
   uint32_t pick(uint32_t bound) { return static_cast<uint32_t>(m_Random() % bound); }
 
   std::string text() {
-    static constexpr std::string_view letters = "atvx=,-. \t\\%#(;1A\xc3";
+    static constexpr std::string_view letters = "atvx=,-. \t\n\x01\\%#(;'1A\xc3\xff";
     std::string result;
     for (uint32_t count = pick(5); count > 0; --count) {
       result += letters[pick(static_cast<uint32_t>(letters.size()))];

@@ -5,7 +5,10 @@
 #include "tabledrivenparser/interface/stdio_via_file_reader.h"
 
 #include <cstdio>
+#include <ctime>
 #include <filesystem>
+#include <iterator>
+#include <utility>
 
 namespace tabledrivenparser::tool {
 
@@ -204,18 +207,43 @@ TEST_F(ViaOption, takesNoPartInConcatenation) {
                           "fatal: Concatenated options cannot have arguments: -via =f"));
 }
 
+// Words of every kind, each with what it is to the parser.
+constexpr std::pair<const char*, const char*> kindsOfWords[] = {
+    {"plain", "plain"},           {"\"a b\"", "a b"},
+    {"'c \"d\" e'", "c \"d\" e"}, {"dir\\file.o", "dir\\file.o"},
+    {"\"q\\\"\\\\\"", "q\"\\"},   {"\\\\server\\x\\", "\\\\server\\x\\"},
+    {"(f g)", "(f g)"},           {"\"\"", ""},
+    {"h#comment\ni", "hi"},
+};
+constexpr const char* dividers[] = {"\r\n", " ", "\n", "\t \r\n\r\n", "\v\f", " ;comment\r\n"};
+
+// The file has no line end at its own end.
 TEST_F(ViaOption, takesAHundredThousandWords) {
   constexpr size_t wordCount = 100 * 1000;
-  std::string contents;
-  for (size_t word = 0; word < wordCount; ++word)
-    contents += "w" + std::to_string(word) + "\r\n";
-  files()["f"] = contents;
-  m_Session.parse({"--via", "f"});
-  const Lines words = m_Session.texts(Id_Words);
-  ASSERT_EQ(words.size(), wordCount);
+  std::string& contents = files()["f"];
+  Lines expected;
   for (size_t word = 0; word < wordCount; ++word) {
-    ASSERT_EQ(words[word], "w" + std::to_string(word));
+    const auto& [written, meant] = kindsOfWords[word % std::size(kindsOfWords)];
+    contents += dividers[word * 7 / 3 % std::size(dividers)];
+    contents += written;
+    expected.push_back(meant);
   }
+  m_Session.parse({"--via", "f"});
+  EXPECT_TRUE(m_Session.texts(Id_Words) == expected);
+  EXPECT_THAT(m_Session.reports(), IsEmpty());
+}
+
+// One look at all earlier words for each word would take hours.
+TEST_F(ViaOption, takesTimeInProportionToTheWords) {
+  constexpr size_t wordCount = 1000 * 1000;
+  std::string& contents = files()["f"];
+  for (size_t word = 0; word < wordCount / 4; ++word)
+    contents += "lib.a \"a b\" --diag_error=L1,L2\n";
+  const std::clock_t start = std::clock();
+  m_Session.parse({"--via", "f"});
+  EXPECT_LT((std::clock() - start) / CLOCKS_PER_SEC, 20);
+  EXPECT_EQ(m_Session.texts(Id_Words).size(), wordCount / 2);
+  EXPECT_EQ(m_Session.texts(Id_DiagError).size(), wordCount / 2);
 }
 
 // The reader of real files.

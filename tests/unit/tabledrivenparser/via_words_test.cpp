@@ -201,11 +201,22 @@ TEST_P(ViaBufferBounds, cutNoWordHoweverTheFileFallsOnThem) {
 INSTANTIATE_TEST_SUITE_P(Shift, ViaBufferBounds,
                          testing::Range(size_t{0}, size_t{1025}, size_t{32}));
 
+// What is in front moves the words: blanks, a comment, or other words.
 TEST(ViaBuffer, cutsNoWordAtAnyPosition) {
-  const std::string text = "ab \"c d\" e\\\\f '\\'' x#y\nz \\\" (g h) \"\" last";
-  const Lines expected = {"ab", "c d", "e\\\\f", "'", "xz", "\"", "(g h)", "", "last"};
-  for (size_t shift = 0; shift <= 1024; ++shift) {
-    ASSERT_THAT(wordsOf(std::string(shift, ' ') + text), ElementsAreArray(expected)) << shift;
+  const std::string text =
+      "ab \"c d\"\r\ne\\\\f\r\n'\\'' x#y\nz \\\" \"\\\"\\\\\" (g h)\t\"\" \\ last";
+  const Lines expected = {"ab",   "c d",   "e\\\\f", "'",  "xz",  "\"",
+                          "\"\\", "(g h)", "",       "\\", "last"};
+  std::string otherWords = "\r\n";
+  Lines otherAndExpected = expected;
+  for (size_t shift = 0; shift <= ViaFile::bufferSize; ++shift) {
+    const std::string blanks(shift, ' ');
+    ASSERT_THAT(wordsOf(blanks + text), ElementsAreArray(expected)) << shift;
+    ASSERT_THAT(wordsOf(blanks + text + "\n"), ElementsAreArray(expected)) << shift;
+    ASSERT_THAT(wordsOf("#" + blanks + "\n" + text), ElementsAreArray(expected)) << shift;
+    ASSERT_THAT(wordsOf(otherWords + text), ElementsAreArray(otherAndExpected)) << shift;
+    if (shift % 2 == 0) otherAndExpected.insert(otherAndExpected.begin(), "o");
+    otherWords.insert(0, shift % 2 == 0 ? "o" : " ");
   }
 }
 
