@@ -328,8 +328,8 @@ void RegionGeneral::setFastLimit() {
 // A region that does not trace counts its blocks; a tracing one its allocations, and of a block
 // only what no client gets.
 void RegionGeneral::noteBlock(const void* block, size_t bytes, size_t overhead) {
-  if (!isTracing()) return m_Stats->allocated(block, bytes, 0);
   m_Stats->extended();
+  if (!isTracing()) return m_Stats->allocated(block, bytes, 0);
   m_Stats->overheadIncreased(overhead);
 }
 

@@ -90,6 +90,10 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   > Error: L6831E: 'none' はアーカイブ 'lib.a' に存在しません
   > E
   1
+  $ in_japanese -xC lib.a a.o <<'E'
+  > Error: L6836E: 'a.o' は既に存在するため、抽出しません
+  > E
+  1
   $ in_japanese -r --diag_style=ide new.a a.o <<'E'
   > quarn : warning L6875:  ELF ではないオブジェクト 'a.o' をアーカイブ 'new.a' に追加しています
   > quarn : アーカイブ 'new.a' を作成しています
@@ -104,13 +108,31 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   > Fatal error: L3903U: 引数 'x' はオプション 'normalise' では使用できません。
   > E
   1
+  $ in_japanese --diag_error=0 --unknown <<'E'
+  > Warning: L9962I: 不明な診断番号です: 0
+  > Fatal error: L3900U: オプション '--unknown' は認識できません。
+  > E
+  1
+  $ in_japanese --message_locale=fr_FR -t lib.a <<'E'
+  > Fatal error: L9780E: メッセージロケール fr_FR を初期化できませんでした
+  > E
+  1
+  $ in_japanese -t . <<'E'
+  > Error: L6835E: ファイル '.' の読み込みに失敗しました : Is a directory
+  > E
+  1
+  $ echo --via=again > again
+  $ in_japanese --via=again <<'E'
+  > Fatal error: L3902U: via ファイルの再帰的な取り込みが、ファイル 'again' で深さ 10 に達しました。
+  > E
+  1
   $ in_japanese --via none <<'E'
   > Fatal error: L3904U: via ファイル 'none' を開けませんでした。
   > E
   1
   $ variant 1.o; variant 2.o '$R:L22'
   $ in_japanese --create variants.a 1.o 2.o <<'E'
-  > Warning: L6877W: '1.o' で始まるマイナーバリアントグループのアーカイブメンバ '2.o' の属性の差に、シンボル装飾で表現できない属性が含まれています
+  > Warning: L6877W: '1.o' で始まるマイナーバリアントグループのアーカイブメンバ '2.o' の属性の差異に、シンボル装飾で表現できない属性が含まれています
   > E
   0
   $ in_japanese --sizes variants.a <<'E'
@@ -158,19 +180,19 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   > 
   >  -n         オブジェクトアーカイブにシンボルテーブルを追加しません。
   >  -s         アーカイブのシンボルテーブルを強制的に再生成します。
-  >  -t         アーカイブの内容一覧を出力します。
+  >  -t         アーカイブの内容一覧を表示します。
   > --zs        シンボルテーブルを表示します。
   > --zt        アーカイブの内容を要約します (サイズ + エントリ)。
-  >  -c         新しいアーカイブを作成するときの警告を抑止します。
+  >  -c         新しいアーカイブを作成するときの警告を抑制します。
   >  -C         抽出時に既存のファイルを上書きしません。
   >  -T         ファイル名をシステムの最大長に切り詰めます。
-  >  -v         詳細な出力を行います。
+  >  -v         詳細な情報を出力します。
   > --create    新しいアーカイブを強制的に作成します。
   > --via file  via ファイルから追加の引数を読み込みます。
   > --sizes     各メンバのサイズとライブラリの合計を一覧表示します。
   > --entries   ENTRY ポイントを含むセクションを一覧表示します。
-  > --vsn       現在の Quarn のバージョンを出力します。 
-  > --help      このメッセージを出力します。 
+  > --vsn       Quarn の現在のバージョンを表示します。
+  > --help      このメッセージを表示します。
   > 
   > 例:-
   > 

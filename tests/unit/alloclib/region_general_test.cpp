@@ -5,6 +5,7 @@
 #include "region_fixture.h"
 
 #include <cstring>
+#include <sstream>
 
 namespace alloclib {
 namespace {
@@ -429,6 +430,23 @@ TEST_F(RegionGeneralCreateTest, TheTransparentModeForwardsToARegionOfItsOwn) {
   // The initial size is that of the inner region's first block.
   EXPECT_THAT(getReport(false, false), testing::HasSubstr("shell,               20480,"));
   region->Destroy(true);
+}
+
+TEST_F(RegionGeneralCreateTest, ATraceTellsOfEachNewBlockInEveryMode) {
+  setTraceLevel(1);
+  for (int mode : {Debug_Plain, Debug_Tracing}) {
+    setDebugMode(mode);
+    testing::internal::CaptureStderr();
+    RegionGeneral* region = RegionGeneral::Create(0, "grows");
+    (void)region->allocate(8000);
+    (void)region->allocate(20000);
+    region->Destroy(true);
+    std::istringstream trace(testing::internal::GetCapturedStderr());
+    int count = 0;
+    for (std::string line; std::getline(trace, line);)
+      count += line.starts_with("(grows:") && line.ends_with(") region extended");
+    EXPECT_EQ(count, 3) << trace.str();
+  }
 }
 
 TEST_F(RegionGeneralCreateDeathTest, AnUnknownModeIsAFault) {

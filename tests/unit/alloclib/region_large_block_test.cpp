@@ -61,6 +61,14 @@ TEST_F(RegionLargeBlockTest, ARunSkipsAHoleThatIsTooSmall) {
   EXPECT_EQ(allocate(1), first);
 }
 
+TEST_F(RegionLargeBlockTest, ARunIsBrokenByAWordOfTakenPages) {
+  // Free are the last eight pages of the first word and all of the third.
+  RegionLargeBlockPeer::setBits(pages, 0, 24, false);
+  RegionLargeBlockPeer::setBits(pages, 32, 32, false);
+  EXPECT_EQ(allocate(20), RegionLargeBlockPeer::getChunk(pages, 0) + 64 * page);
+  EXPECT_EQ(allocate(8), RegionLargeBlockPeer::getChunk(pages, 0) + 24 * page);
+}
+
 TEST_F(RegionLargeBlockTest, TheNextChunkComesWhenTheFirstIsFull) {
   for (int count = 0; count < 256; ++count)
     allocate(1);
@@ -173,6 +181,20 @@ TEST_F(RegionLargeBlockTest, DiscardedMemoryIsFilledOnRequest) {
   EXPECT_EQ(first[page - 1], 0);
   EXPECT_EQ(second[0], 1);
   EXPECT_EQ(second[page - 1], 1);
+}
+
+TEST_F(RegionLargeBlockTest, DestroyingWithFalseFreesNothing) {
+  RecordingRegion other;
+  RegionLargeBlock* doomed = RegionLargeBlockPeer::create(&other);
+  RegionLargeBlockPeer::setBits(doomed, 0, 10240, false);
+  doomed->AllocFull(page, 8, nullptr);
+  RegionLargeBlock* overflow = RegionLargeBlockPeer::getOverflow(doomed);
+  doomed->Destroy(false);
+  EXPECT_TRUE(other.discards.empty());
+  for (RegionLargeBlock* region : {overflow, doomed}) {
+    std::free(RegionLargeBlockPeer::getChunk(region, 0));
+    std::free(region);
+  }
 }
 
 TEST_F(RegionLargeBlockDeathTest, OnlyWholePagesGoInAndOut) {

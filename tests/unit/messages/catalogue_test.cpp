@@ -2,10 +2,12 @@
 // Keys, texts and the choice of a language.
 #include "messages/interface/catalogue.h"
 
+#include "messages/interface/format.h"
 #include "tests/unit/messages/messages_fixture.h"
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <map>
 #include <string>
 #include <vector>
@@ -40,6 +42,41 @@ std::map<unsigned, std::string> argumentsOf(std::string_view format) {
     arguments[position] = conversion;
   }
   return arguments;
+}
+
+// Arguments of the kinds that a format asks for.
+std::vector<Argument> exampleArguments(std::string_view format) {
+  std::vector<Argument> examples;
+  for (const auto& [position, conversion] : argumentsOf(format)) {
+    switch (conversion.back()) {
+    case 's':
+      examples.emplace_back("text");
+      break;
+    case 'c':
+      examples.emplace_back('?');
+      break;
+    default:
+      examples.emplace_back(7);
+    }
+  }
+  return examples;
+}
+
+bool isAbove127(char character) {
+  return static_cast<unsigned char>(character) > 127;
+}
+
+// Whether every first byte of a character is followed by as many others as it says.
+bool isUtf8(std::string_view text) {
+  while (!text.empty()) {
+    const auto first = static_cast<unsigned char>(text.front());
+    const size_t length = first < 0x80 ? 1 : first >> 5 == 6 ? 2 : first >> 4 == 14 ? 3 : 0;
+    if (length == 0 || length > text.size()) return false;
+    const auto isFollower = [](char byte) { return (static_cast<unsigned char>(byte) >> 6) == 2; };
+    if (!std::all_of(text.begin() + 1, text.begin() + length, isFollower)) return false;
+    text.remove_prefix(length);
+  }
+  return true;
 }
 
 std::vector<std::string_view> linesOf(std::string_view text) {
@@ -101,6 +138,47 @@ TEST(Catalogue, HasTheSameArgumentsInEveryLanguage) {
   for (size_t i = 0; i < english.size(); ++i)
     EXPECT_EQ(argumentsOf(japanese[i].text), argumentsOf(english[i].text))
         << textOf(english[i].key);
+}
+
+// A text that names some arguments by position and others in turn would be a fault when printed.
+TEST(Catalogue, HasOnlyGoodFormats) {
+  const auto english = catalogueRows(EnglishCatalogue);
+  for (uint32_t index = 0; index < CatalogueCount; ++index) {
+    const auto rows = catalogueRows(index);
+    ASSERT_EQ(rows.size(), english.size());
+    for (size_t i = 0; i < rows.size(); ++i) {
+      const std::vector<Argument> arguments = exampleArguments(english[i].text);
+      std::string text;
+      EXPECT_EQ(appendFormatted(text, rows[i].text, arguments), FormatStatus_Done)
+          << textOf(rows[i].key);
+      EXPECT_FALSE(text.empty());
+    }
+  }
+}
+
+TEST(Catalogue, IsUtf8InEveryLanguage) {
+  EXPECT_TRUE(isUtf8("a\xc3\xa9\xe3\x81\x82"));
+  EXPECT_FALSE(isUtf8("\x82\xa0"));
+  EXPECT_FALSE(isUtf8("\xe3\x81"));
+  for (uint32_t index = 0; index < CatalogueCount; ++index) {
+    for (const CatalogueRow& row : catalogueRows(index))
+      EXPECT_TRUE(isUtf8(row.text)) << textOf(row.key);
+  }
+}
+
+TEST(Catalogue, IsJapaneseWhereverThereAreWords) {
+  std::vector<Key> withoutWords;
+  for (const CatalogueRow& row : catalogueRows(JapaneseCatalogue)) {
+    if (std::none_of(row.text.begin(), row.text.end(), isAbove127)) withoutWords.push_back(row.key);
+  }
+  EXPECT_THAT(withoutWords, ElementsAre(ListedMember, AddedMember, ReplacedMember, DeletedMember,
+                                        MovedMember, ExtractedMember, PrintedMember, SizesRow,
+                                        CommandLineEcho, VariantGroupMember));
+}
+
+TEST(Catalogue, IsEnglishInPlainAscii) {
+  for (const CatalogueRow& row : catalogueRows(EnglishCatalogue))
+    EXPECT_TRUE(std::none_of(row.text.begin(), row.text.end(), isAbove127)) << textOf(row.key);
 }
 
 // What a program that reads the output looks for stays, and so do the ends of lines.
