@@ -5,8 +5,8 @@
 // would otherwise be kept by hand.
 #pragma once
 
+#include "support/interface/letters.h"
 #include "tabledrivenparser/interface/constraint.h"
-#include "tabledrivenparser/interface/letters.h"
 #include "tabledrivenparser/interface/value.h"
 
 #include <array>
@@ -107,8 +107,9 @@ constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows)
   FirstLetterIndex index{};
   index.fill(noRow);
   for (size_t row = rows.size(); row-- > 0;) {
-    if (rows[row].name.empty() || !isLetter(rows[row].name.front())) continue;
-    index[static_cast<size_t>(lowered(rows[row].name.front()) - 'a')] = static_cast<uint32_t>(row);
+    if (rows[row].name.empty() || !support::isLetter(rows[row].name.front())) continue;
+    index[static_cast<size_t>(support::lowered(rows[row].name.front()) - 'a')] =
+        static_cast<uint32_t>(row);
   }
   return index;
 }
@@ -116,8 +117,8 @@ constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows)
 // Without regard to case, and an upper-case letter before its lower-case twin.
 constexpr bool comesBefore(std::string_view left, std::string_view right) {
   for (size_t at = 0; at < left.size() && at < right.size(); ++at) {
-    const auto a = static_cast<unsigned char>(lowered(left[at]));
-    const auto b = static_cast<unsigned char>(lowered(right[at]));
+    const auto a = static_cast<unsigned char>(support::lowered(left[at]));
+    const auto b = static_cast<unsigned char>(support::lowered(right[at]));
     if (a != b) return a < b;
   }
   if (left.size() != right.size()) return left.size() < right.size();
@@ -135,9 +136,9 @@ constexpr bool areSorted(std::span<const MatchString> rows) {
 // Names that start with no letter must sort before those that do.
 constexpr bool isFindable(std::string_view name) {
   if (name.empty()) return true;
-  if (static_cast<unsigned char>(lowered(name.front())) > 'z') return false;
+  if (static_cast<unsigned char>(support::lowered(name.front())) > 'z') return false;
   for (char character : name.substr(1)) {
-    if (character == '-' || character != lowered(character)) return false;
+    if (character == '-' || character != support::lowered(character)) return false;
   }
   return true;
 }

@@ -15,7 +15,7 @@ bool liesInRanges(Number number, const IntegerRange* range) {
 }
 
 bool sameText(std::string_view left, std::string_view right, bool isCaseSensitive) {
-  return isCaseSensitive ? left == right : equalIgnoringCase(left, right);
+  return isCaseSensitive ? left == right : support::equalIgnoringCase(left, right);
 }
 
 bool matchesAlternative(std::string_view text, std::string_view alternative) {
@@ -84,7 +84,7 @@ bool meetsConstraint(const ValueDefinition& definition, const Value& value, uint
 const MatchString* findEnumerator(const Enumeration& enumeration, std::string_view name,
                                   uint32_t tableMask) {
   return findUsable(enumeration, tableMask, [name](const MatchString& entry) {
-    return equalIgnoringCase(entry.name, name);
+    return support::equalIgnoringCase(entry.name, name);
   });
 }
 

@@ -16,7 +16,7 @@ bool startsWith(std::string_view text, char character) {
 size_t commonLength(std::string_view word, std::string_view name) {
   size_t at = 1;
   for (; at < word.size() && at < name.size(); ++at) {
-    const char character = word[at] == '-' ? '_' : lowered(word[at]);
+    const char character = word[at] == '-' ? '_' : support::lowered(word[at]);
     if (character != name[at]) break;
   }
   return at;
@@ -30,7 +30,7 @@ Match compareWord(std::string_view word, const MatchString& row) {
   match.longName = row.hasLongName();
   if (word.empty() || row.name.empty()) return match;
   match.firstCharExact = word.front() == row.name.front();
-  if (lowered(word.front()) != lowered(row.name.front())) return match;
+  if (support::lowered(word.front()) != support::lowered(row.name.front())) return match;
 
   match.length = commonLength(word, row.name);
   match.complete = match.length == row.name.size();
@@ -100,15 +100,16 @@ Match positionalMatch(const OptionTable& table, std::string_view word) {
 
 // The rows that start with the word's first letter; for other words those before all letters.
 std::span<const MatchString> candidateRows(const OptionTable& table, std::string_view word) {
-  const char first = word.empty() ? '\0' : lowered(word.front());
+  const char first = word.empty() ? '\0' : support::lowered(word.front());
   uint32_t start = 0;
-  if (isLetter(first)) start = table.firstRows[static_cast<size_t>(first - 'a')];
+  if (support::isLetter(first)) start = table.firstRows[static_cast<size_t>(first - 'a')];
   if (start == noRow) return {};
   uint32_t end = start;
   for (; end < table.rows.size(); ++end) {
     const std::string_view name = table.rows[end].name;
-    const char letter = !name.empty() && isLetter(name.front()) ? lowered(name.front()) : '\0';
-    if (letter != (isLetter(first) ? first : '\0')) break;
+    const char letter =
+        !name.empty() && support::isLetter(name.front()) ? support::lowered(name.front()) : '\0';
+    if (letter != (support::isLetter(first) ? first : '\0')) break;
   }
   return table.rows.subspan(start, end - start);
 }

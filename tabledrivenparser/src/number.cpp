@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tabledrivenparser/src/number.h"
 
-#include "tabledrivenparser/interface/letters.h"
+#include "support/interface/letters.h"
 
 #include <cerrno>
 #include <cstdlib>
@@ -13,7 +13,7 @@ namespace {
 
 bool isDigit(char character, int base) {
   if (character >= '0' && character <= '9') return true;
-  return base == 16 && lowered(character) >= 'a' && lowered(character) <= 'f';
+  return base == 16 && support::lowered(character) >= 'a' && support::lowered(character) <= 'f';
 }
 
 // A negative unsigned number stands for the one that wraps to it.
@@ -34,10 +34,10 @@ uint64_t largestMagnitude(ValueType type, bool isNegative) {
 
 NumberText readNumber(const char* text, ValueType type) {
   NumberText number;
-  const bool isHexadecimal = text[0] == '0' && lowered(text[1]) == 'x';
+  const bool isHexadecimal = text[0] == '0' && support::lowered(text[1]) == 'x';
   const int base = isHexadecimal ? 16 : 10;
   if (isHexadecimal) text += 2;
-  while (isWhiteSpace(*text))
+  while (support::isWhiteSpace(*text))
     ++text;
   const bool isNegative = *text == '-';
   if (isNegative || *text == '+') ++text;

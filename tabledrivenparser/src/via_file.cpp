@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tabledrivenparser/interface/via_file.h"
 
-#include "tabledrivenparser/interface/letters.h"
+#include "support/interface/letters.h"
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/via_file_reader.h"
 
@@ -52,7 +52,7 @@ void ViaFile::close() {
 }
 
 const char* ViaFile::nextToken() {
-  while (isWhiteSpace(peek()))
+  while (support::isWhiteSpace(peek()))
     ++m_Position;
   if (peek() == '\0') m_LastChar = '\0';
   if (m_LastChar == '\0') return nullptr;
@@ -62,7 +62,7 @@ const char* ViaFile::nextToken() {
   for (;;) {
     const char character = peek();
     if (m_LastChar == '\0') return nullptr;
-    const bool isBlank = isWhiteSpace(character) && !state.isEnclosed();
+    const bool isBlank = support::isWhiteSpace(character) && !state.isEnclosed();
     if (isBlank || isLineEnd(character) || character == '\0') return finishWord(character, state);
     ++m_Position;
     if (!countCharacter()) return fail(OptionMessage::ViaFileCommandTooLong);

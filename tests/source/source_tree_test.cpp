@@ -29,7 +29,7 @@ const std::map<std::string, Names> Arrows = {
     {"alloclib", {"checking"}},
     {"checking", {}},
     {"support", {"alloclib", "checking"}},
-    {"tabledrivenparser", {"alloclib", "checking"}},
+    {"tabledrivenparser", {"support", "alloclib", "checking"}},
     {"messages", {"tabledrivenparser", "support", "alloclib", "checking"}},
     {"elfext", {"support", "alloclib", "checking"}},
     {"arlib", {"elfext", "support", "alloclib", "checking"}},

@@ -59,10 +59,14 @@ static_assert(restrictionsMet(masks, 0xFFFFFFFF));
 static_assert(!restrictionsMet(masks, 1));
 static_assert(!restrictionsMet(masks, 6));
 
-static_assert(isWhiteSpace(' ') && isWhiteSpace('\t') && isWhiteSpace('\v') && isWhiteSpace('\r'));
-static_assert(!isWhiteSpace('\b') && !isWhiteSpace('\x0e') && !isWhiteSpace('\x85'));
-static_assert(isLetter('A') && isLetter('z') && !isLetter('@') && !isLetter('\xe9'));
-static_assert(lowered('Z') == 'z' && lowered('[') == '[' && lowered('\xc0') == '\xc0');
+static_assert(support::isWhiteSpace(' ') && support::isWhiteSpace('\t') &&
+              support::isWhiteSpace('\v') && support::isWhiteSpace('\r'));
+static_assert(!support::isWhiteSpace('\b') && !support::isWhiteSpace('\x0e') &&
+              !support::isWhiteSpace('\x85'));
+static_assert(support::isLetter('A') && support::isLetter('z') && !support::isLetter('@') &&
+              !support::isLetter('\xe9'));
+static_assert(support::lowered('Z') == 'z' && support::lowered('[') == '[' &&
+              support::lowered('\xc0') == '\xc0');
 
 // The addresses of inline variables are no constants to every compiler under its sanitizers.
 TEST(TableCheck, holdsForTheTablesOfTheTests) {
