@@ -68,8 +68,7 @@ void showCommandLine(const Parser& parser, const char* toolName) {
 
 [[noreturn]] void showVersionNumber() {
   messages::writeRaw(support::versionNumberText(support::buildData()) + "\n");
-  messages::flushAll();
-  std::exit(0);
+  std::exit(flushOutput() ? 0 : 1);
 }
 
 void applyAction(const Parser& parser, const ActionOption& row, Settings& settings) {

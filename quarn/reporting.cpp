@@ -16,4 +16,11 @@ std::string hostErrorText(int errorNumber) {
   return std::strerror(errorNumber);
 }
 
+bool flushOutput() {
+  if (messages::flushAll()) return true;
+  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, "stdout",
+                hostErrorText(messages::stdoutError()));
+  return false;
+}
+
 } // namespace quarn

@@ -24,4 +24,8 @@ bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&...
 // The host's text for an error number; "Success" for 0.
 std::string hostErrorText(int errorNumber);
 
+// Hands over what stdout has held back. False after a report: what it could not take must not look
+// like success to whoever reads the status only.
+bool flushOutput();
+
 } // namespace quarn

@@ -20,13 +20,6 @@ constexpr size_t DriverRegionSize = 1024;
 
 alloclib::RegionGeneral* driverRegion = nullptr;
 
-// What stdout could not take must not look like success to whoever reads the status only.
-void reportFailedOutput() {
-  if (messages::flushAll()) return;
-  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, "stdout",
-                hostErrorText(messages::stdoutError()));
-}
-
 } // namespace
 
 void startUp(int argc, const char* const* argv, support::Host& host) {
@@ -37,7 +30,7 @@ void startUp(int argc, const char* const* argv, support::Host& host) {
   std::array<char, support::ToolNameSize> toolName;
   support::toolNameFrom(argc > 0 ? argv[0] : nullptr, toolName);
   quarnMain(argc, argv, toolName.data(), host, *driverRegion);
-  reportFailedOutput();
+  flushOutput();
   shutDown(messages::errorCount() != 0 ? 1 : 0);
 }
 

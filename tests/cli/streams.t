@@ -91,8 +91,17 @@ A reader that goes away ends a listing, and the archive is whole.
   10
   $ quarn -t zeros.a > /dev/null
 
-A full device on stdout does not harm the archive.
+A full device on stdout is told of, and does not harm the archive.
 
+  $ for words in --version_number --vsn --help "-t lib.a"; do quarn $words > /dev/full; echo $?; done
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
   $ cp lib.a before.a; quarn -t -s lib.a > /dev/full 2> /dev/null; cmp lib.a before.a; ls *.a
   before.a
   big.a
