@@ -15,13 +15,24 @@ namespace elfext {
 namespace {
 
 // Each letter behind the "_" of a library's name tells of one choice.
+// clang-format off
 constexpr std::string_view BuiltInLines[] = {
-    "*_a* $IEEE1$ZEV_ISAv4", "*_t* $IEEE1$KRELL_ISAv1", "*_w* $IEEE1$KRELL_ISAv4~$ZEV_ISAv1",
-    "*_?f* $IEEE1$KCPv3",    "*_?v* $IEEE1$HFUv1",      "*_??p* $IEEE1$PE",
-    "*_??m* $IEEE1$ME",      "*_???s* $IEEE1$STKCKD",   "*_???u* $IEEE1$~STKCKD",
-    "*_????e* $IEEE1$RWPI",  "*_????n* $IEEE1$~SHL",    "g_* $IEEE1$IEEEX fz",
-    "f_* $IEEE1$IEEEF fz",   "fj_* $IEEE1$IEEEJ fz",
+    "*_a* $IEEE1$ZEV_ISAv4",
+    "*_t* $IEEE1$KRELL_ISAv1",
+    "*_w* $IEEE1$KRELL_ISAv4~$ZEV_ISAv1",
+    "*_?f* $IEEE1$KCPv3",
+    "*_?v* $IEEE1$HFUv1",
+    "*_??p* $IEEE1$PE",
+    "*_??m* $IEEE1$ME",
+    "*_???s* $IEEE1$STKCKD",
+    "*_???u* $IEEE1$~STKCKD",
+    "*_????e* $IEEE1$RWPI",
+    "*_????n* $IEEE1$~SHL",
+    "g_* $IEEE1$IEEEX fz",
+    "f_* $IEEE1$IEEEF fz",
+    "fj_* $IEEE1$IEEEJ fz",
 };
+// clang-format on
 
 // The next word of the line, which loses it; empty at the line's end.
 std::string_view takeWord(std::string_view& line) {
