@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/src/extents.h"
 
-#include "elfext/interface/sort.h"
-
 #include <algorithm>
 #include <numeric>
 
@@ -18,7 +16,7 @@ bool startsBefore(const Extent& left, const Extent& right) {
 std::vector<Extent> sortedByStart(std::span<const Extent> extents) {
   std::vector<Extent> sorted(extents.begin(), extents.end());
   if (!std::is_sorted(sorted.begin(), sorted.end(), startsBefore))
-    smoothSort(std::span(sorted), startsBefore);
+    std::sort(sorted.begin(), sorted.end(), startsBefore);
   return sorted;
 }
 
@@ -112,7 +110,7 @@ std::vector<uint32_t> findFirstHolders(std::span<const Extent> outer,
     return inner[left].start != inner[right].start ? inner[left].start < inner[right].start
                                                    : left < right;
   };
-  smoothSort(std::span(order), comesFirst);
+  std::sort(order.begin(), order.end(), comesFirst);
   auto next = outerSorted.begin();
   for (const uint32_t i : order) {
     for (; next != outerSorted.end() && next->start <= inner[i].start; ++next)

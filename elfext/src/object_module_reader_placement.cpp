@@ -94,7 +94,7 @@ void tieOverlappingRegions(std::vector<Region> regions) {
     return left.extent.start != right.extent.start ? left.extent.start < right.extent.start
                                                    : left.extent.id < right.extent.id;
   };
-  smoothSort(std::span(regions), comesFirst);
+  std::sort(regions.begin(), regions.end(), comesFirst);
   const Region* farthest = nullptr;
   for (const Region& region : regions) {
     if (farthest != nullptr && region.extent.start < farthest->extent.end) {
