@@ -107,6 +107,24 @@ TEST(SourceTree, EveryHeaderIsIncludedOnce) {
   }
 }
 
+// A text that nobody prints has no place in the catalogues.
+TEST(SourceTree, EveryMessageIsReported) {
+  std::string sources;
+  for (const char* room : {"quarn", "messages"}) {
+    for (const fs::path& file : sourcesOf(room)) {
+      const std::string name = file.filename().string();
+      if (!name.ends_with("_catalogue.cpp") && name != "message_keys.h")
+        sources += contentsOf(file);
+    }
+  }
+  const std::string keys = contentsOf(Root / "messages/interface/message_keys.h");
+  const std::regex line("constexpr Key (\\w+)");
+  for (std::sregex_iterator match(keys.begin(), keys.end(), line), end; match != end; ++match) {
+    const std::string name = (*match)[1];
+    EXPECT_TRUE(std::regex_search(sources, std::regex("\\b" + name + "\\b"))) << name;
+  }
+}
+
 // The options that the help leaves out, deliberately.
 const Names UnmentionedOptions = {
     "",
