@@ -15,6 +15,7 @@
 #include "elfext/interface/object_module.h"
 #include "support/interface/shared_texts.h"
 
+#include <algorithm>
 #include <cstring>
 #include <span>
 #include <vector>
@@ -97,7 +98,8 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
 bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
                       elfext::FullAttr& attributes) {
   constexpr std::string_view Prefix = elfext::DecorationPrefix;
-  uint64_t left = 2 * objectSize;
+  constexpr uint64_t AlwaysRead = 0x100000;
+  uint64_t left = std::max<uint64_t>(2 * objectSize, AlwaysRead);
   bool isFirst = true;
   for (const elfext::Symbol* symbol : module.getSymbols()) {
     const char* name = symbol->getName();
@@ -176,6 +178,7 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
   elfext::ObjectModule module;
   elfext::BySizeDeferredContentsSelector selector;
   if (!archiveMember->flushContents()) return false;
+  module.setObjectName(std::string(archiveMember->getName()).c_str());
   module.setErrorHandler(archiveMember->getArchive()->getElfextErrorHandler());
   if (!archiveMember->readInto(module, &selector)) return false;
   archiveMember->discardContents();

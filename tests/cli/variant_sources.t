@@ -141,6 +141,13 @@ Of several symbols for the whole object the last one counts, where together they
   gcd 1.o
   gcd 2.o
 
+However many there are, all of them count.
+
+  $ long='$ZEV_ISAv7$N$HFUv3$PE$A:L44L22$IEEE1$IW$RWPI$USESV6$STKCKD$USESV7$OTIME$ROPI$EBA8$STANDARDLIB$MICROLIB$REQ8$EABIv2'
+  $ variant 1.o "$long"; texts=(); for i in $(seq 200); do texts+=("$long"); done; variant 2.o "${texts[@]}" '$J$IEEE1'; make
+  gcd 1.o
+  gcd$$BuildAttributes$$ZEV_ISAv3$J$IEEE1 2.o
+
 An absolute symbol that is global is a name like others, and so no other object has the same names.
 
   $ variant 2.o

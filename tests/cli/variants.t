@@ -264,14 +264,16 @@ is an ordinary member.
   sum 5.o
   lcm 4.o
 
-Names of variants may stand twice where other names may not.
+Names of variants may stand twice where other names may not; they neither count as seen nor heed what is.
 
-  $ quarn -r --unique_symbols lib.a "$QUARN_EXAMPLES"/wide_plain.o; rm -f lib.a
-  $ quarn --create --unique_symbols lib.a 1.o 2.o 4.o 5.o; listed lib.a
+  $ for i in p q; do llvm-objcopy --keep-global-symbol=wide_gcd --keep-global-symbol=wide_power \
+  >   --redefine-sym wide_gcd=gcd --redefine-sym wide_power=$i "$QUARN_EXAMPLES/wide_plain.o" $i.o; done
+  $ rm -f lib.a; quarn --create --unique_symbols lib.a p.o 1.o 2.o q.o; listed lib.a
   gcd 1.o
   gcd$$BuildAttributes$$J$IEEE1 2.o
-  lcm 4.o
-  sum 5.o
+  gcd p.o
+  p p.o
+  q q.o
 
 Attributes are told from decorated names in a table that somebody else made.
 
