@@ -18,6 +18,8 @@
 // A symbol's name may carry a suffix: "$$BuildAttributes$" and the text of an attribute set.
 #pragma once
 
+#include "elfext/interface/attribute_string.h"
+
 #include <array>
 #include <cstdint>
 #include <span>
@@ -28,7 +30,7 @@ namespace arlib {
 constexpr std::string_view ArchiveMagic = "!<arch>\n";
 constexpr std::string_view MemberMagic = "`\n";
 constexpr std::string_view LongNameTerminator = "/\n";
-constexpr std::string_view AttributeMarker = "$$BuildAttributes$";
+constexpr std::string_view AttributeMarker = elfext::DecorationMarker;
 constexpr uint8_t PaddingByte = 0x0A;
 
 constexpr uint32_t MemberHeaderSize = 60;

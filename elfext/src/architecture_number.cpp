@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/src/architecture_number.h"
 
-#include <array>
+#include "elfext/src/feature_chains.h"
+
 #include <span>
 
 namespace elfext {
@@ -9,10 +10,6 @@ namespace elfext {
 namespace {
 
 using namespace features;
-
-constexpr std::array ZevLevels = {ZEV_ISAv3, ZEV_ISAv4, ZEV_ISAv5, ZEV_ISAv6, ZEV_ISAv7, ZEV_ISAv8};
-constexpr std::array KrellLevels = {KRELL_ISAv1, KRELL_ISAv2, KRELL_ISAv3, KRELL_ISAv4,
-                                    KRELL_ISAv5};
 
 // The number of the highest level that the features hold whole; the lowest has number `first`.
 uint32_t highestLevel(FeatureSet features, std::span<const FeatureSet> levels, uint32_t first) {
@@ -72,8 +69,8 @@ uint32_t numberOfKrellAlone(FeatureSet features, uint32_t krell) {
 } // namespace
 
 IsaLevels getIsaLevels(FeatureSet features) {
-  return {.zev = highestLevel(features, ZevLevels, 3),
-          .krell = highestLevel(features, KrellLevels, 1),
+  return {.zev = highestLevel(features, ZevChain, 3),
+          .krell = highestLevel(features, KrellChain, 1),
           .z64 = features.contains(Z64_ISA) ? 8u : 0u};
 }
 

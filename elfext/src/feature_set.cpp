@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/interface/feature_set.h"
 
+#include "elfext/src/feature_chains.h"
+
 #include <array>
 #include <span>
 
@@ -9,12 +11,6 @@ namespace elfext {
 namespace {
 
 using namespace features;
-
-constexpr std::array KrellChain = {KRELL_ISAv1, KRELL_ISAv2, KRELL_ISAv3, KRELL_ISAv4, KRELL_ISAv5};
-constexpr std::array ZevChain = {ZEV_ISAv3, ZEV_ISAv4, ZEV_ISAv5, ZEV_ISAv6, ZEV_ISAv7, ZEV_ISAv8};
-constexpr std::array WmmxChain = {WMMX_ISA, WMMX2_ISA};
-constexpr std::array PldChain = {PLD7, PLD9, PLD1, PLD2, PLD3, PLD4, PLD5, PLD6, PLD8};
-constexpr std::array HfuChain = {HFU_ISAv1, HFU_ISAv2, HFU_ISAv3, HFU_ISAv5, FP_ISA_ZEVv8};
 
 // Each level contains the one below it, and more.
 constexpr bool isCumulative(std::span<const FeatureSet> chain) {

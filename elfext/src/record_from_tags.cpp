@@ -5,6 +5,7 @@
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/target_table.h"
+#include "elfext/src/feature_chains.h"
 #include "elfext/src/standard_tags.h"
 
 namespace elfext {
@@ -216,7 +217,6 @@ void RecordFromTags::addMakersFlags() {
 }
 
 void RecordFromTags::addMakersFeatures() {
-  constexpr FeatureSet Preloads[] = {PLD1, PLD2, PLD3, PLD4, PLD5, PLD9, PLD6, PLD7, PLD8};
   FeatureSet& features = m_Record.m_Features;
   if (has(ZevTag::Tag_ZV_mdivide) && get(ZevTag::Tag_ZV_mdivide) <= 1)
     features.put(MARVELL_DIV, get(ZevTag::Tag_ZV_mdivide) == 1);
@@ -224,8 +224,8 @@ void RecordFromTags::addMakersFeatures() {
     const uint32_t preload = get(ZevTag::Tag_ZV_pld);
     if (preload == 0)
       features.put(PLD1, false);
-    else if (preload <= std::size(Preloads))
-      features |= Preloads[preload - 1];
+    else if (preload <= PreloadsByTag.size())
+      features |= PreloadsByTag[preload - 1];
   }
   const bool hasFullIsa = !has(ZevTag::Tag_ZV_full_isa) || get(ZevTag::Tag_ZV_full_isa) == 1;
   if (hasFullIsa && has(Tag_KRELL_ISA_use)) features |= KRELL_ISAv5;

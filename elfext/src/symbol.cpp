@@ -5,6 +5,7 @@
 #include "elfext/interface/symbol.h"
 
 #include "alloclib/interface/region_objects.h"
+#include "elfext/interface/attribute_string.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/symbol_version_definition.h"
@@ -42,13 +43,13 @@ uint64_t Symbol::getAbiValue() const {
 bool Symbol::isBuildAttributesSymbol() const {
   if (startsAsBuildAttributes()) return true;
   return m_Category == Category_Absolute && m_Name != nullptr &&
-         std::strstr(m_Name, "$$BuildAttributes$") != nullptr;
+         std::strstr(m_Name, DecorationMarker.data()) != nullptr;
 }
 
 bool Symbol::startsAsBuildAttributes() const {
-  constexpr std::string_view start = "BuildAttributes$";
   if (m_Category != Category_Hosted && m_Category != Category_Absolute) return false;
-  return m_Name != nullptr && std::strncmp(m_Name, start.data(), start.size()) == 0;
+  return m_Name != nullptr &&
+         std::strncmp(m_Name, DecorationPrefix.data(), DecorationPrefix.size()) == 0;
 }
 
 void Symbol::markChanged() {

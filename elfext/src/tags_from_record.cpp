@@ -5,7 +5,10 @@
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/target_table.h"
 #include "elfext/src/architecture_number.h"
+#include "elfext/src/feature_chains.h"
 #include "elfext/src/standard_tags.h"
+
+#include <algorithm>
 
 namespace elfext {
 
@@ -202,16 +205,12 @@ void TagsFromRecord::deriveEightByteAlignment() {
   set(ZevTag::Tag_ZV_eba, eba);
 }
 
+// The highest level counts.
 void TagsFromRecord::derivePreload() {
-  struct Preload {
-    FeatureSet set;
-    uint32_t value;
-  };
-  // The last one counts.
-  constexpr Preload Preloads[] = {{PLD7, 8}, {PLD9, 6}, {PLD1, 1}, {PLD2, 2}, {PLD3, 3},
-                                  {PLD4, 4}, {PLD5, 5}, {PLD6, 7}, {PLD8, 9}};
-  for (const Preload& preload : Preloads) {
-    if (has(preload.set)) set(ZevTag::Tag_ZV_pld, preload.value);
+  for (const FeatureSet level : PldChain) {
+    if (!has(level)) continue;
+    const auto value = std::ranges::find(PreloadsByTag, level) - PreloadsByTag.begin() + 1;
+    set(ZevTag::Tag_ZV_pld, static_cast<uint32_t>(value));
   }
 }
 
