@@ -13,6 +13,11 @@
 #include <span>
 #include <string>
 
+namespace elfext {
+class ErrorHandler;
+class ObjectModule;
+} // namespace elfext
+
 namespace arlib {
 
 class ArchiveMember;
@@ -90,6 +95,11 @@ public:
   bool getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
+
+private:
+  // Reads the member into a fresh module, under that handler. False after a report, if any.
+  static bool read(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
+                   elfext::ObjectModule& module);
 };
 
 } // namespace arlib

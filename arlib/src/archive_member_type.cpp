@@ -140,6 +140,17 @@ void findNames(const elfext::ObjectModule& module, const ArchiveMember& archiveM
 
 } // namespace
 
+bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
+                                     elfext::ErrorHandler* errorHandler,
+                                     elfext::ObjectModule& module) {
+  elfext::BySizeDeferredContentsSelector selector;
+  module.setObjectName(std::string(archiveMember.getName()).c_str());
+  module.setErrorHandler(errorHandler);
+  if (!archiveMember.flushContents() || !archiveMember.readInto(module, &selector)) return false;
+  archiveMember.discardContents();
+  return true;
+}
+
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                                                std::string& reason) const {
   std::optional<elfext::FullAttr> attributes;
@@ -152,17 +163,12 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, Symbo
   QUARN_ASSERT(1, archiveMember != NULL);
   elfext::ElfextErrorStringCapture capture;
   elfext::ObjectModule module;
-  module.setObjectName(std::string(archiveMember->getName()).c_str());
-  module.setErrorHandler(&capture);
-  elfext::BySizeDeferredContentsSelector selector;
   reason.clear();
   attributes.reset();
-  if (!archiveMember->flushContents()) return false;
-  if (!archiveMember->readInto(module, &selector)) {
+  if (!read(*archiveMember, &capture, module)) {
     reason = capture.getText();
     return false;
   }
-  archiveMember->discardContents();
   findNames(module, *archiveMember, names);
   elfext::FullAttr stated;
   if (findAttributes(module, archiveMember->getSize(),
@@ -176,12 +182,8 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
                                                    bool useObjectAttributes) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   elfext::ObjectModule module;
-  elfext::BySizeDeferredContentsSelector selector;
-  if (!archiveMember->flushContents()) return false;
-  module.setObjectName(std::string(archiveMember->getName()).c_str());
-  module.setErrorHandler(archiveMember->getArchive()->getElfextErrorHandler());
-  if (!archiveMember->readInto(module, &selector)) return false;
-  archiveMember->discardContents();
+  if (!read(*archiveMember, archiveMember->getArchive()->getElfextErrorHandler(), module))
+    return false;
   return findAttributes(module, archiveMember->getSize(), useObjectAttributes, attributes);
 }
 
