@@ -29,8 +29,9 @@ enum class FileKind : uint8_t {
 // What the host knows of a file, all in 64 bits: the caller narrows, with checks.
 struct FileStatus {
   FileKind kind = FileKind::Nothing;
-  int64_t size = 0;             // bytes
-  int64_t modificationTime = 0; // seconds since 1970
+  int64_t size = 0;                     // bytes
+  int64_t modificationTime = 0;         // seconds since 1970
+  uint32_t modificationNanoseconds = 0; // behind the second, as far as the host tells
   int64_t uid = 0;
   int64_t gid = 0;
   uint32_t mode = 0; // type and permission bits, as in st_mode
@@ -56,6 +57,14 @@ public:
 
   // Opens an existing file. Never waits, also not on a FIFO.
   [[nodiscard]] virtual HostError openForReading(const char* name, FileHandle& file) = 0;
+
+  // The same for a file that is going to be locked: a host may want the right to write for that.
+  [[nodiscard]] virtual HostError openForUpdate(const char* name, FileHandle& file) = 0;
+
+  // Waits until nobody else holds the lock of the file, and takes it. It is the process's own word
+  // to others who lock: who doesn't ask isn't kept from anything. Closing the handle gives it back.
+  // An error means that the host or the file system has no locks.
+  [[nodiscard]] virtual HostError lock(FileHandle file) = 0;
 
   // Creates a file that must not exist yet (else EEXIST). It is a temporary: should a signal end
   // the process before `rename` or `remove` was called with its name, the host removes it.
@@ -84,6 +93,9 @@ public:
 
   // Puts `from` in the place of `to` in one step: at no moment is there no `to`.
   [[nodiscard]] virtual HostError rename(const char* from, const char* to) = 0;
+
+  // The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
+  [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
 
   [[nodiscard]] virtual HostError remove(const char* name) = 0;
 

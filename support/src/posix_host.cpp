@@ -16,6 +16,7 @@
 #include <dirent.h>
 #include <fcntl.h>
 #include <memory>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -90,7 +91,8 @@ FileStatus statusFrom(const struct stat& native) {
   FileStatus status;
   status.kind = kindOf(native.st_mode);
   status.size = native.st_size;
-  status.modificationTime = native.st_mtime;
+  status.modificationTime = native.st_mtim.tv_sec;
+  status.modificationNanoseconds = static_cast<uint32_t>(native.st_mtim.tv_nsec);
   status.uid = native.st_uid;
   status.gid = native.st_gid;
   status.mode = native.st_mode;
@@ -106,6 +108,40 @@ HostError openNative(const char* name, int flags, FileHandle& file) {
   return file.isOpen() ? 0 : errno;
 }
 
+// The lock belongs to the opening, not to the process: closing another handle of the same file
+// keeps it.
+int lockNative(int descriptor) {
+#ifdef F_OFD_SETLKW
+  struct flock whole = {};
+  whole.l_type = F_WRLCK;
+  whole.l_whence = SEEK_SET;
+  return fcntl(descriptor, F_OFD_SETLKW, &whole);
+#else
+  return flock(descriptor, LOCK_EX);
+#endif
+}
+
+// A second name, and then no first one. Should the first one stay, the file is in its place all the
+// same.
+HostError linkAndUnlink(const char* from, const char* to) {
+  if (link(from, to) != 0) return errno;
+  unlink(from);
+  return 0;
+}
+
+HostError renameNewNative(const char* from, const char* to) {
+#ifdef RENAME_NOREPLACE
+  if (renameat2(AT_FDCWD, from, AT_FDCWD, to, RENAME_NOREPLACE) == 0) return 0;
+  if (errno != EINVAL && errno != ENOSYS) return errno;
+#endif
+  const HostError error = linkAndUnlink(from, to);
+  // A file system without second names (and without the call above) has no such step: look, then
+  // rename.
+  if (error != EPERM && error != ENOSYS && error != EOPNOTSUPP) return error;
+  if (access(to, F_OK) == 0) return EEXIST;
+  return std::rename(from, to) == 0 ? 0 : errno;
+}
+
 // One step of followLinks: the text of a link, or empty if the name is no link.
 std::string linkText(const std::string& name) {
   std::array<char, MaximumTemporaryName> text;
@@ -118,6 +154,19 @@ class PosixHost final : public Host {
 public:
   HostError openForReading(const char* name, FileHandle& file) override {
     return openNative(name, O_RDONLY | O_NONBLOCK, file);
+  }
+
+  // Locks of an open file description want the right to write. They don't meet those that scripts
+  // take with flock around a whole build: such a script must not wait for itself.
+  HostError openForUpdate(const char* name, FileHandle& file) override {
+    return openNative(name, O_RDWR | O_NONBLOCK, file);
+  }
+
+  HostError lock(FileHandle file) override {
+    while (lockNative(file.number) != 0) {
+      if (errno != EINTR) return errno;
+    }
+    return 0;
   }
 
   HostError createTemporary(const char* name, FileHandle& file) override {
@@ -182,6 +231,13 @@ public:
   HostError rename(const char* from, const char* to) override {
     const SignalHold hold;
     if (std::rename(from, to) != 0) return errno;
+    forgetTemporary(from);
+    return 0;
+  }
+
+  HostError renameNew(const char* from, const char* to) override {
+    const SignalHold hold;
+    if (const HostError error = renameNewNative(from, to); error != 0) return error;
     forgetTemporary(from);
     return 0;
   }

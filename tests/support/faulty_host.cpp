@@ -14,6 +14,7 @@ HostError FaultyHost::fault(const char* operation, const std::string& name) {
   m_FailedOperation = operation;
   m_FailedName = name;
   if (m_FailingSignal != 0) std::raise(m_FailingSignal);
+  if (m_Disturbance) m_Disturbance();
   return m_FailingError;
 }
 
@@ -26,6 +27,17 @@ HostError FaultyHost::openForReading(const char* name, FileHandle& file) {
   if (const HostError error = fault("openForReading", name)) return error;
   const HostError error = m_Host.openForReading(name, file);
   return remember(error, name, file);
+}
+
+HostError FaultyHost::openForUpdate(const char* name, FileHandle& file) {
+  if (const HostError error = fault("openForUpdate", name)) return error;
+  const HostError error = m_Host.openForUpdate(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::lock(FileHandle file) {
+  const HostError error = fault("lock", m_OpenNames[file.number]);
+  return error != 0 ? error : m_Host.lock(file);
 }
 
 HostError FaultyHost::createTemporary(const char* name, FileHandle& file) {
@@ -77,6 +89,11 @@ HostError FaultyHost::close(FileHandle file) {
 HostError FaultyHost::rename(const char* from, const char* to) {
   const HostError error = fault("rename", from);
   return error != 0 ? error : m_Host.rename(from, to);
+}
+
+HostError FaultyHost::renameNew(const char* from, const char* to) {
+  const HostError error = fault("renameNew", from);
+  return error != 0 ? error : m_Host.renameNew(from, to);
 }
 
 HostError FaultyHost::remove(const char* name) {

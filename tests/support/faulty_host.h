@@ -1,14 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A host on which one call goes wrong: the k-th, counted over all operations that can fail. Or a
-// signal comes in front of it. All others go to the host behind it.
+// signal comes in front of it, or somebody else does something to the files. All others go to the
+// host behind it.
 #pragma once
 
 #include "support/interface/host.h"
 
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <string>
+#include <utility>
 
 namespace testsupport {
 
@@ -22,6 +25,7 @@ public:
     m_FailingError = error;
     m_Calls = 0;
     m_FailingSignal = 0;
+    m_Disturbance = nullptr;
     m_FailedOperation.clear();
   }
   // A signal comes when the call with this number is made, which then goes on as always if the
@@ -31,6 +35,13 @@ public:
     m_FailingSignal = signal;
   }
 
+  // Somebody else does something in front of the call with this number, which then goes on as
+  // always. Counting starts anew.
+  void disturbCall(uint64_t number, std::function<void()> disturbance) {
+    failCall(number, 0);
+    m_Disturbance = std::move(disturbance);
+  }
+
   [[nodiscard]] uint64_t callCount() const { return m_Calls; }
   // Which operation failed, as "rename"; empty if none did.
   [[nodiscard]] const std::string& failedOperation() const { return m_FailedOperation; }
@@ -38,6 +49,8 @@ public:
   [[nodiscard]] const std::string& failedName() const { return m_FailedName; }
 
   support::HostError openForReading(const char* name, support::FileHandle& file) override;
+  support::HostError openForUpdate(const char* name, support::FileHandle& file) override;
+  support::HostError lock(support::FileHandle file) override;
   support::HostError createTemporary(const char* name, support::FileHandle& file) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
@@ -50,6 +63,7 @@ public:
   // The file is closed also when the call fails.
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
+  support::HostError renameNew(const char* from, const char* to) override;
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
@@ -68,6 +82,7 @@ private:
   uint64_t m_FailingCall = 0;
   support::HostError m_FailingError = 0;
   int m_FailingSignal = 0;
+  std::function<void()> m_Disturbance;
   uint64_t m_Calls = 0;
   std::string m_FailedOperation;
   std::string m_FailedName;

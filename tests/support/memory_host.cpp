@@ -83,6 +83,16 @@ HostError MemoryHost::openForReading(const char* name, FileHandle& file) {
   return 0;
 }
 
+HostError MemoryHost::openForUpdate(const char* name, FileHandle& file) {
+  const std::shared_ptr<File> target = find(name);
+  if (target && target->isReadOnly) return EACCES;
+  return openForReading(name, file);
+}
+
+HostError MemoryHost::lock(FileHandle) {
+  return m_LockAnswer ? m_LockAnswer() : 0;
+}
+
 HostError MemoryHost::createTemporary(const char* name, FileHandle& file) {
   if (has(name)) return EEXIST;
   enter(name, FileKind::RegularFile);
@@ -150,6 +160,10 @@ HostError MemoryHost::rename(const char* from, const char* to) {
   return 0;
 }
 
+HostError MemoryHost::renameNew(const char* from, const char* to) {
+  return has(to) ? EEXIST : rename(from, to);
+}
+
 HostError MemoryHost::remove(const char* name) {
   const auto target = m_Files.find(std::string_view(name));
   if (target == m_Files.end()) return ENOENT;
@@ -163,6 +177,7 @@ FileStatus MemoryHost::statusFrom(const File& file) {
   status.kind = file.kind;
   status.size = file.toldSize.value_or(static_cast<int64_t>(file.bytes.size()));
   status.modificationTime = file.modificationTime;
+  status.modificationNanoseconds = file.modificationNanoseconds;
   status.uid = file.uid;
   status.gid = file.gid;
   status.mode = file.mode;

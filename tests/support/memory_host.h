@@ -7,12 +7,14 @@
 #include "support/interface/host.h"
 
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <memory>
 #include <optional>
 #include <span>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace testsupport {
@@ -24,6 +26,7 @@ public:
     std::string bytes;
     std::string link; // where a symbolic link leads; empty for what is no link
     int64_t modificationTime = 1'000'000'000;
+    uint32_t modificationNanoseconds = 0;
     int64_t uid = 1;
     int64_t gid = 2;
     uint32_t mode = 0100644;
@@ -54,6 +57,10 @@ public:
   void setRoom(uint64_t bytes) { m_Room = bytes; }
   void setEndlessRoom() { m_Room.reset(); }
 
+  // What a call for a lock answers from now on, in place of 0; what somebody else does while one
+  // waits for it can be done here, too.
+  void setLocks(std::function<support::HostError()> answer) { m_LockAnswer = std::move(answer); }
+
   // Handles that were opened and not closed.
   [[nodiscard]] size_t openHandles() const;
   // So many bytes have been asked for by readAt, and so many calls were made to it.
@@ -61,6 +68,8 @@ public:
   [[nodiscard]] uint64_t readCalls() const { return m_ReadCalls; }
 
   support::HostError openForReading(const char* name, support::FileHandle& file) override;
+  support::HostError openForUpdate(const char* name, support::FileHandle& file) override;
+  support::HostError lock(support::FileHandle file) override;
   support::HostError createTemporary(const char* name, support::FileHandle& file) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
@@ -70,6 +79,7 @@ public:
   support::HostError flush(support::FileHandle file) override;
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
+  support::HostError renameNew(const char* from, const char* to) override;
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
@@ -88,6 +98,7 @@ private:
   std::map<std::string, std::shared_ptr<File>, std::less<>> m_Files;
   std::vector<std::shared_ptr<File>> m_Open; // by handle number; null when closed
   std::optional<uint64_t> m_Room;
+  std::function<support::HostError()> m_LockAnswer;
   uint64_t m_NextInode = 1;
   uint64_t m_NextTemporary = 0;
   uint64_t m_BytesRead = 0;

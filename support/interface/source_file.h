@@ -1,0 +1,105 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Files that bytes are read from, each opened once.
+//
+// A name leads to another file from one moment to the next: whoever reads some bytes of a file now
+// and others later must not go by its name a second time. So a run reads each file through the one
+// opening that it began with. Only so many files are open at a time; a file that had to be closed
+// in between is opened by its name again, and then it must be the same file, of the same size and
+// time, or its bytes are no longer to be had: the read fails with ESTALE.
+#pragma once
+
+#include "support/interface/host.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <deque>
+#include <memory>
+#include <span>
+#include <string>
+
+namespace support {
+
+class SourceFile;
+
+// What a file that is closed and opened again must still be: the same file, as long as before, and
+// not written to since.
+[[nodiscard]] bool isUnchanged(const FileStatus& before, const FileStatus& now);
+
+// The files that one run has open. They share the bound, also with those that outlive this object.
+class SourceFiles {
+public:
+  // Enough for the files that a run turns between, and few enough to leave the process room.
+  static constexpr size_t DefaultBound = 64;
+
+  // The host must outlive this object and all files that it has opened.
+  explicit SourceFiles(Host& host, size_t bound = DefaultBound);
+
+  [[nodiscard]] Host& getHost() const;
+
+  // Opens a file for reading. The host's error number, or 0.
+  [[nodiscard]] HostError open(const char* name, std::shared_ptr<SourceFile>& file);
+
+  // Opens a file so that it can be locked, and keeps it open whatever the bound.
+  [[nodiscard]] HostError openForUpdate(const char* name, std::shared_ptr<SourceFile>& file);
+
+  // A file that is not opened before somebody wants its bytes; `status` is what it must be then.
+  [[nodiscard]] std::shared_ptr<SourceFile> remember(const char* name, const FileStatus& status);
+
+  // The first failure of a close that nobody has heard of yet: its error number, or 0, and the name
+  // of the file. Reading went well all the same.
+  [[nodiscard]] HostError takeCloseError(std::string& name);
+
+private:
+  friend class SourceFile;
+  struct Shared;
+
+  std::shared_ptr<Shared> m_Shared;
+};
+
+// One of them. It is closed when nobody holds it any more.
+class SourceFile : public std::enable_shared_from_this<SourceFile> {
+public:
+  ~SourceFile() { close(); }
+  SourceFile(const SourceFile&) = delete;
+  SourceFile& operator=(const SourceFile&) = delete;
+
+  [[nodiscard]] const char* getName() const { return m_Name.c_str(); }
+  // What the host told of the file when it was opened.
+  [[nodiscard]] const FileStatus& getStatus() const { return m_Status; }
+  [[nodiscard]] Host& getHost() const;
+
+  // As Host::readAt. ESTALE if the file had to be opened again and is another one now.
+  [[nodiscard]] HostError readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done);
+
+  // 0 if the file still is as long and as old as when it was opened. ESTALE if it was written to
+  // meanwhile: what was read of it may be old in one place and new in another.
+  [[nodiscard]] HostError checkUnchanged();
+
+  // Waits until nobody else has locked the file; only for one that was opened for update. The
+  // host's error number where there are no locks.
+  [[nodiscard]] HostError lock();
+
+  // Lets go of the file, and so of its lock. Who reads on opens it again.
+  void close();
+
+  // The open file, which is the caller's to close from now on; only directly behind the opening.
+  [[nodiscard]] FileHandle giveHandle();
+
+private:
+  friend class SourceFiles;
+
+  SourceFile(std::shared_ptr<SourceFiles::Shared> shared, const char* name)
+      : m_Shared(std::move(shared)), m_Name(name) {}
+
+  [[nodiscard]] HostError openFirst(bool isForUpdate);
+  [[nodiscard]] HostError openAgain();
+
+  std::shared_ptr<SourceFiles::Shared> m_Shared;
+  std::string m_Name;
+  FileStatus m_Status;
+  FileHandle m_Handle;
+  bool m_IsKeptOpen = false;
+};
+
+} // namespace support

@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The files that are open stand in a queue. Who comes in when it is full sends out the one that has
+// been in it longest: runs go through their files in order, so that is the one that is not wanted
+// for the longest time.
+#include "support/interface/source_file.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <utility>
+
+namespace support {
+
+struct SourceFiles::Shared {
+  Host& host;
+  size_t bound;
+  std::deque<SourceFile*> open = {};
+  HostError closeError = 0;
+  std::string closeErrorName = {};
+
+  // Closes the oldest file that may be closed. False if there is none.
+  bool closeOldest() {
+    if (open.empty()) return false;
+    open.front()->close();
+    return true;
+  }
+
+  HostError openHandle(const char* name, bool isForUpdate, FileHandle& handle) {
+    return isForUpdate ? host.openForUpdate(name, handle) : host.openForReading(name, handle);
+  }
+
+  // The process or the machine may allow fewer files than the bound does.
+  HostError openWithinBound(const char* name, bool isForUpdate, FileHandle& handle) {
+    while (open.size() >= bound && closeOldest()) {
+    }
+    HostError error = openHandle(name, isForUpdate, handle);
+    while ((error == EMFILE || error == ENFILE) && closeOldest())
+      error = openHandle(name, isForUpdate, handle);
+    return error;
+  }
+
+  void noteClose(HostError error, const std::string& name) {
+    if (error == 0 || closeError != 0) return;
+    closeError = error;
+    closeErrorName = name;
+  }
+};
+
+bool isUnchanged(const FileStatus& before, const FileStatus& now) {
+  return now.isSameFile(before) && now.size == before.size &&
+         now.modificationTime == before.modificationTime &&
+         now.modificationNanoseconds == before.modificationNanoseconds;
+}
+
+SourceFiles::SourceFiles(Host& host, size_t bound)
+    : m_Shared(std::make_shared<Shared>(Shared{.host = host, .bound = bound})) {}
+
+Host& SourceFiles::getHost() const {
+  return m_Shared->host;
+}
+
+HostError SourceFiles::open(const char* name, std::shared_ptr<SourceFile>& file) {
+  file.reset(new SourceFile(m_Shared, name));
+  return file->openFirst(false);
+}
+
+HostError SourceFiles::openForUpdate(const char* name, std::shared_ptr<SourceFile>& file) {
+  file.reset(new SourceFile(m_Shared, name));
+  return file->openFirst(true);
+}
+
+std::shared_ptr<SourceFile> SourceFiles::remember(const char* name, const FileStatus& status) {
+  std::shared_ptr<SourceFile> file(new SourceFile(m_Shared, name));
+  file->m_Status = status;
+  return file;
+}
+
+HostError SourceFiles::takeCloseError(std::string& name) {
+  name = m_Shared->closeErrorName;
+  return std::exchange(m_Shared->closeError, 0);
+}
+
+Host& SourceFile::getHost() const {
+  return m_Shared->host;
+}
+
+HostError SourceFile::openFirst(bool isForUpdate) {
+  m_IsKeptOpen = isForUpdate;
+  HostError error = m_Shared->openWithinBound(m_Name.c_str(), isForUpdate, m_Handle);
+  if (error != 0) {
+    m_Handle = {};
+    return error;
+  }
+  if (!m_IsKeptOpen) m_Shared->open.push_back(this);
+  error = m_Shared->host.statusOf(m_Handle, m_Status);
+  if (error != 0) close();
+  return error;
+}
+
+HostError SourceFile::openAgain() {
+  if (m_Handle.isOpen()) return 0;
+  const FileStatus before = m_Status;
+  HostError error = openFirst(false);
+  if (error == 0 && !isUnchanged(before, m_Status)) error = ESTALE;
+  m_Status = before;
+  if (error != 0) close();
+  return error;
+}
+
+HostError SourceFile::readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done) {
+  done = 0;
+  if (const HostError error = openAgain(); error != 0) return error;
+  return m_Shared->host.readAt(m_Handle, bytes, offset, done);
+}
+
+HostError SourceFile::checkUnchanged() {
+  if (const HostError error = openAgain(); error != 0) return error;
+  FileStatus now;
+  if (const HostError error = m_Shared->host.statusOf(m_Handle, now); error != 0) return error;
+  return isUnchanged(m_Status, now) ? 0 : ESTALE;
+}
+
+HostError SourceFile::lock() {
+  return m_Shared->host.lock(m_Handle);
+}
+
+FileHandle SourceFile::giveHandle() {
+  std::erase(m_Shared->open, this);
+  return std::exchange(m_Handle, {});
+}
+
+void SourceFile::close() {
+  if (!m_Handle.isOpen()) return;
+  m_Shared->noteClose(m_Shared->host.close(giveHandle()), m_Name);
+}
+
+} // namespace support
