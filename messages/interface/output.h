@@ -33,6 +33,24 @@ void writeText(Stream stream, std::string_view text);
 // Writes bytes to stdout unchanged.
 void writeRaw(std::string_view bytes);
 
+// Keeps what is written to both streams until it is known whether it is true: a run that finds
+// itself overtaken drops it and starts over. Too much of it, or the end of the process, and it
+// comes out.
+class HeldOutput {
+public:
+  HeldOutput() = default;
+  // What is still held comes out.
+  ~HeldOutput() { release(); }
+  HeldOutput(const HeldOutput&) = delete;
+  HeldOutput& operator=(const HeldOutput&) = delete;
+
+  // From now on.
+  void hold();
+  void release();
+  // Forgets what was written since `hold`. False if some of it is out already.
+  [[nodiscard]] bool drop();
+};
+
 // Call at every way out of the process. False if stdout has failed, now or earlier.
 bool flushAll();
 

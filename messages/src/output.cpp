@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <string>
 #include <unistd.h>
+#include <utility>
+#include <vector>
 
 namespace messages {
 
@@ -17,6 +19,25 @@ constinit DescriptorSink outputDescriptor;
 constinit DescriptorSink errorDescriptor;
 constinit OutputBuffer outputBuffer(&outputDescriptor);
 constinit OutputSink* errorSink = &errorDescriptor;
+
+// What is held back, in the order in which it was written.
+struct HeldPiece {
+  Stream stream;
+  std::string bytes;
+};
+
+constexpr size_t MostHeld = 0x100000; // bytes
+
+struct Hold {
+  bool isOn = false;
+  size_t size = 0;
+  std::vector<HeldPiece> pieces = {};
+};
+
+Hold& currentHold() {
+  static Hold hold;
+  return hold;
+}
 
 // A name with such a byte could otherwise move the cursor, or change a terminal's settings.
 bool mustBeEscaped(char character) {
@@ -41,7 +62,7 @@ std::string escaped(std::string_view text) {
   return result;
 }
 
-void writeBytes(Stream stream, std::string_view bytes) {
+void passOn(Stream stream, std::string_view bytes) {
   if (stream == Stream_Output) {
     outputBuffer.append(bytes);
     return;
@@ -51,6 +72,27 @@ void writeBytes(Stream stream, std::string_view bytes) {
   static_cast<void>(errorSink->write(bytes));
 }
 
+void releaseHeld() {
+  Hold& hold = currentHold();
+  hold.isOn = false;
+  for (const HeldPiece& piece : std::exchange(hold.pieces, {})) {
+    passOn(piece.stream, piece.bytes);
+  }
+}
+
+void writeBytes(Stream stream, std::string_view bytes) {
+  Hold& hold = currentHold();
+  if (hold.isOn) hold.size += bytes.size();
+  if (hold.isOn && hold.size > MostHeld) releaseHeld();
+  if (!hold.isOn) {
+    passOn(stream, bytes);
+    return;
+  }
+  if (hold.pieces.empty() || hold.pieces.back().stream != stream)
+    hold.pieces.push_back({stream, {}});
+  hold.pieces.back().bytes += bytes;
+}
+
 } // namespace
 
 void openStreams() {
@@ -58,7 +100,22 @@ void openStreams() {
   errorDescriptor.open(STDERR_FILENO);
 }
 
+void HeldOutput::hold() {
+  currentHold() = {.isOn = true};
+}
+
+void HeldOutput::release() {
+  releaseHeld();
+}
+
+bool HeldOutput::drop() {
+  const bool isDropped = currentHold().isOn;
+  currentHold() = {};
+  return isDropped;
+}
+
 void closeStreams() {
+  releaseHeld();
   outputBuffer.flush();
   outputBuffer.noteError(outputDescriptor.close());
   static_cast<void>(errorDescriptor.close());
@@ -78,10 +135,11 @@ void writeText(Stream stream, std::string_view text) {
 }
 
 void writeRaw(std::string_view bytes) {
-  outputBuffer.append(bytes);
+  writeBytes(Stream_Output, bytes);
 }
 
 bool flushAll() {
+  releaseHeld();
   outputBuffer.flush();
   return !stdoutFailed();
 }

@@ -316,4 +316,74 @@ TEST(ProcessEnd, AShutDownThatFailsDoesNotGoRoundInCircles) {
             "once\n");
 }
 
+// ---- Output that is held back
+
+struct HeldOutputTest : MessagesTest {
+  void SetUp() override {
+    MessagesTest::SetUp();
+    setOutputSinks(&m_Sink, &m_Sink);
+  }
+
+  static void writeBoth() {
+    writeText(Stream_Output, "out 1\n");
+    writeText(Stream_Error, "err\n");
+    writeRaw("out 2\n");
+  }
+
+  std::string written() {
+    flushAll();
+    return m_All;
+  }
+
+  static constexpr const char* Both = "out 1\nerr\nout 2\n";
+  std::string m_All;
+  OrderedSink m_Sink{m_All};
+};
+
+TEST_F(HeldOutputTest, ComesOutInItsOrder) {
+  HeldOutput held;
+  held.hold();
+  writeBoth();
+  EXPECT_EQ(m_All, "");
+  held.release();
+  EXPECT_EQ(written(), Both);
+  EXPECT_FALSE(held.drop());
+}
+
+TEST_F(HeldOutputTest, MayBeDroppedAndBegunAgain) {
+  HeldOutput held;
+  for (int i = 0; i < 3; ++i) {
+    held.hold();
+    writeBoth();
+    EXPECT_TRUE(held.drop());
+  }
+  held.hold();
+  writeBoth();
+  held.release();
+  EXPECT_EQ(written(), Both);
+}
+
+TEST_F(HeldOutputTest, ComesOutAtTheEnd) {
+  {
+    HeldOutput held;
+    held.hold();
+    writeBoth();
+  }
+  EXPECT_EQ(written(), Both);
+  HeldOutput held;
+  held.hold();
+  writeBoth();
+  EXPECT_EQ(written(), std::string(Both) + Both);
+}
+
+TEST_F(HeldOutputTest, ComesOutWhenItIsTooMuch) {
+  HeldOutput held;
+  held.hold();
+  const std::string line(1000, 'x');
+  for (int i = 0; i < 2000; ++i)
+    writeRaw(line);
+  EXPECT_FALSE(held.drop());
+  EXPECT_EQ(written().size(), 2'000'000u);
+}
+
 } // namespace messages
