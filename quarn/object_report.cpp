@@ -51,7 +51,7 @@ private:
   [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
   void addMember(ArchiveMember& member);
   void addEntries(const elfext::ObjectModule& module, const ArchiveMember& member);
-  void addSizes(elfext::ObjectModule& module, const ArchiveMember& member);
+  void addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member);
   void printEntries() const;
 
   arlib::Archive& m_Archive;
@@ -81,8 +81,10 @@ void ObjectReport::addMember(ArchiveMember& member) {
   elfext::ObjectModule module;
   elfext::BySizeDeferredContentsSelector selector;
   if (!member.readObjectModule(module, &selector)) return;
+  const elfext::SizesStatistics totals = elfext::computeSizesStatistics(&module);
+  if (module.hasLostContents()) return;
   addEntries(module, member);
-  addSizes(module, member);
+  addSizes(totals, member);
 }
 
 void ObjectReport::addEntries(const elfext::ObjectModule& module, const ArchiveMember& member) {
@@ -101,8 +103,7 @@ void ObjectReport::addEntries(const elfext::ObjectModule& module, const ArchiveM
     m_Entries.push_back({static_cast<uint32_t>(module.getEntry()), name, member.getName()});
 }
 
-void ObjectReport::addSizes(elfext::ObjectModule& module, const ArchiveMember& member) {
-  const elfext::SizesStatistics totals = elfext::computeSizesStatistics(&module);
+void ObjectReport::addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member) {
   ObjectSizes sizes;
   sizes.code = static_cast<uint32_t>(totals.m_Code + totals.m_LiteralPools);
   sizes.readOnlyData = static_cast<uint32_t>(totals.m_RoData + totals.m_InternalPadding);

@@ -9,7 +9,8 @@ namespace elfext {
 
 class DataStore {
 public:
-  // Both answer true; the range must lie within the store.
+  // Both answer true, but for bytes that the file could not give: the module's handler has been
+  // told of these, and nothing is read or written. The range must lie within the store.
   virtual bool read(uint64_t offset, void* destination, uint64_t count) const = 0;
   virtual bool write(uint64_t offset, const void* source, uint64_t count) = 0;
   // Bytes.

@@ -4,6 +4,8 @@
 // its bytes, so that code and debug information need not even be read.
 #pragma once
 
+#include "support/interface/host.h"
+
 #include <cstdint>
 
 namespace elfext {
@@ -15,6 +17,9 @@ public:
   // `size` bytes at `offset` of the object, valid as long as the source; null if they can't be
   // had. An object module owns the source that its buffers refer to.
   [[nodiscard]] virtual const uint8_t* view(uint64_t offset, uint64_t size) = 0;
+
+  // Why they could not be had the last time: the host's error number; 0 where it has none.
+  [[nodiscard]] virtual support::HostError getHostError() const = 0;
 };
 
 } // namespace elfext

@@ -136,6 +136,10 @@ public:
   void adoptImageSource(std::unique_ptr<ImageSource> imageSource) {
     m_ImageSource = std::move(imageSource);
   }
+  // Tells the handler that the file could not give bytes which somebody wanted to look at only now.
+  void reportLostContents(support::HostError error);
+  // Whether that has happened: what was made of the contents since is not to be trusted.
+  [[nodiscard]] bool hasLostContents() const { return m_HasLostContents; }
   // The text, or a copy of it in the object region, as setNamesInBuffer says. Null stays null.
   [[nodiscard]] const char* keepText(const char* text) const;
 
@@ -579,6 +583,7 @@ private:
   const uint8_t* m_ReadBuffer = nullptr;
   bool m_AreNamesInBuffer = false;
   std::unique_ptr<ImageSource> m_ImageSource;
+  bool m_HasLostContents = false;
   ErrorHandler* m_ErrorHandler = nullptr;
   const char* m_FileName = nullptr;
   const char* m_ObjectName = nullptr;

@@ -5,17 +5,22 @@
 // been told to its error handler, except that a handler which lets a foreign machine pass gets true
 // and the module as it was.
 //
-// Section contents that nobody looks at are not read. In the forms that read from a file the
-// module therefore holds on to the file, its own or the caller's, until it is cleared or destroyed.
-// The host must live as long.
+// A range that the file does not have fails the read, also where nobody would look at its end.
+//
+// Section contents that nobody looks at are not read in the forms that open a file by its name, or
+// that share one that is open: the module holds on to the file until it is cleared or destroyed.
+// The host must live as long. Bytes that can't be had when somebody does look are told to the
+// module's handler then, as a read error; see Buffer. The forms for a caller's handle have read
+// everything when they return, but for what was deferred.
 //
 // The selector may be null. It is asked only in the first and the fourth form, for files larger
 // than 0x100000 bytes.
 #pragma once
 
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <cstdint>
+#include <memory>
 #include <span>
 
 namespace elfext {
@@ -39,14 +44,17 @@ class ObjectModule;
                                DeferredContentsSelector* selector);
 
 // A whole open file. With deferred contents the module closes the file when the last of them is
-// loaded or dropped. Without, and after a failure, it remains the caller's to close, once the
-// module has been cleared.
+// loaded or dropped. Without, and after a failure, it remains the caller's to close, at any time.
 [[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile,
                                ObjectModule& module, DeferredContentsSelector* selector);
 
-// The second form for an open file, which remains the caller's to close, after the module has been
-// cleared.
+// The second form for an open file, which remains the caller's to close, at any time.
 [[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile, uint64_t offset,
+                               uint64_t size, ObjectModule& module,
+                               DeferredContentsSelector* selector);
+
+// The second form for a file that others read as well, all through its one opening.
+[[nodiscard]] bool readElfFile(std::shared_ptr<support::SourceFile> file, uint64_t offset,
                                uint64_t size, ObjectModule& module,
                                DeferredContentsSelector* selector);
 

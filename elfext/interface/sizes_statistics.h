@@ -24,7 +24,8 @@ struct SizesStatistics {
 };
 
 // Changes nothing of the module but its views of symbols, which are made on demand. A module that
-// was read can always be counted.
+// was read can always be counted; of one that has lost contents since, the bytes that can't be
+// looked at are missing.
 [[nodiscard]] SizesStatistics computeSizesStatistics(ObjectModule* objectModule);
 
 // The eight totals, each cut to 32 bits, between two rules.

@@ -40,14 +40,32 @@ void Buffer::setExternalData(ExternalDataFunction function, void* handle, uint64
   m_ExternalDataSize = size;
 }
 
+void Buffer::tellLoss() const {
+  if (!m_Contents.isLost() || m_IsLossTold) return;
+  m_IsLossTold = true;
+  m_ObjectModule->reportLostContents(m_Contents.getHostError());
+}
+
+const uint8_t* Buffer::viewAt(uint64_t offset) const {
+  const uint8_t* bytes = m_Contents.view();
+  tellLoss();
+  return bytes == nullptr ? nullptr : bytes + offset;
+}
+
+uint8_t* Buffer::modifyAt(uint64_t offset) {
+  uint8_t* bytes = m_Contents.modify();
+  tellLoss();
+  return bytes == nullptr ? nullptr : bytes + offset;
+}
+
 const uint8_t* Buffer::getContents() const {
   QUARN_ASSERT(1, !m_ExternalDataFunction);
-  return m_Contents.view();
+  return viewAt(0);
 }
 
 uint8_t* Buffer::getModifiableContents() {
   QUARN_ASSERT(1, !m_ExternalDataFunction);
-  return m_Contents.modify();
+  return modifyAt(0);
 }
 
 uint64_t Buffer::getSize() const {
@@ -61,26 +79,28 @@ void Buffer::setSize(uint64_t size) {
   }
   QUARN_ASSERT(1, size <= UINT32_MAX);
   m_Contents.setSize(size);
+  tellLoss();
 }
 
 void Buffer::reserve(uint64_t size) {
   if (isExternal()) return;
   QUARN_ASSERT(1, size <= UINT32_MAX);
   m_Contents.reserve(size);
+  tellLoss();
 }
 
 template <class Word>
 Word Buffer::loadWord(uint64_t offset) const {
-  if (!isExternal())
-    return assemble<Word>(m_Contents.view() + offset, m_ObjectModule->isLittleEndian());
   std::array<uint8_t, sizeof(Word)> bytes;
-  read(offset, bytes.data(), bytes.size());
-  return assemble<Word>(bytes.data(), m_ObjectModule->isLittleEndian());
+  if (isExternal()) readExternal(offset, bytes.data(), bytes.size());
+  const uint8_t* word = isExternal() ? bytes.data() : viewAt(offset);
+  return word == nullptr ? Word{0} : assemble<Word>(word, m_ObjectModule->isLittleEndian());
 }
 
 template <class Word>
 void Buffer::storeWord(uint64_t offset, Word value) {
-  disassemble<Word>(m_Contents.modify() + offset, value, m_ObjectModule->isLittleEndian());
+  uint8_t* word = modifyAt(offset);
+  if (word != nullptr) disassemble<Word>(word, value, m_ObjectModule->isLittleEndian());
 }
 
 template <class Word>
@@ -94,7 +114,7 @@ uint64_t Buffer::appendWord(Word value) {
 uint8_t Buffer::getByte(uint64_t offset) const {
   if (isExternal()) return loadWord<uint8_t>(offset);
   QUARN_ASSERT(1, offset < m_Contents.getSize());
-  return m_Contents.view()[offset];
+  return loadWord<uint8_t>(offset);
 }
 
 uint16_t Buffer::get16(uint64_t offset) const {
@@ -137,7 +157,7 @@ void Buffer::setByte(uint64_t offset, uint8_t value) {
   QUARN_ASSERT(1, !m_ExternalDataFunction);
   QUARN_ASSERT(1, offset <= UINT32_MAX);
   QUARN_ASSERT(1, offset < m_Contents.getSize());
-  m_Contents.modify()[offset] = value;
+  storeWord(offset, value);
 }
 
 void Buffer::set16(uint64_t offset, uint16_t value) {
@@ -178,18 +198,24 @@ void Buffer::readExternal(uint64_t offset, void* buffer, uint64_t count) const {
   }
 }
 
-void Buffer::read(uint64_t offset, void* buffer, uint64_t count) const {
+bool Buffer::read(uint64_t offset, void* buffer, uint64_t count) const {
   QUARN_ASSERT(1, offset + count >= offset);
   QUARN_ASSERT(1, offset + count >= count);
   QUARN_ASSERT(1, buffer != NULL);
-  if (isExternal()) return readExternal(offset, buffer, count);
+  if (isExternal()) {
+    readExternal(offset, buffer, count);
+    return true;
+  }
   QUARN_ASSERT(1, offset <= m_Contents.getSize());
   QUARN_ASSERT(1, count <= m_Contents.getSize());
   QUARN_ASSERT(1, offset + count <= m_Contents.getSize());
-  if (count != 0) std::memcpy(buffer, m_Contents.view() + offset, count);
+  if (count == 0) return true;
+  const uint8_t* bytes = viewAt(offset);
+  if (bytes != nullptr) std::memcpy(buffer, bytes, count);
+  return bytes != nullptr;
 }
 
-void Buffer::write(uint64_t offset, const void* buffer, uint64_t count) {
+bool Buffer::write(uint64_t offset, const void* buffer, uint64_t count) {
   QUARN_ASSERT(1, !m_ExternalDataFunction);
   QUARN_ASSERT(1, buffer != NULL);
   QUARN_ASSERT(1, offset <= UINT32_MAX);
@@ -197,7 +223,10 @@ void Buffer::write(uint64_t offset, const void* buffer, uint64_t count) {
   QUARN_ASSERT(1, offset <= m_Contents.getSize());
   QUARN_ASSERT(1, count <= m_Contents.getSize());
   QUARN_ASSERT(1, offset + count <= m_Contents.getSize());
-  if (count != 0) std::memcpy(m_Contents.modify() + offset, buffer, count);
+  if (count == 0) return true;
+  uint8_t* bytes = modifyAt(offset);
+  if (bytes != nullptr) std::memcpy(bytes, buffer, count);
+  return bytes != nullptr;
 }
 
 uint64_t Buffer::appendByte(uint8_t value) {

@@ -8,15 +8,13 @@
 
 namespace elfext {
 
-// What an image can't give is zero bytes: who needs to tell the difference has asked the image
-// itself, before.
+// An image that has failed once is not asked again: the same bytes must not be there for one look
+// and gone for the next.
 const uint8_t* ContentBytes::fetch() const {
+  if (m_IsLost) return nullptr;
   m_Foreign = m_Source->view(m_SourceOffset, m_Size);
-  m_Source = nullptr;
-  if (m_Foreign != nullptr) return m_Foreign;
-  void* zeros = m_Region->allocate(m_Size, 1);
-  std::memset(zeros, 0, m_Size);
-  m_Foreign = static_cast<const uint8_t*>(zeros);
+  m_IsLost = m_Foreign == nullptr;
+  if (!m_IsLost) m_Source = nullptr;
   return m_Foreign;
 }
 
@@ -30,6 +28,7 @@ void ContentBytes::borrow(const uint8_t* bytes, uint64_t size) {
   m_Source = nullptr;
   m_Foreign = bytes;
   m_Size = size;
+  m_IsLost = false;
 }
 
 void ContentBytes::defer(ImageSource& source, uint64_t offset, uint64_t size) {
@@ -37,32 +36,39 @@ void ContentBytes::defer(ImageSource& source, uint64_t offset, uint64_t size) {
   m_SourceOffset = offset;
   m_Foreign = nullptr;
   m_Size = size;
+  m_IsLost = false;
 }
 
-FastArray<unsigned char>& ContentBytes::own() {
+FastArray<unsigned char>* ContentBytes::own() {
   const uint8_t* foreign = isOwned() ? nullptr : view();
+  if (m_IsLost) return nullptr;
   if (m_Own == nullptr) m_Own = alloclib::create<FastArray<unsigned char>>(*m_Region, m_Region);
-  if (isOwned()) return *m_Own;
+  if (isOwned()) return m_Own;
   QUARN_ASSERT(1, m_Size <= UINT32_MAX);
   m_Own->setSize(static_cast<uint32_t>(m_Size));
   if (foreign != nullptr) std::memcpy(m_Own->begin(), foreign, m_Size);
   m_Foreign = nullptr;
   m_Source = nullptr;
-  return *m_Own;
+  return m_Own;
 }
 
 uint8_t* ContentBytes::modify() {
-  return m_Size == 0 ? nullptr : own().begin();
+  FastArray<unsigned char>* bytes = m_Size == 0 ? nullptr : own();
+  return bytes == nullptr ? nullptr : bytes->begin();
 }
 
 void ContentBytes::setSize(uint64_t size) {
+  if (size == 0 && !isOwned()) borrow(nullptr, 0);
   // Less of somebody else's bytes is still a view of them.
-  if (isOwned() || size > m_Size) own().setSize(static_cast<uint32_t>(size));
+  const bool mustOwn = isOwned() || size > m_Size;
+  FastArray<unsigned char>* bytes = mustOwn ? own() : nullptr;
+  if (bytes != nullptr) bytes->setSize(static_cast<uint32_t>(size));
   m_Size = size;
 }
 
 void ContentBytes::reserve(uint64_t capacity) {
-  own().reserve(static_cast<uint32_t>(capacity));
+  if (FastArray<unsigned char>* bytes = own(); bytes != nullptr)
+    bytes->reserve(static_cast<uint32_t>(capacity));
 }
 
 } // namespace elfext

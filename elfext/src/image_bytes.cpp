@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <new>
+#include <utility>
 
 namespace elfext {
 
@@ -17,20 +18,16 @@ constexpr size_t BlocksAhead = 16;
 ImageBytes::ImageBytes(std::span<const uint8_t> bytes)
     : m_Bytes(bytes.data()), m_Size(bytes.size()) {}
 
+ImageBytes::ImageBytes(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size)
+    : m_Size(size), m_File(std::move(file)), m_FileOffset(offset) {}
+
 ImageBytes::ImageBytes(support::Host& host, support::FileHandle file, uint64_t offset,
                        uint64_t size, bool closesFile)
-    : m_Size(size), m_Host(&host), m_File(file), m_FileOffset(offset), m_ClosesFile(closesFile) {}
+    : m_Size(size), m_Host(&host), m_Handle(file), m_FileOffset(offset), m_ClosesFile(closesFile) {}
 
 ImageBytes::~ImageBytes() {
   // What was read is right whatever a close says of it now.
-  static_cast<void>(closeFile());
-}
-
-support::HostError ImageBytes::closeFile() {
-  if (!m_ClosesFile || !m_File.isOpen()) return 0;
-  const support::FileHandle file = m_File;
-  m_File = {};
-  return m_Host->close(file);
+  if (m_ClosesFile && m_Handle.isOpen()) static_cast<void>(m_Host->close(m_Handle));
 }
 
 bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
@@ -40,14 +37,17 @@ bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
 }
 
 bool ImageBytes::prepare() {
-  if (m_Host == nullptr || m_Size == 0 || m_Loaded != nullptr)
-    return m_Failure == ImageFailure::None;
+  if (!isFromFile() || m_Size == 0 || m_Loaded != nullptr) return m_Failure == ImageFailure::None;
   m_Loaded.reset(new (std::nothrow) uint8_t[m_Size]);
   if (m_Loaded == nullptr) return fail(ImageFailure::NoMemory);
   m_Bytes = m_Loaded.get();
   m_MissingBlocks = (m_Size - 1) / BlockSize + 1;
   m_IsBlockLoaded.resize(m_MissingBlocks);
   return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
+}
+
+bool ImageBytes::loadAll() {
+  return m_MissingBlocks == 0 || load(0, m_Size);
 }
 
 const uint8_t* ImageBytes::view(uint64_t offset, uint64_t size) {
@@ -82,13 +82,18 @@ size_t ImageBytes::endOfMissing(size_t first, size_t end) const {
   return first;
 }
 
+support::HostError ImageBytes::readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done) {
+  done = 0;
+  if (m_File != nullptr) return m_File->readAt(bytes, offset, done);
+  return m_Handle.isOpen() ? m_Host->readAt(m_Handle, bytes, offset, done) : 0;
+}
+
 bool ImageBytes::loadBlocks(size_t first, size_t end) {
-  if (!m_File.isOpen()) return fail(ImageFailure::Unreadable);
   const uint64_t offset = first * BlockSize;
   const uint64_t size = std::min(end * BlockSize, m_Size) - offset;
   size_t done = 0;
   const support::HostError error =
-      m_Host->readAt(m_File, {m_Loaded.get() + offset, size}, m_FileOffset + offset, done);
+      readAt({m_Loaded.get() + offset, size}, m_FileOffset + offset, done);
   if (error != 0 || done < size) return fail(ImageFailure::Unreadable, error);
   std::fill(m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(first),
             m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(end), true);

@@ -1,15 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The bytes of one object file: in memory that somebody lends, or in a range of an open file, of
-// which only those blocks are read that somebody looks at. A small image is read whole, in one
-// host call.
+// The bytes of one object file: in memory that somebody lends, or in a range of a file, of which
+// only those blocks are read that somebody looks at. A small image is read whole, in one host call.
 //
 // The bytes of a file keep one address, in one array as large as the image whose untouched pages
 // cost nothing. So a thousand overlapping views need no more memory than one.
 #pragma once
 
 #include "elfext/interface/image_source.h"
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <cstdint>
 #include <memory>
@@ -33,8 +32,10 @@ public:
 
   // Bytes that outlive this object.
   explicit ImageBytes(std::span<const uint8_t> bytes);
-  // `size` bytes at `offset` of the file, which must stay open as long as somebody looks for bytes;
-  // with `closesFile` it is this object that closes it.
+  // `size` bytes at `offset` of a file that others may read as well.
+  ImageBytes(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size);
+  // The same for a handle, which must stay open as long as somebody looks for bytes; with
+  // `closesFile` it is this object that closes it.
   ImageBytes(support::Host& host, support::FileHandle file, uint64_t offset, uint64_t size,
              bool closesFile);
   ~ImageBytes() override;
@@ -45,13 +46,12 @@ public:
   // failure.
   [[nodiscard]] bool prepare();
 
-  // From now on the file is somebody else's to close.
+  // Reads all that was not looked at yet. False for a failure.
+  [[nodiscard]] bool loadAll();
+  // From now on the handle is somebody else's to close.
   void leaveFileOpen() { m_ClosesFile = false; }
-  // Somebody else closes the file now: what was not read can't be had any more.
-  void forgetFile() { m_File = {}; }
-  // Closes the file if it is this object's to close; the host's answer.
-  [[nodiscard]] support::HostError closeFile();
-  [[nodiscard]] bool isReadWhole() const { return m_MissingBlocks == 0; }
+  // Somebody else closes the handle now: what was not read can't be had any more.
+  void forgetFile() { m_Handle = {}; }
 
   // Bytes.
   [[nodiscard]] uint64_t getSize() const { return m_Size; }
@@ -64,18 +64,22 @@ public:
 
   // What the last failed operation failed for, with the host's error number; 0 where it has none.
   [[nodiscard]] ImageFailure getFailure() const { return m_Failure; }
-  [[nodiscard]] support::HostError getHostError() const { return m_HostError; }
+  [[nodiscard]] support::HostError getHostError() const override { return m_HostError; }
 
 private:
   [[nodiscard]] bool fail(ImageFailure failure, support::HostError error = 0);
   [[nodiscard]] bool load(uint64_t offset, uint64_t size);
   [[nodiscard]] bool loadBlocks(size_t first, size_t end);
   [[nodiscard]] size_t endOfMissing(size_t first, size_t end) const;
+  [[nodiscard]] bool isFromFile() const { return m_File != nullptr || m_Host != nullptr; }
+  [[nodiscard]] support::HostError readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done);
 
   const uint8_t* m_Bytes = nullptr;
   uint64_t m_Size;
+  std::shared_ptr<support::SourceFile> m_File;
+  // Or the handle that there is in its place.
   support::Host* m_Host = nullptr;
-  support::FileHandle m_File;
+  support::FileHandle m_Handle;
   uint64_t m_FileOffset = 0;
   bool m_ClosesFile = false;
   std::unique_ptr<uint8_t[]> m_Loaded;

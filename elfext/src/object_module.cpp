@@ -13,6 +13,7 @@
 #include "elfext/interface/preemption.h"
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
+#include "elfext/src/go_on.h"
 #include "elfext/src/pruner.h"
 
 #include <algorithm>
@@ -243,6 +244,7 @@ void ObjectModule::clear() {
     bool goes(const Preemption&) const override { return true; }
   };
   prune(Everything());
+  m_HasLostContents = false;
   // The headers stay, but not where they were.
   forgetPlacement();
   clearDynamicData();
@@ -252,6 +254,11 @@ void ObjectModule::clear() {
   m_ReadBuffer = nullptr;
   m_AreNamesInBuffer = false;
   m_ImageSource.reset();
+}
+
+void ObjectModule::reportLostContents(support::HostError error) {
+  m_HasLostContents = true;
+  static_cast<void>(goOn(*this, &ErrorHandler::ioErrorReading, error));
 }
 
 void ObjectModule::clearDynamicData() {

@@ -19,15 +19,13 @@ DataStructure* RawDataBlock::createDataStructure(alloclib::RegionGeneral&, uint6
 }
 
 bool RawDataBlock::read(uint64_t offset, void* destination, uint64_t count) const {
-  m_Contents.read(offset, destination, count);
-  return true;
+  return m_Contents.read(offset, destination, count);
 }
 
 bool RawDataBlock::write(uint64_t offset, const void* source, uint64_t count) {
   // A block that nobody has given bytes yet has room for them now.
   if (m_Contents.getSize() != m_Size) m_Contents.setSize(m_Size);
-  m_Contents.write(offset, source, count);
-  return true;
+  return m_Contents.write(offset, source, count);
 }
 
 } // namespace elfext

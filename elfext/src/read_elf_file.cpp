@@ -43,26 +43,53 @@ bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, Deferral
   return false;
 }
 
-// A range of a file that this read has opened.
-bool readOwnFile(support::Host& host, support::FileHandle file, uint64_t offset, uint64_t size,
-                 ObjectModule& module) {
-  auto image = std::make_unique<ImageBytes>(host, file, offset, size, true);
-  // A small image is in memory as a whole, and the file is not needed any more.
-  if (size <= ImageBytes::WholeReadLimit && image->prepare()) {
-    const support::HostError error = image->closeFile();
-    if (error != 0) return reportReadError(module, error);
+// Whether the file has the range at all: a look at its end may come late, or never.
+bool hasRange(const support::FileStatus& status, uint64_t offset, uint64_t size) {
+  const auto available = static_cast<uint64_t>(status.size);
+  return offset <= available && size <= available - offset;
+}
+
+bool readShared(const std::shared_ptr<support::SourceFile>& file, uint64_t offset, uint64_t size,
+                ObjectModule& module) {
+  if (!hasRange(file->getStatus(), offset, size)) return reportReadError(module, 0);
+  return readImage(module, std::make_unique<ImageBytes>(file, offset, size), nullptr);
+}
+
+// A range of a file that this read has opened. A small image is in memory as a whole, and the file
+// is not needed any more.
+bool readOwnFile(support::SourceFiles& files, const std::shared_ptr<support::SourceFile>& file,
+                 uint64_t offset, uint64_t size, ObjectModule& module) {
+  if (size > ImageBytes::WholeReadLimit || !hasRange(file->getStatus(), offset, size))
+    return readShared(file, offset, size, module);
+  auto image = std::make_unique<ImageBytes>(file, offset, size);
+  if (image->prepare()) {
+    file->close();
+    std::string name;
+    if (const support::HostError error = files.takeCloseError(name); error != 0)
+      return reportReadError(module, error);
   }
   return readImage(module, std::move(image), nullptr);
 }
 
+// A range of a file that the caller may close when the read is over.
+bool readLentFile(support::Host& host, support::FileHandle file, const support::FileStatus& status,
+                  uint64_t offset, uint64_t size, ObjectModule& module) {
+  if (!hasRange(status, offset, size)) return reportReadError(module, 0);
+  auto image = std::make_unique<ImageBytes>(host, file, offset, size, false);
+  if (image->prepare() && !image->loadAll()) return reportReadError(module, image->getHostError());
+  image->forgetFile();
+  return readImage(module, std::move(image), nullptr);
+}
+
 // What is not deferred is loaded, so that the deferred sections alone decide when the file closes.
-bool loadWhatIsNotDeferred(const ObjectModule& module, const ImageBytes& image) {
+// False if some of it can't be had, which has been reported.
+bool loadWhatIsNotDeferred(const ObjectModule& module) {
   for (const Section* section : module.getSections()) {
     if (!section->isContentsDeferred()) static_cast<void>(section->getContents());
   }
   for (RawDataBlock* block : module.getRawDataBlocks())
     static_cast<void>(block->getBuffer().getContents());
-  return image.getFailure() == ImageFailure::None;
+  return !module.hasLostContents();
 }
 
 // A large file whose sections may be deferred. The first deferred section makes the record that
@@ -72,8 +99,10 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
   if (deferral.shared == nullptr) return isRead;
-  if (isRead && !loadWhatIsNotDeferred(module, bytes))
-    isRead = reportReadError(module, bytes.getHostError());
+  if (isRead && !loadWhatIsNotDeferred(module)) {
+    module.clear();
+    isRead = false;
+  }
   if (isRead)
     bytes.forgetFile();
   else if (!isOwnFile)
@@ -82,21 +111,13 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   return error == 0 || !isRead ? isRead : reportReadError(module, error);
 }
 
-bool readWholeFile(support::Host& host, support::FileHandle file, bool isOwnFile,
+bool readWholeFile(support::Host& host, support::FileHandle file, const support::FileStatus& status,
                    ObjectModule& module, DeferredContentsSelector* selector) {
-  support::FileStatus status;
-  const support::HostError error = host.statusOf(file, status);
-  if (error != 0) {
-    if (isOwnFile) static_cast<void>(host.close(file));
-    return reportReadError(module, error);
-  }
   const auto size = static_cast<uint64_t>(status.size);
-  if (selector != nullptr && size > LargestEagerFile) {
-    DeferralFile deferral = {.host = host, .file = file, .selector = *selector};
-    return readDeferring(deferral, size, isOwnFile, module);
-  }
-  if (isOwnFile) return readOwnFile(host, file, 0, size, module);
-  return readImage(module, std::make_unique<ImageBytes>(host, file, 0, size, false), nullptr);
+  if (selector == nullptr || size <= LargestEagerFile)
+    return readLentFile(host, file, status, 0, size, module);
+  DeferralFile deferral = {.host = host, .file = file, .selector = *selector};
+  return readDeferring(deferral, size, /*isOwnFile=*/false, module);
 }
 
 } // namespace
@@ -104,20 +125,33 @@ bool readWholeFile(support::Host& host, support::FileHandle file, bool isOwnFile
 bool readElfFile(support::Host& host, const char* fileName, ObjectModule& module,
                  DeferredContentsSelector* selector) {
   QUARN_ASSERT(1, fileName != NULL);
+  module.clear();
   module.setFileName(fileName);
-  support::FileHandle file;
-  const support::HostError error = host.openForReading(fileName, file);
-  if (error != 0) return reportReadError(module, error);
-  return readWholeFile(host, file, /*isOwnFile=*/true, module, selector);
+  support::SourceFiles files(host);
+  std::shared_ptr<support::SourceFile> file;
+  if (const support::HostError error = files.open(fileName, file); error != 0)
+    return reportReadError(module, error);
+  const auto size = static_cast<uint64_t>(file->getStatus().size);
+  if (selector == nullptr || size <= LargestEagerFile)
+    return readOwnFile(files, file, 0, size, module);
+  DeferralFile deferral = {.host = host, .file = file->giveHandle(), .selector = *selector};
+  return readDeferring(deferral, size, /*isOwnFile=*/true, module);
 }
 
 bool readElfFile(support::Host& host, const char* fileName, uint64_t offset, uint64_t size,
                  ObjectModule& module, DeferredContentsSelector*) {
   QUARN_ASSERT(1, fileName != NULL);
-  support::FileHandle file;
-  const support::HostError error = host.openForReading(fileName, file);
-  if (error != 0) return reportReadError(module, error);
-  return readOwnFile(host, file, offset, size, module);
+  support::SourceFiles files(host);
+  std::shared_ptr<support::SourceFile> file;
+  if (const support::HostError error = files.open(fileName, file); error != 0)
+    return reportReadError(module, error);
+  return readOwnFile(files, file, offset, size, module);
+}
+
+bool readElfFile(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
+                 ObjectModule& module, DeferredContentsSelector*) {
+  QUARN_ASSERT(1, file != NULL);
+  return readShared(file, offset, size, module);
 }
 
 bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> bytes,
@@ -131,14 +165,19 @@ bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> 
 bool readElfFile(support::Host& host, support::FileHandle elfFile, ObjectModule& module,
                  DeferredContentsSelector* selector) {
   mustBeOpen(elfFile);
-  return readWholeFile(host, elfFile, /*isOwnFile=*/false, module, selector);
+  support::FileStatus status;
+  const support::HostError error = host.statusOf(elfFile, status);
+  if (error != 0) return reportReadError(module, error);
+  return readWholeFile(host, elfFile, status, module, selector);
 }
 
 bool readElfFile(support::Host& host, support::FileHandle elfFile, uint64_t offset, uint64_t size,
                  ObjectModule& module, DeferredContentsSelector*) {
   mustBeOpen(elfFile);
-  return readImage(module, std::make_unique<ImageBytes>(host, elfFile, offset, size, false),
-                   nullptr);
+  support::FileStatus status;
+  const support::HostError error = host.statusOf(elfFile, status);
+  if (error != 0) return reportReadError(module, error);
+  return readLentFile(host, elfFile, status, offset, size, module);
 }
 
 } // namespace elfext

@@ -29,13 +29,11 @@ bool Section::isModifiable() const {
 }
 
 bool Section::read(uint64_t offset, void* destination, uint64_t count) const {
-  readable().read(offset, destination, count);
-  return true;
+  return readable().read(offset, destination, count);
 }
 
 bool Section::write(uint64_t offset, const void* source, uint64_t count) {
-  writable().write(offset, source, count);
-  return true;
+  return writable().write(offset, source, count);
 }
 
 uint64_t Section::appendByte(uint8_t value) {

@@ -72,23 +72,23 @@ void countSection(Section& section, const CompressedSectionExtractor& extractor,
   }
 }
 
-bool isAllZero(const RawDataBlock& block) {
+// Null for a block whose bytes can't be had, which has been told.
+uint64_t* totalFor(const RawDataBlock& block, SizesStatistics& statistics) {
   std::array<uint8_t, 4096> bytes;
   for (uint64_t offset = 0; offset < block.getSize();) {
     const uint64_t count = std::min<uint64_t>(bytes.size(), block.getSize() - offset);
-    block.read(offset, bytes.data(), count);
+    if (!block.read(offset, bytes.data(), count)) return nullptr;
     if (std::any_of(bytes.begin(), bytes.begin() + static_cast<ptrdiff_t>(count),
                     [](uint8_t byte) { return byte != 0; }))
-      return false;
+      return &statistics.m_RoData;
     offset += count;
   }
-  return true;
+  return &statistics.m_InternalPadding;
 }
 
 void countRawData(const ObjectModule& module, SizesStatistics& statistics) {
   for (const RawDataBlock* block : module.getRawDataBlocks()) {
-    uint64_t& total = isAllZero(*block) ? statistics.m_InternalPadding : statistics.m_RoData;
-    total += block->getSize();
+    if (uint64_t* total = totalFor(*block, statistics)) *total += block->getSize();
   }
 }
 

@@ -7,7 +7,9 @@
 #include "module_fixture.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
+#include <string>
 
 namespace elfext {
 namespace {
@@ -222,6 +224,7 @@ public:
     ++views;
     return isBroken || offset + size > bytes.size() ? nullptr : bytes.data() + offset;
   }
+  [[nodiscard]] support::HostError getHostError() const override { return isBroken ? EIO : 0; }
 
   std::vector<uint8_t> bytes = {0, 1, 2, 3, 4, 5, 6, 7};
   bool isBroken = false;
@@ -253,14 +256,71 @@ TEST_F(BufferTest, CopiesBytesOfTheImageBeforeTheFirstChange) {
   EXPECT_EQ(image.bytes[2], 2u);
 }
 
-TEST_F(BufferTest, ShowsZeroBytesForWhatTheImageCannotGive) {
+class ReadErrorNotes final : public ErrorHandler {
+public:
+  bool report(const ObjectModule&, uint32_t, const std::string& text) override {
+    texts.push_back(text);
+    return true;
+  }
+
+  std::vector<std::string> texts;
+};
+
+class LostBytesTest : public BufferTest {
+protected:
+  LostBytesTest() {
+    module.setErrorHandler(&notes);
+    image.isBroken = true;
+    buffer.defer(image, 2, 4);
+  }
+
+  ReadErrorNotes notes;
   CountingImage image;
-  image.isBroken = true;
-  buffer.defer(image, 2, 4);
-  EXPECT_THAT(contents(), testing::ElementsAre(0, 0, 0, 0));
-  buffer.setByte(0, 1);
-  EXPECT_THAT(contents(), testing::ElementsAre(1, 0, 0, 0));
+};
+
+TEST_F(LostBytesTest, AreToldOfOnceAndNeverLookLikeData) {
+  uint8_t bytes[4] = {9, 9, 9, 9};
+  EXPECT_FALSE(module.hasLostContents());
+  EXPECT_EQ(buffer.getContents(), nullptr);
+  EXPECT_FALSE(buffer.read(0, bytes, 4));
+  EXPECT_THAT(bytes, testing::ElementsAre(9, 9, 9, 9));
+  EXPECT_EQ(buffer.get32(0), 0u);
+  EXPECT_EQ(buffer.getSize(), 4u);
+  EXPECT_TRUE(module.hasLostContents());
+  EXPECT_THAT(notes.texts, testing::ElementsAre("I/O error reading file: Input/output error"));
+}
+
+TEST_F(LostBytesTest, AreNotAskedForAgain) {
+  EXPECT_EQ(buffer.getContents(), nullptr);
+  image.isBroken = false;
+  EXPECT_EQ(buffer.getContents(), nullptr);
   EXPECT_EQ(image.views, 1);
+}
+
+TEST_F(LostBytesTest, CannotBeWrittenTo) {
+  const uint8_t byte = 7;
+  EXPECT_EQ(buffer.getModifiableContents(), nullptr);
+  EXPECT_FALSE(buffer.write(0, &byte, 1));
+  buffer.setByte(0, 1);
+  buffer.set32(0, 1);
+  buffer.appendByte(2);
+  buffer.reserve(100);
+  EXPECT_EQ(buffer.getSize(), 5u);
+  EXPECT_EQ(buffer.getContents(), nullptr);
+  EXPECT_EQ(notes.texts.size(), 1u);
+}
+
+TEST_F(LostBytesTest, GiveWayToOthers) {
+  EXPECT_EQ(buffer.getContents(), nullptr);
+  const uint8_t bytes[] = {1, 2};
+  buffer.borrow(bytes, 2);
+  EXPECT_THAT(contents(), testing::ElementsAre(1, 2));
+  buffer.defer(image, 2, 4);
+  EXPECT_EQ(buffer.getContents(), nullptr);
+  EXPECT_EQ(notes.texts.size(), 2u);
+  buffer.setSize(0);
+  buffer.appendByte(3);
+  EXPECT_THAT(contents(), testing::ElementsAre(3));
 }
 
 TEST_F(BufferTest, MayBeLargerThan4GiBWhenItsBytesAreElsewhere) {

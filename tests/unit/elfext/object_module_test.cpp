@@ -133,6 +133,7 @@ public:
   explicit NotedSource(int& ends) : m_Ends(ends) {}
   ~NotedSource() override { ++m_Ends; }
   const uint8_t* view(uint64_t, uint64_t) override { return nullptr; }
+  [[nodiscard]] support::HostError getHostError() const override { return 0; }
 
 private:
   int& m_Ends;

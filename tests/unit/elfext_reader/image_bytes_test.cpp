@@ -78,7 +78,6 @@ TEST_F(ImageBytesTest, ASmallImageIsReadInOneCall) {
   EXPECT_TRUE(image.prepare());
   EXPECT_TRUE(image.prepare());
   EXPECT_EQ(m_Host.callCount(), 1U);
-  EXPECT_TRUE(image.isReadWhole());
   expectBytes(image, 0, ImageBytes::WholeReadLimit);
   EXPECT_EQ(m_Host.callCount(), 1U);
 }
@@ -91,7 +90,6 @@ TEST_F(ImageBytesTest, OfALargeImageOnlyTheBlocksThatAreLookedAtAreRead) {
   EXPECT_EQ(m_Memory.bytesRead(), 0x1000U);
   expectBytes(image, 0x20000, 0x1000);
   EXPECT_EQ(m_Memory.bytesRead(), 0x1000U);
-  EXPECT_FALSE(image.isReadWhole());
 }
 
 TEST_F(ImageBytesTest, BytesKeepTheirAddresses) {
@@ -100,7 +98,6 @@ TEST_F(ImageBytesTest, BytesKeepTheirAddresses) {
   const uint8_t* first = image.view(0x10000, 1);
   expectBytes(image, 0, Large);
   EXPECT_EQ(image.view(0x10000, 1), first);
-  EXPECT_TRUE(image.isReadWhole());
 }
 
 TEST_F(ImageBytesTest, LooksInAnyOrderGiveTheSameBytes) {
@@ -112,6 +109,38 @@ TEST_F(ImageBytesTest, LooksInAnyOrderGiveTheSameBytes) {
     expectBytes(image, offset, size);
   }
   EXPECT_LE(m_Memory.bytesRead(), Large);
+}
+
+TEST_F(ImageBytesTest, MayBeReadToItsEnd) {
+  const support::FileHandle file = open(pattern(Large));
+  ImageBytes image(m_Host, file, 2, Large, false);
+  EXPECT_TRUE(image.prepare());
+  expectBytes(image, 0x20010, 16);
+  EXPECT_TRUE(image.loadAll());
+  EXPECT_EQ(m_Memory.bytesRead(), Large);
+  image.forgetFile();
+  EXPECT_EQ(m_Host.close(file), 0);
+  expectBytes(image, 0, Large);
+  EXPECT_TRUE(image.loadAll());
+}
+
+TEST_F(ImageBytesTest, SharesAFileWithOthers) {
+  const support::FileHandle handle = open(pattern(Large));
+  EXPECT_EQ(m_Host.close(handle), 0);
+  support::SourceFiles files(m_Host);
+  std::shared_ptr<support::SourceFile> file;
+  ASSERT_EQ(files.open("lib", file), 0);
+  {
+    ImageBytes image(file, 2, Large);
+    ImageBytes other(file, 2 + 0x20000, 16);
+    file.reset();
+    EXPECT_TRUE(image.prepare());
+    EXPECT_TRUE(other.prepare());
+    m_Memory.addFile("lib", "another file");
+    expectBytes(image, 0x20010, 16);
+    EXPECT_EQ(m_Memory.openHandles(), 1U);
+  }
+  EXPECT_EQ(m_Memory.openHandles(), 0U);
 }
 
 TEST_F(ImageBytesTest, WhoReadsOnIsReadAheadFor) {
@@ -171,7 +200,6 @@ TEST_F(ImageBytesTest, MayLeaveAFileOpenOrForgetIt) {
   image.forgetFile();
   expectBytes(image, 0, 16);
   EXPECT_EQ(image.view(0x20000, 1), nullptr);
-  EXPECT_EQ(image.closeFile(), 0);
   EXPECT_EQ(m_Memory.openHandles(), 2U);
 }
 

@@ -61,6 +61,7 @@ std::string textOf(const Section& section) {
 
 constexpr uint32_t Text = 1;
 constexpr uint32_t Data = 2;
+constexpr uint32_t Padding = 5;
 
 // Code, data and a symbol; with `padding`, also a section of so many bytes.
 ObjectBuilder sample(size_t padding = 0) {
@@ -176,7 +177,9 @@ TEST_P(ReadElfFileInEachWayTest, LeavesNoFileOfItsOwnOpenForASmallObject) {
 TEST_P(ReadElfFileInEachWayTest, LooksForTheContentsOfALargeObjectWhenTheyAreWanted) {
   put(largeSample());
   ASSERT_TRUE(readBy(GetParam()));
-  EXPECT_LT(m_Host.bytesRead(), LargestEagerFile / 2);
+  if (!isOpenedByCaller(GetParam())) {
+    EXPECT_LT(m_Host.bytesRead(), LargestEagerFile / 2);
+  }
   EXPECT_EQ(m_Host.openHandles(), GetParam() == Way::Memory ? 0U : 1U);
   EXPECT_FALSE(m_Module->hasDeferredContents());
   EXPECT_EQ(textOf(*m_Module->getSection(Data)), "data");
@@ -261,6 +264,7 @@ TEST_P(ReadElfFileInEachWayTest, ReportsASizeForWhichThereIsNoMemory) {
   constexpr uint64_t size = uint64_t{1} << 60;
   put(sample());
   m_Host.at("a.o").toldSize = int64_t{size};
+  m_Host.at("lib.a").toldSize = int64_t{size} + 2;
   if (GetParam() == Way::PartOfFile)
     EXPECT_FALSE(readElfFile(m_Host, "lib.a", 2, size, *m_Module, nullptr));
   else if (GetParam() == Way::PartOfOpenFile)
@@ -269,6 +273,73 @@ TEST_P(ReadElfFileInEachWayTest, ReportsASizeForWhichThereIsNoMemory) {
     EXPECT_FALSE(readBy(GetParam()));
   EXPECT_THAT(m_Reports.m_Texts, ElementsAre("Out of memory"));
   EXPECT_EQ(m_Host.openHandles(), isOpenedByCaller(GetParam()) ? 1U : 0U);
+}
+
+// The end of the range is in no section, so that nobody would look at it.
+TEST_P(ReadElfFileInEachWayTest, ReportsARangeThatTheFileDoesNotHave) {
+  for (const ObjectBuilder& file : {sample(), largeSample()}) {
+    const std::string bytes = file.bytes();
+    put(bytes);
+    m_Bytes += "more than there is";
+    m_Reports.m_Texts.clear();
+    if (GetParam() != Way::PartOfFile && GetParam() != Way::PartOfOpenFile) continue;
+    EXPECT_FALSE(readBy(GetParam()));
+    EXPECT_THAT(m_Reports.m_Texts, ElementsAre("I/O error reading file 'a.o'"));
+    EXPECT_TRUE(m_Module->isEmpty());
+  }
+}
+
+// Of a file that the module has opened itself, the contents that it has not looked at may be lost
+// later. It says so then, and nothing looks like data.
+TEST_F(ReadElfFileTest, ContentsThatAreLostLaterAreReported) {
+  for (const Way way : {Way::WholeFile, Way::PartOfFile}) {
+    makeModule();
+    m_Reports.m_Texts.clear();
+    put(largeSample());
+    ASSERT_TRUE(readBy(way));
+    for (const char* name : {"a.o", "lib.a"})
+      m_Host.at(name).bytes.resize(50);
+    EXPECT_EQ(m_Module->getSection(Padding)->getContents(), nullptr);
+    EXPECT_TRUE(m_Module->hasLostContents());
+    EXPECT_THAT(m_Reports.m_Texts, ElementsAre("I/O error reading file 'a.o'"));
+    m_Module->clear();
+    EXPECT_FALSE(m_Module->hasLostContents());
+  }
+}
+
+// A caller's file is the caller's to close, and to overwrite, when the read is over.
+TEST_F(ReadElfFileTest, ACallersFileIsNotNeededAfterwards) {
+  put(largeSample());
+  for (const Way way : {Way::OpenFile, Way::PartOfOpenFile}) {
+    makeModule();
+    const char* name = way == Way::OpenFile ? "a.o" : "lib.a";
+    const support::FileHandle file = open(name);
+    const bool isRead = way == Way::OpenFile
+                            ? readElfFile(m_Host, file, *m_Module, nullptr)
+                            : readElfFile(m_Host, file, 2, m_Bytes.size(), *m_Module, nullptr);
+    ASSERT_TRUE(isRead);
+    ASSERT_EQ(m_Host.close(file), 0);
+    m_Host.at(name).bytes.assign(m_Bytes.size() + 4, 'x');
+    EXPECT_EQ(textOf(*m_Module->getSection(Text)), "code");
+    EXPECT_EQ(textOf(*m_Module->getSection(Data)), "data");
+    EXPECT_THAT(m_Reports.m_Texts, IsEmpty());
+  }
+}
+
+TEST_F(ReadElfFileTest, AFileMayBeSharedWithOthers) {
+  put(largeSample());
+  support::SourceFiles files(m_Host);
+  std::shared_ptr<support::SourceFile> file;
+  ASSERT_EQ(files.open("lib.a", file), 0);
+  ASSERT_TRUE(readElfFile(file, 2, m_Bytes.size(), *m_Module, nullptr));
+  // Another file of that name is none of the module's business.
+  m_Host.addFile("lib.a", "another");
+  EXPECT_EQ(textOf(*m_Module->getSection(Text)), "code");
+  file.reset();
+  EXPECT_EQ(m_Host.openHandles(), 1U);
+  EXPECT_EQ(textOf(*m_Module->getSection(Data)), "data");
+  m_Module.reset();
+  EXPECT_EQ(m_Host.openHandles(), 0U);
 }
 
 TEST_P(ReadElfFileInEachWayTest, NamesTheModuleAfterAWholeFileOnly) {
