@@ -25,9 +25,8 @@ constexpr size_t LongestHostName = 255; // of this one
 class Extraction final : public MemberRoutine {
 public:
   explicit Extraction(const Run& run)
-      : m_Settings(run.settings), m_Host(run.archive.getHost()), m_Contents(run.archive) {
-    [[maybe_unused]] const int error = m_Host.status(run.archiveName(), m_ArchiveStatus);
-  }
+      : m_Settings(run.settings), m_Host(run.archive.getHost()),
+        m_ArchiveStatus(run.archive.getOwnFile()->getStatus()), m_Contents(run.archive) {}
 
   void operator()(ArchiveMember& member) override;
 
@@ -39,7 +38,7 @@ private:
 
   const Settings& m_Settings;
   support::Host& m_Host;
-  support::FileStatus m_ArchiveStatus;
+  const support::FileStatus& m_ArchiveStatus;
   ContentsReader m_Contents;
 };
 
@@ -48,13 +47,11 @@ std::string Extraction::outputName(std::string_view name) const {
   return std::string(name.substr(0, LongestFileName).substr(0, LongestHostName));
 }
 
-// A member that is called like the archive would be written over it before its bytes are read. If
-// the host doesn't tell which file the archive is, no file that is there is safe.
+// A member that is called like the archive would be written over it before its bytes are read.
 bool Extraction::mayWrite(const std::string& name) const {
   support::FileStatus status;
   if (m_Host.status(name.c_str(), status) != 0) return true;
-  const bool isArchiveKnown = m_ArchiveStatus.kind != support::FileKind::Nothing;
-  return m_Settings.overwriteOnExtract && isArchiveKnown && !status.isSameFile(m_ArchiveStatus);
+  return m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus);
 }
 
 void Extraction::operator()(ArchiveMember& member) {
@@ -77,13 +74,14 @@ void Extraction::operator()(ArchiveMember& member) {
   write(member, name, file);
 }
 
-// False if the member could not be read, which has been reported. A failed write ends the copy.
+// False if the member could not be read, or changed meanwhile, which has been reported. A failed
+// write ends the copy.
 bool Extraction::copy(const ArchiveMember& member, support::FileHandle file, int& writeError) {
   if (!m_Contents.begin(member)) return false;
   while (writeError == 0) {
     std::span<const uint8_t> piece;
     if (!m_Contents.read(piece)) return false;
-    if (piece.empty()) break;
+    if (piece.empty()) return m_Contents.finish();
     writeError = m_Host.write(file, piece);
   }
   return true;
@@ -118,6 +116,9 @@ public:
     }
   }
 
+  // Too late to take anything back, but not to tell.
+  void finish() { m_Contents.finish(); }
+
 private:
   const Settings& m_Settings;
   ContentsReader m_Contents;
@@ -135,6 +136,7 @@ void printMembers(Run& run) {
   if (isMissing(run)) return;
   Printing printing(run);
   forEachSelectedMember(run.archive, run.settings.fileList, printing);
+  printing.finish();
 }
 
 } // namespace quarn

@@ -48,7 +48,7 @@ public:
   void moveNewMembers();
 
 private:
-  bool insertArchive(const std::string& word);
+  bool insertArchive(const FileProbe& probe);
   void insertMemberOf(const ArchiveMember& source);
   void insertPlainFile(const std::string& word, const FileProbe& probe);
   ArchiveMember* addPlainFile(const std::string& word, const FileProbe& probe);
@@ -67,45 +67,39 @@ private:
 };
 
 void Insertion::insert(const std::string& word) {
-  const FileProbe probe = arlib::probeFile(m_Archive.getHost(), word.c_str());
+  const FileProbe probe = arlib::probeFile(m_Archive.getSourceFiles(), word.c_str());
   if (!probe.exists()) {
     reportMessage(messages::ErrorWord, messages::FileDoesNotExist, word);
     return;
   }
-  if (probe.hasArchiveMagic() && insertArchive(word)) return;
+  if (probe.hasArchiveMagic() && insertArchive(probe)) return;
   insertPlainFile(word, probe);
 }
 
 // A file that begins like an archive but can't be read as one is a plain file, and nothing is said
 // of what was wrong with it.
-bool Insertion::insertArchive(const std::string& word) {
+bool Insertion::insertArchive(const FileProbe& probe) {
   arlib::Archive source(m_Archive.getHost());
-  if (!arlib::readFile(word.c_str(), source)) return false;
+  if (!arlib::readFile(probe.file, source)) return false;
   for (const ArchiveMember* member : source.getMembers()) {
     if (!member->isAuxiliary()) insertMemberOf(*member);
   }
   return true;
 }
 
+// Of a member that is too new to be replaced the header's numbers still become those of the source.
 void Insertion::insertMemberOf(const ArchiveMember& source) {
-  const ArchiveMember::ContentsLocation& location = *source.getContentsLocation();
   ArchiveMember* target = m_Names.findUnmodified(source.getName());
   const bool isNew = target == nullptr;
-  bool isKept = false;
+  const bool isKept =
+      !isNew && !mayReplace(m_Run.settings.updateMode, target->getDate(), source.getDate());
   if (isNew) {
-    target = m_Archive.addMemberFromFileRegion(source.getName(), location.fileName, location.offset,
-                                               source.getSize(), std::nullopt);
-    if (target == nullptr) return;
-  } else if (!mayReplace(m_Run.settings.updateMode, target->getDate(), source.getDate())) {
-    isKept = true;
-  } else if (!target->setContentsFromFileRegion(location.fileName, location.offset,
-                                                source.getSize())) {
-    return;
+    target = m_Archive.addMemberFromMember(source);
+  } else if (isKept) {
+    target->takeHeaderNumbers(source);
+  } else {
+    target->setContentsFromMember(source);
   }
-  target->setDate(source.getDate());
-  target->setUid(source.getUid());
-  target->setGid(source.getGid());
-  target->setMode(source.getMode());
   warnIfNotElf(*target);
   if (!isKept) tell(isNew ? messages::AddedMember : messages::ReplacedMember, *target);
 }

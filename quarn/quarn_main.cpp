@@ -4,8 +4,10 @@
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"
+#include "arlib/interface/writer_turn.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/library_attribute_map.h"
+#include "messages/interface/output.h"
 #include "quarn/actions.h"
 #include "quarn/arlib_error_handler.h"
 #include "quarn/banner.h"
@@ -21,6 +23,8 @@
 #include "tabledrivenparser/interface/stdio_via_file_reader.h"
 
 #include <cerrno>
+#include <memory>
+#include <utility>
 
 namespace quarn {
 
@@ -89,11 +93,21 @@ bool isWorkGiven(int argc, const Parser& parser, const char* archiveName, suppor
 }
 
 // A new archive is made where the file is missing or --create says to look away from what it holds.
+// Who is going to write waits for his turn at the file first.
 bool openArchive(Run& run, const char* name) {
   run.archive.setClientData(&run.openStatus);
   run.archive.setFileName(name);
-  const bool exists = support::fileKind(run.archive.getHost(), name) != support::FileKind::Nothing;
-  if (exists && !run.settings.createArchive) return arlib::readFile(name, run.archive);
+  std::shared_ptr<support::SourceFile> file;
+  if (run.settings.accessMode == Access_Write) {
+    file = arlib::takeTurn(run.archive.getSourceFiles(), name);
+  }
+  const bool exists = file != nullptr ||
+                      support::fileKind(run.archive.getHost(), name) != support::FileKind::Nothing;
+  if (exists && !run.settings.createArchive) {
+    return file != nullptr ? arlib::readFile(file, run.archive)
+                           : arlib::readFile(name, run.archive);
+  }
+  run.archive.setOwnFile(std::move(file));
   run.openStatus.missing = true;
   run.openStatus.errorNumber = exists ? 0 : ENOENT;
   return true;
@@ -150,42 +164,42 @@ void chooseSymbolTableMode(Run& run) {
   }
 }
 
-// An archive that wasn't there when it was opened must not take the place of one that is there now:
-// the host may have failed to tell, or somebody else may have been faster.
-bool hasAppeared(const Run& run) {
-  if (!run.openStatus.missing || run.settings.createArchive) return false;
-  if (support::fileKind(run.archive.getHost(), run.archiveName()) == support::FileKind::Nothing) {
-    return false;
-  }
-  reportMessage(messages::ErrorWord, messages::WritingArchive, run.archiveName(),
-                hostErrorText(EEXIST));
-  return true;
-}
+// How a run ended. Who has been overtaken has made a new archive where somebody else was faster:
+// nothing is written, and the run may start over with the archive that is there now.
+enum class RunEnd { Done, Overtaken };
 
 // The tables are rebuilt before the last look at the error count, so that a warning of the rebuild
 // that was raised to an error keeps the old file as well.
-void writeArchive(Run& run) {
+RunEnd writeArchive(Run& run) {
   const bool isNew = run.openStatus.missing;
-  if (run.settings.accessMode != Access_Write && !isNew) return;
+  if (run.settings.accessMode != Access_Write && !isNew) return RunEnd::Done;
   if (isNew && run.settings.warnOnCreate) {
     reportMessage(messages::RemarkWord, messages::CreatingArchive, run.archiveName());
   }
   run.archive.updateAuxiliaryMembers();
-  if (hasErrors() || hasAppeared(run)) return;
-  arlib::writeFile(run.archiveName(), run.archive);
+  if (hasErrors()) return RunEnd::Done;
+  if (!isNew || run.openStatus.errorNumber == 0) {
+    arlib::writeFile(run.archiveName(), run.archive);
+    return RunEnd::Done;
+  }
+  const arlib::NewFile newFile = arlib::writeNewFile(run.archiveName(), run.archive);
+  return newFile == arlib::NewFile::Exists ? RunEnd::Overtaken : RunEnd::Done;
 }
 
-void runAction(Run& run, const char* archiveName) {
-  if (!openArchive(run, archiveName) || hasErrors()) return;
+RunEnd runAction(Run& run, const char* archiveName, messages::HeldOutput& output) {
+  const bool isOpen = openArchive(run, archiveName);
+  // Nobody can overtake who has his turn.
+  if (!run.openStatus.missing) output.release();
+  if (!isOpen || hasErrors()) return RunEnd::Done;
   if (run.settings.accessMode == Access_Write && run.archive.isReadOnly()) {
     reportMessage(messages::ErrorWord, messages::OutputReadOnly, archiveName);
-    return;
+    return RunEnd::Done;
   }
-  if (!findPosition(run)) return;
+  if (!findPosition(run)) return RunEnd::Done;
   dispatch(run);
-  if (hasErrors()) return;
+  if (hasErrors()) return RunEnd::Done;
   chooseSymbolTableMode(run);
-  writeArchive(run);
+  return writeArchive(run);
 }
 
 // A map says by a library's name what all of its members may need. One that can't be read gives way
@@ -198,6 +212,36 @@ void setLibraryAttributes(arlib::Archive& archive, const char* archiveName, cons
   elfext::FullAttr attributes = elfext::LibraryFullAttr;
   elfext::getLibraryAttributes(attributes, archiveName, map);
   archive.setLibraryAttributes(attributes);
+}
+
+RunEnd runOnce(support::Host& host, const char* archiveName, Settings& settings,
+               messages::HeldOutput& output) {
+  arlib::Archive archive(host);
+  ArlibErrorHandler handler(settings.verbose);
+  archive.setErrorHandler(&handler);
+  archive.setIncludeDebugSymbols(settings.includeDebugSymbols);
+  archive.setUniqueSymbolsOnly(settings.uniqueSymbolsOnly);
+  archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
+  setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
+  ArchiveOpenStatus openStatus;
+  Run run = {archive, settings, openStatus};
+  const RunEnd end = runAction(run, archiveName, output);
+  archive.closeFiles();
+  return end;
+}
+
+// Somebody else's new archive is taken over as if it had been there from the start. What this run
+// has said so far is held back until it is known to be true: too much of it, and there is no way
+// back.
+void runUntilDone(support::Host& host, const char* archiveName, Settings& settings) {
+  constexpr int MostRuns = 100; // others that make and remove it all the time can't be outrun
+  messages::HeldOutput output;
+  for (int run = 0; run < MostRuns; ++run) {
+    if (settings.accessMode == Access_Write) output.hold();
+    if (runOnce(host, archiveName, settings, output) == RunEnd::Done) return;
+    if (!output.drop()) break;
+  }
+  reportMessage(messages::ErrorWord, messages::WritingArchive, archiveName, hostErrorText(EEXIST));
 }
 
 } // namespace
@@ -221,16 +265,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
   processOptions(parser, toolName, settings);
   const char* archiveName = archiveNameOf(parser.textsValue(Option_Words));
   if (isWorkGiven(argc, parser, archiveName, host, toolName, settings)) {
-    arlib::Archive archive(host);
-    ArlibErrorHandler handler(settings.verbose);
-    archive.setErrorHandler(&handler);
-    archive.setIncludeDebugSymbols(settings.includeDebugSymbols);
-    archive.setUniqueSymbolsOnly(settings.uniqueSymbolsOnly);
-    archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
-    setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
-    ArchiveOpenStatus openStatus;
-    Run run = {archive, settings, openStatus};
-    runAction(run, archiveName);
+    runUntilDone(host, archiveName, settings);
   }
   parser.releaseValues();
 }

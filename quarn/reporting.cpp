@@ -11,9 +11,10 @@ void endAfterFatalMessage() {
   shutDown(1);
 }
 
-// The process never leaves the C locale, so the text is the same for every user.
+// The process never leaves the C locale, so the text is the same for every user. Where the host has
+// given no number it was not the host that failed.
 std::string hostErrorText(int errorNumber) {
-  return std::strerror(errorNumber);
+  return errorNumber == 0 ? "Unexpected end of file" : std::strerror(errorNumber);
 }
 
 bool flushOutput() {

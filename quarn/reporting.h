@@ -21,7 +21,7 @@ bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&...
   return isPrinted;
 }
 
-// The host's text for an error number; "Success" for 0.
+// The host's text for an error number. 0 stands for a file that ended too early.
 std::string hostErrorText(int errorNumber);
 
 // Hands over what stdout has held back. False after a report: what it could not take must not look

@@ -15,9 +15,10 @@
 #include "checking/interface/checking.h"
 #include "elfext/interface/fast_array.h"
 #include "elfext/interface/full_attr.h"
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <span>
 #include <string_view>
@@ -29,8 +30,6 @@ class ErrorHandler;
 }
 
 namespace arlib {
-
-class KeptFile;
 
 enum class SymbolTableMode : uint32_t {
   Always = 0,    // keep a symbol table, even an empty one
@@ -86,9 +85,21 @@ public:
   [[nodiscard]] const char* getFileName() const { return m_FileName; }
 
   [[nodiscard]] bool isReadOnly() const { return m_ReadOnly; }
-  [[nodiscard]] support::Host& getHost() const { return *m_Host; }
+  [[nodiscard]] support::Host& getHost() const { return m_SourceFiles.getHost(); }
 
-  // Removes all members and releases what they hold outside memory.
+  // The files that members' bytes come from. Each is opened once and stays the one that it was,
+  // whatever its name leads to later; see support/interface/source_file.h.
+  [[nodiscard]] support::SourceFiles& getSourceFiles() { return m_SourceFiles; }
+  // The file that the archive was read from, or that it is to replace unread; null if there is
+  // none. When the archive is written, its name must still lead to this file.
+  [[nodiscard]] const std::shared_ptr<support::SourceFile>& getOwnFile() const { return m_OwnFile; }
+  void setOwnFile(std::shared_ptr<support::SourceFile> file) { m_OwnFile = std::move(file); }
+  // Closes all of them; who wants bytes of them opens them again. False after a report of a close
+  // that failed, now or since the last call.
+  bool closeFiles();
+
+  // Removes all members, lets go of the files, and releases what members hold outside the regions,
+  // and the bytes of the tables.
   void clear();
 
   // All members in file order, auxiliary ones included.
@@ -116,6 +127,10 @@ public:
   ArchiveMember* addMemberFromFileRegion(std::string_view memberName, const char* fileName,
                                          uint32_t offset, uint32_t size,
                                          std::optional<std::string_view> reportedName);
+
+  // Appends a member with the bytes and the header's numbers of a member of another archive, which
+  // are read through the file that that archive was read from.
+  ArchiveMember* addMemberFromMember(const ArchiveMember& source);
 
   // Removes a member, and its symbols from the list of symbols; the order of the rest stays.
   void removeMember(ArchiveMember* archiveMember);
@@ -164,6 +179,13 @@ public:
            (m_ErrorHandler->*operation)(*this, std::forward<A>(details)...);
   }
 
+  // The same for a failure that ends the operation whatever the handler says. Always false.
+  template <class... P, class... A>
+  bool end(bool (ErrorHandler::*operation)(const Archive&, P...), A&&... details) const {
+    static_cast<void>(goOn(operation, std::forward<A>(details)...));
+    return false;
+  }
+
   // For failures with nothing to go on with: the handler must answer false. Always false.
   template <class... P, class... A>
   bool fail(bool (ErrorHandler::*operation)(const Archive&, P...), A&&... details) const {
@@ -184,10 +206,18 @@ private:
     elfext::FastArray<Symbol*> byMemberAndName;
   };
 
+  // What a file that may become a member's contents is, and the file itself. False after a report.
+  bool openSource(const char* fileName, FileProbe& probe);
+  // All but the archive's own, which may be locked. The error number that was reported, or 0.
+  int closeInputs();
+  int reportCloseErrors();
+  // Keeps the file for the members whose bytes it has.
+  support::SourceFile* hold(const std::shared_ptr<support::SourceFile>& file);
   ArchiveMember* appendMember(std::string_view regionName);
-  ArchiveMember* appendFileMember(std::string_view regionName, const char* regionFileName,
-                                  uint32_t offset, uint32_t size,
-                                  const support::FileStatus& status);
+  // Date, uid, gid and mode are those of the file.
+  ArchiveMember* appendFileMember(std::string_view regionName,
+                                  const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
+                                  uint32_t size);
   // Whether a piece lies inside a file. If not, the handler decides: on true the piece is cut to
   // what is there.
   bool isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
@@ -205,7 +235,10 @@ private:
   std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
                                      const ArchiveMember* archiveMember) const;
 
-  support::Host* m_Host;
+  support::SourceFiles m_SourceFiles;
+  // All that members' locations refer to, and perhaps some to which none refers any more.
+  std::vector<std::shared_ptr<support::SourceFile>> m_HeldFiles;
+  std::shared_ptr<support::SourceFile> m_OwnFile;
   // Members, symbols and names. Declared before what lives in them, so destroyed after it.
   alloclib::RegionOwner m_ObjectRegion;
   // The arrays below, and the members' bytes.
@@ -221,8 +254,8 @@ private:
   bool m_UseObjectBuildAttributes = false;
   std::optional<elfext::FullAttr> m_LibraryAttributes;
 
-  // Set while a rebuild reads one object after the other.
-  KeptFile* m_ObjectFile = nullptr;
+  // Bytes of tables that were read and then replaced: names and symbols are views of them.
+  std::vector<std::span<uint8_t>> m_ViewedBytes;
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
   elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;

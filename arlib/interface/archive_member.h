@@ -5,7 +5,7 @@
 #pragma once
 
 #include "arlib/interface/archive_member_type.h"
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <cstdint>
 #include <memory>
@@ -21,6 +21,7 @@ class ObjectModule;
 namespace arlib {
 
 class Archive;
+class Symbol;
 struct FileProbe;
 
 // Lives in the archive's object region. It is never freed by itself; what it holds outside the
@@ -31,9 +32,10 @@ class ArchiveMember {
 public:
   // Where the bytes lie on disk; their number is the member's size.
   struct ContentsLocation {
-    const char* fileName = nullptr; // lives in the archive's object region
-    uint32_t offset = 0;            // of the contents, in that file
-    bool isTemporary = false;       // made by this run, deleted when the location is released
+    support::SourceFile* file = nullptr; // held by the archive
+    const char* fileName = nullptr;      // its name
+    uint32_t offset = 0;                 // of the contents, in that file
+    bool isTemporary = false;            // made by this run, deleted when the location is released
   };
 
   static constexpr uint32_t NoFileNameTableOffset = 0xFFFFFFFF;
@@ -68,6 +70,8 @@ public:
   // The bytes in memory. They stay valid until they are discarded or replaced.
   [[nodiscard]] bool hasContents() const { return m_Contents.has_value(); }
   [[nodiscard]] std::span<const uint8_t> getContents() const;
+  // The same to edit in place: only behind clearType, since the type rests on the bytes.
+  [[nodiscard]] std::span<uint8_t> getModifiableContents();
 
   [[nodiscard]] const std::optional<ContentsLocation>& getContentsLocation() const;
 
@@ -89,6 +93,16 @@ public:
   bool setContentsFromFile(const char* fileName);
   bool setContentsFromFile(const char* fileName, const FileProbe& probe);
   bool setContentsFromFileRegion(const char* fileName, uint32_t offset, uint32_t size);
+
+  // Replaces the bytes and the header's numbers by those of a member of another archive, through
+  // the file that that archive was read from.
+  void setContentsFromMember(const ArchiveMember& source);
+
+  // Date, uid, gid and mode become those of the other member.
+  void takeHeaderNumbers(const ArchiveMember& source);
+
+  // Position of a symbol in the archive's list of symbols, or Archive::NotFound.
+  [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
 
   // For a client that is about to edit the contents in place: loads them, and leaves the type to be
   // determined anew. False if they could not be loaded.
@@ -121,11 +135,14 @@ private:
   };
 
   // Uninitialised bytes in the archive's container region; the old ones are freed, except those of
-  // a table that came from the file, into which names point.
+  // a table that came from the file, into which names point: they go when the archive is cleared.
   std::span<uint8_t> replaceContents(uint32_t size);
   void freeContents();
-  void setLocation(const char* regionFileName, uint32_t offset, bool isTemporary);
-  void takeFile(const char* fileName, uint32_t offset, uint32_t size, const FileProbe& probe);
+  // The archive holds the file from now on.
+  void setLocation(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
+                   bool isTemporary);
+  void takeFile(const std::shared_ptr<support::SourceFile>& file, uint32_t offset, uint32_t size);
+  void markReplaced();
   bool readContents(std::span<uint8_t> bytes);
   // From the location, which there must be, under the module's own handler.
   bool readInto(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector) const;

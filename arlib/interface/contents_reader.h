@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Reads members' contents in pieces, wherever they are, so that no member has to be in memory as a
-// whole. The file that holds the bytes stays open from one member to the next, as most members of a
-// run come from one file.
+// whole. Most members of a run come from one file, and what is read ahead of one member serves the
+// next.
 #pragma once
 
 #include "arlib/interface/archive.h"
@@ -11,9 +11,12 @@
 #include <memory>
 #include <span>
 
+namespace support {
+class SourceFile;
+}
+
 namespace arlib {
 
-class KeptFile;
 class ReadWindow;
 
 class ContentsReader {
@@ -31,10 +34,12 @@ public:
   // report.
   bool read(std::span<const uint8_t>& piece);
 
-  // Closes what is open. False after a report. Without it that is done too, but not reported.
+  // Makes sure that the file of the members read so far was not written to meanwhile: what came of
+  // them could be old in one place and new in another. `begin` does so where it turns to another
+  // file. False after a report.
   bool finish();
 
-  // The host's error number of the last failure; 0 if a file ended too early.
+  // The host's error number of the last failure; 0 if a file ended too early, ESTALE if it changed.
   [[nodiscard]] int getError() const { return m_Error; }
 
 private:
@@ -42,11 +47,11 @@ private:
   // cache. Copying inside the kernel was measured, and is no faster than this.
   static constexpr uint64_t PieceSize = 0x40000;
 
-  bool openFile(const char* fileName);
+  bool turnTo(support::SourceFile* file);
   bool failToRead(int error);
 
   Archive& m_Archive;
-  std::unique_ptr<KeptFile> m_File;
+  support::SourceFile* m_File = nullptr; // that was read last, and is still to be looked at
   std::unique_ptr<ReadWindow> m_Window;
   const uint8_t* m_Memory = nullptr; // the rest of a member that is in memory
   uint64_t m_Offset = 0;             // of the rest of a member that is on disk

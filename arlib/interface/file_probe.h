@@ -1,14 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// All that the archive wants to know of a file before it takes it in, by one look: what the host
-// tells of it, and its first bytes.
+// All that the archive wants to know of a file before it takes it in: what the host tells of it,
+// and its first bytes. The file is open then, and whatever is read of it later is read of that
+// same file.
 #pragma once
 
 #include "elfext/interface/format_recognizer.h"
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <array>
 #include <cstdint>
+#include <memory>
 #include <span>
 
 namespace arlib {
@@ -18,6 +20,9 @@ struct FileProbe {
   support::FileStatus status;
   std::array<uint8_t, elfext::RecognizedBytes> bytes = {};
   uint32_t byteCount = 0; // 0 also for a file that can't be opened
+  // Of a regular file. One that can't be opened now is tried again when its bytes are wanted, and
+  // tells why then.
+  std::shared_ptr<support::SourceFile> file;
 
   [[nodiscard]] std::span<const uint8_t> firstBytes() const {
     return std::span(bytes).first(byteCount);
@@ -33,7 +38,10 @@ struct FileProbe {
 };
 
 // Opens regular files only: looking at a device or a FIFO could have effects, or wait.
-FileProbe probeFile(support::Host& host, const char* fileName);
+FileProbe probeFile(support::SourceFiles& files, const char* fileName);
+
+// The same without the first bytes.
+FileProbe openProbe(support::SourceFiles& files, const char* fileName);
 
 // What may be said of a file's status alone, as FileProbe::refusal does.
 support::HostError refusalOf(const support::FileStatus& status);

@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cstring>
 #include <functional>
+#include <string>
 #include <type_traits>
 #include <vector>
 
@@ -48,8 +49,8 @@ static_assert(std::is_trivially_destructible_v<Symbol>,
               "symbols die with their region, without a destructor run");
 
 Archive::Archive(support::Host& host)
-    : m_Host(&host), m_ObjectRegion(alloclib::RegionGeneral::Create(
-                         InitialRegionSize, "arlib::Archive::ObjectRegion")),
+    : m_SourceFiles(host), m_ObjectRegion(alloclib::RegionGeneral::Create(
+                               InitialRegionSize, "arlib::Archive::ObjectRegion")),
       m_ContainerRegion(
           alloclib::RegionGeneral::Create(InitialRegionSize, "arlib::Archive::ContainerRegion")),
       m_ArchiveMembers(m_ContainerRegion.get()), m_SortedArchiveMembers(m_ContainerRegion.get()),
@@ -84,6 +85,11 @@ void Archive::clear() {
     member->releaseContentsLocation();
     member->freeContents();
   }
+  for (const std::span<uint8_t> bytes : m_ViewedBytes)
+    m_ContainerRegion->discard(bytes.data(), bytes.size());
+  m_ViewedBytes.clear();
+  m_HeldFiles.clear();
+  m_OwnFile.reset();
   m_ArchiveMembers.setSize(0);
   m_SortedArchiveMembers.setSize(0);
   m_Symbols.setSize(0);
@@ -113,17 +119,38 @@ ArchiveMember* Archive::appendMember(std::string_view regionName) {
   return member;
 }
 
-ArchiveMember* Archive::appendFileMember(std::string_view regionName, const char* regionFileName,
-                                         uint32_t offset, uint32_t size,
-                                         const support::FileStatus& status) {
+support::SourceFile* Archive::hold(const std::shared_ptr<support::SourceFile>& file) {
+  // Neighbours mostly come from one file.
+  if (m_HeldFiles.empty() || m_HeldFiles.back() != file) m_HeldFiles.push_back(file);
+  return file.get();
+}
+
+int Archive::reportCloseErrors() {
+  std::string name;
+  const int error = m_SourceFiles.takeCloseError(name);
+  if (error != 0) fail(&ErrorHandler::reportCloseError, name.c_str(), error);
+  return error;
+}
+
+int Archive::closeInputs() {
+  for (const auto& file : m_HeldFiles) {
+    if (file != m_OwnFile) file->close();
+  }
+  return reportCloseErrors();
+}
+
+bool Archive::closeFiles() {
+  for (const auto& file : m_HeldFiles)
+    file->close();
+  if (m_OwnFile != nullptr) m_OwnFile->close();
+  return reportCloseErrors() == 0;
+}
+
+ArchiveMember* Archive::appendFileMember(std::string_view regionName,
+                                         const std::shared_ptr<support::SourceFile>& file,
+                                         uint32_t offset, uint32_t size) {
   ArchiveMember* member = appendMember(regionName);
-  member->m_Date = status.modificationTime;
-  member->m_Uid = static_cast<uint32_t>(status.uid);
-  member->m_Gid = static_cast<uint32_t>(status.gid);
-  member->m_Mode = status.mode;
-  member->m_Size = size;
-  member->setLocation(regionFileName, offset, false);
-  member->m_Modified = true;
+  member->takeFile(file, offset, size);
   markEdited();
   return member;
 }
@@ -158,7 +185,7 @@ ArchiveMember* Archive::addMember(std::string_view name, int64_t date, uint32_t 
 
 ArchiveMember* Archive::addMemberFromFile(const char* fileName) {
   QUARN_ASSERT(1, fileName != NULL);
-  return addMemberFromFile(fileName, probeFile(*m_Host, fileName));
+  return addMemberFromFile(fileName, probeFile(m_SourceFiles, fileName));
 }
 
 ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe& probe) {
@@ -168,12 +195,17 @@ ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe&
     fail(&ErrorHandler::reportReadError, fileName, error);
     return nullptr;
   }
-  const char* regionFileName = copyToRegion(fileName);
-  ArchiveMember* member =
-      appendFileMember(support::lastPathComponent(regionFileName), regionFileName, 0,
-                       static_cast<uint32_t>(probe.status.size), probe.status);
+  const std::string_view leaf = support::lastPathComponent(fileName);
+  ArchiveMember* member = appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, 0,
+                                           static_cast<uint32_t>(probe.status.size));
   member->m_Type = ArchiveMemberType::decide(probe.firstBytes());
   return member;
+}
+
+bool Archive::openSource(const char* fileName, FileProbe& probe) {
+  probe = openProbe(m_SourceFiles, fileName);
+  const int error = probe.refusal();
+  return error == 0 || fail(&ErrorHandler::reportReadError, fileName, error);
 }
 
 ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, const char* fileName,
@@ -182,16 +214,21 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   QUARN_ASSERT(1, fileName != NULL);
   QUARN_ASSERT(1, !m_ReadOnly);
   FileProbe probe;
-  probe.statusError = m_Host->status(fileName, probe.status);
-  if (const int error = probe.refusal(); error != 0) {
-    fail(&ErrorHandler::reportReadError, fileName, error);
-    return nullptr;
-  }
+  if (!openSource(fileName, probe)) return nullptr;
   if (!isInsideFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
   const std::string_view leaf = support::lastPathComponent(memberName);
-  ArchiveMember* member = appendFileMember({copyToRegion(leaf), leaf.size()},
-                                           copyToRegion(fileName), offset, size, probe.status);
+  ArchiveMember* member =
+      appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, offset, size);
   member->m_Type = ArchiveMemberType::decide(member);
+  return member;
+}
+
+ArchiveMember* Archive::addMemberFromMember(const ArchiveMember& source) {
+  QUARN_ASSERT(1, !m_ReadOnly);
+  const std::string_view leaf = support::lastPathComponent(source.getName());
+  ArchiveMember* member = appendMember({copyToRegion(leaf), leaf.size()});
+  member->setContentsFromMember(source);
+  markEdited();
   return member;
 }
 

@@ -33,43 +33,59 @@ bool readFile(const char* fileName, Archive& archive) {
   return ArchiveFileReader(archive).read(fileName);
 }
 
-bool ArchiveFileReader::read(const char* fileName) {
+bool readFile(const std::shared_ptr<support::SourceFile>& file, Archive& archive) {
+  QUARN_ASSERT(1, file != NULL);
+  return ArchiveFileReader(archive).read(file);
+}
+
+void ArchiveFileReader::begin(const char* fileName) {
   m_Archive.clear();
   m_Archive.setFileName(fileName);
   m_Archive.m_ReadOnly = false;
   m_Archive.m_SymbolTableMode = SymbolTableMode::IfSymbols;
-  m_RegionFileName = m_Archive.getFileName();
+}
+
+bool ArchiveFileReader::read(const char* fileName) {
+  begin(fileName);
   // A device or a socket is not even opened: that could have effects, or fail in words of its own.
   if (support::fileKind(m_Host, fileName) == support::FileKind::Special) {
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, EINVAL);
+    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, EINVAL);
   }
-  if (const int error = m_Host.openForReading(fileName, m_File); error != 0) {
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  if (const int error = m_Archive.m_SourceFiles.open(fileName, m_File); error != 0) {
+    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
   }
-  if (!closeFile(readOpenFile()) || !readSymbolTable()) {
+  return readTables();
+}
+
+bool ArchiveFileReader::read(const std::shared_ptr<support::SourceFile>& file) {
+  m_File = file;
+  begin(file->getName());
+  return readTables();
+}
+
+bool ArchiveFileReader::readTables() {
+  if (!readOpenFile() || !checkUnchanged() || !readSymbolTable()) {
     m_Archive.clear();
     return false;
   }
-  m_Archive.m_ReadOnly = !m_Host.isWritable(fileName);
+  m_Archive.m_OwnFile = m_File;
+  m_Archive.m_ReadOnly = !m_Host.isWritable(m_File->getName());
   return true;
 }
 
-// A file that can't be closed fails the read, unless it had failed before.
-bool ArchiveFileReader::closeFile(bool isRead) {
-  const int error = m_Host.close(m_File);
-  if (error == 0 || !isRead) return isRead;
-  return m_Archive.fail(&ErrorHandler::reportCloseError, nullptr, error);
+// Headers of one state of the file and tables of another would name wrong members.
+bool ArchiveFileReader::checkUnchanged() {
+  const int error = m_File->checkUnchanged();
+  return error == 0 || m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
 }
 
 bool ArchiveFileReader::readOpenFile() {
-  if (const int error = m_Host.statusOf(m_File, m_Status); error != 0) {
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
-  }
+  m_Status = m_File->getStatus();
   if (m_Status.kind != support::FileKind::RegularFile) {
     const int error = m_Status.kind == support::FileKind::Directory ? EISDIR : EINVAL;
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
   }
-  m_Window.setFile(m_File);
+  m_Window.setFile(m_File.get());
   return readMagic() && readMembers();
 }
 
@@ -77,10 +93,10 @@ bool ArchiveFileReader::readMagic() {
   int error = 0;
   const std::string_view magic = asText(m_Window.fetch(0, ArchiveMagic.size(), error));
   if (magic.size() < ArchiveMagic.size()) {
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
   }
   if (magic == ArchiveMagic) return true;
-  return m_Archive.fail(&ErrorHandler::reportBadArchiveMagic);
+  return m_Archive.end(&ErrorHandler::reportBadArchiveMagic);
 }
 
 bool ArchiveFileReader::readMembers() {
@@ -125,12 +141,12 @@ ArchiveFileReader::Pass ArchiveFileReader::readHeader() {
   const std::span<const uint8_t> bytes =
       m_Window.fetch(m_Offset, MemberHeaderSize + elfext::RecognizedBytes, error);
   if (error != 0) {
-    m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+    m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
     return Pass::Failure;
   }
   if (bytes.empty()) return Pass::End;
   if (bytes.size() < MemberHeaderSize) {
-    m_Archive.fail(&ErrorHandler::reportTruncatedMemberHeader, m_Offset);
+    m_Archive.end(&ErrorHandler::reportTruncatedMemberHeader, m_Offset);
     return Pass::Failure;
   }
   std::memcpy(m_HeaderBytes, bytes.data(), MemberHeaderSize);
@@ -164,7 +180,7 @@ bool ArchiveFileReader::parseNumber(HeaderField which, uint32_t base, FieldRepor
 bool ArchiveFileReader::parseSize() {
   const std::string_view text = field(SizeField);
   if (parseHeaderNumber(text, 10, SizeField.width, m_Numbers.size)) return true;
-  return m_Archive.fail(&ErrorHandler::reportBadSize, m_Offset, untilNul(text));
+  return m_Archive.end(&ErrorHandler::reportBadSize, m_Offset, untilNul(text));
 }
 
 bool ArchiveFileReader::parseName(std::string_view& name) {
@@ -224,21 +240,20 @@ bool ArchiveFileReader::checkHostFile() {
   m_HostFileIsChecked = true;
   const int error = refusalOf(m_Status);
   if (error == 0) return true;
-  return m_Archive.fail(&ErrorHandler::reportReadError, m_RegionFileName, error);
+  return m_Archive.end(&ErrorHandler::reportReadError, m_File->getName(), error);
 }
 
 ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   if (!checkHostFile()) return nullptr;
   auto offset = static_cast<uint32_t>(m_Offset + MemberHeaderSize);
   uint32_t size = m_Numbers.size;
-  if (!m_Archive.isInsideFile(m_RegionFileName, name, offset, size, m_Status.size)) return nullptr;
+  if (!m_Archive.isInsideFile(m_File->getName(), name, offset, size, m_Status.size)) return nullptr;
   // A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
   std::string_view leaf = support::lastPathComponent(name);
   if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
     leaf = {m_Archive.copyToRegion(leaf), leaf.size()};
   }
-  ArchiveMember* member =
-      m_Archive.appendFileMember(leaf, m_RegionFileName, offset, size, m_Status);
+  ArchiveMember* member = m_Archive.appendFileMember(leaf, m_File, offset, size);
   member->m_FileNameTableOffset = m_LongNameIndex;
   member->m_Date = m_Numbers.date;
   member->m_Uid = m_Numbers.uid;
@@ -255,9 +270,9 @@ bool ArchiveFileReader::takeAuxiliaryContents(ArchiveMember* member) {
   const std::span<uint8_t> bytes = member->replaceContents(member->m_Size);
   member->m_ContentsAreViewed = true;
   size_t done = 0;
-  const int error = m_Host.readAt(m_File, bytes, m_Offset + MemberHeaderSize, done);
+  const int error = m_File->readAt(bytes, m_Offset + MemberHeaderSize, done);
   if (error != 0 || done < m_Numbers.size) {
-    return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
   }
   if (member == m_Archive.m_FileNameTable) {
     m_LongNames = asText(bytes);
@@ -272,7 +287,7 @@ bool ArchiveFileReader::skipContents() {
   if (m_Offset + MemberHeaderSize + m_Numbers.size <= static_cast<uint64_t>(m_Status.size)) {
     return true;
   }
-  return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, 0);
+  return m_Archive.end(&ErrorHandler::reportReadError, nullptr, 0);
 }
 
 bool ArchiveFileReader::skipPadding() {
@@ -282,9 +297,9 @@ bool ArchiveFileReader::skipPadding() {
   // The next header comes along, as it will be wanted next.
   const std::span<const uint8_t> bytes =
       m_Window.fetch(offset, 1 + MemberHeaderSize + elfext::RecognizedBytes, error);
-  if (bytes.empty()) return m_Archive.fail(&ErrorHandler::reportReadError, nullptr, error);
+  if (bytes.empty()) return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
   if (bytes[0] == PaddingByte) return true;
-  return m_Archive.goOn(&ErrorHandler::reportBadPadding, offset, static_cast<int>(bytes[0]));
+  return m_Archive.goOn(&ErrorHandler::reportBadPadding, offset, static_cast<int8_t>(bytes[0]));
 }
 
 bool ArchiveFileReader::readSymbolTable() {
@@ -305,11 +320,11 @@ bool ArchiveFileReader::readSymbolTable() {
 // Before anything is reserved, and in 64 bits: a count near 2^30 would wrap to a small size.
 bool ArchiveFileReader::readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count) {
   const auto size = static_cast<uint32_t>(bytes.size());
-  if (size < 4) return m_Archive.fail(&ErrorHandler::reportSymbolTableTooShort, size);
+  if (size < 4) return m_Archive.end(&ErrorHandler::reportSymbolTableTooShort, size);
   count = getBigEndian32(bytes.data());
   const uint64_t required = 4 + 4 * uint64_t{count};
   if (size >= required) return true;
-  return m_Archive.fail(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
+  return m_Archive.end(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
 }
 
 void ArchiveFileReader::noteMemberOffsets() {
@@ -326,7 +341,7 @@ bool ArchiveFileReader::readSymbols(std::span<const uint8_t> bytes, uint32_t cou
   for (uint32_t i = 0; i < count; ++i) {
     const size_t end = text.find('\0', position);
     if (end == text.npos) {
-      return m_Archive.fail(&ErrorHandler::reportSymbolNameUnterminated, i, count);
+      return m_Archive.end(&ErrorHandler::reportSymbolNameUnterminated, i, count);
     }
     const std::string_view name = text.substr(position, end - position);
     if (!addSymbol(i, name, getBigEndian32(bytes.data() + 4 + 4 * size_t{i}))) return false;

@@ -17,17 +17,21 @@ namespace arlib {
 
 class ArchiveFileReader {
 public:
-  explicit ArchiveFileReader(Archive& archive)
-      : m_Archive(archive), m_Host(archive.getHost()), m_Window(m_Host) {}
+  explicit ArchiveFileReader(Archive& archive) : m_Archive(archive), m_Host(archive.getHost()) {}
 
+  // Opens the file by its name.
   bool read(const char* fileName);
+  // Reads a file that is open already.
+  bool read(const std::shared_ptr<support::SourceFile>& file);
 
 private:
   using FieldReport = bool (ErrorHandler::*)(const Archive&, uint64_t, std::string_view);
 
   enum class Pass { Member, End, Failure };
 
+  void begin(const char* fileName);
   bool readOpenFile();
+  bool readTables();
   bool readMagic();
   bool readMembers();
   Pass readMember();
@@ -44,7 +48,7 @@ private:
   bool takeAuxiliaryContents(ArchiveMember* member);
   bool skipContents();
   bool skipPadding();
-  bool closeFile(bool isRead);
+  bool checkUnchanged();
 
   bool readSymbolTable();
   bool readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count);
@@ -59,11 +63,10 @@ private:
 
   Archive& m_Archive;
   support::Host& m_Host;
-  support::FileHandle m_File;
+  std::shared_ptr<support::SourceFile> m_File;
   ReadWindow m_Window;
-  support::FileStatus m_Status;
+  support::FileStatus m_Status; // as the file was when it was opened
   bool m_HostFileIsChecked = false;
-  const char* m_RegionFileName = nullptr;
 
   // The member being read.
   uint64_t m_Offset = 0; // of its header

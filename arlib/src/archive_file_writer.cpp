@@ -10,8 +10,9 @@
 
 #include <array>
 #include <cerrno>
-#include <cinttypes>
+#include <cstring>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace arlib {
@@ -75,13 +76,16 @@ std::string nameField(const ArchiveMember& member) {
 
 class ArchiveFileWriter {
 public:
-  ArchiveFileWriter(const char* fileName, Archive& archive)
+  ArchiveFileWriter(const char* fileName, Archive& archive, bool mustBeNew)
       : m_FileName(fileName), m_Archive(archive), m_Host(archive.getHost()),
-        m_Target(m_Host.followLinks(fileName)), m_Contents(archive) {}
+        m_Target(m_Host.followLinks(fileName)), m_Contents(archive), m_MustBeNew(mustBeNew) {}
 
   bool write();
+  // Whether there is a file where there must be none; that has not been reported.
+  [[nodiscard]] bool hasAppeared() const { return m_HasAppeared; }
 
 private:
+  bool checkTarget();
   bool createTemporary();
   bool writeTemporary();
   bool writeMember(GatheringOutput& output, const ArchiveMember& member);
@@ -89,6 +93,9 @@ private:
   bool writeContents(GatheringOutput& output, const ArchiveMember& member);
   bool closeTemporary();
   bool replaceTarget();
+  // 0 if the file to replace is the one that was read, or the reason not to replace it.
+  [[nodiscard]] int checkIsOwnTarget() const;
+  bool takeName();
   bool removeTemporary();
   void relocateMembers();
   bool failToWrite(int error) {
@@ -100,25 +107,42 @@ private:
   support::Host& m_Host;
   std::string m_Target; // the file that the name leads to
   FileStatus m_OldStatus;
+  FileStatus m_NewStatus; // of the complete temporary
   std::string m_TemporaryName;
   support::FileHandle m_Temporary;
   ContentsReader m_Contents;
+  bool m_MustBeNew;
+  bool m_HasAppeared = false;
 };
 
 bool writeFile(const char* fileName, Archive& archive) {
   QUARN_ASSERT(1, fileName != NULL);
-  return ArchiveFileWriter(fileName, archive).write();
+  return ArchiveFileWriter(fileName, archive, false).write();
 }
 
-bool ArchiveFileWriter::write() {
+NewFile writeNewFile(const char* fileName, Archive& archive) {
+  QUARN_ASSERT(1, fileName != NULL);
+  ArchiveFileWriter writer(fileName, archive, true);
+  if (writer.write()) return NewFile::Written;
+  return writer.hasAppeared() ? NewFile::Exists : NewFile::Failed;
+}
+
+bool ArchiveFileWriter::checkTarget() {
   // A target that the host can't tell about (a circle of links) is not taken for a new file.
   const int statusError = m_Host.status(m_Target.c_str(), m_OldStatus);
   if (statusError != 0 && statusError != ENOENT) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, statusError);
   }
+  m_HasAppeared = m_MustBeNew && statusError == 0;
+  if (m_HasAppeared) return false;
   if (statusError == 0 && !m_Host.isWritable(m_Target.c_str())) {
     return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
   }
+  return true;
+}
+
+bool ArchiveFileWriter::write() {
+  if (!checkTarget()) return false;
   // A table that could not be rebuilt has been reported. The old one would lead to wrong members.
   if (!m_Archive.updateAuxiliaryMembers()) return false;
   if (m_Archive.computeFileSize() > MaximumFileSize) {
@@ -155,8 +179,10 @@ bool ArchiveFileWriter::writeTemporary() {
     if (!writeMember(output, *member)) return false;
   }
   if (!m_Contents.finish()) return failToWrite(m_Contents.getError());
-  int error = output.drain();
+  int error = m_Archive.closeInputs();
+  if (error == 0) error = output.drain();
   if (error == 0) error = m_Host.flush(m_Temporary);
+  if (error == 0) error = m_Host.statusOf(m_Temporary, m_NewStatus);
   return error == 0 || failToWrite(error);
 }
 
@@ -196,15 +222,35 @@ bool ArchiveFileWriter::closeTemporary() {
   return m_Archive.fail(&ErrorHandler::reportCloseError, m_TemporaryName.c_str(), error);
 }
 
+// Without locks somebody else may have been faster, and what he has made must stay.
+int ArchiveFileWriter::checkIsOwnTarget() const {
+  const support::SourceFile* own = m_Archive.getOwnFile().get();
+  if (own == nullptr || std::strcmp(m_FileName, own->getName()) != 0) return 0;
+  FileStatus now;
+  const int error = m_Host.status(m_Target.c_str(), now);
+  if (error != 0 && error != ENOENT) return error;
+  return support::isUnchanged(own->getStatus(), now) ? 0 : ESTALE;
+}
+
+bool ArchiveFileWriter::takeName() {
+  const char* temporary = m_TemporaryName.c_str();
+  const int error = m_MustBeNew ? m_Host.renameNew(temporary, m_Target.c_str())
+                                : m_Host.rename(temporary, m_Target.c_str());
+  m_HasAppeared = m_MustBeNew && error == EEXIST;
+  if (error == 0 || m_HasAppeared) return error == 0;
+  return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+}
+
 // Only a regular file is ever replaced: a directory or a device stays what it is.
 bool ArchiveFileWriter::replaceTarget() {
   if (m_OldStatus.kind == FileKind::Directory || m_OldStatus.kind == FileKind::Special) {
     const int reason = m_OldStatus.kind == FileKind::Directory ? EISDIR : EINVAL;
     return m_Archive.fail(&ErrorHandler::reportDeleteError, m_FileName, reason);
   }
-  const int error = m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
-  if (error == 0) return true;
-  return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+  if (const int error = checkIsOwnTarget(); error != 0) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+  }
+  return takeName();
 }
 
 // The one way out of every failure. What made it necessary has been reported, so a temporary that
@@ -214,14 +260,21 @@ bool ArchiveFileWriter::removeTemporary() {
   return false;
 }
 
+// The old files are let go of, and with them the lock on the old archive.
 void ArchiveFileWriter::relocateMembers() {
-  const char* fileName = m_Archive.getFileName();
+  std::shared_ptr<support::SourceFile> file =
+      m_Archive.m_SourceFiles.remember(m_Archive.getFileName(), m_NewStatus);
   uint64_t offset = ArchiveMagic.size();
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
     member->releaseContentsLocation();
-    member->setLocation(fileName, static_cast<uint32_t>(offset + MemberHeaderSize), false);
+    member->setLocation(file, static_cast<uint32_t>(offset + MemberHeaderSize), false);
     offset = nextHeaderOffset(offset, member->m_Size);
   }
+  m_Archive.m_HeldFiles.assign(1, file);
+  m_Archive.m_OwnFile = std::move(file);
+  // They have been read to the end, and the archive is written.
+  std::string name;
+  static_cast<void>(m_Archive.m_SourceFiles.takeCloseError(name));
 }
 
 } // namespace arlib

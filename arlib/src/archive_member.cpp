@@ -3,7 +3,6 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
-#include "arlib/src/kept_file.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/read_elf_file.h"
@@ -72,6 +71,16 @@ const std::optional<ArchiveMember::ContentsLocation>& ArchiveMember::getContents
   return m_ContentsLocation;
 }
 
+std::span<uint8_t> ArchiveMember::getModifiableContents() {
+  QUARN_ASSERT(1, m_Type == NULL);
+  QUARN_ASSERT(1, m_Contents.has_value());
+  return {m_Contents->bytes, m_Contents->size};
+}
+
+uint32_t ArchiveMember::getSymbolIndex(const Symbol* symbol) const {
+  return m_Archive->getSymbolIndex(symbol);
+}
+
 std::span<uint8_t> ArchiveMember::replaceContents(uint32_t size) {
   if (m_Contents && m_Contents->capacity >= size && !m_ContentsAreViewed) {
     m_Contents->size = size;
@@ -85,34 +94,29 @@ std::span<uint8_t> ArchiveMember::replaceContents(uint32_t size) {
 }
 
 void ArchiveMember::freeContents() {
-  if (m_Contents && !m_ContentsAreViewed) {
+  if (m_Contents && m_ContentsAreViewed) {
+    m_Archive->m_ViewedBytes.push_back({m_Contents->bytes, m_Contents->capacity});
+  } else if (m_Contents) {
     m_Archive->m_ContainerRegion->discard(m_Contents->bytes, m_Contents->capacity);
   }
   m_Contents.reset();
   m_ContentsAreViewed = false;
 }
 
-void ArchiveMember::setLocation(const char* regionFileName, uint32_t offset, bool isTemporary) {
-  m_ContentsLocation = ContentsLocation{regionFileName, offset, isTemporary};
+void ArchiveMember::setLocation(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
+                                bool isTemporary) {
+  support::SourceFile* held = m_Archive->hold(file);
+  m_ContentsLocation = ContentsLocation{held, held->getName(), offset, isTemporary};
 }
 
 bool ArchiveMember::readContents(std::span<uint8_t> bytes) {
-  support::Host& host = m_Archive->getHost();
-  const char* fileName = m_ContentsLocation->fileName;
-  support::FileHandle file;
-  if (const int error = host.openForReading(fileName, file); error != 0) {
-    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
-  }
+  support::SourceFile& file = *m_ContentsLocation->file;
   size_t done = 0;
-  const int readError = host.readAt(file, bytes, m_ContentsLocation->offset, done);
-  const int closeError = host.close(file);
-  if (readError != 0 || done < bytes.size()) {
-    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, readError);
-  }
-  if (closeError != 0) {
-    return m_Archive->fail(&ErrorHandler::reportCloseError, fileName, closeError);
-  }
-  return true;
+  int error = file.readAt(bytes, m_ContentsLocation->offset, done);
+  const bool isCutShort = error == 0 && done < bytes.size();
+  if (error == 0 && !isCutShort) error = file.checkUnchanged();
+  if (error == 0 && !isCutShort) return true;
+  return m_Archive->fail(&ErrorHandler::reportReadError, file.getName(), error);
 }
 
 bool ArchiveMember::loadContents() {
@@ -132,10 +136,12 @@ bool ArchiveMember::flushContents() {
     return m_Archive->fail(&ErrorHandler::reportWriteError, name.c_str(), error);
   }
   const std::span<const uint8_t> bytes = getContents();
-  const int writeError = host.write(file, bytes.first(std::min<size_t>(m_Size, bytes.size())));
+  int writeError = host.write(file, bytes.first(std::min<size_t>(m_Size, bytes.size())));
+  support::FileStatus status;
+  if (writeError == 0) writeError = host.statusOf(file, status);
   const int closeError = host.close(file);
   if (writeError == 0 && closeError == 0) {
-    setLocation(m_Archive->copyToRegion(name), 0, true);
+    setLocation(m_Archive->m_SourceFiles.remember(name.c_str(), status), 0, true);
     return true;
   }
   // Of the two failures the first one is told; a temporary that can't be removed is only litter.
@@ -174,25 +180,29 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
   releaseContentsLocation();
 }
 
-void ArchiveMember::takeFile(const char* fileName, uint32_t offset, uint32_t size,
-                             const FileProbe& probe) {
+void ArchiveMember::takeFile(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
+                             uint32_t size) {
   freeContents();
   // A temporary file of the old contents is left alone: only releaseContentsLocation deletes.
-  setLocation(m_Archive->copyToRegion(fileName), offset, false);
+  setLocation(file, offset, false);
+  const support::FileStatus& status = file->getStatus();
   m_Size = size;
-  m_Date = probe.status.modificationTime;
-  m_Uid = static_cast<uint32_t>(probe.status.uid);
-  m_Gid = static_cast<uint32_t>(probe.status.gid);
-  m_Mode = probe.status.mode;
+  m_Date = status.modificationTime;
+  m_Uid = static_cast<uint32_t>(status.uid);
+  m_Gid = static_cast<uint32_t>(status.gid);
+  m_Mode = status.mode;
+  m_Modified = true;
+}
+
+void ArchiveMember::markReplaced() {
   m_Archive->m_FileNameTableUpToDate = false;
   m_Archive->m_SymbolTableUpToDate = false;
   m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
-  m_Modified = true;
 }
 
 bool ArchiveMember::setContentsFromFile(const char* fileName) {
   QUARN_ASSERT(1, fileName != NULL);
-  return setContentsFromFile(fileName, probeFile(m_Archive->getHost(), fileName));
+  return setContentsFromFile(fileName, probeFile(m_Archive->m_SourceFiles, fileName));
 }
 
 bool ArchiveMember::setContentsFromFile(const char* fileName, const FileProbe& probe) {
@@ -200,7 +210,8 @@ bool ArchiveMember::setContentsFromFile(const char* fileName, const FileProbe& p
   if (const int error = probe.refusal(); error != 0) {
     return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
   }
-  takeFile(fileName, 0, static_cast<uint32_t>(probe.status.size), probe);
+  takeFile(probe.file, 0, static_cast<uint32_t>(probe.status.size));
+  markReplaced();
   m_Type = ArchiveMemberType::decide(probe.firstBytes());
   return true;
 }
@@ -210,31 +221,38 @@ bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t off
   QUARN_ASSERT(1, fileName != NULL);
   QUARN_ASSERT(1, m_Type != NULL);
   FileProbe probe;
-  probe.statusError = m_Archive->getHost().status(fileName, probe.status);
-  if (const int error = probe.refusal(); error != 0) {
-    return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
-  }
+  if (!m_Archive->openSource(fileName, probe)) return false;
   if (!m_Archive->isInsideFile(fileName, std::nullopt, offset, size, probe.status.size)) {
     return false;
   }
-  takeFile(fileName, offset, size, probe);
+  takeFile(probe.file, offset, size);
+  markReplaced();
   m_Type = nullptr;
   determineType();
   return true;
 }
 
+void ArchiveMember::setContentsFromMember(const ArchiveMember& source) {
+  QUARN_ASSERT(1, m_Type != NULL);
+  const ContentsLocation& location = *source.getContentsLocation();
+  takeFile(location.file->shared_from_this(), location.offset, source.m_Size);
+  markReplaced();
+  takeHeaderNumbers(source);
+  m_Type = source.m_Type;
+}
+
+void ArchiveMember::takeHeaderNumbers(const ArchiveMember& source) {
+  QUARN_ASSERT(1, !m_Archive->isReadOnly());
+  m_Date = source.m_Date;
+  m_Uid = source.m_Uid;
+  m_Gid = source.m_Gid;
+  m_Mode = source.m_Mode;
+}
+
 bool ArchiveMember::readInto(elfext::ObjectModule& module,
                              elfext::DeferredContentsSelector* selector) const {
-  const auto& [fileName, offset, isTemporary] = *m_ContentsLocation;
-  KeptFile* file = m_Archive->m_ObjectFile;
-  if (file == nullptr) {
-    return elfext::readElfFile(m_Archive->getHost(), fileName, offset, m_Size, module, selector);
-  }
-  if (const int error = file->turnTo(fileName); error != 0) {
-    elfext::ErrorHandler* handler = module.getErrorHandler();
-    return handler != nullptr && handler->ioErrorReading(module, error);
-  }
-  return elfext::readElfFile(m_Archive->getHost(), file->getFile(), offset, m_Size, module,
+  const ContentsLocation& location = *m_ContentsLocation;
+  return elfext::readElfFile(location.file->shared_from_this(), location.offset, m_Size, module,
                              selector);
 }
 

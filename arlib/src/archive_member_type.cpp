@@ -16,6 +16,7 @@
 #include "support/interface/shared_texts.h"
 
 #include <algorithm>
+#include <array>
 #include <cstring>
 #include <span>
 #include <vector>
@@ -58,8 +59,12 @@ bool ElfImageArchiveMemberType::isElfImage(const ArchiveMember* archiveMember) c
   QUARN_ASSERT(1, archiveMember != NULL);
   if (archiveMember->hasContents()) return elfext::isElfData(archiveMember->getContents());
   const ArchiveMember::ContentsLocation& location = *archiveMember->getContentsLocation();
-  return elfext::isElfFile(archiveMember->getArchive()->getHost(), location.fileName,
-                           location.offset, archiveMember->getSize());
+  std::array<uint8_t, elfext::RecognizedBytes> bytes;
+  const std::span<uint8_t> wanted =
+      std::span(bytes).first(std::min<size_t>(archiveMember->getSize(), bytes.size()));
+  size_t done = 0;
+  return location.file->readAt(wanted, location.offset, done) == 0 &&
+         elfext::isElfData(wanted.first(done));
 }
 
 namespace {

@@ -2,7 +2,6 @@
 #include "arlib/src/auxiliary_members.h"
 
 #include "arlib/interface/archive_format.h"
-#include "arlib/src/kept_file.h"
 #include "elfext/interface/attribute_string.h"
 
 #include <algorithm>
@@ -23,21 +22,6 @@ bool hasLongName(const ArchiveMember* member) {
 
 } // namespace
 
-// While it lasts, objects of the archive are read through one open file as far as they are in one.
-class AuxiliaryMembers::ObjectFileScope {
-public:
-  explicit ObjectFileScope(Archive& archive) : m_Archive(archive), m_File(archive.getHost()) {
-    m_Archive.m_ObjectFile = &m_File;
-  }
-  ~ObjectFileScope() { m_Archive.m_ObjectFile = nullptr; }
-  ObjectFileScope(const ObjectFileScope&) = delete;
-  ObjectFileScope& operator=(const ObjectFileScope&) = delete;
-
-private:
-  Archive& m_Archive;
-  KeptFile m_File;
-};
-
 bool Archive::updateAuxiliaryMembers() {
   return AuxiliaryMembers(*this).update();
 }
@@ -55,6 +39,7 @@ bool AuxiliaryMembers::update() {
   if (!m_Archive.m_FileNameTableUpToDate) {
     m_Archive.m_ArchiveMemberOffsetsUpToDate = false;
     if (!updateFileNameTable()) return false;
+    if (hasLayoutChanged()) m_Archive.m_SymbolTableUpToDate = false;
   }
   if (!m_Archive.m_SymbolTableUpToDate) {
     m_Archive.m_ArchiveMemberOffsetsUpToDate = false;
@@ -79,6 +64,24 @@ void AuxiliaryMembers::putTablesInPlace() {
   }
   m_Archive.m_FileNameTableUpToDate = true;
   m_Archive.m_SymbolTableUpToDate = true;
+}
+
+// A long-name table that comes, goes or changes its size shifts all members behind it, and with
+// them what the symbol table's offsets lead to. As long as the table counts as up to date, each
+// member's offset is the one that the table knows.
+bool AuxiliaryMembers::hasLayoutChanged() const {
+  const ArchiveMember* symbols = m_Archive.m_SymbolTable;
+  if (symbols == nullptr) return false;
+  uint64_t cursor = nextHeaderOffset(ArchiveMagic.size(), symbols->m_Size);
+  if (const ArchiveMember* names = m_Archive.m_FileNameTable; names != nullptr) {
+    cursor = nextHeaderOffset(cursor, names->m_Size);
+  }
+  for (const ArchiveMember* member : m_Archive.m_ArchiveMembers) {
+    if (member->isAuxiliary()) continue;
+    if (member->m_Offset != cursor) return true;
+    cursor = nextHeaderOffset(cursor, member->m_Size);
+  }
+  return false;
 }
 
 void AuxiliaryMembers::computeOffsets() {
@@ -159,7 +162,6 @@ bool AuxiliaryMembers::updateSymbolTable() {
     removeSymbolTable();
     return true;
   }
-  const ObjectFileScope objectFile(m_Archive);
   collectSymbolHostingMembers();
   if (m_SymbolHostingMembers.getSize() == 0 &&
       m_Archive.m_SymbolTableMode == SymbolTableMode::IfSymbols) {

@@ -24,8 +24,6 @@ public:
   bool update();
 
 private:
-  class ObjectFileScope;
-
   bool updateFileNameTable();
   bool updateSymbolTable();
   void removeSymbolTable();
@@ -39,6 +37,7 @@ private:
   ArchiveMember* appendTable(const ArchiveMemberType* type);
   bool resizeTable(ArchiveMember* table, uint32_t size);
   void forgetTable(ArchiveMember*& table);
+  [[nodiscard]] bool hasLayoutChanged() const;
   void putTablesInPlace();
   void computeOffsets();
 

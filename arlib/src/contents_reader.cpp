@@ -1,36 +1,35 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "arlib/interface/contents_reader.h"
 
-#include "arlib/src/kept_file.h"
 #include "arlib/src/read_window.h"
+#include "support/interface/source_file.h"
 
 #include <algorithm>
 
 namespace arlib {
 
 ContentsReader::ContentsReader(Archive& archive)
-    : m_Archive(archive), m_File(std::make_unique<KeptFile>(archive.getHost())),
-      m_Window(std::make_unique<ReadWindow>(archive.getHost())) {}
+    : m_Archive(archive), m_Window(std::make_unique<ReadWindow>()) {}
 
 ContentsReader::~ContentsReader() = default;
 
 bool ContentsReader::finish() {
-  m_Error = m_File->close();
-  if (m_Error == 0) return true;
-  return m_Archive.fail(&ErrorHandler::reportCloseError, m_File->getFileName(), m_Error);
+  if (m_File == nullptr) return true;
+  if (const int error = m_File->checkUnchanged(); error != 0) return failToRead(error);
+  return true;
 }
 
-bool ContentsReader::openFile(const char* fileName) {
-  if (m_File->isOpen(fileName)) return true;
-  if (!finish()) return false;
-  if (const int error = m_File->open(fileName); error != 0) return failToRead(error);
-  m_Window->setFile(m_File->getFile());
-  return true;
+bool ContentsReader::turnTo(support::SourceFile* file) {
+  if (m_File == file) return true;
+  const bool isFinished = finish();
+  m_File = file;
+  m_Window->setFile(file);
+  return isFinished;
 }
 
 bool ContentsReader::failToRead(int error) {
   m_Error = error;
-  return m_Archive.fail(&ErrorHandler::reportReadError, m_File->getFileName(), error);
+  return m_Archive.fail(&ErrorHandler::reportReadError, m_File->getName(), error);
 }
 
 bool ContentsReader::begin(const ArchiveMember& member) {
@@ -43,7 +42,7 @@ bool ContentsReader::begin(const ArchiveMember& member) {
     return true;
   }
   m_Offset = member.getContentsLocation()->offset;
-  return openFile(member.getContentsLocation()->fileName);
+  return turnTo(member.getContentsLocation()->file);
 }
 
 bool ContentsReader::read(std::span<const uint8_t>& piece) {

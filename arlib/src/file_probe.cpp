@@ -22,7 +22,8 @@ support::HostError FileProbe::refusal() const {
 
 support::HostError refusalOf(const FileStatus& status) {
   if (status.kind == FileKind::Directory) return EISDIR;
-  if (status.kind != FileKind::RegularFile) return EINVAL;
+  // A host that tells of no mode at all has told nothing of the file.
+  if (status.kind != FileKind::RegularFile || status.mode == 0) return EINVAL;
   const auto isOutside = [](int64_t value) { return value < 0 || value > 0x7FFFFFFF; };
   if (isOutside(status.modificationTime) || isOutside(status.size) || isOutside(status.uid) ||
       isOutside(status.gid)) {
@@ -31,15 +32,23 @@ support::HostError refusalOf(const FileStatus& status) {
   return 0;
 }
 
-FileProbe probeFile(support::Host& host, const char* fileName) {
+FileProbe openProbe(support::SourceFiles& files, const char* fileName) {
   FileProbe probe;
-  probe.statusError = host.status(fileName, probe.status);
+  probe.statusError = files.getHost().status(fileName, probe.status);
   if (probe.statusError != 0 || probe.status.kind != FileKind::RegularFile) return probe;
-  support::FileHandle file;
-  if (host.openForReading(fileName, file) != 0) return probe;
+  if (files.open(fileName, probe.file) == 0) {
+    probe.status = probe.file->getStatus();
+  } else {
+    probe.file = files.remember(fileName, probe.status);
+  }
+  return probe;
+}
+
+FileProbe probeFile(support::SourceFiles& files, const char* fileName) {
+  FileProbe probe = openProbe(files, fileName);
+  if (probe.refusal() != 0) return probe;
   size_t done = 0;
-  if (host.readAt(file, probe.bytes, 0, done) == 0) probe.byteCount = static_cast<uint32_t>(done);
-  if (host.close(file) != 0) probe.byteCount = 0;
+  if (probe.file->readAt(probe.bytes, 0, done) == 0) probe.byteCount = static_cast<uint32_t>(done);
   return probe;
 }
 

@@ -21,8 +21,7 @@ support::HostError ReadWindow::read(uint64_t offset, size_t size) {
   const size_t wanted = std::max(size, isWalk ? AheadSize : LeapSize);
   if (m_Bytes.size() < wanted) m_Bytes.resize(wanted);
   m_Start = offset;
-  const support::HostError error =
-      m_Host->readAt(m_File, std::span(m_Bytes).first(wanted), offset, m_Used);
+  const support::HostError error = m_File->readAt(std::span(m_Bytes).first(wanted), offset, m_Used);
   if (error != 0) m_Used = 0;
   m_EndsFile = error == 0 && m_Used < wanted;
   return error;

@@ -4,7 +4,7 @@
 // host call for each step, and whoever leaps over large bodies doesn't read them.
 #pragma once
 
-#include "support/interface/host.h"
+#include "support/interface/source_file.h"
 
 #include <cstdint>
 #include <span>
@@ -14,10 +14,8 @@ namespace arlib {
 
 class ReadWindow {
 public:
-  explicit ReadWindow(support::Host& host) : m_Host(&host) {}
-
   // What has been read of another file is forgotten. The file stays the caller's.
-  void setFile(support::FileHandle file) {
+  void setFile(support::SourceFile* file) {
     m_File = file;
     m_Start = 0;
     m_Used = 0;
@@ -39,8 +37,7 @@ private:
   // What a leap reads at least: room for a header, its neighbours and a body's first bytes.
   static constexpr size_t LeapSize = 0x200;
 
-  support::Host* m_Host;
-  support::FileHandle m_File;
+  support::SourceFile* m_File = nullptr;
   std::vector<uint8_t> m_Bytes;
   uint64_t m_Start = 0; // file offset of the first byte
   size_t m_Used = 0;

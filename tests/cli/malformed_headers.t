@@ -28,11 +28,11 @@ Not an archive at all.
 Too short to tell.
 
   $ : > lib.a; refused
-  Error: L6835E: Reading file 'lib.a' : Success
+  Error: L6835E: Reading file 'lib.a' : Unexpected end of file
   $ printf '!<a' > lib.a; refused
-  Error: L6835E: Reading file 'lib.a' : Success
+  Error: L6835E: Reading file 'lib.a' : Unexpected end of file
   $ printf '!<arch>' > lib.a; refused
-  Error: L6835E: Reading file 'lib.a' : Success
+  Error: L6835E: Reading file 'lib.a' : Unexpected end of file
 
 A header that is cut short, anywhere.
 
@@ -113,9 +113,9 @@ The member is not all there.
 The byte behind an odd member is not there, or is not the right one.
 
   $ { magic; header a.o/ 0 0 0 644 1; printf a; } > lib.a; refused
-  Error: L6835E: Reading file 'lib.a' : Success
+  Error: L6835E: Reading file 'lib.a' : Unexpected end of file
   $ { magic; header / 0 0 0 0 5; words 0; printf '\0'; } > lib.a; refused
-  Error: L6835E: Reading file 'lib.a' : Success
+  Error: L6835E: Reading file 'lib.a' : Unexpected end of file
   $ { magic; header a.o/ 0 0 0 644 1; printf 'aX'; member b.o/ b; } > lib.a; both quarn -t lib.a
   out: a.o
   out: b.o
@@ -124,7 +124,7 @@ The byte behind an odd member is not there, or is not the right one.
   $ { magic; header a.o/ 0 0 0 644 1; printf 'a\377'; member b.o/ b; } > lib.a; both quarn -t lib.a
   out: a.o
   out: b.o
-  err: Warning: L6974W: 'lib.a': malformed archive: Padding byte at offset 69 has value 255 and not 0x0A as it should be
+  err: Warning: L6974W: 'lib.a': malformed archive: Padding byte at offset 69 has value -1 and not 0x0A as it should be
   status 0
   $ { magic; member b.o/ bb; header a.o/ 0 0 0 644 1; printf 'a\0'; } > lib.a; both quarn -t lib.a
   out: b.o

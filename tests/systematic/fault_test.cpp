@@ -92,13 +92,15 @@ std::string wantedBytes(const Edit& edit) {
   return disk.read("lib.a");
 }
 
-// Failures that a run survives: what is only best effort, and the look at an input file that tells
-// objects from others (a file that can't be looked at is none).
+// Failures that a run survives: what is only best effort, the close of the old archive when the new
+// one has taken its place, and the look at an input file that tells objects from others (a file
+// that can't be looked at is none).
 bool isTolerated(const FaultyHost& host) {
   const std::string& operation = host.failedOperation();
   if (operation == "setPermissions" || operation == "status") return true;
+  if (host.failedName() == "lib.a") return operation == "close";
   return host.failedName() == "new.o" &&
-         (operation == "openForReading" || operation == "readAt" || operation == "close");
+         (operation == "openForReading" || operation == "readAt" || operation == "statusOf");
 }
 
 // An object that can't be read is told of, and kept without its symbols.

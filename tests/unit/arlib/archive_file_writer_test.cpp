@@ -34,6 +34,8 @@ protected:
       m_Host.failCall(0, 0);
       EXPECT_TRUE(readFile("lib.a", archive));
       archive.addMemberFromFile("a.o");
+      // As if they had been closed to make room for others.
+      archive.closeFiles();
       m_Host.failCall(call, error);
       const bool isWritten = writeFile("lib.a", archive);
       const std::string& failed = m_Host.failedOperation();
@@ -275,8 +277,16 @@ TEST_F(ArchiveFileWriterTest, ReportsAMemberThatHasBecomeShorter) {
   EXPECT_THAT(m_Host.names(), ElementsAre("a.o", "lib.a"));
 }
 
+TEST_F(ArchiveFileWriterTest, WritesAMemberWhoseFileIsGoneButOpen) {
+  add("a.o", "x");
+  m_Host.remove("a.o");
+  EXPECT_TRUE(write());
+  EXPECT_EQ(written(), archive().member("a.o", "x").bytes());
+}
+
 TEST_F(ArchiveFileWriterTest, ReportsAMemberWhoseFileIsGone) {
   add("a.o", "x");
+  m_Archive.closeFiles();
   m_Host.remove("a.o");
   EXPECT_FALSE(write());
   EXPECT_THAT(reports(),
@@ -291,6 +301,7 @@ TEST_F(ArchiveFileWriterTest, WritesNothingWhereATableCouldNotBeRebuilt) {
   const std::string before = written();
   member(0)->discardContents();
   member(1)->setName("another_name_of_some_length.o");
+  m_Archive.closeFiles();
   m_Host.at("lib.a").isUnreadable = true;
   EXPECT_FALSE(write());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'lib.a': Permission denied"));
@@ -344,7 +355,7 @@ TEST_F(FailingWrite, AtAMembersFileIsReportedTwice) {
   expectOldArchive();
   EXPECT_FALSE(writeFailing("close", 1, EIO));
   EXPECT_THAT(m_Handler.reports,
-              ElementsAre("0 I/O error closing file 'lib.a': Input/output error",
+              ElementsAre("0 I/O error closing file 'a.o': Input/output error",
                           "0 I/O error writing file 'lib.a.0': Input/output error"));
   expectOldArchive();
 }
@@ -364,7 +375,7 @@ TEST_F(FailingWrite, AtTheFlushCountsAsAWrite) {
 }
 
 TEST_F(FailingWrite, AtTheCloseRemovesTheTemporary) {
-  EXPECT_FALSE(writeFailing("close", 3, EIO));
+  EXPECT_FALSE(writeFailing("close", 2, EIO));
   EXPECT_THAT(m_Handler.reports,
               ElementsAre("0 I/O error closing file 'lib.a.0': Input/output error"));
   expectOldArchive();

@@ -61,8 +61,15 @@ TEST_F(ArchiveMemberTest, LoadsItsBytesOnDemandAndOnce) {
   EXPECT_TRUE(added->loadContents());
 }
 
+TEST_F(ArchiveMemberTest, HasItsBytesFromTheFileThatItWasMadeOf) {
+  ArchiveMember* added = m_Archive.addMemberFromFile("a.o");
+  m_Host.addFile("a.o", "somebody else's");
+  EXPECT_EQ(contentsOf(added), "contents");
+}
+
 TEST_F(ArchiveMemberTest, ReportsAFileThatIsGone) {
   ArchiveMember* added = m_Archive.addMemberFromFile("a.o");
+  m_Archive.closeFiles();
   m_Host.remove("a.o");
   EXPECT_FALSE(added->loadContents());
   EXPECT_FALSE(added->hasContents());
@@ -77,18 +84,19 @@ TEST_F(ArchiveMemberTest, ReportsAFileThatHasBecomeShorterWithoutAReason) {
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o'"));
 }
 
+// Opening the file again, asking what it is, reading it, and asking once more.
 TEST_F(FailingContents, AreReportedAndNotKept) {
-  m_Host.failCall(1, EMFILE);
-  EXPECT_FALSE(m_Member->loadContents());
-  m_Host.failCall(2, EIO);
-  EXPECT_FALSE(m_Member->loadContents());
-  m_Host.failCall(3, EIO);
-  EXPECT_FALSE(m_Member->loadContents());
-  EXPECT_THAT(m_Handler.reports, ElementsAre("0 I/O error reading file 'a.o': Too many open files",
-                                             "0 I/O error reading file 'a.o': Input/output error",
-                                             "0 I/O error closing file 'a.o': Input/output error"));
-  EXPECT_FALSE(m_Member->hasContents());
+  for (uint64_t call = 1; call <= 4; ++call) {
+    m_Archive.closeFiles();
+    m_Host.failCall(call, EIO);
+    EXPECT_FALSE(m_Member->loadContents());
+    EXPECT_FALSE(m_Member->hasContents());
+    EXPECT_THAT(m_Handler.take(),
+                ElementsAre("0 I/O error reading file 'a.o': Input/output error"));
+  }
+  m_Archive.closeFiles();
   EXPECT_EQ(m_Disk.openHandles(), 0u);
+  m_Host.failCall(0, 0);
   EXPECT_TRUE(m_Member->loadContents());
 }
 
@@ -103,6 +111,27 @@ TEST_F(ArchiveMemberTest, GoesToATemporaryFileWhenItsBytesAreNowhereElse) {
   EXPECT_EQ(m_Host.read(added->getContentsLocation()->fileName), "memory");
   EXPECT_TRUE(added->flushContents());
   EXPECT_EQ(filesBeside().size(), 1u);
+}
+
+TEST_F(ArchiveMemberTest, MayBeEditedInPlaceOnceItsTypeIsCleared) {
+  ArchiveMember* added = m_Archive.addMemberFromFile("a.o");
+  EXPECT_TRUE(added->clearType());
+  added->getModifiableContents()[0] = 'C';
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(asString(added->getContents()), "Contents");
+  EXPECT_DEATH(static_cast<void>(added->getModifiableContents()), "m_Type == NULL");
+}
+
+TEST_F(ArchiveMemberTest, FindsTheIndexOfASymbol) {
+  m_Host.addFile("lib.a",
+                 archive().symbolTable({{"s", "a.o"}, {"t", "a.o"}}).member("a.o", "x").bytes());
+  ASSERT_TRUE(readFile("lib.a", m_Archive));
+  const ArchiveMember* defining = m_Archive.getMembers()[1];
+  EXPECT_EQ(defining->getSymbolIndex(m_Archive.getSymbols()[1]), 1u);
+  Archive other(m_Host);
+  ASSERT_TRUE(readFile("lib.a", other));
+  EXPECT_EQ(defining->getSymbolIndex(other.getSymbols()[1]), Archive::NotFound);
+  EXPECT_DEATH(static_cast<void>(defining->getSymbolIndex(nullptr)), "symbol != NULL");
 }
 
 TEST_F(ArchiveMemberTest, NeedsNoTemporaryFileForWhatIsOnDisk) {
@@ -129,11 +158,15 @@ TEST_F(FailingContents, LeaveNoTemporaryFileBehind) {
   EXPECT_FALSE(m_InMemory->flushContents());
   m_Host.failCall(3, EIO);
   EXPECT_FALSE(m_InMemory->flushContents());
+  m_Host.failCall(4, EIO);
+  EXPECT_FALSE(m_InMemory->flushContents());
   EXPECT_THAT(m_Handler.reports,
               ElementsAre("0 I/O error writing file '': Permission denied",
                           "0 I/O error writing file '/tmp/quarn.0': No space left on device",
-                          "0 I/O error closing file '/tmp/quarn.1': Input/output error"));
+                          "0 I/O error writing file '/tmp/quarn.1': Input/output error",
+                          "0 I/O error closing file '/tmp/quarn.2': Input/output error"));
   EXPECT_THAT(m_Disk.names(), ElementsAre("a.o"));
+  m_Archive.closeFiles();
   EXPECT_EQ(m_Disk.openHandles(), 0u);
   EXPECT_FALSE(m_InMemory->getContentsLocation().has_value());
   EXPECT_TRUE(m_InMemory->flushContents());

@@ -39,6 +39,8 @@ TEST_F(ArchiveMemberTypeTest, IsDecidedByTheBytesWhereverTheyAre) {
   m_Host.remove("a.o");
   EXPECT_EQ(ArchiveMemberType::decide(onDisk), ElfImageArchiveMemberType::getInstance());
   onDisk->discardContents();
+  EXPECT_EQ(ArchiveMemberType::decide(onDisk), ElfImageArchiveMemberType::getInstance());
+  m_Archive.closeFiles();
   EXPECT_EQ(ArchiveMemberType::decide(onDisk), UnknownArchiveMemberType::getInstance());
   EXPECT_THAT(reports(), IsEmpty());
 }

@@ -96,7 +96,42 @@ TEST_F(ArchiveListTest, AddsAFileUnderTheLastPartOfItsName) {
   EXPECT_EQ(added->getType(), ElfImageArchiveMemberType::getInstance());
   EXPECT_STREQ(added->getContentsLocation()->fileName, "dir\\sub/a.o");
   EXPECT_EQ(added->getContentsLocation()->offset, 0u);
-  EXPECT_EQ(m_Host.openHandles(), 0u);
+}
+
+// A host that tells of no mode has told nothing of the file.
+TEST_F(ArchiveListTest, RefusesAFileWithoutAMode) {
+  m_Host.addFile("a.o", "x").mode = 0;
+  EXPECT_EQ(m_Archive.addMemberFromFile("a.o"), nullptr);
+  EXPECT_EQ(m_Archive.addMemberFromFileRegion("a.o", "a.o", 0, 1, std::nullopt), nullptr);
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Invalid argument",
+                                     "0 I/O error reading file 'a.o': Invalid argument"));
+}
+
+// Many input files must not need as many descriptors at once.
+TEST_F(ArchiveListTest, KeepsNoMoreFilesOpenThanItsBound) {
+  for (int i = 0; i < 300; ++i) {
+    const std::string name = std::to_string(i);
+    ASSERT_NE(add(name.c_str(), "contents of " + name), nullptr);
+    ASSERT_LE(m_Host.openHandles(), support::SourceFiles::DefaultBound);
+  }
+  for (uint32_t i = 0; i < 300; ++i)
+    EXPECT_EQ(contentsOf(member(i)), "contents of " + std::to_string(i));
+  EXPECT_LE(m_Host.openHandles(), support::SourceFiles::DefaultBound);
+}
+
+TEST_F(ArchiveListTest, TakesAMemberOverThroughTheFileOfItsOwnArchive) {
+  m_Host.addFile("source.a", archive().member("a.o", object().bytes()).bytes());
+  {
+    Archive source(m_Host);
+    ASSERT_TRUE(readFile("source.a", source));
+    m_Host.addFile("source.a", std::string(500, 'x'));
+    const ArchiveMember* added = m_Archive.addMemberFromMember(*source.getMembers()[0]);
+    EXPECT_EQ(added->getName(), "a.o");
+    EXPECT_EQ(added->getType(), ElfImageArchiveMemberType::getInstance());
+    EXPECT_EQ(added->getDate(), source.getMembers()[0]->getDate());
+    EXPECT_TRUE(added->isModified());
+  }
+  EXPECT_EQ(contentsOf(member(0)), object().bytes());
 }
 
 TEST_F(ArchiveListTest, TakesAFileItCannotOpenForOneOfUnknownType) {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The two tables that are derived from the members: when they are rebuilt, what they hold, where
 // they stand.
+#include "elfext/interface/elf_constants.h"
 #include "tests/unit/arlib/archive_fixture.h"
 
 namespace arlib {
@@ -9,6 +10,14 @@ namespace {
 
 const std::string Long1 = "first_long_name_of_member.o";
 const std::string Long2 = "second_long_name_of_member.o";
+
+std::string objectThatDefines(const char* name) {
+  testsupport::ObjectBuilder file = object();
+  file.section(".text", elfext::SHT_PROGBITS).zeros(4);
+  file.section(".symtab", elfext::SHT_SYMTAB).link(3).symbol({.name = name, .section = 1});
+  file.section(".strtab", elfext::SHT_STRTAB);
+  return file.bytes();
+}
 
 class AuxiliaryMembersTest : public ArchiveTest {
 protected:
@@ -258,6 +267,7 @@ TEST_F(AuxiliaryMembersTest, DeterminesTypesThatAreNotKnown) {
 
 TEST_F(AuxiliaryMembersTest, DeterminesTheTypeOfAMemberThatCannotBeRead) {
   ArchiveMember* edited = add("a.o", object().bytes());
+  m_Archive.closeFiles();
   m_Host.at("a.o").isUnreadable = true;
   EXPECT_FALSE(edited->clearType());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Permission denied"));
@@ -274,10 +284,40 @@ TEST_F(AuxiliaryMembersTest, LoadsATableThatWasDiscarded) {
   EXPECT_EQ(longNameTable(), Long1 + "/\n");
 }
 
+// A long name that comes, goes or changes shifts all members, and the symbol table leads to them.
+TEST_F(AuxiliaryMembersTest, KeepsSymbolsRightWhenNamesChangeTheLayout) {
+  const std::string defining = objectThatDefines("f");
+  const ArchiveBuilder library = archive()
+                                     .symbolTable({{"f", "a.o"}})
+                                     .longNames({Long1})
+                                     .member("a.o", defining)
+                                     .member(Long1, "y");
+  for (const std::string& name : {Long1 + "_and_more_of_it", std::string("short"), Long1 + "__"}) {
+    for (const uint32_t index : {2u, 3u}) {
+      read(library);
+      member(index)->setName(name);
+      ASSERT_TRUE(writeFile("lib.a", m_Archive));
+      ASSERT_TRUE(readFile("lib.a", m_Archive));
+      EXPECT_THAT(reports(), IsEmpty());
+      ASSERT_THAT(symbolNamesOf(m_Archive), ElementsAre("f"));
+      EXPECT_EQ(m_Archive.getSymbols()[0]->getDefiningMember()->getSize(), defining.size());
+    }
+  }
+}
+
+// Names that leave the layout as it is leave the table alone, also where no object can be read.
+TEST_F(AuxiliaryMembersTest, DoesNotRebuildSymbolsForANameThatMovesNothing) {
+  read(archive().symbolTable({{"s", "a.o"}}).member("a.o", "no object"));
+  member(1)->setName("b.o");
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_NE(m_Archive.getSymbolTable(), nullptr);
+}
+
 TEST_F(AuxiliaryMembersTest, FailsWhereATableCannotBeLoaded) {
   read(archive().longNames({Long1}).member(Long1, "x"));
   member(0)->discardContents();
   m_Archive.moveMember(member(1), 0);
+  m_Archive.closeFiles();
   m_Host.at("lib.a").isUnreadable = true;
   EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'lib.a': Permission denied"));
@@ -290,6 +330,7 @@ TEST_F(AuxiliaryMembersTest, FailsWhereTheSymbolTableCannotBeLoaded) {
   read(archive().symbolTable({{"s", "a"}}).member("a", "x"));
   member(0)->discardContents();
   m_Archive.setSymbolTableMode(SymbolTableMode::Always);
+  m_Archive.closeFiles();
   m_Host.at("lib.a").isUnreadable = true;
   EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'lib.a': Permission denied"));

@@ -8,14 +8,23 @@
 
 namespace arlib {
 
+namespace {
+
+FileProbe probe(MemoryHost& host, const char* fileName) {
+  support::SourceFiles files(host);
+  return probeFile(files, fileName);
+}
+
+} // namespace
+
 TEST(FileProbeTest, TellsArchivesByTheirMagic) {
   MemoryHost host;
   host.addFile("lib.a", "!<arch>\n");
   host.addFile("short", "!<arch>");
   host.addFile("other", "!<thin>\nmore");
-  EXPECT_TRUE(probeFile(host, "lib.a").hasArchiveMagic());
-  EXPECT_FALSE(probeFile(host, "short").hasArchiveMagic());
-  EXPECT_FALSE(probeFile(host, "other").hasArchiveMagic());
+  EXPECT_TRUE(probe(host, "lib.a").hasArchiveMagic());
+  EXPECT_FALSE(probe(host, "short").hasArchiveMagic());
+  EXPECT_FALSE(probe(host, "other").hasArchiveMagic());
 }
 
 TEST(FileProbeTest, TakesTheFirstBytesOfRegularFilesOnly) {
@@ -23,12 +32,12 @@ TEST(FileProbeTest, TakesTheFirstBytesOfRegularFilesOnly) {
   host.addFile("file", std::string(100, 'x'));
   host.addFile("locked", "secret").isUnreadable = true;
   host.addSpecial("fifo").bytes = "never looked at";
-  EXPECT_EQ(probeFile(host, "file").firstBytes().size(), elfext::RecognizedBytes);
-  EXPECT_TRUE(probeFile(host, "file").exists());
-  EXPECT_EQ(probeFile(host, "locked").firstBytes().size(), 0u);
-  EXPECT_EQ(probeFile(host, "locked").refusal(), 0);
-  EXPECT_EQ(probeFile(host, "fifo").firstBytes().size(), 0u);
-  EXPECT_FALSE(probeFile(host, "gone").exists());
+  EXPECT_EQ(probe(host, "file").firstBytes().size(), elfext::RecognizedBytes);
+  EXPECT_TRUE(probe(host, "file").exists());
+  EXPECT_EQ(probe(host, "locked").firstBytes().size(), 0u);
+  EXPECT_EQ(probe(host, "locked").refusal(), 0);
+  EXPECT_EQ(probe(host, "fifo").firstBytes().size(), 0u);
+  EXPECT_FALSE(probe(host, "gone").exists());
   EXPECT_EQ(host.openHandles(), 0u);
 }
 
@@ -38,11 +47,26 @@ TEST(FileProbeTest, SaysWhyAFileCannotBeTaken) {
   host.addFile("big", "x").toldSize = int64_t{1} << 31;
   host.addDirectory("dir");
   host.addSpecial("fifo");
-  EXPECT_EQ(probeFile(host, "file").refusal(), 0);
-  EXPECT_EQ(probeFile(host, "big").refusal(), EOVERFLOW);
-  EXPECT_EQ(probeFile(host, "dir").refusal(), EISDIR);
-  EXPECT_EQ(probeFile(host, "fifo").refusal(), EINVAL);
-  EXPECT_EQ(probeFile(host, "gone").refusal(), ENOENT);
+  host.addFile("untold", "x").mode = 0;
+  EXPECT_EQ(probe(host, "file").refusal(), 0);
+  EXPECT_EQ(probe(host, "untold").refusal(), EINVAL);
+  EXPECT_EQ(probe(host, "big").refusal(), EOVERFLOW);
+  EXPECT_EQ(probe(host, "dir").refusal(), EISDIR);
+  EXPECT_EQ(probe(host, "fifo").refusal(), EINVAL);
+  EXPECT_EQ(probe(host, "gone").refusal(), ENOENT);
+}
+
+// What is read of it later is read of the file that was looked at.
+TEST(FileProbeTest, KeepsTheFileThatItHasLookedAt) {
+  MemoryHost host;
+  host.addFile("file", "old bytes");
+  const FileProbe old = probe(host, "file");
+  host.addFile("file", "new");
+  EXPECT_EQ(old.status.size, 9);
+  std::array<uint8_t, 9> bytes;
+  size_t done = 0;
+  EXPECT_EQ(old.file->readAt(bytes, 0, done), 0);
+  EXPECT_EQ(asString(bytes), "old bytes");
 }
 
 } // namespace arlib
