@@ -92,30 +92,34 @@ std::vector<std::string> ToolFolder::leaves() const {
   return names;
 }
 
+void ToolFolder::remove(const std::string& leaf) const {
+  fs::remove_all(m_Folder + "/" + leaf);
+}
+
 void ToolFolder::removeAllBut(const std::vector<std::string>& kept) const {
   for (const std::string& leaf : leaves()) {
     if (std::find(kept.begin(), kept.end(), leaf) == kept.end()) {
-      fs::remove_all(m_Folder + "/" + leaf);
+      remove(leaf);
     }
   }
 }
 
-void ToolFolder::enter() const {
+void ToolFolder::enter(const std::string& notes) const {
   alarm(LongestRun);
   if (chdir(m_Folder.c_str()) != 0) _exit(99);
   setenv("TMPDIR", m_Folder.c_str(), 1);
-  redirect(STDOUT_FILENO, m_Notes + "/out");
-  redirect(STDERR_FILENO, m_Notes + "/err");
+  redirect(STDOUT_FILENO, m_Notes + "/out" + notes);
+  redirect(STDERR_FILENO, m_Notes + "/err" + notes);
 }
 
-ToolRun ToolFolder::collect(int process) const {
+ToolRun ToolFolder::collect(int process, const std::string& notes) const {
   int state = 0;
   rusage usage = {};
   wait4(process, &state, 0, &usage);
   return {WIFEXITED(state) ? WEXITSTATUS(state) : -1,
           WIFSIGNALED(state) ? WTERMSIG(state) : 0,
-          readWhole(m_Notes + "/out"),
-          readWhole(m_Notes + "/err"),
+          readWhole(m_Notes + "/out" + notes),
+          readWhole(m_Notes + "/err" + notes),
           secondsOf(usage.ru_utime) + secondsOf(usage.ru_stime),
           static_cast<uint64_t>(usage.ru_maxrss) * 1024};
 }
@@ -140,6 +144,33 @@ ToolRun ToolFolder::runProgram(const std::vector<std::string>& words) const {
     startProgram(QUARN_PROGRAM, words);
   }
   return collect(process);
+}
+
+// They wait for the end of a pipe, which comes when all are there.
+std::vector<ToolRun>
+ToolFolder::runAtOnce(const std::vector<std::vector<std::string>>& runs) const {
+  std::fflush(nullptr);
+  int start[2];
+  if (pipe(start) != 0) return {};
+  std::vector<pid_t> processes;
+  for (size_t i = 0; i < runs.size(); ++i) {
+    const pid_t process = fork();
+    if (process == 0) {
+      enter(std::to_string(i));
+      close(start[1]);
+      char nothing = 0;
+      if (::read(start[0], &nothing, 1) != 0) _exit(97);
+      close(start[0]);
+      startProgram(QUARN_PROGRAM, runs[i]);
+    }
+    processes.push_back(process);
+  }
+  close(start[0]);
+  close(start[1]);
+  std::vector<ToolRun> results;
+  for (size_t i = 0; i < runs.size(); ++i)
+    results.push_back(collect(processes[i], std::to_string(i)));
+  return results;
 }
 
 ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,

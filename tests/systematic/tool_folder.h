@@ -38,6 +38,7 @@ public:
   [[nodiscard]] std::string read(const std::string& leaf) const;
   // Everything in the folder, sorted.
   [[nodiscard]] std::vector<std::string> leaves() const;
+  void remove(const std::string& leaf) const;
   void removeAllBut(const std::vector<std::string>& kept) const;
 
   // The words behind the tool's name. A run that takes long is ended.
@@ -45,14 +46,19 @@ public:
   // The same by the real program, as users start it.
   [[nodiscard]] ToolRun runProgram(const std::vector<std::string>& words) const;
 
+  // Several runs of the real program that start at the same moment. What each prints is its own.
+  [[nodiscard]] std::vector<ToolRun>
+  runAtOnce(const std::vector<std::vector<std::string>>& runs) const;
+
   // The same with a fault. `callCount` becomes the number of calls that were made; 0 if a signal
   // ended the process.
   [[nodiscard]] ToolRun runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
                                         uint64_t& callCount) const;
 
 private:
-  [[nodiscard]] ToolRun collect(int process) const;
-  void enter() const;
+  // `notes` tells apart what runs at the same time print.
+  [[nodiscard]] ToolRun collect(int process, const std::string& notes = "") const;
+  void enter(const std::string& notes = "") const;
 
   std::string m_Folder;
   std::string m_Notes; // beside the folder: what the runs print
