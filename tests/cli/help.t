@@ -64,13 +64,13 @@ All ways to it give the same.
 
 Only the tool's name in the examples changes with the name it is called by.
 
-  $ (exec -a /usr/bin/zqlibrarian.exe quarn) | grep librarian
-  librarian options archive [ file_list ]
-          librarian -r  mylib.a obj1 obj2 obj3...
-          librarian -x  mylib.a ?sort*
-          librarian -d  mylib.a hash.o
-          librarian -tv ansilib.a
-  $ (exec -a /usr/bin/zqlibrarian.exe quarn) | sed 's/librarian/quarn/' | cmp - help
+  $ (exec -a /usr/bin/zqbookkeeper.exe quarn) | grep bookkeeper
+  bookkeeper options archive [ file_list ]
+          bookkeeper -r  mylib.a obj1 obj2 obj3...
+          bookkeeper -x  mylib.a ?sort*
+          bookkeeper -d  mylib.a hash.o
+          bookkeeper -tv ansilib.a
+  $ (exec -a /usr/bin/zqbookkeeper.exe quarn) | sed 's/bookkeeper/quarn/' | cmp - help
   $ (exec -a '' quarn) > unnamed; echo $?; sed -n 9p unnamed
   0
    options archive [ file_list ]

@@ -163,7 +163,7 @@ variant() {
   shift
   for text; do symbols+=(--add-symbol "BuildAttributes\$$text=0,local"); done
   llvm-objcopy --keep-global-symbol=wide_gcd --redefine-sym wide_gcd=gcd --remove-section .ZEV.attributes \
-    --remove-section .ARM.attributes "${symbols[@]}" "$QUARN_EXAMPLES/wide_plain.o" "$file"
+    "${symbols[@]}" "$QUARN_EXAMPLES/wide_plain.o" "$file"
 }
 
 # published FILE: the names in the symbol table, as they stand in the file. The count and the offsets are in front.

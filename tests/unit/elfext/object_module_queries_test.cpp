@@ -157,10 +157,10 @@ TEST_F(AddressQueryTest, FindsTheLowestAddressNotBelow) {
 }
 
 TEST_F(AddressQueryTest, SeesTheInstructionSetMark) {
-  const Symbol* thumb = module.createHostedSymbol("thumb", 9, STT_FUNC, 1, 0, section);
+  const Symbol* marked = module.createHostedSymbol("marked", 9, STT_FUNC, 1, 0, section);
   EXPECT_FALSE(module.getSymbolsAtAddress(0x108, Symbol::Class_All, &found));
   EXPECT_TRUE(module.getSymbolsAtAddress(0x109, Symbol::Class_All, &found));
-  EXPECT_EQ(found[0], thumb);
+  EXPECT_EQ(found[0], marked);
 }
 
 TEST_F(AddressQueryTest, PutsSymbolsWithoutAPlaceAt0) {
