@@ -43,15 +43,15 @@ constexpr CatalogueRow Rows[] = {
                                    "\n"},
     {HelpWildcards,                "file_list ではワイルドカード '%c' と '*' を使用できます\n"
                                    "\n"},
-    {HelpEditOptions,              "オプション:-\n"
+    {HelpEditOptions,              "オプション:\n"
                                    "\n"
                                    " -r         <file_list> のファイルを挿入し、同名の既存メンバを置き換えます。\n"
                                    " -d         <file_list> のメンバを削除します。\n"
                                    " -x         <file_list> のメンバを抽出し、同名のファイルに保存します。\n"
                                    " -m         <file_list> のファイルを移動します。\n"
                                    " -p         ファイルを標準出力に出力します。\n"
-                                   " -a pos     <pos> という名前のファイルの後ろに挿入または移動します。\n"
-                                   " -b pos     <pos> という名前のファイルの前に挿入または移動します。\n"
+                                   " -a pos     ファイルを <pos> という名前のファイルの後ろに挿入または移動します。\n"
+                                   " -b pos     ファイルを <pos> という名前のファイルの前に挿入または移動します。\n"
                                    " -u         古いファイルだけを更新します。-r と共に使用します。\n"
                                    "\n"},
     {HelpOtherOptions,             " -n         オブジェクトアーカイブにシンボルテーブルを追加しません。\n"
@@ -70,7 +70,7 @@ constexpr CatalogueRow Rows[] = {
                                    "--vsn       Quarn の現在のバージョンを表示します。\n"
                                    "--help      このメッセージを表示します。\n"
                                    "\n"},
-    {HelpExamples,                 "例:-\n"
+    {HelpExamples,                 "例:\n"
                                    "\n"
                                    "        %s -r  mylib.a obj1 obj2 obj3...\n"
                                    "        %s -x  mylib.a %csort*\n"
@@ -99,7 +99,7 @@ constexpr CatalogueRow Rows[] = {
     {DeletingFile,                 "ファイル '%s' の削除に失敗しました : %s"},
     {OutputReadOnly,               "出力ファイル '%s' は読み取り専用です"},
     {NoMembersForCreate,           "--create にアーカイブメンバが指定されていません"},
-    {UnrecognizedOption,           "オプション '%s%s' は認識できません。"},
+    {UnrecognizedOption,           "オプション '%s%s' を認識できません。"},
     {MissingArgument,              "オプション '%s' の引数がありません。"},
     {RecursiveViaFile,             "via ファイルの再帰的な取り込みが、ファイル '%2$s' で深さ %1$d に達しました。"},
     {ArgumentNotPermitted,         "引数 '%s' はオプション '%s' では使用できません。"},

@@ -110,7 +110,7 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   1
   $ in_japanese --diag_error=0 --unknown <<'E'
   > Warning: L9962I: 不明な診断番号です: 0
-  > Fatal error: L3900U: オプション '--unknown' は認識できません。
+  > Fatal error: L3900U: オプション '--unknown' を認識できません。
   > E
   1
   $ in_japanese --message_locale=fr_FR -t lib.a <<'E'
@@ -167,15 +167,15 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   > 
   > file_list ではワイルドカード '?' と '*' を使用できます
   > 
-  > オプション:-
+  > オプション:
   > 
   >  -r         <file_list> のファイルを挿入し、同名の既存メンバを置き換えます。
   >  -d         <file_list> のメンバを削除します。
   >  -x         <file_list> のメンバを抽出し、同名のファイルに保存します。
   >  -m         <file_list> のファイルを移動します。
   >  -p         ファイルを標準出力に出力します。
-  >  -a pos     <pos> という名前のファイルの後ろに挿入または移動します。
-  >  -b pos     <pos> という名前のファイルの前に挿入または移動します。
+  >  -a pos     ファイルを <pos> という名前のファイルの後ろに挿入または移動します。
+  >  -b pos     ファイルを <pos> という名前のファイルの前に挿入または移動します。
   >  -u         古いファイルだけを更新します。-r と共に使用します。
   > 
   >  -n         オブジェクトアーカイブにシンボルテーブルを追加しません。
@@ -194,7 +194,7 @@ in_japanese ARGUMENT...: the status of a run, and how its output differs from wh
   > --vsn       Quarn の現在のバージョンを表示します。
   > --help      このメッセージを表示します。
   > 
-  > 例:-
+  > 例:
   > 
   >         quarn -r  mylib.a obj1 obj2 obj3...
   >         quarn -x  mylib.a ?sort*
