@@ -4,8 +4,8 @@
 // nothing of an object around it, and tells of each step. The section is walked up to three times:
 // for what holds of the file, of sections, and of symbols.
 //
-// A part whose length can't be right is told as corrupt and left out. Other bytes that run past
-// the end of their part stop the program.
+// A part whose length can't be right is told as corrupt and left out, and one of a kind that there
+// is not is told as skipped. Other bytes that run past the end of their part stop the program.
 #pragma once
 
 #include "elfext/interface/build_attributes_tags.h"

@@ -14,6 +14,9 @@ constexpr std::string_view ZevVendor = "ZEV";
 
 // What a run of attributes in a section holds for.
 enum AttributeScope : uint32_t { Tag_File = 1, Tag_Section = 2, Tag_Symbol = 3 };
+constexpr bool isAttributeScope(uint32_t kind) {
+  return kind >= Tag_File && kind <= Tag_Symbol;
+}
 
 enum QobixTag : uint32_t {
   Tag_CPU_raw_name = 4,

@@ -191,10 +191,16 @@ private:
       say(":\n");
       decode(part, vendor, static_cast<AttributeScope>(scope));
     } else {
-      m_HasLaterScope = m_HasLaterScope || scope > m_Pass;
-      say(" (skipped)\n");
+      skip(scope);
     }
     return true;
+  }
+
+  // Also a kind that there is not, which has been told by its line.
+  void skip(uint32_t scope) {
+    m_HasLaterScope = m_HasLaterScope || scope > m_Pass;
+    m_IsWellFormed = m_IsWellFormed && isAttributeScope(scope);
+    say(" (skipped)\n");
   }
 
   void decode(CheckedReader& part, std::string_view vendor, AttributeScope scope) {

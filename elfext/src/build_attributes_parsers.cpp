@@ -50,7 +50,7 @@ private:
   bool walkSubSubsection(AttributeBytes bytes, size_t& size) {
     size_t position = 0;
     uint32_t kind = 0;
-    if (!readUleb(bytes, position, kind) || kind < Tag_File || kind > Tag_Symbol) return false;
+    if (!readUleb(bytes, position, kind) || !isAttributeScope(kind)) return false;
     if (bytes.size() - position < LengthSize) return false;
     size = getWord<uint32_t>(bytes.data() + position, m_IsLittleEndian);
     position += LengthSize;

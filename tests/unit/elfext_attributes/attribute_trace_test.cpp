@@ -147,13 +147,25 @@ TEST_F(AttributeTraceTest, MakesOnlyThePassesThatItNeeds) {
   EXPECT_EQ(countPasses(m_Trace), 3u);
 }
 
-TEST_F(AttributeTraceTest, SkipsPartsOfOtherKindsInEveryPass) {
-  EXPECT_TRUE(trace("A" + subsection("qobix", part(6, "") + part('\x21', "") + part('\0', ""))));
+TEST_F(AttributeTraceTest, SkipsPartsOfOtherKindsInEveryPassAndAnswersFalse) {
+  EXPECT_FALSE(trace("A" + subsection("qobix", part(6, "") + part('\x21', "") + part('\0', ""))));
   EXPECT_EQ(countPasses(m_Trace), 3u);
   EXPECT_THAT(m_Trace, HasSubstr("    CPU_arch subsubsection (size 5 out of 15) (skipped)\n"));
   EXPECT_THAT(m_Trace, HasSubstr("    <tag:33> subsubsection (size 5 out of 10) (skipped)\n"));
   EXPECT_THAT(m_Trace, HasSubstr("    <tag:0> subsubsection (size 5 out of 5) (skipped)\n"));
   EXPECT_THAT(m_Table.runs, IsEmpty());
+}
+
+// A kind that there is not makes the section ill formed, and the parts behind it are read on.
+TEST_F(AttributeTraceTest, GoesOnBehindAKindThatThereIsNot) {
+  for (const char kind : {'\0', '\4', '\7'}) {
+    m_Table = {};
+    EXPECT_FALSE(trace("A" + subsection("qobix", part(kind, "") + part(1, "\x06\x0a")))) << +kind;
+    EXPECT_EQ(countPasses(m_Trace), kind == 0 ? 1u : 3u);
+    EXPECT_THAT(m_Trace, HasSubstr(" subsubsection (size 5 out of 12) (skipped)\n"
+                                   "    File subsubsection (size 7 out of 7):\n"));
+    EXPECT_THAT(m_Table.runs, SizeIs(1));
+  }
 }
 
 TEST_F(AttributeTraceTest, AddsToTheTableAndShowsItBefore) {
