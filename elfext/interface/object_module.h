@@ -127,7 +127,7 @@ public:
   // The file's bytes as long as the module needs them, where they are all in memory; null if not.
   [[nodiscard]] const uint8_t* getReadBuffer() const { return m_ReadBuffer; }
   void setReadBuffer(const uint8_t* readBuffer) { m_ReadBuffer = readBuffer; }
-  // While set, names that are handed in are kept as they are and not copied; they must live as
+  // While set, the names of what is made are kept as they are and not copied; they must live as
   // long as the module's contents.
   [[nodiscard]] bool areNamesInBuffer() const { return m_AreNamesInBuffer; }
   void setNamesInBuffer(bool areNamesInBuffer) { m_AreNamesInBuffer = areNamesInBuffer; }
@@ -142,6 +142,8 @@ public:
   [[nodiscard]] bool hasLostContents() const { return m_HasLostContents; }
   // The text, or a copy of it in the object region, as setNamesInBuffer says. Null stays null.
   [[nodiscard]] const char* keepText(const char* text) const;
+  // A copy of the text in the object region. Null stays null.
+  [[nodiscard]] const char* copyText(const char* text) const;
 
   // ---- Header fields, under the ELF standard's names
 

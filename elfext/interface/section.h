@@ -80,7 +80,7 @@ public:
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
   void setSegment(Segment* segment) { m_Segment = segment; }
 
-  // The text is kept as it is while the module keeps names so, else copied. Null clears it.
+  // The text is copied. Null clears it.
   void setName(const char* name);
   void setFlags(uint32_t flags);
   void addFlags(uint32_t flags);
@@ -102,6 +102,8 @@ public:
 
   // What the file says, as it stands: address, offset, entry size, info and alignment.
   void adoptHeader(const SectionHeader& header);
+  // Text that lives as long as the module's contents.
+  void adoptName(const char* name) { m_Name = name; }
   void adoptSize(uint64_t size) { m_Size = size; }
   void adoptLink(Section* link);
   void setAuxiliary(bool isAuxiliary) { m_IsAuxiliary = isAuxiliary; }

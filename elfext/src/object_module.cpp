@@ -83,18 +83,21 @@ void ObjectModule::forgetPlacement() {
 // ---- Names
 
 const char* ObjectModule::keepText(const char* text) const {
-  if (text == nullptr || m_AreNamesInBuffer) return text;
-  return alloclib::copyString(getObjectRegion(), text);
+  return m_AreNamesInBuffer ? text : copyText(text);
+}
+
+const char* ObjectModule::copyText(const char* text) const {
+  return text == nullptr ? nullptr : alloclib::copyString(getObjectRegion(), text);
 }
 
 void ObjectModule::setFileName(const char* name) {
   if (isSameText(name, m_FileName)) return;
   QUARN_ASSERT(1, !hasDeferredContents());
-  m_FileName = name == nullptr ? nullptr : alloclib::copyString(getObjectRegion(), name);
+  m_FileName = copyText(name);
 }
 
 void ObjectModule::setObjectName(const char* name) {
-  m_ObjectName = name == nullptr ? nullptr : alloclib::copyString(getObjectRegion(), name);
+  m_ObjectName = copyText(name);
 }
 
 void ObjectModule::setObjectName(const char* archiveName, const char* memberName) {

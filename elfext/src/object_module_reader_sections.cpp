@@ -208,7 +208,7 @@ bool readName(ReadContext& context, uint32_t index, const Section& table, const 
   if (offset >= table.getSize())
     return goOn(context.module, &ErrorHandler::sectionNameOutOfRange, index, offset,
                 table.getSize());
-  if (names != nullptr) context.module.getSection(index)->setName(names + offset);
+  if (names != nullptr) context.module.getSection(index)->adoptName(names + offset);
   return true;
 }
 

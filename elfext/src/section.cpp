@@ -35,7 +35,7 @@ void Section::markChanged() {
 void Section::setName(const char* name) {
   if (name == m_Name) return;
   if (name != nullptr && m_Name != nullptr && std::strcmp(name, m_Name) == 0) return;
-  m_Name = m_ObjectModule->keepText(name);
+  m_Name = m_ObjectModule->copyText(name);
   markChanged();
 }
 

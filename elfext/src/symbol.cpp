@@ -60,8 +60,7 @@ void Symbol::markChanged() {
 void Symbol::setName(const char* name) {
   if (name == m_Name) return;
   if (name != nullptr && m_Name != nullptr && std::strcmp(name, m_Name) == 0) return;
-  m_Name =
-      name == nullptr ? nullptr : alloclib::copyString(m_ObjectModule->getObjectRegion(), name);
+  m_Name = m_ObjectModule->copyText(name);
   markChanged();
 }
 

@@ -208,13 +208,17 @@ TEST_F(SectionTest, KeepsTheOldTextForAnEqualName) {
   EXPECT_FALSE(makesStale([&] { section->setName(".text"); }));
 }
 
-TEST_F(SectionTest, DoesNotCopyNamesThatAreInTheBuffer) {
-  const char names[] = "one\0two";
+TEST_F(SectionTest, CopiesItsNameUnlessItIsInTheBuffer) {
+  char name[] = "name";
   module.setNamesInBuffer(true);
-  Section* section = module.createSection(names, SHT_PROGBITS, 0);
-  EXPECT_EQ(section->getName(), names);
-  section->setName(names + 4);
-  EXPECT_EQ(section->getName(), names + 4);
+  Section* section = module.createSection(name, SHT_PROGBITS, 0);
+  EXPECT_EQ(section->getName(), name);
+  // A name that is set later is the client's, not the buffer's.
+  section->setName(name + 1);
+  EXPECT_NE(section->getName(), name + 1);
+  EXPECT_STREQ(section->getName(), "ame");
+  section->setName(nullptr);
+  EXPECT_EQ(section->getName(), nullptr);
 }
 
 TEST_F(SectionTest, AddsFlags) {

@@ -428,8 +428,10 @@ TEST_F(ReadElfFileTest, NamesThatAreGivenLaterAreCopiedAllTheSame) {
   ASSERT_TRUE(readBy(Way::Memory));
   std::string name = "later";
   m_Module->getSymbol(1)->setName(name.c_str());
+  m_Module->getSection(Text)->setName(name.c_str());
   name = "reused";
   EXPECT_STREQ(m_Module->getSymbol(1)->getName(), "later");
+  EXPECT_STREQ(m_Module->getSection(Text)->getName(), "later");
 }
 
 TEST_P(ReadElfFileInEachWayTest, StringsAreCopiesUnlessTheMemoryIsLent) {
