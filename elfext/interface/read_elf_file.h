@@ -3,7 +3,7 @@
 // Reads an ELF file into an object module. All forms return true on success; the module is then
 // filled, and what it held before is gone. On failure the module is empty, and what was wrong has
 // been told to its error handler, except that a handler which lets a foreign machine pass gets true
-// and the module as it was.
+// and the module as it was, or empty where the read has named it.
 //
 // A range that the file does not have fails the read, also where nobody would look at its end.
 //

@@ -8,6 +8,8 @@
 #include "elfext/interface/section.h"
 #include "elfext/src/object_module_reader.h"
 
+#include <string>
+
 namespace elfext {
 
 namespace {
@@ -18,6 +20,15 @@ constexpr uint64_t LargestEagerFile = 0x100000;
 void mustBeOpen(const support::FileHandle& file) {
   const support::FileHandle* elfFile = file.isOpen() ? &file : nullptr;
   QUARN_ASSERT(1, elfFile != NULL);
+}
+
+// Contents that stay in the file of an old name end with it. The new one, which may be a text of
+// the module's contents, is answered as the module has it.
+const char* nameModule(ObjectModule& module, const char* fileName) {
+  const std::string name = fileName;
+  module.clear();
+  module.setFileName(name.c_str());
+  return module.getFileName();
 }
 
 bool reportReadError(ObjectModule& module, support::HostError error) {
@@ -125,12 +136,10 @@ bool readWholeFile(support::Host& host, support::FileHandle file, const support:
 bool readElfFile(support::Host& host, const char* fileName, ObjectModule& module,
                  DeferredContentsSelector* selector) {
   QUARN_ASSERT(1, fileName != NULL);
-  module.clear();
-  module.setFileName(fileName);
   support::SourceFiles files(host);
   std::shared_ptr<support::SourceFile> file;
-  if (const support::HostError error = files.open(fileName, file); error != 0)
-    return reportReadError(module, error);
+  const support::HostError error = files.open(nameModule(module, fileName), file);
+  if (error != 0) return reportReadError(module, error);
   const auto size = static_cast<uint64_t>(file->getStatus().size);
   if (selector == nullptr || size <= LargestEagerFile)
     return readOwnFile(files, file, 0, size, module);
@@ -158,7 +167,7 @@ bool readElfFile(support::Host&, const char* fileName, std::span<const uint8_t> 
                  ObjectModule& module, DeferredContentsSelector*) {
   const uint8_t* readBuffer = bytes.data();
   QUARN_ASSERT(1, fileName != NULL && readBuffer != NULL);
-  module.setFileName(fileName);
+  nameModule(module, fileName);
   return readImage(module, std::make_unique<ImageBytes>(bytes), nullptr, readBuffer);
 }
 

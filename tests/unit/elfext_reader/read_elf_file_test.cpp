@@ -234,6 +234,41 @@ TEST_P(ReadElfFileInEachWayTest, TakesTheBytesThatAreThereForTheWholeObject) {
   EXPECT_THAT(m_Reports.m_Texts, ElementsAre(Truncated));
 }
 
+// The name of a module can't change while contents are in the file of the old one.
+TEST_P(ReadElfFileInEachWayTest, TakesThePlaceOfContentsThatAreStillInAFile) {
+  put(largeSample());
+  m_Host.addFile("before.o", m_Bytes);
+  for (const bool isNamed : {false, true}) {
+    const size_t handlesBefore = m_Host.openHandles();
+    ListedSelector selector({Text});
+    ASSERT_TRUE(isNamed ? readElfFile(m_Faulty, "before.o", *m_Module, &selector)
+                        : readElfFile(m_Faulty, open("before.o"), *m_Module, &selector));
+    ASSERT_TRUE(m_Module->hasDeferredContents());
+    put(sample());
+    ASSERT_TRUE(readBy(GetParam()));
+    EXPECT_THAT(m_Reports.m_Texts, IsEmpty());
+    EXPECT_EQ(textOf(*m_Module->getSection(Text)), "code");
+    EXPECT_EQ(m_Host.openHandles(), handlesBefore + (isOpenedByCaller(GetParam()) ? 1 : 0));
+  }
+}
+
+TEST_P(ReadElfFileInEachWayTest, MayBeGivenANameThatIsTheModulesOwn) {
+  if (isOpenedByCaller(GetParam())) return;
+  ObjectBuilder file = sample();
+  file.section("a.o", SHT_PROGBITS);
+  file.section("lib.a", SHT_PROGBITS);
+  put(file);
+  ASSERT_TRUE(readBy(GetParam()));
+  const char* name = m_Module->getSection(GetParam() == Way::PartOfFile ? 7 : 6)->getName();
+  if (GetParam() == Way::WholeFile)
+    EXPECT_TRUE(readElfFile(m_Faulty, name, *m_Module, nullptr));
+  else if (GetParam() == Way::PartOfFile)
+    EXPECT_TRUE(readElfFile(m_Faulty, name, 2, m_Bytes.size(), *m_Module, nullptr));
+  else
+    EXPECT_TRUE(readElfFile(m_Faulty, name, lentBytes(), *m_Module, nullptr));
+  EXPECT_STREQ(m_Module->getFileName(), GetParam() == Way::PartOfFile ? nullptr : "a.o");
+}
+
 TEST_P(ReadElfFileInEachWayTest, MaySkipABadMachineAndHoldsNothingThen) {
   put(largeSample().machine(3));
   RecordingReports agreeing(true);
