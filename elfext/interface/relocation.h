@@ -8,6 +8,7 @@
 
 namespace elfext {
 
+class RelocationSection;
 class Section;
 class Symbol;
 
@@ -37,11 +38,15 @@ public:
 
   // The section that the relocation applies to.
   [[nodiscard]] Section* getSection() const { return m_Section; }
+  // The relocation section that it was read from; null if it was made since, or when that section
+  // is deleted.
+  [[nodiscard]] const RelocationSection* getOrigin() const { return m_Origin; }
   [[nodiscard]] Symbol* getTarget() const { return m_Target; }
   // Which table the relocation belongs to follows the target, if there is one.
   void setTarget(Symbol* target);
 
 private:
+  friend class Pruner;
   friend class Section;
 
   void markChanged();
@@ -50,6 +55,7 @@ private:
   int64_t m_Addend = 0;
   Section* m_Section;
   Symbol* m_Target = nullptr;
+  const RelocationSection* m_Origin = nullptr;
   uint16_t m_Type;
   bool m_IsDynamic = false;
   bool m_HasAddend = false;

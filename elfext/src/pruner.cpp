@@ -108,6 +108,9 @@ void Pruner::sweepRelocations() {
   for (Section* section : m_ObjectModule.m_Sections) {
     if (section->m_Goes) continue;
     section->materializeRelocations();
+    for (Relocation* relocation : section->m_Relocations.span())
+      if (relocation->m_Origin != nullptr && relocation->m_Origin->m_Goes)
+        relocation->m_Origin = nullptr;
     if (!m_SymbolsGo || section->m_Relocations.isEmpty()) continue;
     section->m_Relocations.removeIf([](const Relocation* relocation) {
       return relocation->getTarget() != nullptr && relocation->getTarget()->m_Goes;

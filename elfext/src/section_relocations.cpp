@@ -58,8 +58,12 @@ void Section::materializeRelocations() {
   const bool isRelocatable = std::exchange(m_IsRelocatable, true);
   const bool areFrozen = std::exchange(m_ObjectModule->m_IndexesFrozen, false);
   const bool areUpToDate = m_ObjectModule->areAuxiliarySectionsUpToDate();
-  for (RelocationSection* section : sections)
+  for (RelocationSection* section : sections) {
+    const uint32_t first = m_Relocations.getSize();
     section->takeRows()->appendTo(*this);
+    for (Relocation* relocation : m_Relocations.span().subspan(first))
+      relocation->m_Origin = section;
+  }
   m_IsRelocatable = isRelocatable;
   m_ObjectModule->m_IndexesFrozen = areFrozen;
   m_ObjectModule->setAuxiliarySectionsUpToDate(areUpToDate);

@@ -10,6 +10,11 @@
 #include "elfext/interface/group.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/src/go_on.h"
+#include "elfext/src/relocation_places.h"
+
+#include <algorithm>
+#include <unordered_map>
+#include <vector>
 
 namespace elfext {
 
@@ -161,35 +166,53 @@ bool leavesGroup(const Relocation& relocation) {
   return group != nullptr && group != relocation.getSection()->getGroup();
 }
 
-// The section that the file has the relocations in; 0 for relocations that no file had.
-uint32_t relocationSectionOf(const Section& section) {
-  const auto sections = section.getStaticRelocationSections();
-  return sections.empty() ? 0 : sections.front()->getIndex();
-}
-
-bool validateGroupsOfRelocations(const ObjectModule& module) {
-  for (Section* section : module.getSections()) {
-    for (uint32_t i = 0; i < section->getRelocationCount(); ++i) {
-      const Relocation* relocation = section->getRelocation(i);
-      if (!leavesGroup(*relocation)) continue;
-      const uint32_t home = relocation->getTarget()->getHostedSymbolSection()->getIndex();
-      if (!goOn(module, &ErrorHandler::relocationLeavesGroup, i, relocationSectionOf(*section),
-                home, section->getIndex()))
-        return false;
-    }
+// Relocations in no section are told with section 0.
+bool validateGroupsOfRelocations(const ObjectModule& module, Section& target) {
+  const std::vector<RelocationPlace> places = findRelocationPlaces(target);
+  for (uint32_t i = 0; i < places.size(); ++i) {
+    const Relocation& relocation = *target.getRelocation(i);
+    if (!leavesGroup(relocation)) continue;
+    const RelocationSection* section = places[i].section;
+    if (!goOn(module, &ErrorHandler::relocationLeavesGroup, places[i].row,
+              section == nullptr ? 0 : section->getIndex(),
+              relocation.getTarget()->getHostedSymbolSection()->getIndex(), target.getIndex()))
+      return false;
   }
   return true;
 }
 
+bool validateGroupsOfRelocations(const ObjectModule& module) {
+  for (Section* section : module.getSections()) {
+    if (!validateGroupsOfRelocations(module, *section)) return false;
+  }
+  return true;
+}
+
+using RowCounts = std::unordered_map<const RelocationSection*, uint32_t>;
+
+RowCounts countRowsThatAreNotAllowed(const ObjectModule& module) {
+  RowCounts counts;
+  for (Section* section : module.getSections()) {
+    if (section->isRelocatable()) continue;
+    for (const RelocationPlace& place : findRelocationPlaces(*section))
+      ++counts[place.section];
+  }
+  return counts;
+}
+
 bool validateRelocationTargets(const ObjectModule& module) {
+  RowCounts rowCounts = countRowsThatAreNotAllowed(module);
   for (const Section* section : module.getSections()) {
     const RelocationSection* relocations = section->asRelocationSection();
-    if (relocations == nullptr || relocations->getTarget() == nullptr) continue;
-    const Section& target = *relocations->getTarget();
-    if (target.isRelocatable() || target.getRelocationCount() == 0) continue;
-    if (!goOn(module, &ErrorHandler::relocationNotAllowed, 0, section->getIndex(),
-              target.getIndex()))
-      return false;
+    const Section* target = relocations == nullptr ? nullptr : relocations->getTarget();
+    if (target == nullptr || target->isRelocatable()) continue;
+    // Row 0 of a section without rows stands for the section.
+    const uint32_t rowCount = std::max(rowCounts[relocations], 1U);
+    for (uint32_t row = 0; row < rowCount; ++row) {
+      if (!goOn(module, &ErrorHandler::relocationNotAllowed, row, section->getIndex(),
+                target->getIndex()))
+        return false;
+    }
   }
   return true;
 }

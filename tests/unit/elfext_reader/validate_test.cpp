@@ -275,7 +275,8 @@ TEST_F(ValidateTest, OnlyItsGroupRefersToALocalSymbolOfAGroup) {
       8, 2, m_Module.createHostedDynamicSymbol("d", 0, 0, STB_LOCAL, STV_DEFAULT, m_Text));
   expectGood(m_Module);
   debug->addRelocation(12, 2, local);
-  const std::string text = "Relocation #3 in section #4 references a local symbol in section #1 "
+  // The one to a dynamic symbol is in no section; so this is the third row.
+  const std::string text = "Relocation #2 in section #4 references a local symbol in section #1 "
                            "which is not in the same group as its target section #3";
   expectReport(m_Module, text);
   local->setBinding(STB_GLOBAL);
@@ -295,17 +296,43 @@ TEST_F(ValidateTest, ALocalSymbolOfAGroupIsNoneOfAnotherGroup) {
                          "which is not in the same group as its target section #2");
 }
 
+TEST_F(ValidateTest, ARelocationInNoSectionIsNamedByItsPlaceAmongThoseOfItsTarget) {
+  Section* data = m_Module.createSection(".data", SHT_PROGBITS, SHF_ALLOC);
+  m_Module.createRelocationSection(".rel", SHT_REL, 0)->setTarget(data, false);
+  makeGroup({m_Text});
+  Symbol* local = makeLocal(m_Text);
+  addRelocation(data, 0, false);
+  data->addRelocation(4, 2, local, 8);
+  data->addRelocation(8, 2, local);
+  const std::string end = " references a local symbol in section #1 which is not in the same group "
+                          "as its target section #2";
+  EXPECT_THAT(validateWith(m_Module, true), ElementsAre("Relocation #1 in section #0" + end,
+                                                        "Relocation #1 in section #3" + end));
+}
+
 TEST_F(ValidateTest, SomeSectionsAreNotRelocated) {
   Section* note = m_Module.createSection(".note", SHT_NOTE, 0);
   RelocationSection* relocations = m_Module.createRelocationSection(".rel", SHT_REL, 0);
   relocations->setTarget(note, false);
   m_Module.createRelocationSection(".rel", SHT_REL, 0);
   note->setRelocatable(true);
+  expectGood(m_Module);
+  note->setRelocatable(false);
+  const std::string end =
+      " in section #3 has target section #2 which should not be relocated at all";
+  // Of a section without relocations, the first row stands for all of it.
+  expectReport(m_Module, "Relocation #0" + end);
+  note->setRelocatable(true);
   addRelocation(note, 0, false);
   expectGood(m_Module);
   note->setRelocatable(false);
-  expectReport(m_Module, "Relocation #0 in section #3 has target section #2 which should not be "
-                         "relocated at all");
+  expectReport(m_Module, "Relocation #0" + end);
+  note->setRelocatable(true);
+  addRelocation(note, 4, false);
+  addRelocation(note, 4, true);
+  note->setRelocatable(false);
+  EXPECT_THAT(validateWith(m_Module, true),
+              ElementsAre("Relocation #0" + end, "Relocation #1" + end));
 }
 
 TEST_F(ValidateTest, ASectionSymbolHasASection) {
@@ -408,6 +435,107 @@ TEST_F(ValidateTest, ChecksHaveAnOrderAndEndAtARefusal) {
         handler.m_Texts,
         testing::ElementsAreArray(inOrder.begin(), inOrder.begin() + static_cast<ptrdiff_t>(told)));
   }
+}
+
+// ---- What says where a relocation stands in its file
+
+// Sections 1 to 4: .text in a group, a note, symbols and their strings. Symbol 1 is for the group
+// alone.
+class ValidateRelocationsTest : public ReaderTest {
+protected:
+  ValidateRelocationsTest() {
+    m_File.section(".text", SHT_PROGBITS).flags(CodeFlags | SHF_GROUP).zeros(16);
+    m_File.section(".note", SHT_NOTE).zeros(16);
+    m_File.section(".symtab", SHT_SYMTAB).link(4).symbol({.name = "x", .section = 1, .binding = 0});
+    m_File.section(".strtab", SHT_STRTAB);
+    m_File.section(".group", SHT_GROUP).link(3).info(1).word(GRP_COMDAT).word(1);
+    m_File.section(".data", SHT_PROGBITS).zeros(16);
+  }
+  static constexpr uint32_t Note = 2;
+  static constexpr uint32_t Data = 6;
+
+  // The next section; each of its rows refers to symbol 1 or to none.
+  void relocationSection(uint32_t target, const std::vector<uint32_t>& symbols,
+                         uint32_t type = SHT_REL) {
+    SectionBuilder& section = m_File.section(".rel", type).link(3).info(target);
+    for (const uint32_t symbol : symbols)
+      section.relocation({.symbol = symbol});
+  }
+
+  static std::string leaves(uint32_t row, uint32_t section) {
+    return "Relocation #" + std::to_string(row) + " in section #" + std::to_string(section) +
+           " references a local symbol in section #1 which is not in the same group as its target "
+           "section #6";
+  }
+  static std::string isNotAllowed(uint32_t row, uint32_t section, uint32_t target = Note) {
+    return "Relocation #" + std::to_string(row) + " in section #" + std::to_string(section) +
+           " has target section #" + std::to_string(target) +
+           " which should not be relocated at all";
+  }
+
+  ObjectBuilder m_File = object();
+};
+
+TEST_F(ValidateRelocationsTest, EachIsNamedByItsOwnSectionAndRow) {
+  relocationSection(Data, {0, 1});
+  relocationSection(Data, {1, 0, 1});
+  relocationSection(Data, {0, 0, 1}, SHT_RELA);
+  relocationSection(Data, {1}, SHT_RELA);
+  const ReadResult result = readGood(m_File);
+  EXPECT_THAT(validateWith(*result.module, false), ElementsAre(leaves(1, 7)));
+  EXPECT_THAT(validateWith(*result.module, true),
+              ElementsAre(leaves(1, 7), leaves(0, 8), leaves(2, 8), leaves(2, 9), leaves(0, 10)));
+}
+
+TEST_F(ValidateRelocationsTest, ItsRowMovesWithThoseInFrontOfIt) {
+  relocationSection(Data, {0, 1});
+  relocationSection(Data, {0, 1});
+  const ReadResult result = readGood(m_File);
+  Section* data = result.section(Data);
+  data->removeRelocation(data->getRelocation(0));
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(0, 7), leaves(1, 8)));
+  data->setRelocationIndex(data->getRelocation(2), 0);
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(0, 8), leaves(0, 7)));
+  data->addRelocation(0, 2, result.symbol(1));
+  EXPECT_THAT(validateWith(*result.module, true),
+              ElementsAre(leaves(0, 8), leaves(0, 7), leaves(1, 7)));
+}
+
+TEST_F(ValidateRelocationsTest, ItIsInASectionOfItsKind) {
+  relocationSection(Data, {0, 1});
+  relocationSection(Data, {0, 1});
+  relocationSection(Data, {0}, SHT_RELA);
+  const ReadResult result = readGood(m_File);
+  result.section(Data)->getRelocation(1)->setAddend(4);
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(0, 9), leaves(1, 8)));
+  result.section(Data)->getRelocation(1)->clearAddend();
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(1, 7), leaves(1, 8)));
+  result.module->deleteSection(result.section(7));
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(1, 7), leaves(3, 7)));
+  auto* other = static_cast<RelocationSection*>(result.section(7));
+  other->setTarget(result.section(1), false);
+  EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(1, 0), leaves(3, 0)));
+}
+
+TEST_F(ValidateRelocationsTest, EachRowOfASectionThatIsNotRelocatedIsTold) {
+  relocationSection(Note, {});
+  relocationSection(Note, {0, 0});
+  relocationSection(Data, {0});
+  relocationSection(Note, {0}, SHT_RELA);
+  relocationSection(3, {});
+  const ReadResult result = readGood(m_File);
+  result.module->setReadConditions(ReadCondition_HasRelocationInAuxiliarySection);
+  const std::vector<std::string> inOrder = {isNotAllowed(0, 7), isNotAllowed(0, 8),
+                                            isNotAllowed(1, 8), isNotAllowed(0, 10),
+                                            isNotAllowed(0, 11, 3)};
+  EXPECT_EQ(validateWith(*result.module, true), inOrder);
+  for (size_t refused = 0; refused < inOrder.size(); ++refused) {
+    RefusingOne handler(refused);
+    result.module->setErrorHandler(&handler);
+    EXPECT_FALSE(result.module->validate());
+    EXPECT_EQ(handler.m_Texts.size(), refused + 1);
+  }
+  result.module->setErrorHandler(nullptr);
 }
 
 // ---- What counts in files whose addresses are laid out
