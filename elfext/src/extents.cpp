@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/src/extents.h"
 
+#include "elfext/src/first_holders.h"
+
 #include <algorithm>
-#include <numeric>
 
 namespace elfext {
 
@@ -34,35 +35,6 @@ size_t countBelow(const std::vector<uint64_t>& sorted, uint64_t limit) {
   return static_cast<size_t>(std::lower_bound(sorted.begin(), sorted.end(), limit) -
                              sorted.begin());
 }
-
-// The lowest value of those with a key not below a limit, over keys that are known beforehand.
-class LowestFrom {
-public:
-  explicit LowestFrom(std::vector<uint64_t> sortedKeys)
-      : m_Keys(std::move(sortedKeys)), m_Lowest(m_Keys.size() + 1, NoExtent) {}
-
-  void add(uint64_t key, uint32_t value) {
-    for (size_t i = rankFromTop(key); i < m_Lowest.size(); i += i & (0 - i))
-      m_Lowest[i] = std::min(m_Lowest[i], value);
-  }
-
-  [[nodiscard]] uint32_t find(uint64_t limit) const {
-    uint32_t lowest = NoExtent;
-    for (size_t i = rankFromTop(limit); i > 0; i -= i & (0 - i))
-      lowest = std::min(lowest, m_Lowest[i]);
-    return lowest;
-  }
-
-private:
-  // How many keys are not below this one.
-  [[nodiscard]] size_t rankFromTop(uint64_t key) const {
-    return m_Keys.size() - countBelow(m_Keys, key);
-  }
-
-  std::vector<uint64_t> m_Keys;
-  // A binary indexed tree: element i has the lowest of the i & -i keys that end at rank i.
-  std::vector<uint32_t> m_Lowest;
-};
 
 std::vector<uint64_t> sortedEnds(std::span<const Extent> extents) {
   std::vector<uint64_t> ends;
@@ -97,27 +69,17 @@ std::optional<std::pair<uint32_t, uint32_t>> findFirstOverlap(std::span<const Ex
   return std::pair(first->id, second->id);
 }
 
-// Both sides in the order of their starts: when an inner extent's turn comes, the outer ones that
-// start at or before it are known, and only the ends are left to compare.
 std::vector<uint32_t> findFirstHolders(std::span<const Extent> outer,
                                        std::span<const Extent> inner) {
-  std::vector<uint32_t> holders(inner.size(), NoExtent);
-  const std::vector<Extent> outerSorted = sortedByStart(outer);
-  LowestFrom lowest(sortedEnds(outer));
-  std::vector<uint32_t> order(inner.size());
-  std::iota(order.begin(), order.end(), 0);
-  const auto comesFirst = [&](uint32_t left, uint32_t right) {
-    return inner[left].start != inner[right].start ? inner[left].start < inner[right].start
-                                                   : left < right;
-  };
-  std::sort(order.begin(), order.end(), comesFirst);
-  auto next = outerSorted.begin();
-  for (const uint32_t i : order) {
-    for (; next != outerSorted.end() && next->start <= inner[i].start; ++next)
-      lowest.add(next->end, next->id);
-    holders[i] = lowest.find(inner[i].end);
-  }
-  return holders;
+  std::vector<Holder> holders;
+  holders.reserve(outer.size());
+  for (const Extent& extent : outer)
+    holders.push_back({.start = extent.start, .size = extent.end - extent.start, .id = extent.id});
+  std::vector<Guest> guests;
+  guests.reserve(inner.size());
+  for (const Extent& extent : inner)
+    guests.push_back({.start = extent.start, .size = extent.end - extent.start});
+  return findFirstHolders(holders, guests);
 }
 
 } // namespace elfext

@@ -10,6 +10,7 @@
 #include "elfext/interface/sort.h"
 #include "elfext/src/extents.h"
 #include "elfext/src/object_module_reader.h"
+#include "elfext/src/segment_finder.h"
 
 #include <algorithm>
 #include <set>
@@ -106,93 +107,16 @@ void tieOverlappingRegions(std::vector<Region> regions) {
   }
 }
 
-// Whether a section without bytes is placed by where its segment lies, or else by where it ends.
-bool takesRangeTest(const ReadContext& context, uint32_t segmentType) {
-  switch (segmentType) {
-  case PT_LOAD:
-  case PT_NOTE:
-  case PT_PHDR:
-  case PT_TLS:
-  case PT_ZEV_EXIDX:
-    return true;
-  case PT_DYNAMIC:
-  case PT_INTERP:
-    return context.module.getOsAbi() != ELFOSABI_ZEV;
-  default:
-    return false;
-  }
-}
-
-// Finds the segments of sections without bytes in the file. Each section has to be held against
-// each segment, and both may be many, so what counts of the segments stands close together.
-class SegmentFinder {
-public:
-  explicit SegmentFinder(const ReadContext& context) {
-    for (uint32_t i = 0; i < context.segmentCount(); ++i) {
-      const ProgramHeader& header = context.programHeaders[i];
-      const Place place = {header.offset, header.filesz, header.vaddr, header.memsz, i};
-      (takesRangeTest(context, header.type) ? m_RangePlaces : m_EndPlaces).push_back(place);
-    }
-  }
-
-  // NoExtent for a section of no segment.
-  [[nodiscard]] uint32_t find(const SectionHeader& section) const {
-    for (const Place& place : m_EndPlaces) {
-      if (isAtEnd(section, place)) return place.segment;
-    }
-    uint32_t candidate = NoExtent;
-    for (const Place& place : m_RangePlaces) {
-      if (!isInFileRange(section, place)) continue;
-      if (isInMemoryRange(section, place)) return place.segment;
-      if (candidate == NoExtent) candidate = place.segment;
-    }
-    return candidate;
-  }
-
-private:
-  struct Place {
-    uint64_t offset;
-    uint64_t filesz;
-    uint64_t vaddr;
-    uint64_t memsz;
-    uint32_t segment;
-  };
-
-  static bool isInFileRange(const SectionHeader& section, const Place& place) {
-    return section.offset >= place.offset && section.offset - place.offset <= place.filesz &&
-           section.size <= place.memsz;
-  }
-
-  static bool isInMemoryRange(const SectionHeader& section, const Place& place) {
-    return section.addr >= place.vaddr && section.addr - place.vaddr <= place.memsz &&
-           section.size <= place.memsz - (section.addr - place.vaddr);
-  }
-
-  static bool isAtEnd(const SectionHeader& section, const Place& place) {
-    return section.offset >= place.offset && section.offset - place.offset == place.filesz &&
-           place.memsz >= place.filesz && section.size <= place.memsz - place.filesz;
-  }
-
-  std::vector<Place> m_RangePlaces;
-  // Of segments that hold such sections only behind their bytes; they come first.
-  std::vector<Place> m_EndPlaces;
-};
-
-bool needsSegment(const SectionHeader& header) {
-  return header.type != SHT_NULL && !hasFileBytes(header);
-}
-
 void tieSectionsWithoutBytes(ReadContext& context) {
   if (context.programHeaders.empty()) return;
-  const SegmentFinder finder(context);
+  const std::vector<uint32_t> segments =
+      findSegments(context.sectionHeaders, context.programHeaders, context.module.getOsAbi());
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
-    const SectionHeader& header = context.sectionHeaders[i];
-    if (!needsSegment(header)) continue;
-    const uint32_t segment = finder.find(header);
-    if (segment == NoExtent) continue;
-    [[maybe_unused]] const bool ret =
-        FileRegion::link(*context.module.getSegment(segment), *context.module.getSection(i),
-                         header.offset - context.programHeaders[segment].offset);
+    if (segments[i] == NoExtent) continue;
+    const uint64_t distance =
+        context.sectionHeaders[i].offset - context.programHeaders[segments[i]].offset;
+    [[maybe_unused]] const bool ret = FileRegion::link(*context.module.getSegment(segments[i]),
+                                                       *context.module.getSection(i), distance);
     QUARN_ASSERT(1, ret);
   }
 }

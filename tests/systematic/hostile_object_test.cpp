@@ -271,18 +271,44 @@ std::string versions() {
 
 // ---- Segments and notes
 
-std::string segmentsAndEmptySections(uint32_t segmentType) {
+// As many as there can be.
+constexpr uint32_t MostSegments = 65534;
+constexpr uint32_t MostSections = 65000;
+
+std::string segmentsAndEmptySections(uint32_t segmentType, uint64_t memorySize) {
   ObjectBuilder file = object().type(ET_EXEC);
-  for (uint32_t i = 0; i < 16000; ++i)
-    file.segment({.type = segmentType, .offset = 52, .memsz = 4});
-  for (uint32_t i = 0; i < 14000; ++i)
+  for (uint32_t i = 0; i < MostSegments; ++i)
+    file.segment({.type = segmentType, .offset = 52, .memsz = memorySize});
+  for (uint32_t i = 1; i < MostSections; ++i)
     file.section("", SHT_NOBITS).flags(SHF_ALLOC).offset(52).address(1).size(4);
   return file.bytes();
 }
 
-template <uint32_t SegmentType>
+// All begin and end elsewhere, in the file and in memory; their bytes are those of their headers.
+std::string staggeredSegmentsAndEmptySections() {
+  constexpr uint64_t range = uint64_t{32} * MostSegments;
+  const auto scatter = [](uint64_t number) { return number * 2654435761 % range; };
+  ObjectBuilder file = object().type(ET_EXEC);
+  for (uint32_t i = 0; i < MostSegments; ++i) {
+    const uint64_t offset = scatter(i);
+    const uint64_t address = scatter(i + MostSegments);
+    file.segment({.offset = 52 + offset,
+                  .vaddr = address,
+                  .filesz = scatter(i + 2 * MostSegments) % (range - offset),
+                  .memsz = scatter(i + 3 * MostSegments) % 4096});
+  }
+  for (uint32_t i = 1; i < MostSections; ++i)
+    file.section("", SHT_NOBITS)
+        .flags(SHF_ALLOC)
+        .offset(52 + scatter(i + 5))
+        .address(scatter(i + 7))
+        .size(i % 4096);
+  return file.bytes();
+}
+
+template <uint32_t SegmentType, uint64_t MemorySize>
 std::string segmentsTimesSections() {
-  return segmentsAndEmptySections(SegmentType);
+  return segmentsAndEmptySections(SegmentType, MemorySize);
 }
 
 std::string segmentsOverOneAnother() {
@@ -398,8 +424,9 @@ const Hostile Hostiles[] = {
   {"PreemptionMaps",              preemptionMaps,                                  ""},
   {"DynamicSections",             manyDynamicSections,                             ""},
   {"Versions",                    versions,                                        ""},
-  {"LoadsTimesSections",          segmentsTimesSections<PT_LOAD>,                  ""},
-  {"SegmentsTimesSections",       segmentsTimesSections<PT_NULL>,                  ""},
+  {"LoadsTimesSections",          segmentsTimesSections<PT_LOAD, 4>,               ""},
+  {"SegmentsTimesSections",       segmentsTimesSections<PT_NULL, 3>,               ""},
+  {"StaggeredLoadsTimesSections", staggeredSegmentsAndEmptySections,               ""},
   {"SegmentsOverOneAnother",      segmentsOverOneAnother,                          ""},
   {"NotesOfNoSections",           notesOfNoSections,                               ""},
   {"DebugOverlays",               debugOverlays,                                   ""},
