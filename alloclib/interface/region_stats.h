@@ -39,7 +39,6 @@ public:
   [[nodiscard]] uint64_t getMaximumSize() const { return m_MaximumSize; }
   [[nodiscard]] uint64_t getAllocations() const { return m_Allocations; }
   [[nodiscard]] uint64_t getFrees() const { return m_Frees; }
-  [[nodiscard]] uint64_t getUses() const { return m_Uses; }
   [[nodiscard]] bool isAccurate() const { return m_Accurate; }
 
   // Above what number of finished records of one name they are merged: the limit minus 10 if it

@@ -13,7 +13,6 @@ public:
     return uint64_t{m_EntrySize} * m_EntryCount;
   }
   [[nodiscard]] uint32_t getEntrySize() const { return m_EntrySize; }
-  [[nodiscard]] uint64_t getEntryCount() const { return m_EntryCount; }
   void setEntrySize(uint32_t size) { m_EntrySize = size; }
   void setEntryCount(uint64_t count) { m_EntryCount = count; }
 

@@ -10,9 +10,7 @@
 #include "elfext/interface/hash_functions.h"
 #include "elfext/interface/storage.h"
 
-#include <algorithm>
 #include <cstdint>
-#include <limits>
 #include <memory>
 #include <new>
 #include <type_traits>
@@ -45,14 +43,6 @@ public:
       return true;
     }
     return false;
-  }
-
-  // Makes at once the buckets that so many entries want; never fewer than there are.
-  void reserveEntries(uint32_t count) {
-    const uint64_t wanted = uint64_t{count} * 4 / 3 + 1;
-    const uint64_t largest = std::numeric_limits<uint32_t>::max();
-    const auto buckets = static_cast<uint32_t>(std::min(wanted, largest));
-    if (buckets > m_HashTableSize) rehash(buckets);
   }
 
 protected:

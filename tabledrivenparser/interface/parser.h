@@ -83,8 +83,7 @@ public:
   uint64_t addressValue(uint32_t id) const;     // both widths
   const char* textValue(uint32_t id) const;     // may be null
   const StrList* textsValue(uint32_t id) const; // STRING_VECTOR, VIA_FILE; null for an empty one
-  const IntegerList* integersValue(uint32_t id) const;         // null for an empty one
-  const LongIntegerList* longIntegersValue(uint32_t id) const; // null for an empty one
+  const IntegerList* integersValue(uint32_t id) const; // null for an empty one
 
   // The rest serves handlers, listeners and the parser's own rooms.
 

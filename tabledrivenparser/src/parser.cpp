@@ -225,10 +225,6 @@ const IntegerList* Parser::integersValue(uint32_t id) const {
   return recordOfType(id, Type_IntVector).value.integers;
 }
 
-const LongIntegerList* Parser::longIntegersValue(uint32_t id) const {
-  return recordOfType(id, Type_Int64Vector).value.longIntegers;
-}
-
 void Parser::report(ReportLevel level, OptionMessage message,
                     std::initializer_list<OptionMessageArgument> arguments) {
   if (m_Failed) return;

@@ -150,18 +150,6 @@ TYPED_TEST(HashTableTest, RemovesAKey) {
   EXPECT_THAT(this->exportSorted(), ElementsAre(Pair(1u, 1), Pair(35u, 1)));
 }
 
-TYPED_TEST(HashTableTest, MakesBucketsForManyAtOnce) {
-  this->putUpTo(5);
-  this->m_Table.reserveEntries(1000);
-  const uint32_t buckets = this->m_Table.getBucketCount();
-  EXPECT_GE(buckets, 1334u);
-  this->putUpTo(1000);
-  EXPECT_EQ(this->m_Table.getBucketCount(), buckets);
-  this->m_Table.reserveEntries(1);
-  EXPECT_EQ(this->m_Table.getBucketCount(), buckets);
-  EXPECT_EQ(this->m_Table.get(999), 999);
-}
-
 #ifndef QUARN_SHAKE_ORDER
 TYPED_TEST(HashTableTest, ExportsByBucketsAndTheNewestOfEachFirst) {
   for (uint32_t key : {20u, 0u, 17u, 3u, 34u})
