@@ -11,12 +11,12 @@ namespace messages {
 
 namespace {
 
-struct Catalogue {
+struct NamedCatalogue {
   std::string_view name;
-  std::span<const CatalogueRow> (*rows)();
+  const BuiltInCatalogue& (*catalogue)();
 };
 
-constexpr Catalogue Catalogues[CatalogueCount] = {
+constexpr NamedCatalogue Catalogues[CatalogueCount] = {
     {"en_US", englishCatalogue},
     {"ja_JP", japaneseCatalogue},
 };
@@ -47,6 +47,12 @@ const CatalogueRow* findRow(std::span<const CatalogueRow> rows, Key key) {
   return row != rows.end() && row->key == key ? &*row : nullptr;
 }
 
+std::span<const FormatPiece> piecesOf(const BuiltInCatalogue& catalogue, const CatalogueRow& row) {
+  const auto index = static_cast<size_t>(&row - catalogue.rows.data());
+  const size_t start = index == 0 ? 0 : catalogue.ends[index - 1];
+  return catalogue.pieces.subspan(start, catalogue.ends[index] - start);
+}
+
 std::string_view notFoundText(Key key) {
   static char text[64];
   const KeyText keyText(key);
@@ -66,13 +72,19 @@ const Row* findByName(std::span<const Row> rows, std::string_view name) {
 } // namespace
 
 std::span<const CatalogueRow> catalogueRows(uint32_t index) {
-  return Catalogues[index].rows();
+  return Catalogues[index].catalogue().rows;
+}
+
+MessageFormat messageFormat(Key key) {
+  if (const CatalogueRow* row = findRow(externalCatalogue, key)) return {row->text, {}};
+  const BuiltInCatalogue& catalogue = Catalogues[catalogueIndex].catalogue();
+  const CatalogueRow* row = findRow(catalogue.rows, key);
+  return row ? MessageFormat{row->text, piecesOf(catalogue, *row)}
+             : MessageFormat{notFoundText(key), {}};
 }
 
 std::string_view messageText(Key key) {
-  if (const CatalogueRow* row = findRow(externalCatalogue, key)) return row->text;
-  const CatalogueRow* row = findRow(catalogueRows(catalogueIndex), key);
-  return row ? row->text : notFoundText(key);
+  return messageFormat(key).text;
 }
 
 void setExternalCatalogue(std::span<const CatalogueRow> rows) {
@@ -82,8 +94,8 @@ void setExternalCatalogue(std::span<const CatalogueRow> rows) {
 bool setLocale(std::string_view name) {
   const size_t dot = name.find('.');
   const bool hasDot = dot != std::string_view::npos;
-  const Catalogue* catalogue =
-      findByName(std::span<const Catalogue>(Catalogues), name.substr(0, dot));
+  const NamedCatalogue* catalogue =
+      findByName(std::span<const NamedCatalogue>(Catalogues), name.substr(0, dot));
   const CodePage* codePage =
       findByName(std::span<const CodePage>(CodePages), hasDot ? name.substr(dot + 1) : name);
   const bool isValid = hasDot ? catalogue && codePage : catalogue || codePage;

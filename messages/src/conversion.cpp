@@ -30,8 +30,12 @@ std::string_view writeDigits(DigitBuffer& buffer, uint64_t value, char letter) {
   return {buffer.data(), static_cast<size_t>(result.ptr - buffer.data())};
 }
 
+size_t computePadding(const Conversion& conversion, size_t length) {
+  return length < conversion.width ? conversion.width - length : 0;
+}
+
 void appendPadded(std::string& text, const Conversion& conversion, std::string_view value) {
-  const size_t padding = conversion.width - std::min(conversion.width, value.size());
+  const size_t padding = computePadding(conversion, value.size());
   if (!conversion.isLeftAligned) text.append(padding, ' ');
   text.append(value);
   if (conversion.isLeftAligned) text.append(padding, ' ');
@@ -45,7 +49,7 @@ void appendNumber(std::string& text, const Conversion& conversion, NumberParts p
     parts.zeroCount += conversion.width - length;
     length = conversion.width;
   }
-  const size_t padding = conversion.width - std::min(conversion.width, length);
+  const size_t padding = computePadding(conversion, length);
   if (!conversion.isLeftAligned) text.append(padding, ' ');
   text.append(parts.front).append(parts.zeroCount, '0').append(parts.digits);
   if (conversion.isLeftAligned) text.append(padding, ' ');
@@ -55,7 +59,7 @@ void appendNumber(std::string& text, const Conversion& conversion, NumberParts p
 NumberParts makeParts(DigitBuffer& buffer, const Conversion& conversion, uint64_t value) {
   std::string_view digits = writeDigits(buffer, value, conversion.letter);
   if (value == 0 && conversion.hasPrecision) digits = {};
-  const size_t wanted = std::max(conversion.precision, digits.size());
+  const size_t wanted = std::max<size_t>(conversion.precision, digits.size());
   return {"", wanted - digits.size(), digits};
 }
 

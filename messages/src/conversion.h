@@ -9,14 +9,14 @@
 namespace messages {
 
 struct Conversion {
+  uint32_t width = 0;
+  uint32_t precision = 0;
+  bool hasPrecision = false;
   bool isLeftAligned = false; // -
   bool showsPlus = false;     // +
   bool showsBlank = false;    // blank
   bool isAlternate = false;   // #
   bool isZeroPadded = false;  // 0
-  size_t width = 0;
-  bool hasPrecision = false;
-  size_t precision = 0;
   char letter = '\0';
 };
 

@@ -4,7 +4,7 @@
 #include "messages/src/catalogues.h"
 
 #include "messages/interface/message_keys.h"
-#include "messages/src/catalogue_checks.h"
+#include "messages/src/compiled_catalogue.h"
 
 namespace messages {
 
@@ -126,10 +126,15 @@ constexpr CatalogueRow Rows[] = {
 
 static_assert(isSortedAndUnique(Rows));
 
+constexpr auto Compiled = compileRows<Rows>();
+static_assert(!Compiled.hasFault());
+
+constexpr BuiltInCatalogue Catalogue = {Rows, Compiled.pieces, Compiled.ends};
+
 } // namespace
 
-std::span<const CatalogueRow> englishCatalogue() {
-  return Rows;
+const BuiltInCatalogue& englishCatalogue() {
+  return Catalogue;
 }
 
 } // namespace messages

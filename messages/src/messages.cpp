@@ -3,9 +3,9 @@
 // call, so that lines of several processes on one terminal don't mix.
 #include "messages/interface/messages.h"
 
-#include "messages/interface/catalogue.h"
 #include "messages/interface/format.h"
 #include "messages/interface/process_end.h"
+#include "messages/src/catalogues.h"
 #include "messages/src/message_state.h"
 
 #include <algorithm>
@@ -57,11 +57,6 @@ void appendCode(std::string& line, Key key) {
                   ArgumentArray<char, std::string_view>{CodeLetter, keyText.textBehindLetter()});
 }
 
-void appendBody(std::string& line, std::string_view format, std::span<const Argument> arguments) {
-  appendArguments(line, format, arguments);
-  if (!format.empty()) line += '\n';
-}
-
 void checkStyle() {
   if (messageState.style >= std::size(Styles)) {
     internalFault("Messages: unexpected diagnostic style %d", messageState.style);
@@ -71,6 +66,27 @@ void checkStyle() {
 [[noreturn]] void endWithTooManyArguments() {
   writeText(Stream_Error, "** NLS Fatal Error: Too many arguments in format string\n");
   endProcess(1);
+}
+
+// A fault in the format ends the process.
+void appendMessage(std::string& line, const MessageFormat& format,
+                   std::span<const Argument> arguments) {
+  const FormatStatus status = format.pieces.empty() ? appendFormatted(line, format.text, arguments)
+                                                    : appendPieces(line, format.pieces, arguments);
+  switch (status) {
+  case FormatStatus_Done:
+    return;
+  case FormatStatus_BadFormat:
+    internalFault("Messages: Bad message format %s\n", format.text);
+  case FormatStatus_TooManyArguments:
+    endWithTooManyArguments();
+  }
+}
+
+void appendBody(std::string& line, const MessageFormat& format,
+                std::span<const Argument> arguments) {
+  appendMessage(line, format, arguments);
+  if (!format.text.empty()) line += '\n';
 }
 
 uint32_t columnAfter(uint32_t column, std::string_view text) {
@@ -90,14 +106,7 @@ std::string& freshLine() {
 
 void appendArguments(std::string& line, std::string_view format,
                      std::span<const Argument> arguments) {
-  switch (appendFormatted(line, format, arguments)) {
-  case FormatStatus_Done:
-    return;
-  case FormatStatus_BadFormat:
-    internalFault("Messages: Bad message format %s\n", format);
-  case FormatStatus_TooManyArguments:
-    endWithTooManyArguments();
-  }
+  appendMessage(line, {format, {}}, arguments);
 }
 
 void appendLead(std::string& line, const Location* location, uint32_t severity) {
@@ -147,9 +156,8 @@ bool reportArguments(uint32_t severityWord, const Location* location, Key key,
   checkStyle();
   std::string& line = freshLine();
   appendLead(line, location, severity);
-  const std::string_view text = messageText(key);
   if (severity != Severity_Remark) appendCode(line, key);
-  appendBody(line, text, arguments);
+  appendBody(line, messageFormat(key), arguments);
   writeText(messageState.diagnosticStream, line);
   return true;
 }
@@ -161,21 +169,21 @@ bool reportFormatArguments(uint32_t severityWord, const Location* location, std:
   checkStyle();
   std::string& line = freshLine();
   appendLead(line, location, severity);
-  appendBody(line, format, arguments);
+  appendBody(line, {format, {}}, arguments);
   writeText(messageState.diagnosticStream, line);
   return true;
 }
 
 void plainMessageArguments(Key key, std::span<const Argument> arguments) {
   std::string& line = freshLine();
-  appendArguments(line, messageText(key), arguments);
+  appendMessage(line, messageFormat(key), arguments);
   messageState.column = columnAfter(messageState.column, line);
   writeText(messageState.diagnosticStream, line);
 }
 
 void listingMessageArguments(Key key, std::span<const Argument> arguments) {
   std::string& line = freshLine();
-  appendArguments(line, messageText(key), arguments);
+  appendMessage(line, messageFormat(key), arguments);
   if (line.ends_with('\n')) messageState.column = 0;
   writeText(Stream_Output, line);
 }

@@ -3,6 +3,7 @@
 #include "messages/interface/catalogue.h"
 
 #include "messages/interface/format.h"
+#include "messages/src/catalogues.h"
 #include "tests/unit/messages/messages_fixture.h"
 
 #include <gmock/gmock.h>
@@ -152,6 +153,22 @@ TEST(Catalogue, HasOnlyGoodFormats) {
       EXPECT_EQ(appendFormatted(text, rows[i].text, arguments), FormatStatus_Done)
           << textOf(rows[i].key);
       EXPECT_FALSE(text.empty());
+    }
+  }
+}
+
+// The compiler read the formats: each row has the pieces of its own text.
+TEST_F(CatalogueTest, FillsThePiecesOfEachTextInEveryLanguage) {
+  for (const char* locale : {"en_US", "ja_JP"}) {
+    ASSERT_TRUE(setLocale(locale));
+    for (const CatalogueRow& row : catalogueRows(EnglishCatalogue)) {
+      const MessageFormat format = messageFormat(row.key);
+      const std::vector<Argument> arguments = exampleArguments(row.text);
+      std::string filled;
+      std::string expected;
+      EXPECT_EQ(appendPieces(filled, format.pieces, arguments), FormatStatus_Done);
+      EXPECT_EQ(appendFormatted(expected, format.text, arguments), FormatStatus_Done);
+      EXPECT_EQ(filled, expected) << textOf(row.key);
     }
   }
 }
@@ -360,6 +377,33 @@ TEST_F(CatalogueTest, AnExternalCatalogueComesFirst) {
   EXPECT_EQ(messageText(NoArchiveSpecified), "No archive specified");
   setExternalCatalogue({});
   EXPECT_EQ(messageText(OutOfMemory), "Out of memory");
+}
+
+TEST_F(CatalogueTest, AnExternalTextIsFilledLikeABuiltInOne) {
+  static constexpr CatalogueRow rows[] = {{FileDoesNotExist, "No file %s, 100%%"},
+                                          {ListedMember, "<%1$s|%1$-6s>\n"}};
+  listingMessage(ListedMember, "a.o");
+  setExternalCatalogue(rows);
+  listingMessage(ListedMember, "a.o");
+  listingMessage(AddedMember, "b.o");
+  report(ErrorWord, nullptr, FileDoesNotExist, "%d");
+  setExternalCatalogue({});
+  listingMessage(ListedMember, "c.o");
+  EXPECT_EQ(outputText(), "a.o\n<a.o|a.o   >\na - b.o\nc.o\n");
+  EXPECT_EQ(errorText(), "Error: L6833E: No file %d, 100%\n");
+}
+
+TEST_F(CatalogueTest, AChangeOfLanguageHoldsForTheNextLine) {
+  for (const char* locale : {"en_US", "ja_JP", "en_US"}) {
+    ASSERT_TRUE(setLocale(locale));
+    listingMessage(NoEntryPoints);
+  }
+  ASSERT_TRUE(setLocale("ja_JP"));
+  const std::string japanese(messageText(NoEntryPoints));
+  ASSERT_TRUE(setLocale("en_US"));
+  const std::string text(messageText(NoEntryPoints));
+  EXPECT_NE(japanese, text);
+  EXPECT_EQ(outputText(), text + japanese + text);
 }
 
 TEST_F(CatalogueTest, ALocaleNameChoosesTableAndCodePage) {

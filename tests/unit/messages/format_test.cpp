@@ -2,6 +2,8 @@
 // The formatter, against the C library's own where that can be asked.
 #include "messages/interface/format.h"
 
+#include "messages/src/format_reader.h"
+
 #include <gtest/gtest.h>
 
 #include <climits>
@@ -18,11 +20,23 @@ struct Result {
   std::string text;
 };
 
+std::vector<FormatPiece> piecesOf(std::string_view format) {
+  std::vector<FormatPiece> pieces;
+  FormatReader reader(format);
+  for (FormatPiece piece; reader.read(piece);)
+    pieces.push_back(piece);
+  return pieces;
+}
+
+// A format comes to the same whether it is read beforehand or as it is filled.
 template <class... Arguments>
 Result format(std::string_view text, const Arguments&... arguments) {
   const std::vector<Argument> list{Argument(arguments)...};
   Result result{};
   result.status = appendFormatted(result.text, text, list);
+  std::string filled;
+  EXPECT_EQ(appendPieces(filled, piecesOf(text), list), result.status) << text;
+  EXPECT_EQ(filled, result.text) << text;
   return result;
 }
 
@@ -75,6 +89,7 @@ TEST(Format, CopiesWhatIsNoConversion) {
   EXPECT_EQ(good("no archive"), "no archive");
   EXPECT_EQ(good("100%% of %s", "it"), "100% of it");
   EXPECT_EQ(good("%%"), "%");
+  EXPECT_EQ(good("%%%%s%%d%s", "!"), "%%s%d!");
 }
 
 TEST(Format, RendersSignedNumbersAsTheLibraryDoes) {
@@ -202,6 +217,59 @@ TEST(Format, RefusesWidthsThatNoNumberHolds) {
   EXPECT_TRUE(isBad("%2147483648d", 1));
   EXPECT_TRUE(isBad("%.99999999999999999999d", 1));
   EXPECT_TRUE(isBad("%*d", INT64_MAX, 1));
+}
+
+TEST(Format, KeepsWhatCameOutBeforeTheFault) {
+  EXPECT_EQ(format("a%s b%d c", "1", "2").text, "a1 b");
+  EXPECT_EQ(format("a%s b%*d", "1", "2").text, "a1 b");
+  EXPECT_EQ(format("a%s b%q", "1", "2").text, "a1 b");
+  EXPECT_EQ(format("a%1$s b%21$s", "1").text, "a1 b");
+}
+
+// What is wrong with the format itself comes behind what is wrong with an argument in front of it.
+TEST(Format, TellsTheFirstFaultOfAConversion) {
+  EXPECT_EQ(format("%1$*2$.*21$d", 1, "a").status, FormatStatus_BadFormat);
+  EXPECT_EQ(format("%1$*3$.*21$d", 1, 2).status, FormatStatus_BadFormat);
+  EXPECT_EQ(format("%1$*2$.*21$d", 1, 2).status, FormatStatus_TooManyArguments);
+  EXPECT_EQ(format("%21$*2$.*2$d", 1, 2).status, FormatStatus_TooManyArguments);
+  EXPECT_EQ(format("%21$*2$.*2$", 1, 2).status, FormatStatus_BadFormat);
+}
+
+TEST(Format, IsReadOnceAndFilledManyTimes) {
+  constexpr std::string_view Text = "%2$-*3$s from %1$.4s at %4$5d, 100%%\n";
+  const std::vector<FormatPiece> pieces = piecesOf(Text);
+  for (int round = 0; round < 1000; ++round) {
+    const std::string name = "name" + std::to_string(round);
+    const std::vector<Argument> arguments = {"member.o", name, round % 20 - 10, round};
+    std::string filled = "before ";
+    std::string expected = "before ";
+    ASSERT_EQ(appendPieces(filled, pieces, arguments), FormatStatus_Done);
+    ASSERT_EQ(appendFormatted(expected, Text, arguments), FormatStatus_Done);
+    ASSERT_EQ(filled, expected);
+  }
+  // A width that came from an argument is not kept.
+  std::string text;
+  ASSERT_EQ(appendPieces(text, pieces, std::vector<Argument>{"m", "n", 3, 1}), FormatStatus_Done);
+  EXPECT_EQ(text, "n   from m at     1, 100%\n");
+}
+
+TEST(Format, IsReadByTheCompiler) {
+  constexpr FormatPiece Piece = [] {
+    FormatPiece piece;
+    FormatReader("in %-20.3s").read(piece);
+    return piece;
+  }();
+  static_assert(Piece.literal == "in " && Piece.hasConversion && Piece.argument == 0);
+  static_assert(Piece.conversion.width == 20 && Piece.conversion.precision == 3);
+  static_assert(Piece.conversion.isLeftAligned && Piece.conversion.letter == 's');
+}
+
+TEST(Format, HasAPieceForEachConversionAndTheRest) {
+  EXPECT_TRUE(piecesOf("").empty());
+  EXPECT_EQ(piecesOf("text").size(), 1u);
+  EXPECT_EQ(piecesOf("%s").size(), 1u);
+  EXPECT_EQ(piecesOf("%s\n").size(), 2u);
+  EXPECT_EQ(piecesOf("%s%21$s%s").size(), 2u) << "nothing counts behind a fault";
 }
 
 TEST(Format, KnowsNoLocale) {
