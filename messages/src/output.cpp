@@ -5,7 +5,7 @@
 #include "messages/src/descriptor_sink.h"
 #include "messages/src/output_buffer.h"
 
-#include <algorithm>
+#include <cstdint>
 #include <string>
 #include <unistd.h>
 #include <utility>
@@ -34,15 +34,22 @@ struct Hold {
   std::vector<HeldPiece> pieces = {};
 };
 
-Hold& currentHold() {
-  static Hold hold;
-  return hold;
+constinit Hold currentHold;
+
+// A name with such a byte could otherwise move the cursor, or change a terminal's settings. Nothing
+// is left out by a shortcut here, so that the compiler tests many bytes at a time.
+bool mustBeEscaped(char character) {
+  const auto byte = static_cast<unsigned char>(character);
+  const bool isControl = byte < 32;
+  const bool isTabOrLineFeed = (byte == '\t') | (byte == '\n');
+  return (isControl & !isTabOrLineFeed) | (byte == 127);
 }
 
-// A name with such a byte could otherwise move the cursor, or change a terminal's settings.
-bool mustBeEscaped(char character) {
-  const unsigned char byte = static_cast<unsigned char>(character);
-  return (byte < 32 && byte != '\t' && byte != '\n') || byte == 127;
+bool hasBytesToEscape(std::string_view text) {
+  uint8_t isFound = 0;
+  for (const char character : text)
+    isFound |= mustBeEscaped(character);
+  return isFound != 0;
 }
 
 char octalDigit(unsigned value) {
@@ -73,7 +80,7 @@ void passOn(Stream stream, std::string_view bytes) {
 }
 
 void releaseHeld() {
-  Hold& hold = currentHold();
+  Hold& hold = currentHold;
   hold.isOn = false;
   for (const HeldPiece& piece : std::exchange(hold.pieces, {})) {
     passOn(piece.stream, piece.bytes);
@@ -81,7 +88,7 @@ void releaseHeld() {
 }
 
 void writeBytes(Stream stream, std::string_view bytes) {
-  Hold& hold = currentHold();
+  Hold& hold = currentHold;
   if (hold.isOn) hold.size += bytes.size();
   if (hold.isOn && hold.size > MostHeld) releaseHeld();
   if (!hold.isOn) {
@@ -101,7 +108,7 @@ void openStreams() {
 }
 
 void HeldOutput::hold() {
-  currentHold() = {.isOn = true};
+  currentHold = {.isOn = true};
 }
 
 void HeldOutput::release() {
@@ -109,8 +116,8 @@ void HeldOutput::release() {
 }
 
 bool HeldOutput::drop() {
-  const bool isDropped = currentHold().isOn;
-  currentHold() = {};
+  const bool isDropped = currentHold.isOn;
+  currentHold = {};
   return isDropped;
 }
 
@@ -127,7 +134,7 @@ void setOutputSinks(OutputSink* output, OutputSink* error) {
 }
 
 void writeText(Stream stream, std::string_view text) {
-  if (std::any_of(text.begin(), text.end(), mustBeEscaped)) {
+  if (hasBytesToEscape(text)) {
     writeBytes(stream, escaped(text));
     return;
   }

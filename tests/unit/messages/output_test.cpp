@@ -8,6 +8,7 @@
 #include <atomic>
 #include <cerrno>
 #include <csignal>
+#include <cstdio>
 #include <fcntl.h>
 #include <sys/wait.h>
 #include <thread>
@@ -117,6 +118,23 @@ TEST_F(OutputTest, TextIsEscapedOnBothStreams) {
   writeText(Stream_Error, text);
   EXPECT_EQ(outputText(), "\\000\\037 ~\\177\x80\t\n");
   EXPECT_EQ(errorText(), outputText());
+}
+
+TEST_F(OutputTest, AByteIsEscapedWhereverItStands) {
+  constexpr size_t Size = 70;
+  std::string expected;
+  for (int byte = 0; byte < 256; ++byte) {
+    const bool isEscaped = (byte < 32 && byte != '\t' && byte != '\n') || byte == 127;
+    char octal[8];
+    std::snprintf(octal, sizeof octal, "\\%.3o", static_cast<unsigned>(byte));
+    for (size_t at = 0; at < Size; ++at) {
+      std::string text(Size, 'x');
+      text[at] = static_cast<char>(byte);
+      writeText(Stream_Output, text);
+      expected += isEscaped ? std::string(at, 'x') + octal + std::string(Size - at - 1, 'x') : text;
+    }
+  }
+  EXPECT_EQ(outputText(), expected);
 }
 
 TEST_F(OutputTest, LargePiecesKeepTheirPlace) {
