@@ -6,11 +6,10 @@
 #include "arlib/interface/archive_format.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/attribute_string.h"
+#include "quarn/local_dates.h"
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
 
-#include <array>
-#include <ctime>
 #include <string>
 
 namespace quarn {
@@ -19,8 +18,6 @@ using arlib::ArchiveMember;
 
 namespace {
 
-constexpr size_t DateSize = 18; // bytes, the NUL included
-
 // "rw-r--r--": the low nine bits alone.
 std::string modeText(uint32_t mode) {
   std::string text = "rwxrwxrwx";
@@ -28,16 +25,6 @@ std::string modeText(uint32_t mode) {
     if ((mode >> (text.size() - 1 - i) & 1) == 0) text[i] = '-';
   }
   return text;
-}
-
-// In local time. A date that the host can't break down, or that needs more room than there is,
-// is left empty.
-std::string dateText(int64_t date) {
-  const time_t seconds = static_cast<time_t>(date);
-  tm brokenDown = {};
-  if (localtime_r(&seconds, &brokenDown) == nullptr) return {};
-  std::array<char, DateSize> text;
-  return {text.data(), strftime(text.data(), text.size(), "%b %d %H:%M %Y", &brokenDown)};
 }
 
 class Listing final : public MemberRoutine {
@@ -49,13 +36,14 @@ public:
       messages::listingMessage(messages::ListedMember, member.getName());
       return;
     }
-    messages::listingMessage(messages::ListedMemberLong, modeText(member.getMode()),
-                             member.getUid(), member.getGid(), member.getSize(),
-                             dateText(member.getDate()), member.getName(), member.getOffset());
+    messages::listingMessage(
+        messages::ListedMemberLong, modeText(member.getMode()), member.getUid(), member.getGid(),
+        member.getSize(), m_Dates.textOf(member.getDate()), member.getName(), member.getOffset());
   }
 
 private:
   bool m_IsLong;
+  LocalDates m_Dates;
 };
 
 // Attributes in their own order and spelling, whatever those of the table. Neighbours mostly have

@@ -156,6 +156,34 @@ TEST_F(OutputTest, ManySmallPiecesComeOutWhole) {
   EXPECT_LT(m_Output.writeCount(), 10u);
 }
 
+TEST_F(OutputTest, TheLinesOfAListingGoOutTogether) {
+  std::string expected;
+  for (int i = 0; i < 10000; ++i) {
+    listingMessage(ListedSymbol, "function_" + std::to_string(i), "a.o", i);
+    char line[100];
+    std::snprintf(line, sizeof line, "function_%-11d from a.o        at offset %6d\n", i, i);
+    expected += line;
+  }
+  EXPECT_EQ(outputText(), expected);
+  EXPECT_LT(m_Output.writeCount(), 10u);
+}
+
+TEST_F(OutputTest, AListingEndsWhereStdoutFails) {
+  for (int i = 0; i < 5000; ++i)
+    listingMessage(ListedMember, "before.o");
+  report(WarningWord, nullptr, NoArchiveSpecified);
+  const std::string before = m_Output.text();
+  EXPECT_EQ(before.size(), 5000u * 9);
+  m_Output.failWith(ENOSPC);
+  for (int i = 0; i < 20000; ++i)
+    listingMessage(ListedMember, "after.o");
+  m_Output.failWith(0);
+  listingMessage(ListedMember, "late.o");
+  EXPECT_FALSE(flushAll());
+  EXPECT_EQ(stdoutError(), ENOSPC);
+  EXPECT_EQ(m_Output.text(), before);
+}
+
 TEST_F(OutputTest, AFailureOfStdoutIsRememberedAndTheRestDropped) {
   m_Output.failWith(ENOSPC);
   writeRaw("a");

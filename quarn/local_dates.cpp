@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "quarn/local_dates.h"
+
+#include <ctime>
+
+namespace quarn {
+
+std::string_view LocalDates::textOf(int64_t date) {
+  const auto [text, isNew] = m_Texts.try_emplace(date);
+  if (isNew) text->second = computeText(date);
+  return text->second.view();
+}
+
+LocalDates::Text LocalDates::computeText(int64_t date) {
+  Text text;
+  const auto seconds = static_cast<time_t>(date);
+  tm brokenDown = {};
+  if (localtime_r(&seconds, &brokenDown) == nullptr) return text;
+  text.length = strftime(text.bytes.data(), TextSize, "%b %d %H:%M %Y", &brokenDown);
+  return text;
+}
+
+} // namespace quarn
