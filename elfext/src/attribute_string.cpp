@@ -2,7 +2,7 @@
 #include "elfext/interface/attribute_string.h"
 
 #include "elfext/src/attribute_tokens.h"
-#include "support/interface/letters.h"
+#include "elfext/src/attribute_words.h"
 
 #include <algorithm>
 #include <cstring>
@@ -12,8 +12,6 @@
 namespace elfext {
 
 namespace {
-
-using support::equalIgnoringCase;
 
 // ---- Reading
 
@@ -26,13 +24,6 @@ void forEachToken(std::string_view text, Function function) {
     text.remove_prefix(token.size());
     if (!token.empty()) function(token);
   }
-}
-
-FeatureSet readFeature(std::string_view token) {
-  for (const FeatureToken& row : FeatureTokens) {
-    if (row.use != TokenUse::Print && equalIgnoringCase(row.token, token)) return row.set;
-  }
-  return {};
 }
 
 // The load words that a scope's letter touches. Stores are of no scope.
@@ -66,28 +57,22 @@ void addAccess(AccessWords& access, const Scope& scope, uint32_t bits) {
   access.stores |= static_cast<uint16_t>(bits >> LoadNameCount);
 }
 
-// The names stand in the order of the table, so one pass over it finds all.
+// The names stand in the order of their numbers; what breaks it, or is no name, ends them.
 uint32_t readAccessNames(std::string_view names) {
   uint32_t bits = 0;
-  for (uint32_t i = 0; i < std::size(AccessNames) && !names.empty(); ++i) {
-    if (!names.starts_with(AccessNames[i])) continue;
-    bits |= uint32_t{1} << i;
-    names.remove_prefix(AccessNames[i].size());
+  for (uint32_t least = 0;;) {
+    const uint32_t number = findAccessName(names);
+    if (number < least || number == std::size(AccessNames)) return bits;
+    bits |= uint32_t{1} << number;
+    names.remove_prefix(AccessNames[number].size());
+    least = number + 1;
   }
-  return bits;
 }
 
 void readAccess(AccessWords& access, std::string_view token) {
   const bool hasScope = token.size() > 1 && token[1] == ':';
   const Scope scope = scopeOf(hasScope ? token[0] : '\0');
   addAccess(access, scope, readAccessNames(token.substr(hasScope ? 2 : 0)));
-}
-
-uint64_t readFlag(std::span<const FlagToken> rows, std::string_view token) {
-  for (const FlagToken& row : rows) {
-    if (equalIgnoringCase(row.token, token)) return row.bits;
-  }
-  return 0;
 }
 
 // ---- Printing
@@ -145,17 +130,19 @@ void printFlags(std::string& text, std::span<const FlagToken> rows, uint64_t fla
 
 FullAttr parseAttributeString(std::string_view text) {
   FullAttr record = {.m_Access = LibraryFullAttr.m_Access};
-  bool hasComplement = false;
+  bool areFlagsTakenBack = false;
   forEachToken(text, [&](std::string_view token) {
-    record.m_Features |= readFeature(token);
     readAccess(record.m_Access, token);
-    record.m_Flags |= readFlag(FlagTokens, token);
-    record.m_Stack8 |= readFlag(Stack8Tokens, token);
-    record.m_AbiLevel |= readFlag(AbiLevelTokens, token);
-    hasComplement = hasComplement || equalIgnoringCase(ComplementToken.token, token);
+    const AttributeWord* word = findAttributeWord(token);
+    if (word == nullptr) return;
+    record.m_Features |= word->features;
+    record.m_Flags |= word->flags;
+    record.m_Stack8 |= word->stack8;
+    record.m_AbiLevel |= word->abiLevel;
+    areFlagsTakenBack = areFlagsTakenBack || word->takesFlagsBack;
   });
   record.m_Features = closeFeatures(record.m_Features);
-  if (!hasComplement) record.m_Flags |= ComplementToken.bits;
+  if (!areFlagsTakenBack) record.m_Flags |= ComplementToken.bits;
   return record;
 }
 

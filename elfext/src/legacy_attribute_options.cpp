@@ -4,6 +4,7 @@
 #include "elfext/interface/attribute_string.h"
 
 #include "elfext/src/attribute_tokens.h"
+#include "elfext/src/attribute_words.h"
 #include "support/interface/letters.h"
 
 #include <iterator>
@@ -126,12 +127,9 @@ void skipWeight(std::string_view& text) {
 
 // The number of the name that the text begins with, or that of all names.
 uint32_t takeAccessName(std::string_view& text) {
-  for (uint32_t i = 0; i < std::size(AccessNames); ++i) {
-    if (!text.starts_with(AccessNames[i])) continue;
-    text.remove_prefix(AccessNames[i].size());
-    return i;
-  }
-  return std::size(AccessNames);
+  const uint32_t name = findAccessName(text);
+  if (name != std::size(AccessNames)) text.remove_prefix(AccessNames[name].size());
+  return name;
 }
 
 } // namespace

@@ -4,10 +4,10 @@
 #include "alloclib/interface/region.h"
 #include "elfext/interface/object_module.h"
 #include "tests/unit/elfext_attributes/generated_records.h"
+#include "tests/unit/elfext_attributes/other_case.h"
 
 #include <gtest/gtest.h>
 
-#include <cctype>
 #include <string>
 #include <vector>
 
@@ -35,14 +35,6 @@ FullAttr withAccess(const AccessWords& access) {
 
 std::string reprinted(std::string_view text) {
   return printAttributeString(parseAttributeString(text));
-}
-
-std::string inOtherCase(std::string text) {
-  for (char& letter : text) {
-    const auto byte = static_cast<unsigned char>(letter);
-    letter = static_cast<char>(std::isupper(byte) ? std::tolower(byte) : std::toupper(byte));
-  }
-  return text;
 }
 
 struct FeatureRow {
