@@ -38,6 +38,7 @@ constexpr CodePage CodePages[] = {
 uint32_t catalogueIndex = EnglishCatalogue;
 uint32_t codePageNumber = Utf8CodePage;
 std::span<const CatalogueRow> externalCatalogue;
+size_t lastIndex = 0; // of the built-in row that was said last
 
 // Null if the rows don't have the key.
 const CatalogueRow* findRow(std::span<const CatalogueRow> rows, Key key) {
@@ -47,10 +48,10 @@ const CatalogueRow* findRow(std::span<const CatalogueRow> rows, Key key) {
   return row != rows.end() && row->key == key ? &*row : nullptr;
 }
 
-std::span<const FormatPiece> piecesOf(const BuiltInCatalogue& catalogue, const CatalogueRow& row) {
-  const auto index = static_cast<size_t>(&row - catalogue.rows.data());
+MessageFormat formatAt(const BuiltInCatalogue& catalogue, size_t index) {
   const size_t start = index == 0 ? 0 : catalogue.ends[index - 1];
-  return catalogue.pieces.subspan(start, catalogue.ends[index] - start);
+  return {catalogue.rows[index].text,
+          catalogue.pieces.subspan(start, catalogue.ends[index] - start)};
 }
 
 std::string_view notFoundText(Key key) {
@@ -75,12 +76,16 @@ std::span<const CatalogueRow> catalogueRows(uint32_t index) {
   return Catalogues[index].catalogue().rows;
 }
 
+// A listing says the same thing thousands of times.
 MessageFormat messageFormat(Key key) {
   if (const CatalogueRow* row = findRow(externalCatalogue, key)) return {row->text, {}};
   const BuiltInCatalogue& catalogue = Catalogues[catalogueIndex].catalogue();
-  const CatalogueRow* row = findRow(catalogue.rows, key);
-  return row ? MessageFormat{row->text, piecesOf(catalogue, *row)}
-             : MessageFormat{notFoundText(key), {}};
+  if (catalogue.rows[lastIndex].key != key) {
+    const CatalogueRow* row = findRow(catalogue.rows, key);
+    if (row == nullptr) return {notFoundText(key), {}};
+    lastIndex = static_cast<size_t>(row - catalogue.rows.data());
+  }
+  return formatAt(catalogue, lastIndex);
 }
 
 std::string_view messageText(Key key) {
