@@ -6,11 +6,13 @@
 #include "arlib/interface/archive_format.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/attribute_string.h"
+#include "elfext/interface/attribute_text_cache.h"
 #include "quarn/local_dates.h"
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
 
 #include <string>
+#include <string_view>
 
 namespace quarn {
 
@@ -46,22 +48,10 @@ private:
   LocalDates m_Dates;
 };
 
-// Attributes in their own order and spelling, whatever those of the table. Neighbours mostly have
-// the same ones.
-class AttributePrinter {
-public:
-  const std::string& print(const arlib::Symbol& symbol) {
-    if (m_Text.data() == nullptr || symbol.getAttributeText() != m_Text) {
-      m_Text = symbol.getAttributeText();
-      m_Printed = elfext::printAttributeString(symbol.getBuildAttributes());
-    }
-    return m_Printed;
-  }
-
-private:
-  std::string_view m_Text; // what was printed last
-  std::string m_Printed;
-};
+// Attributes are shown in their own order and spelling, whatever those of the table.
+std::string reprinted(std::string_view attributeText) {
+  return elfext::printAttributeString(elfext::parseAttributeString(attributeText));
+}
 
 } // namespace
 
@@ -78,13 +68,13 @@ void listSymbolTable(Run& run) {
     reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.archiveName());
     return;
   }
-  AttributePrinter attributes;
+  elfext::AttributeTextCache<std::string> attributes(reprinted);
   std::string shownName;
   for (const arlib::Symbol* symbol : run.archive.getSymbols()) {
     shownName = symbol->getName();
     if (symbol->hasBuildAttributes()) {
       shownName += arlib::AttributeMarker;
-      shownName += attributes.print(*symbol);
+      shownName += attributes.get(symbol->getAttributeText());
     }
     const ArchiveMember* member = symbol->getDefiningMember();
     messages::listingMessage(messages::ListedSymbol, shownName, member->getName(),
