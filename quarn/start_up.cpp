@@ -2,6 +2,7 @@
 #include "quarn/start_up.h"
 
 #include "alloclib/interface/region.h"
+#include "alloclib/interface/session.h"
 #include "messages/interface/messages.h"
 #include "messages/interface/output.h"
 #include "messages/interface/process_end.h"
@@ -11,6 +12,7 @@
 
 #include <array>
 #include <cstdlib>
+#include <optional>
 
 namespace quarn {
 
@@ -18,12 +20,13 @@ namespace {
 
 constexpr size_t DriverRegionSize = 1024;
 
+std::optional<alloclib::Session> session;
 alloclib::RegionGeneral* driverRegion = nullptr;
 
 } // namespace
 
 void startUp(int argc, const char* const* argv, support::Host& host) {
-  alloclib::initialise();
+  session.emplace();
   driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
   messages::initialise();
   messages::setExitHandler(shutDown);
@@ -40,7 +43,7 @@ void shutDown(int code) {
   messages::closeStreams();
   if (driverRegion != nullptr) {
     driverRegion->Destroy(false);
-    alloclib::shutDown(false);
+    session->leave();
   }
   std::exit(code);
 }

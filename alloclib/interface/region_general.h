@@ -23,7 +23,7 @@ class RegionGeneral final : public Region {
 public:
   // A region of one page, which grows on the process's RegionLargeBlock. The initial size, in
   // bytes, counts only in the transparent debug mode. The name is kept, not copied. The caller
-  // ends the region with Destroy. Needs alloclib::initialise().
+  // ends the region with Destroy. Needs an alloclib::Session.
   static RegionGeneral* Create(size_t initialSize, const char* name);
 
   // `size` bytes, never null. `alignment` is a power of two up to 4096. The memory belongs to

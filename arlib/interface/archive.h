@@ -2,6 +2,9 @@
 //
 // One archive in memory: the ordered list of its members and the decoded symbol table.
 //
+// A program that uses archives has an alloclib::Session (alloclib/interface/session.h) for as long
+// as it does: their members and names live in regions.
+//
 // Reading a file into it is archive_file_reader.h, writing it out archive_file_writer.h. Edits only
 // mark derived data as stale; updateAuxiliaryMembers brings it up to date, and the writer calls it.
 #pragma once
@@ -25,10 +28,6 @@
 #include <utility>
 #include <vector>
 
-namespace elfext {
-class ErrorHandler;
-}
-
 namespace arlib {
 
 enum class SymbolTableMode : uint32_t {
@@ -51,10 +50,6 @@ public:
   // Not owned. Null means that failures are silent.
   void setErrorHandler(ErrorHandler* handler) { m_ErrorHandler = handler; }
   [[nodiscard]] ErrorHandler* getErrorHandler() const { return m_ErrorHandler; }
-
-  // Not owned; installed in each object that is read for this archive's members.
-  void setElfextErrorHandler(elfext::ErrorHandler* handler) { m_ElfextErrorHandler = handler; }
-  [[nodiscard]] elfext::ErrorHandler* getElfextErrorHandler() const { return m_ElfextErrorHandler; }
 
   // How symbols are published.
   void setIncludeDebugSymbols(bool include) { m_IncludeDebugSymbols = include; }
@@ -244,7 +239,6 @@ private:
   // The arrays below, and the members' bytes.
   alloclib::RegionOwner m_ContainerRegion;
   ErrorHandler* m_ErrorHandler = nullptr;
-  elfext::ErrorHandler* m_ElfextErrorHandler = nullptr;
   const char* m_FileName = nullptr;
   void* m_ClientData = nullptr;
   SymbolTableMode m_SymbolTableMode = SymbolTableMode::IfSymbols;

@@ -111,8 +111,9 @@ public:
   // Only while the type is not known.
   void determineType();
 
-  // Reads the member's bytes as an object, which reports to the archive's own object handler. The
-  // module must not outlive the archive's host. Null or false if the object can't be read.
+  // Reads the member's bytes as an object. A module of the caller's reports to its own handler, a
+  // new one to nobody. It must not outlive the archive's host. Null or false if the object can't be
+  // read.
   std::unique_ptr<elfext::ObjectModule>
   createObjectModule(elfext::DeferredContentsSelector* selector);
   bool readObjectModule(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector);

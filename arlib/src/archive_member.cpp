@@ -260,7 +260,6 @@ bool ArchiveMember::readObjectModule(elfext::ObjectModule& module,
                                      elfext::DeferredContentsSelector* selector) {
   QUARN_ASSERT(1, m_Type != NULL);
   if (!flushContents()) return false;
-  module.setErrorHandler(m_Archive->getElfextErrorHandler());
   return readInto(module, selector);
 }
 

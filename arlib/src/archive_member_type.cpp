@@ -187,8 +187,7 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
                                                    bool useObjectAttributes) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   elfext::ObjectModule module;
-  if (!read(*archiveMember, archiveMember->getArchive()->getElfextErrorHandler(), module))
-    return false;
+  if (!read(*archiveMember, nullptr, module)) return false;
   return findAttributes(module, archiveMember->getSize(), useObjectAttributes, attributes);
 }
 

@@ -5,6 +5,9 @@
 // on the stack, pointed at an error handler, handed to the reader, looked at and destroyed. All
 // objects and texts that it returns are its own and go with it, or when they are deleted.
 //
+// A program that uses modules has an alloclib::Session (alloclib/interface/session.h) for as long
+// as it does: all that a module holds lives in regions.
+//
 // Texts that are handed in are copied, unless the module is told to keep names as they are.
 //
 // `getX(index)`, `getXCount()`, `getXIndex(x)` and `setXIndex(x, index)` come in families, one for
@@ -104,7 +107,7 @@ struct DebugOverlayRecord {
 
 class ObjectModule final : public ObjectModuleBase, public ObjectWithBuildAttributes {
 public:
-  // An empty module. Needs alloclib::initialise().
+  // An empty module.
   ObjectModule();
   ~ObjectModule();
 

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // For test programs whose subjects live in regions. At the end every region must be gone.
-#include "alloclib/interface/process.h"
+#include "alloclib/interface/session.h"
 
 #include <gtest/gtest.h>
 
 int main(int argc, char** argv) {
   testing::InitGoogleTest(&argc, argv);
-  alloclib::initialise();
-  const int result = RUN_ALL_TESTS();
-  alloclib::shutDown();
-  return result;
+  const alloclib::Session session;
+  return RUN_ALL_TESTS();
 }

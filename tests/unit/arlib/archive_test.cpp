@@ -42,7 +42,6 @@ TEST_F(ArchiveListTest, StartsEmpty) {
   EXPECT_FALSE(m_Archive.getUniqueSymbolsOnly());
   EXPECT_FALSE(m_Archive.getUseObjectBuildAttributes());
   EXPECT_EQ(m_Archive.getClientData(), nullptr);
-  EXPECT_EQ(m_Archive.getElfextErrorHandler(), nullptr);
   EXPECT_EQ(m_Archive.computeFileSize(), 8u);
 }
 

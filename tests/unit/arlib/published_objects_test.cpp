@@ -6,6 +6,8 @@
 #include "arlib/src/minor_variants.h"
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/elf_constants.h"
+#include "elfext/interface/error_string_capture.h"
+#include "elfext/interface/object_module.h"
 
 #include <algorithm>
 #include <deque>
@@ -292,6 +294,76 @@ TEST_F(BestSymbolsTest, CountFlagsAndAccessesToo) {
   EXPECT_EQ(best("$IEEE1$IW"), "m1");
   EXPECT_EQ(best("$A:L22$IEEE1"), "m0");
   EXPECT_EQ(best("$A:L22$IEEE1$IW"), "m2");
+}
+
+// ---- One object at a time
+
+namespace {
+
+class ObjectMemberTest : public ArchiveTest {
+protected:
+  // The names, or the reason why there are none.
+  std::vector<std::string> published(ArchiveMember* member) {
+    const alloclib::RegionOwner region(alloclib::RegionGeneral::Create(1024, "names of a test"));
+    SymbolNameList list(region.get());
+    list.add("what was there before");
+    std::string reason = "an old reason";
+    const auto* type = ElfImageArchiveMemberType::getInstance();
+    if (!type->getSymbolNames(member, list, reason)) return {"no: " + reason};
+    EXPECT_EQ(reason, "");
+    std::vector<std::string> names;
+    for (uint32_t i = 0; i < list.getSize(); ++i)
+      names.emplace_back(list[i]);
+    return names;
+  }
+};
+
+} // namespace
+
+TEST_F(ObjectMemberTest, TellsTheNamesThatTheTableShouldHold) {
+  ArchiveMember* member =
+      add("a.o", objectWith({{"f", elfext::STB_GLOBAL}, {"local"}, {"g", elfext::STB_WEAK}}));
+  EXPECT_THAT(published(member), ElementsAre("f", "g"));
+  EXPECT_THAT(published(add("b.o", objectWith({}))), IsEmpty());
+}
+
+TEST_F(ObjectMemberTest, TellsWhyAnObjectHasNoNames) {
+  EXPECT_THAT(published(add("a.o", object().machine(3).bytes())),
+              ElementsAre("no: ELF file has unsupported machine code 3 (we only handle EM_ZEV = "
+                          "40)"));
+  ArchiveMember* inMemory = m_Archive.addMember("b.o", 0, 0, 0, 0);
+  m_Host.setRoom(0);
+  EXPECT_THAT(published(inMemory), ElementsAre("no: "));
+  EXPECT_EQ(reports().size(), 1u);
+}
+
+TEST_F(ObjectMemberTest, MakesAModuleOfItsObject) {
+  ArchiveMember* member = add("a.o", objectWith({{"f", elfext::STB_GLOBAL}}));
+  const std::unique_ptr<elfext::ObjectModule> module = member->createObjectModule(nullptr);
+  ASSERT_NE(module, nullptr);
+  EXPECT_STREQ(module->getSymbol(1)->getName(), "f");
+  EXPECT_EQ(module->getErrorHandler(), nullptr);
+  EXPECT_EQ(add("b.o", "no object")->createObjectModule(nullptr), nullptr);
+  EXPECT_THAT(reports(), IsEmpty());
+}
+
+TEST_F(ObjectMemberTest, MakesAModuleOfAnObjectInMemory) {
+  const std::string bytes = objectWith({{"f", elfext::STB_GLOBAL}});
+  ArchiveMember* member = m_Archive.addMember("a.o", 0, 0, 0, 0);
+  member->setContents(bytes.data(), static_cast<uint32_t>(bytes.size()));
+  EXPECT_NE(member->createObjectModule(nullptr), nullptr);
+  EXPECT_TRUE(member->getContentsLocation()->isTemporary);
+  m_Host.setRoom(0);
+  ArchiveMember* unflushable = m_Archive.addMember("b.o", 0, 0, 0, 0);
+  EXPECT_EQ(unflushable->createObjectModule(nullptr), nullptr);
+}
+
+TEST_F(ObjectMemberTest, ReadsIntoAModuleThatReportsForItself) {
+  elfext::ElfextErrorStringCapture capture;
+  elfext::ObjectModule module;
+  module.setErrorHandler(&capture);
+  EXPECT_FALSE(add("a.o", object().machine(3).bytes())->readObjectModule(module, nullptr));
+  EXPECT_THAT(std::string(capture.getText()), testing::HasSubstr("unsupported machine code 3"));
 }
 
 } // namespace arlib

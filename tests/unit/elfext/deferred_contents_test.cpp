@@ -191,7 +191,7 @@ TEST_F(DeferredContentsTest, CloseTheFileWhenTheyAreDeleted) {
 }
 
 TEST(DeferredContentsOfAModuleTest, CloseTheFileWhenTheModuleGoes) {
-  const RegionsForATest regions;
+  const alloclib::Session session;
   testsupport::MemoryHost host;
   host.addFile("a.o", "0123456789");
   support::FileHandle handle;

@@ -3,7 +3,7 @@
 // What the tests of the object model share: a module in regions that come and go with each test.
 #pragma once
 
-#include "alloclib/interface/process.h"
+#include "alloclib/interface/session.h"
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/elf_constants.h"
@@ -23,15 +23,9 @@
 
 namespace elfext {
 
-// At the end every region must be gone.
-struct RegionsForATest {
-  RegionsForATest() { alloclib::initialise(); }
-  ~RegionsForATest() { alloclib::shutDown(); }
-};
-
 class ModuleTest : public testing::Test {
 private:
-  RegionsForATest m_Regions;
+  alloclib::Session m_Session;
 
 protected:
   Section* makeSection(const char* name = ".text", uint32_t type = SHT_PROGBITS) {

@@ -77,7 +77,7 @@ TEST_F(ObjectModuleTest, StartsEmpty) {
 }
 
 TEST(ObjectModuleRegionsTest, AreTwoThatGoWithTheModule) {
-  const RegionsForATest regions;
+  const alloclib::Session session;
   testing::internal::CaptureStderr();
   alloclib::setTraceLevel(1);
   { const ObjectModule module; }
@@ -150,7 +150,7 @@ TEST_F(ObjectModuleTest, EndsItsImageWhenItIsCleared) {
 }
 
 TEST(ObjectModuleImageTest, EndsWithTheModule) {
-  const RegionsForATest regions;
+  const alloclib::Session session;
   int ends = 0;
   {
     ObjectModule module;
