@@ -332,6 +332,7 @@ TEST_F(ObjectMemberTest, TellsWhyAnObjectHasNoNames) {
               ElementsAre("no: ELF file has unsupported machine code 3 (we only handle EM_ZEV = "
                           "40)"));
   ArchiveMember* inMemory = m_Archive.addMember("b.o", 0, 0, 0, 0);
+  inMemory->setContents("x", 1);
   m_Host.setRoom(0);
   EXPECT_THAT(published(inMemory), ElementsAre("no: "));
   EXPECT_EQ(reports().size(), 1u);
@@ -355,6 +356,7 @@ TEST_F(ObjectMemberTest, MakesAModuleOfAnObjectInMemory) {
   EXPECT_TRUE(member->getContentsLocation()->isTemporary);
   m_Host.setRoom(0);
   ArchiveMember* unflushable = m_Archive.addMember("b.o", 0, 0, 0, 0);
+  unflushable->setContents("x", 1);
   EXPECT_EQ(unflushable->createObjectModule(nullptr), nullptr);
 }
 
