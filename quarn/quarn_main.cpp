@@ -98,11 +98,13 @@ bool openArchive(Run& run, const char* name) {
   run.archive.setClientData(&run.openStatus);
   run.archive.setFileName(name);
   std::shared_ptr<support::SourceFile> file;
+  support::FileKind kind = support::FileKind::Nothing;
   if (run.settings.accessMode == Access_Write) {
-    file = arlib::takeTurn(run.archive.getSourceFiles(), name);
+    file = arlib::takeTurn(run.archive.getSourceFiles(), name, kind);
+  } else {
+    kind = support::fileKind(run.archive.getHost(), name);
   }
-  const bool exists = file != nullptr ||
-                      support::fileKind(run.archive.getHost(), name) != support::FileKind::Nothing;
+  const bool exists = kind != support::FileKind::Nothing;
   if (exists && !run.settings.createArchive) {
     return file != nullptr ? arlib::readFile(file, run.archive)
                            : arlib::readFile(name, run.archive);

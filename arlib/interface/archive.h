@@ -30,6 +30,8 @@
 
 namespace arlib {
 
+class ReadSymbolTable;
+
 enum class SymbolTableMode : uint32_t {
   Always = 0,    // keep a symbol table, even an empty one
   Never = 1,     // never keep one
@@ -43,7 +45,7 @@ public:
   // Empty and up to date. The host must outlive the archive.
   explicit Archive(support::Host& host);
   // Members' temporary files that no write has released stay on disk.
-  ~Archive() = default;
+  ~Archive();
   Archive(const Archive&) = delete;
   Archive& operator=(const Archive&) = delete;
 
@@ -101,8 +103,9 @@ public:
   [[nodiscard]] std::span<ArchiveMember* const> getMembers() const {
     return {m_ArchiveMembers.begin(), m_ArchiveMembers.getSize()};
   }
-  // The symbol table's contents as read, in table order.
+  // The symbol table's contents as read, in table order. They are made when somebody first asks.
   [[nodiscard]] std::span<Symbol* const> getSymbols() const {
+    if (m_ReadSymbolTable != nullptr) makeSymbols();
     return {m_Symbols.begin(), m_Symbols.getSize()};
   }
   [[nodiscard]] const ArchiveMember* getSymbolTable() const { return m_SymbolTable; }
@@ -218,6 +221,7 @@ private:
   bool isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
                     uint32_t& offset, uint32_t& size, int64_t fileSize) const;
   void markEdited();
+  void makeSymbols() const;
   void sortMembers();
   void sortSymbols();
   void groupSymbols();
@@ -253,7 +257,9 @@ private:
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
   elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;
-  elfext::FastArray<Symbol*> m_Symbols;
+  // The table that was read, until its symbols are made, and then these.
+  mutable std::unique_ptr<ReadSymbolTable> m_ReadSymbolTable;
+  mutable elfext::FastArray<Symbol*> m_Symbols;
   elfext::FastArray<Symbol*> m_SortedSymbols;
   SymbolView m_DefinedSymbols;
   ArchiveMember* m_FileNameTable = nullptr;

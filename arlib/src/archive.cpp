@@ -3,6 +3,7 @@
 
 #include "arlib/interface/archive_format.h"
 #include "arlib/interface/name_order.h"
+#include "arlib/src/read_symbol_table.h"
 #include "elfext/interface/sort.h"
 #include "support/interface/path.h"
 
@@ -58,6 +59,8 @@ Archive::Archive(support::Host& host)
       m_DefinedSymbols{elfext::FastArray<Symbol*>(m_ContainerRegion.get()),
                        elfext::FastArray<Symbol*>(m_ContainerRegion.get())} {}
 
+Archive::~Archive() = default;
+
 const char* Archive::copyToRegion(std::string_view text) {
   return alloclib::copyString(*m_ObjectRegion, text);
 }
@@ -92,6 +95,7 @@ void Archive::clear() {
   m_OwnFile.reset();
   m_ArchiveMembers.setSize(0);
   m_SortedArchiveMembers.setSize(0);
+  m_ReadSymbolTable.reset();
   m_Symbols.setSize(0);
   m_SortedSymbols.setSize(0);
   m_FileNameTable = nullptr;
@@ -253,7 +257,20 @@ void Archive::takeOut(std::span<ArchiveMember* const> sortedMembers) {
   m_ArchiveMembers.setSize(static_cast<uint32_t>(end - m_ArchiveMembers.begin()));
 }
 
+// Asking for what was read changes nothing, though it is written down now.
+void Archive::makeSymbols() const {
+  const std::unique_ptr<ReadSymbolTable> table = std::move(m_ReadSymbolTable);
+  table->forEachSymbol([this](std::string_view name, ArchiveMember* member) {
+    const size_t marker = name.find(AttributeMarker);
+    const std::string_view attributes =
+        marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
+    m_Symbols.append(alloclib::create<Symbol>(*m_ObjectRegion, name.substr(0, marker), attributes,
+                                              this, member));
+  });
+}
+
 void Archive::forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers) {
+  if (m_ReadSymbolTable != nullptr) return m_ReadSymbolTable->forgetSymbolsOf(sortedMembers);
   const auto end = std::remove_if(m_Symbols.begin(), m_Symbols.end(), [&](const Symbol* symbol) {
     return std::binary_search(sortedMembers.begin(), sortedMembers.end(),
                               symbol->getDefiningMember(), std::less<>());
@@ -318,7 +335,9 @@ uint32_t Archive::getMemberIndex(const ArchiveMember* archiveMember) const {
 
 uint32_t Archive::getSymbolIndex(const Symbol* symbol) const {
   QUARN_ASSERT(1, symbol != NULL);
-  return indexOf(m_Symbols, symbol);
+  const std::span<Symbol* const> symbols = getSymbols();
+  const auto found = std::find(symbols.begin(), symbols.end(), symbol);
+  return found == symbols.end() ? NotFound : static_cast<uint32_t>(found - symbols.begin());
 }
 
 void Archive::sortMembers() {
@@ -338,6 +357,7 @@ bool Archive::findMembers(std::string_view name, ArchiveMemberList& list) {
 
 void Archive::sortSymbols() {
   if (m_SortedSymbolsUpToDate) return;
+  static_cast<void>(getSymbols());
   m_SortedSymbols.assign(m_Symbols);
   elfext::mergeSort(m_SortedSymbols.span(), [](const Symbol* left, const Symbol* right) {
     return left->getName().compare(right->getName());
@@ -356,6 +376,7 @@ void Archive::groupSymbols() {
   const auto byMember = [](const Symbol* left, const Symbol* right) {
     return std::less<>()(left->getDefiningMember(), right->getDefiningMember());
   };
+  static_cast<void>(getSymbols());
   m_DefinedSymbols.byMember.assign(m_Symbols);
   std::stable_sort(m_DefinedSymbols.byMember.begin(), m_DefinedSymbols.byMember.end(), byMember);
   m_DefinedSymbols.byMemberAndName.assign(m_DefinedSymbols.byMember);

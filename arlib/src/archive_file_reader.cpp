@@ -2,6 +2,7 @@
 #include "arlib/src/archive_file_reader.h"
 
 #include "arlib/interface/archive_file_reader.h"
+#include "arlib/src/read_symbol_table.h"
 #include "support/interface/host_files.h"
 #include "support/interface/path.h"
 
@@ -308,75 +309,11 @@ bool ArchiveFileReader::readSymbolTable() {
   m_Archive.m_SortedSymbolsUpToDate = false;
   m_Archive.m_DefinedSymbolsUpToDate = false;
   if (m_Archive.m_SymbolTable == nullptr) return true;
-  const std::span<const uint8_t> bytes = m_Archive.m_SymbolTable->getContents();
-  uint32_t count = 0;
-  if (!readSymbolCount(bytes, count)) return false;
-  noteMemberOffsets();
-  // The table holds four bytes for each, so the reservation is in proportion to the file.
-  m_Archive.m_Symbols.reserve(count);
-  return readSymbols(bytes, count);
-}
-
-// Before anything is reserved, and in 64 bits: a count near 2^30 would wrap to a small size.
-bool ArchiveFileReader::readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count) {
-  const auto size = static_cast<uint32_t>(bytes.size());
-  if (size < 4) return m_Archive.end(&ErrorHandler::reportSymbolTableTooShort, size);
-  count = getBigEndian32(bytes.data());
-  const uint64_t required = 4 + 4 * uint64_t{count};
-  if (size >= required) return true;
-  return m_Archive.end(&ErrorHandler::reportSymbolTableCountTooLarge, size, count, required);
-}
-
-void ArchiveFileReader::noteMemberOffsets() {
-  uint64_t offset = ArchiveMagic.size();
-  for (const ArchiveMember* member : m_Archive.m_ArchiveMembers) {
-    m_MemberOffsets.push_back(static_cast<uint32_t>(offset));
-    offset = nextHeaderOffset(offset, member->m_Size);
-  }
-}
-
-bool ArchiveFileReader::readSymbols(std::span<const uint8_t> bytes, uint32_t count) {
-  const std::string_view text = asText(bytes);
-  size_t position = 4 + 4 * size_t{count};
-  for (uint32_t i = 0; i < count; ++i) {
-    const size_t end = text.find('\0', position);
-    if (end == text.npos) {
-      return m_Archive.end(&ErrorHandler::reportSymbolNameUnterminated, i, count);
-    }
-    const std::string_view name = text.substr(position, end - position);
-    if (!addSymbol(i, name, getBigEndian32(bytes.data() + 4 + 4 * size_t{i}))) return false;
-    position = end + 1;
-  }
-  const size_t trailing = text.find_first_not_of('\0', position);
-  if (trailing == text.npos) return true;
-  return m_Archive.goOn(&ErrorHandler::reportSymbolTableTrailingData,
-                        static_cast<uint32_t>(trailing), static_cast<uint32_t>(position));
-}
-
-bool ArchiveFileReader::addSymbol(uint32_t index, std::string_view name, uint32_t offset) {
-  ArchiveMember* member = memberAt(offset);
-  if (member == nullptr) {
-    return m_Archive.goOn(&ErrorHandler::reportSymbolAtNoMember, index, name, offset);
-  }
-  if (member->isAuxiliary()) {
-    return m_Archive.goOn(&ErrorHandler::reportSymbolInNonObject, index, name, offset);
-  }
-  const size_t marker = name.find(AttributeMarker);
-  const std::string_view attributes =
-      marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
-  m_Archive.m_Symbols.append(alloclib::create<Symbol>(
-      *m_Archive.m_ObjectRegion, name.substr(0, marker), attributes, &m_Archive, member));
+  auto table = std::make_unique<ReadSymbolTable>(m_Archive.m_SymbolTable->getContents(),
+                                                 m_Archive.getMembers());
+  if (!table->check(m_Archive)) return false;
+  m_Archive.m_ReadSymbolTable = std::move(table);
   return true;
-}
-
-// Symbols of one member stand together in most tables, so the last answer is tried first.
-ArchiveMember* ArchiveFileReader::memberAt(uint32_t offset) {
-  if (m_LastMember >= m_MemberOffsets.size() || m_MemberOffsets[m_LastMember] != offset) {
-    const auto found = std::lower_bound(m_MemberOffsets.begin(), m_MemberOffsets.end(), offset);
-    if (found == m_MemberOffsets.end() || *found != offset) return nullptr;
-    m_LastMember = static_cast<size_t>(found - m_MemberOffsets.begin());
-  }
-  return m_Archive.m_ArchiveMembers[static_cast<uint32_t>(m_LastMember)];
 }
 
 } // namespace arlib

@@ -51,11 +51,6 @@ private:
   bool checkUnchanged();
 
   bool readSymbolTable();
-  bool readSymbolCount(std::span<const uint8_t> bytes, uint32_t& count);
-  void noteMemberOffsets();
-  bool readSymbols(std::span<const uint8_t> bytes, uint32_t count);
-  bool addSymbol(uint32_t index, std::string_view name, uint32_t offset);
-  ArchiveMember* memberAt(uint32_t offset);
 
   [[nodiscard]] std::string_view field(HeaderField which) const {
     return m_Header.substr(which.position, which.width);
@@ -81,10 +76,6 @@ private:
   // The long-name table's text, and where the last terminator in it starts.
   std::string_view m_LongNames;
   size_t m_LastTerminator = std::string_view::npos;
-
-  // The symbol table's look-up: header offset of each member, ascending.
-  std::vector<uint32_t> m_MemberOffsets;
-  size_t m_LastMember = 0;
 };
 
 } // namespace arlib

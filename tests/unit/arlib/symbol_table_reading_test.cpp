@@ -202,4 +202,33 @@ TEST(SymbolViews, AreEmptyAfterAFailedRead) {
   EXPECT_FALSE(reading.archive.findSymbols("s", list));
 }
 
+// ---- Symbols are made when somebody asks
+
+TEST(SymbolTableReading, KnowsTheTableOfTheFileAlsoAfterEdits) {
+  Reading reading(archive()
+                      .symbolTable({{"a1", "a.o"}, {"b1", "b.o"}, {"a2", "a.o"}, {"c1", "c.o"}})
+                      .member("a.o", "1")
+                      .member("b.o", "2")
+                      .member("c.o", "3"));
+  Archive& archive = reading.archive;
+  archive.removeMember(archive.getMembers()[2]);
+  EXPECT_TRUE(archive.getMembers()[1]->clearType());
+  archive.moveMember(archive.getMembers()[2], 1);
+  EXPECT_TRUE(archive.updateAuxiliaryMembers());
+  EXPECT_THAT(symbolNamesOf(archive), ElementsAre("a1", "a2", "c1"));
+  EXPECT_EQ(archive.getSymbols()[2]->getDefiningMember()->getName(), "c.o");
+  archive.removeMember(archive.getSymbols()[2]->getDefiningMember());
+  EXPECT_THAT(symbolNamesOf(archive), ElementsAre("a1", "a2"));
+}
+
+TEST(SymbolTableReading, LeavesOutWhatTheHandlerWentOnFrom) {
+  Reading reading(archive()
+                      .symbolTable({{"nowhere", 12345u}, {"a", "a.o"}, {"table", 8u}})
+                      .member("a.o", "1"));
+  EXPECT_TRUE(reading.isRead);
+  EXPECT_EQ(reading.handler.take().size(), 2u);
+  EXPECT_THAT(symbolNamesOf(reading.archive), ElementsAre("a"));
+  EXPECT_THAT(reading.handler.reports, IsEmpty());
+}
+
 } // namespace arlib

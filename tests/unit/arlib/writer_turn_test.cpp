@@ -18,10 +18,12 @@ protected:
 
   // What this writer would add to.
   std::string readInTurn() {
-    const auto file = takeTurn(m_Archive.getSourceFiles(), "lib.a");
+    const auto file = takeTurn(m_Archive.getSourceFiles(), "lib.a", m_Kind);
     if (file == nullptr || !readFile(file, m_Archive)) return "(none)";
     return contentsOf(member(0));
   }
+
+  support::FileKind m_Kind = support::FileKind::Special;
 };
 
 const std::string StaleWrite = "0 I/O error writing file 'lib.a': Stale file handle";
@@ -48,6 +50,17 @@ TEST_F(WriterTurnTest, EndsWhereTheFileIsGoneWhenItsTurnHasCome) {
   put("first");
   m_Host.setLocks([&] { return m_Host.remove("lib.a"); });
   EXPECT_EQ(readInTurn(), "(none)");
+  EXPECT_EQ(m_Kind, support::FileKind::Nothing);
+}
+
+// A file that appears behind the look is one that this writer has no turn at: he must not be told
+// of it as if he had.
+TEST_F(WriterTurnTest, TellsWhatWasThereWhenItLooked) {
+  FaultyHost host(m_Host);
+  support::SourceFiles files(host);
+  host.disturbCall(2, [&] { put("first"); });
+  EXPECT_EQ(takeTurn(files, "lib.a", m_Kind), nullptr);
+  EXPECT_EQ(m_Kind, support::FileKind::Nothing);
 }
 
 TEST_F(WriterTurnTest, GoesOnWithoutLocksWhereThereAreNone) {
@@ -71,8 +84,14 @@ TEST_F(WriterTurnTest, DoesNotLockWhatItMayNotWrite) {
 TEST_F(WriterTurnTest, OpensNeitherDirectoriesNorDevices) {
   m_Host.addDirectory("dir");
   m_Host.addSpecial("pipe");
-  for (const char* name : {"dir", "pipe", "gone"})
-    EXPECT_EQ(takeTurn(m_Archive.getSourceFiles(), name), nullptr);
+  const std::vector<std::pair<const char*, support::FileKind>> places = {
+      {"dir", support::FileKind::Directory},
+      {"pipe", support::FileKind::Special},
+      {"gone", support::FileKind::Nothing}};
+  for (const auto& [name, kind] : places) {
+    EXPECT_EQ(takeTurn(m_Archive.getSourceFiles(), name, m_Kind), nullptr);
+    EXPECT_EQ(m_Kind, kind);
+  }
 }
 
 // Somebody who doesn't lock was faster.
