@@ -41,8 +41,11 @@ bool ContentsReader::begin(const ArchiveMember& member) {
     m_Remaining = std::min<uint64_t>(m_Remaining, bytes.size());
     return true;
   }
-  m_Offset = member.getContentsLocation()->offset;
-  return turnTo(member.getContentsLocation()->file);
+  const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();
+  m_Offset = location.offset;
+  if (!turnTo(location.file)) return false;
+  if (location.file->isKept()) m_Memory = location.file->getKept().subspan(m_Offset).data();
+  return true;
 }
 
 bool ContentsReader::read(std::span<const uint8_t>& piece) {

@@ -36,7 +36,7 @@ FileProbe openProbe(support::SourceFiles& files, const char* fileName) {
   FileProbe probe;
   probe.statusError = files.getHost().status(fileName, probe.status);
   if (probe.statusError != 0 || probe.status.kind != FileKind::RegularFile) return probe;
-  if (files.open(fileName, probe.file) == 0) {
+  if (files.openToKeep(fileName, probe.file) == 0) {
     probe.status = probe.file->getStatus();
   } else {
     probe.file = files.remember(fileName, probe.status);

@@ -57,15 +57,15 @@ bool ReadSymbolTable::checkEntry(const Archive& archive, uint32_t index, std::st
   if (member == nullptr) {
     return archive.goOn(&ErrorHandler::reportSymbolAtNoMember, index, name, offsetOf(index));
   }
-  if (!member->isAuxiliary()) return true;
+  if (member != archive.getSymbolTable() && member != archive.getFileNameTable()) return true;
   return archive.goOn(&ErrorHandler::reportSymbolInNonObject, index, name, offsetOf(index));
 }
 
 bool ReadSymbolTable::checkRest(const Archive& archive, size_t position) const {
   const size_t trailing = m_Text.find_first_not_of('\0', position);
   if (trailing == m_Text.npos) return true;
-  return archive.goOn(&ErrorHandler::reportSymbolTableTrailingData,
-                      static_cast<uint32_t>(trailing), static_cast<uint32_t>(position));
+  return archive.goOn(&ErrorHandler::reportSymbolTableTrailingData, static_cast<uint32_t>(trailing),
+                      static_cast<uint32_t>(position));
 }
 
 uint32_t ReadSymbolTable::offsetOf(uint32_t index) const {

@@ -19,7 +19,12 @@ ImageBytes::ImageBytes(std::span<const uint8_t> bytes)
     : m_Bytes(bytes.data()), m_Size(bytes.size()) {}
 
 ImageBytes::ImageBytes(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size)
-    : m_Size(size), m_File(std::move(file)), m_FileOffset(offset) {}
+    : m_Size(size), m_File(std::move(file)), m_FileOffset(offset) {
+  // What is in memory already is viewed there.
+  const std::span<const uint8_t> kept = m_File->getKept();
+  if (kept.data() != nullptr && offset <= kept.size() && size <= kept.size() - offset)
+    m_Bytes = kept.data() + offset;
+}
 
 ImageBytes::ImageBytes(support::Host& host, support::FileHandle file, uint64_t offset,
                        uint64_t size, bool closesFile)
@@ -37,7 +42,7 @@ bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
 }
 
 bool ImageBytes::prepare() {
-  if (!isFromFile() || m_Size == 0 || m_Loaded != nullptr) return m_Failure == ImageFailure::None;
+  if (m_Bytes != nullptr || m_Size == 0) return m_Failure == ImageFailure::None;
   m_Loaded.reset(new (std::nothrow) uint8_t[m_Size]);
   if (m_Loaded == nullptr) return fail(ImageFailure::NoMemory);
   m_Bytes = m_Loaded.get();

@@ -71,7 +71,6 @@ private:
   [[nodiscard]] bool load(uint64_t offset, uint64_t size);
   [[nodiscard]] bool loadBlocks(size_t first, size_t end);
   [[nodiscard]] size_t endOfMissing(size_t first, size_t end) const;
-  [[nodiscard]] bool isFromFile() const { return m_File != nullptr || m_Host != nullptr; }
   [[nodiscard]] support::HostError readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done);
 
   const uint8_t* m_Bytes = nullptr;

@@ -6,7 +6,8 @@
 // and others later must not go by its name a second time. So a run reads each file through the one
 // opening that it began with. Only so many files are open at a time; a file that had to be closed
 // in between is opened by its name again, and then it must be the same file, of the same size and
-// time, or its bytes are no longer to be had: the read fails with ESTALE.
+// time, or its bytes are no longer to be had: the read fails with ESTALE. Small files may be read
+// at once and kept, so that none of that is needed for them.
 #pragma once
 
 #include "support/interface/host.h"
@@ -40,6 +41,15 @@ public:
   // Opens a file for reading. The host's error number, or 0.
   [[nodiscard]] HostError open(const char* name, std::shared_ptr<SourceFile>& file);
 
+  // The same for a file that is going to be read several times, as a whole: a small one is read now
+  // and closed, as long as there is room for its bytes.
+  [[nodiscard]] HostError openToKeep(const char* name, std::shared_ptr<SourceFile>& file);
+
+  // In bytes: what is small, and how much is kept of all files together unless it is set.
+  static constexpr uint64_t LargestKept = 0x10000;
+  static constexpr uint64_t DefaultMostKept = 0x1000000;
+  void setMostKept(uint64_t bytes);
+
   // Opens a file so that it can be locked, and keeps it open whatever the bound.
   [[nodiscard]] HostError openForUpdate(const char* name, std::shared_ptr<SourceFile>& file);
 
@@ -60,7 +70,7 @@ private:
 // One of them. It is closed when nobody holds it any more.
 class SourceFile : public std::enable_shared_from_this<SourceFile> {
 public:
-  ~SourceFile() { close(); }
+  ~SourceFile();
   SourceFile(const SourceFile&) = delete;
   SourceFile& operator=(const SourceFile&) = delete;
 
@@ -71,6 +81,11 @@ public:
 
   // As Host::readAt. ESTALE if the file had to be opened again and is another one now.
   [[nodiscard]] HostError readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done);
+
+  // All bytes, if they are kept: as long as this object lives, whatever becomes of the file. Null
+  // data if they are not.
+  [[nodiscard]] std::span<const uint8_t> getKept() const { return {m_Kept.get(), m_KeptSize}; }
+  [[nodiscard]] bool isKept() const { return m_Kept != nullptr; }
 
   // 0 if the file still is as long and as old as when it was opened. ESTALE if it was written to
   // meanwhile: what was read of it may be old in one place and new in another.
@@ -94,12 +109,15 @@ private:
 
   [[nodiscard]] HostError openFirst(bool isForUpdate);
   [[nodiscard]] HostError openAgain();
+  void keepIfSmall();
 
   std::shared_ptr<SourceFiles::Shared> m_Shared;
   std::string m_Name;
   FileStatus m_Status;
   FileHandle m_Handle;
   bool m_IsKeptOpen = false;
+  std::unique_ptr<uint8_t[]> m_Kept;
+  size_t m_KeptSize = 0;
 };
 
 } // namespace support

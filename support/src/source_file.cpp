@@ -15,6 +15,8 @@ struct SourceFiles::Shared {
   Host& host;
   size_t bound;
   std::deque<SourceFile*> open = {};
+  uint64_t mostKept = DefaultMostKept;
+  uint64_t kept = 0; // bytes, of all files
   HostError closeError = 0;
   std::string closeErrorName = {};
 
@@ -37,6 +39,12 @@ struct SourceFiles::Shared {
     while ((error == EMFILE || error == ENFILE) && closeOldest())
       error = openHandle(name, isForUpdate, handle);
     return error;
+  }
+
+  void leave(SourceFile* file) {
+    // Mostly the first: who makes room is the oldest.
+    const auto place = std::find(open.begin(), open.end(), file);
+    if (place != open.end()) open.erase(place);
   }
 
   void noteClose(HostError error, const std::string& name) {
@@ -64,6 +72,16 @@ HostError SourceFiles::open(const char* name, std::shared_ptr<SourceFile>& file)
   return file->openFirst(false);
 }
 
+void SourceFiles::setMostKept(uint64_t bytes) {
+  m_Shared->mostKept = bytes;
+}
+
+HostError SourceFiles::openToKeep(const char* name, std::shared_ptr<SourceFile>& file) {
+  const HostError error = open(name, file);
+  if (error == 0) file->keepIfSmall();
+  return error;
+}
+
 HostError SourceFiles::openForUpdate(const char* name, std::shared_ptr<SourceFile>& file) {
   file.reset(new SourceFile(m_Shared, name));
   return file->openFirst(true);
@@ -78,6 +96,11 @@ std::shared_ptr<SourceFile> SourceFiles::remember(const char* name, const FileSt
 HostError SourceFiles::takeCloseError(std::string& name) {
   name = m_Shared->closeErrorName;
   return std::exchange(m_Shared->closeError, 0);
+}
+
+SourceFile::~SourceFile() {
+  close();
+  m_Shared->kept -= m_KeptSize;
 }
 
 Host& SourceFile::getHost() const {
@@ -107,13 +130,35 @@ HostError SourceFile::openAgain() {
   return error;
 }
 
+// Whatever goes wrong here is left to who wants the bytes: it will go wrong again, or not.
+void SourceFile::keepIfSmall() {
+  const auto size = static_cast<uint64_t>(m_Status.size);
+  if (m_Status.kind != FileKind::RegularFile || size > SourceFiles::LargestKept) return;
+  if (m_Shared->kept + size > m_Shared->mostKept) return;
+  auto bytes = std::make_unique_for_overwrite<uint8_t[]>(static_cast<size_t>(size));
+  size_t done = 0;
+  if (readAt({bytes.get(), static_cast<size_t>(size)}, 0, done) != 0 || done < size) return;
+  if (checkUnchanged() != 0) return;
+  m_Kept = std::move(bytes);
+  m_KeptSize = done;
+  m_Shared->kept += done;
+  close();
+}
+
 HostError SourceFile::readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done) {
   done = 0;
+  if (isKept()) {
+    const std::span<const uint8_t> rest = getKept().subspan(std::min<uint64_t>(offset, m_KeptSize));
+    done = std::min(bytes.size(), rest.size());
+    std::copy_n(rest.begin(), done, bytes.begin());
+    return 0;
+  }
   if (const HostError error = openAgain(); error != 0) return error;
   return m_Shared->host.readAt(m_Handle, bytes, offset, done);
 }
 
 HostError SourceFile::checkUnchanged() {
+  if (isKept()) return 0;
   if (const HostError error = openAgain(); error != 0) return error;
   FileStatus now;
   if (const HostError error = m_Shared->host.statusOf(m_Handle, now); error != 0) return error;
@@ -125,7 +170,7 @@ HostError SourceFile::lock() {
 }
 
 FileHandle SourceFile::giveHandle() {
-  std::erase(m_Shared->open, this);
+  m_Shared->leave(this);
   return std::exchange(m_Handle, {});
 }
 

@@ -31,6 +31,7 @@ protected:
       m_Handler.take();
       Archive archive(m_Host);
       archive.setErrorHandler(&m_Handler);
+      archive.getSourceFiles().setMostKept(0);
       m_Host.failCall(0, 0);
       EXPECT_TRUE(readFile("lib.a", archive));
       archive.addMemberFromFile("a.o");

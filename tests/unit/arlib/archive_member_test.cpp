@@ -25,6 +25,7 @@ protected:
   FailingContents() {
     m_Disk.addFile("a.o", "contents");
     m_Archive.setErrorHandler(&m_Handler);
+    m_Archive.getSourceFiles().setMostKept(0);
     m_Member = m_Archive.addMemberFromFile("a.o");
     m_InMemory = m_Archive.addMember("b.o", 0, 0, 0, 0);
     m_InMemory->setContents("memory", 6);

@@ -68,6 +68,7 @@ TEST_F(ContentsReaderTest, ReportsEachKindOfFailure) {
   FaultyHost host(m_Host);
   Archive archive(host);
   archive.setErrorHandler(&m_Handler);
+  archive.getSourceFiles().setMostKept(0);
   const ArchiveMember* added = archive.addMemberFromFile("x");
   ContentsReader reader(archive);
   std::span<const uint8_t> piece;
@@ -94,6 +95,18 @@ TEST_F(ContentsReaderTest, ReportsAFileThatEndsTooEarlyWithoutAReason) {
   EXPECT_EQ(readAll(reader, *added), "(failed)");
   EXPECT_EQ(reader.getError(), 0);
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'x'"));
+}
+
+TEST_F(ContentsReaderTest, ReadsWhatIsKeptInMemory) {
+  m_Archive.getSourceFiles().setMostKept(1000);
+  const ArchiveMember* added = add("x", "1234");
+  const ArchiveMember* empty = add("y", "");
+  m_Host.addFile("x", "another");
+  ContentsReader reader(m_Archive);
+  EXPECT_EQ(readAll(reader, *added), "1234");
+  EXPECT_EQ(readAll(reader, *empty), "");
+  EXPECT_TRUE(reader.finish());
+  EXPECT_EQ(m_Host.openHandles(), 0u);
 }
 
 // Bytes of before and after would make a member that nobody has ever seen.

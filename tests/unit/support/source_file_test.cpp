@@ -169,4 +169,73 @@ TEST_F(SourceFileTest, OutlivesWhatHasOpenedIt) {
   EXPECT_EQ(m_Host.close(handle), 0);
 }
 
+// ---- Small files that are kept
+
+TEST_F(SourceFileTest, IsReadOnceAndClosedIfItIsSmall) {
+  m_Disk.addFile("a", "small");
+  std::shared_ptr<SourceFile> file;
+  ASSERT_EQ(m_Files.openToKeep("a", file), 0);
+  EXPECT_TRUE(file->isKept());
+  EXPECT_EQ(m_Disk.openHandles(), 0u);
+  m_Disk.addFile("a", "another");
+  EXPECT_EQ(textOf(*file), "small");
+  EXPECT_EQ(file->checkUnchanged(), 0);
+  EXPECT_EQ(file->getKept().size(), 5u);
+  EXPECT_EQ(m_Disk.readCalls(), 1u);
+  std::array<uint8_t, 4> bytes;
+  size_t done = 0;
+  EXPECT_EQ(file->readAt(bytes, 3, done), 0);
+  EXPECT_EQ(done, 2u);
+  EXPECT_EQ(file->readAt(bytes, UINT64_MAX, done), 0);
+  EXPECT_EQ(done, 0u);
+}
+
+TEST_F(SourceFileTest, IsKeptOnlyAsLongAsThereIsRoom) {
+  m_Files.setMostKept(10);
+  m_Disk.addFile("a", "123456");
+  m_Disk.addFile("b", "12345");
+  m_Disk.addFile("c", "1234");
+  std::shared_ptr<SourceFile> first;
+  std::shared_ptr<SourceFile> second;
+  std::shared_ptr<SourceFile> third;
+  ASSERT_EQ(m_Files.openToKeep("a", first), 0);
+  ASSERT_EQ(m_Files.openToKeep("b", second), 0);
+  ASSERT_EQ(m_Files.openToKeep("c", third), 0);
+  EXPECT_TRUE(first->isKept());
+  EXPECT_FALSE(second->isKept());
+  EXPECT_TRUE(third->isKept());
+  EXPECT_EQ(textOf(*second), "12345");
+  first.reset();
+  ASSERT_EQ(m_Files.openToKeep("b", second), 0);
+  EXPECT_TRUE(second->isKept());
+}
+
+TEST_F(SourceFileTest, IsNotKeptIfItIsLarge) {
+  m_Disk.addFile("a", std::string(SourceFiles::LargestKept + 1, 'x'));
+  std::shared_ptr<SourceFile> file;
+  ASSERT_EQ(m_Files.openToKeep("a", file), 0);
+  EXPECT_FALSE(file->isKept());
+  EXPECT_EQ(m_Disk.readCalls(), 0u);
+}
+
+// A failure now is nobody's: it shows when the bytes are wanted, if it is still there.
+TEST_F(SourceFileTest, IsNotKeptIfItCannotBeReadAsItIs) {
+  m_Disk.addFile("a", "small");
+  std::shared_ptr<SourceFile> file;
+  m_Host.failCall(3, EIO);
+  ASSERT_EQ(m_Files.openToKeep("a", file), 0);
+  EXPECT_EQ(m_Host.failedOperation(), "readAt");
+  EXPECT_FALSE(file->isKept());
+  m_Host.failCall(0, 0);
+  EXPECT_EQ(textOf(*file), "small");
+  for (const uint64_t call : {3u, 4u}) {
+    file.reset();
+    m_Disk.addFile("a", "small");
+    m_Host.disturbCall(call, [&] { m_Disk.at("a").bytes = "smaller"; });
+    ASSERT_EQ(m_Files.openToKeep("a", file), 0);
+    EXPECT_FALSE(file->isKept());
+    EXPECT_EQ(file->checkUnchanged(), ESTALE);
+  }
+}
+
 } // namespace support
