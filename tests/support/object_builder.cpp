@@ -4,6 +4,7 @@
 #include "elfext/interface/elf_constants.h"
 
 #include <algorithm>
+#include <unordered_map>
 
 namespace testsupport {
 
@@ -11,16 +12,9 @@ using namespace elfext;
 
 namespace {
 
-// Offset of the text with its terminator in the table, which grows if it may and must.
-uint32_t placeOf(const std::string& text, std::string& table, bool mayGrow) {
-  const std::string wanted = text + '\0';
-  size_t place = table.find(wanted);
-  if (place == std::string::npos && !mayGrow) return 0;
-  if (place == std::string::npos) {
-    place = table.size();
-    table += wanted;
-  }
-  return static_cast<uint32_t>(place);
+// Where the table has the text with its terminator, or npos.
+size_t findText(const std::string& table, const std::string& text) {
+  return table.find(text + '\0');
 }
 
 } // namespace
@@ -89,6 +83,16 @@ ObjectBuilder& ObjectBuilder::nameless() {
   return *this;
 }
 
+ObjectBuilder& ObjectBuilder::separateTexts() {
+  m_SharesEndings = false;
+  return *this;
+}
+
+ObjectBuilder& ObjectBuilder::relocationsLast() {
+  m_PutsRelocationsLast = true;
+  return *this;
+}
+
 ObjectBuilder& ObjectBuilder::extendedNumbering() {
   m_IsExtended = true;
   return *this;
@@ -113,10 +117,25 @@ struct ObjectBuilder::Layout {
   uint32_t nameTable = 0; // 0: none
   uint64_t programHeaders = 0;
   uint64_t sectionHeaders = 0;
+  bool sharesEndings = true;
+  std::vector<std::unordered_map<std::string, uint32_t>> places; // of the texts met so far
 
   uint32_t textPlace(uint32_t table, const std::string& text) {
     if (text.empty() || table >= contents.size()) return 0;
-    return placeOf(text, contents[table], mayGrow[table]);
+    std::string& bytes = contents[table];
+    if (!mayGrow[table]) {
+      const size_t found = findText(bytes, text);
+      return found == std::string::npos ? 0 : static_cast<uint32_t>(found);
+    }
+    const auto [place, isNew] =
+        places[table].try_emplace(text, static_cast<uint32_t>(bytes.size()));
+    if (!isNew) return place->second;
+    const size_t shared = sharesEndings ? findText(bytes, text) : std::string::npos;
+    if (shared == std::string::npos)
+      bytes += text + '\0';
+    else
+      place->second = static_cast<uint32_t>(shared);
+    return place->second;
   }
 };
 
@@ -191,6 +210,7 @@ uint64_t ObjectBuilder::rightEntrySize(uint32_t type) const {
 
 ObjectBuilder::Layout ObjectBuilder::layOut() const {
   Layout layout;
+  layout.sharesEndings = m_SharesEndings;
   if (m_Sections.size() > 1 || m_IsExtended)
     layout.sections.assign(m_Sections.begin(), m_Sections.end());
   if (!layout.sections.empty() && !m_IsNameless) {
@@ -203,6 +223,7 @@ ObjectBuilder::Layout ObjectBuilder::layOut() const {
     layout.mayGrow.push_back(isTable);
     layout.contents.emplace_back(isTable ? 1 : 0, '\0');
   }
+  layout.places.resize(layout.sections.size());
   for (size_t i = 0; i < layout.sections.size(); ++i) {
     for (const SectionBuilder::Piece& piece : layout.sections[i].m_Pieces) {
       // Putting a piece may make a string table grow, never this section.
@@ -226,10 +247,21 @@ void ObjectBuilder::placeContents(Layout& layout) const {
   uint64_t end = isWide() ? 64 : 52;
   if (!m_Segments.empty()) layout.programHeaders = end;
   end += m_Segments.size() * (isWide() ? 56 : 32);
-  for (size_t i = 0; i < layout.sections.size(); ++i) {
+  layout.offsets.resize(layout.sections.size());
+  const auto place = [&](size_t section) {
     end = (end + unit - 1) / unit * unit;
-    layout.offsets.push_back(i == 0 ? 0 : end);
-    end += layout.contents[i].size();
+    layout.offsets[section] = end;
+    end += layout.contents[section].size();
+  };
+  const auto isLast = [&](size_t section) {
+    const uint32_t type = layout.sections[section].m_Type;
+    return m_PutsRelocationsLast && (type == SHT_REL || type == SHT_RELA);
+  };
+  for (size_t i = 1; i < layout.sections.size(); ++i) {
+    if (!isLast(i)) place(i);
+  }
+  for (size_t i = 1; i < layout.sections.size(); ++i) {
+    if (isLast(i)) place(i);
   }
   end = (end + unit - 1) / unit * unit;
   if (!layout.sections.empty()) layout.sectionHeaders = end;
@@ -298,11 +330,9 @@ std::string ObjectBuilder::bytes() const {
   std::string text = headerBytes(layout);
   for (const SegmentSpec& segment : m_Segments)
     putSegment(text, segment);
-  for (uint32_t i = 0; i < layout.sections.size(); ++i) {
-    if (i > 0) text.resize(layout.offsets[i], '\0');
-    text += layout.contents[i];
-  }
   if (!layout.sections.empty()) text.resize(layout.sectionHeaders, '\0');
+  for (uint32_t i = 1; i < layout.sections.size(); ++i)
+    text.replace(layout.offsets[i], layout.contents[i].size(), layout.contents[i]);
   for (uint32_t i = 0; i < layout.sections.size(); ++i)
     putSectionHeader(text, i, layout);
   text += m_Tail;

@@ -155,6 +155,11 @@ public:
   ObjectBuilder& tail(std::string_view bytes);
   // No section-name table.
   ObjectBuilder& nameless();
+  // No text of a string table starts within another one: for tables of very many texts, where the
+  // search for such an ending would take the time.
+  ObjectBuilder& separateTexts();
+  // The rows of relocation sections come behind all other contents, as compilers write them.
+  ObjectBuilder& relocationsLast();
   // Counts and indices that need more than 16 bits are told by section 0.
   ObjectBuilder& extendedNumbering();
 
@@ -199,6 +204,8 @@ private:
   std::vector<std::pair<size_t, uint8_t>> m_Overwritten;
   std::string m_Tail;
   bool m_IsNameless = false;
+  bool m_SharesEndings = true;
+  bool m_PutsRelocationsLast = false;
   bool m_IsExtended = false;
 };
 
