@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The same work done by quarn, ar and llvm-ar, each as a process of its own, in one run: what
-// counts is the ratio between the rows of a case. Run it on a quiet machine.
+// The same work done by quarn, ar and llvm-ar on libraries of any files, each as a process of its
+// own, in one run: what counts is the ratio between the rows of a case. Run it on a quiet machine.
+// For libraries of objects there is compare/.
 //
 //   archiver_bench QUARN [Google Benchmark's own flags]
 #include "bench/sample_library.h"
-#include "bench/sample_objects.h"
 
 #include <benchmark/benchmark.h>
 
@@ -121,30 +121,6 @@ void addLibrariesOfAnyFile(const Archivers& archivers, const bench::SampleFolder
   }
 }
 
-// Only quarn reports what is in the members.
-void addReports(const Archiver& quarn, const bench::SampleFolder& folder, const std::string& what) {
-  const std::string master = folder.path(what + "." + quarn.name + ".a");
-  for (const char* option : {"--sizes", "--entries", "--zs"})
-    addCase(option + ("/" + what), quarn, [] {}, {quarn.program, option, master});
-}
-
-void addLibrariesOfObjects(const Archivers& archivers, const bench::SampleFolder& folder) {
-  const bench::ObjectShape shapes[] = {
-      {"10000_small_objects", 10000, 1, 3, 64, 0},
-      {"300_objects_of_1000_to_3000_sections", 300, 1000, 3000, 16, 0},
-      {"6000_unrelated_objects", 6000, 10, 10, 64, 0},
-      {"6000_builds_of_2000_modules", 6000, 10, 10, 64, 0, 3},
-      {"1_object_of_20000_sections", 1, 20000, 20000, 16, 0},
-      {"200_objects_of_2_megabytes", 200, 1, 4, 500000, 100000},
-  };
-  for (const bench::ObjectShape& shape : shapes) {
-    const Words files = bench::makeObjects(folder, shape);
-    for (const Archiver& archiver : archivers)
-      addCases(archiver, folder, shape.name, files);
-    addReports(archivers.front(), folder, shape.name);
-  }
-}
-
 } // namespace
 
 int main(int argc, char** argv) {
@@ -166,7 +142,6 @@ int main(int argc, char** argv) {
   benchmark::Initialize(&argc, argv);
   const bench::SampleFolder folder;
   addLibrariesOfAnyFile(archivers, folder);
-  addLibrariesOfObjects(archivers, folder);
   benchmark::RunSpecifiedBenchmarks();
   return 0;
 }
