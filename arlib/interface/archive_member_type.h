@@ -6,6 +6,7 @@
 #pragma once
 
 #include "arlib/interface/symbol_name_list.h"
+#include "elfext/interface/attribute_text_cache.h"
 #include "elfext/interface/full_attr.h"
 
 #include <cstdint>
@@ -21,6 +22,9 @@ class ObjectModule;
 namespace arlib {
 
 class ArchiveMember;
+
+// What decoration texts say: members of a library have thousands of them, of which few differ.
+using AttributeRecords = elfext::AttributeTextCache<elfext::FullAttr>;
 
 class ArchiveMemberType {
 public:
@@ -78,9 +82,9 @@ public:
                                   bool useObjectAttributes) const = 0;
 
   // Both at the cost of one read, as the archive wants its objects' attributes. Without attributes
-  // the object says nothing.
-  virtual bool getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
-                            std::optional<elfext::FullAttr>& attributes,
+  // the object says nothing. The records serve all objects of a rebuild.
+  virtual bool getPublished(ArchiveMember* archiveMember, AttributeRecords& records,
+                            SymbolNameList& names, std::optional<elfext::FullAttr>& attributes,
                             std::string& reason) const = 0;
 };
 
@@ -92,7 +96,7 @@ public:
                       std::string& reason) const override;
   bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                           bool useObjectAttributes) const override;
-  bool getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
+  bool getPublished(ArchiveMember* archiveMember, AttributeRecords& records, SymbolNameList& names,
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
 

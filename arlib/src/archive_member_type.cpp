@@ -101,7 +101,7 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
 // none. Texts of a good object are no longer than the object; of those that share their bytes
 // thousands of times over, only the first ones are read.
 bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
-                      elfext::FullAttr& attributes) {
+                      AttributeRecords& records, elfext::FullAttr& attributes) {
   constexpr std::string_view Prefix = elfext::DecorationPrefix;
   constexpr uint64_t AlwaysRead = 0x100000;
   uint64_t left = std::max<uint64_t>(2 * objectSize, AlwaysRead);
@@ -112,7 +112,7 @@ bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
     const std::string_view text(name + Prefix.size(), strnlen(name + Prefix.size(), left + 1));
     if (text.size() > left) break;
     left -= text.size();
-    const elfext::FullAttr stated = elfext::parseAttributeString(text);
+    const elfext::FullAttr& stated = records.get(text);
     if (isFirst)
       attributes = stated;
     else
@@ -125,8 +125,9 @@ bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
 // What the object says of itself: in its decoration symbols, or as a whole. Then an object that
 // says nothing is of the default kind.
 bool findAttributes(const elfext::ObjectModule& module, uint64_t objectSize,
-                    bool useObjectAttributes, elfext::FullAttr& attributes) {
-  if (!useObjectAttributes) return mergeDecorations(module, objectSize, attributes);
+                    bool useObjectAttributes, AttributeRecords& records,
+                    elfext::FullAttr& attributes) {
+  if (!useObjectAttributes) return mergeDecorations(module, objectSize, records, attributes);
   const elfext::BuildAttributes* own = module.getOwnBuildAttributes();
   attributes = own == nullptr ? elfext::DefaultFullAttr : own->getFullAttr();
   return true;
@@ -159,10 +160,12 @@ bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                                                std::string& reason) const {
   std::optional<elfext::FullAttr> attributes;
-  return getPublished(archiveMember, names, attributes, reason);
+  AttributeRecords records(elfext::parseAttributeString);
+  return getPublished(archiveMember, records, names, attributes, reason);
 }
 
-bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, SymbolNameList& names,
+bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember,
+                                             AttributeRecords& records, SymbolNameList& names,
                                              std::optional<elfext::FullAttr>& attributes,
                                              std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
@@ -177,7 +180,7 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, Symbo
   findNames(module, *archiveMember, names);
   elfext::FullAttr stated;
   if (findAttributes(module, archiveMember->getSize(),
-                     archiveMember->getArchive()->getUseObjectBuildAttributes(), stated))
+                     archiveMember->getArchive()->getUseObjectBuildAttributes(), records, stated))
     attributes = stated;
   return true;
 }
@@ -188,7 +191,8 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
   QUARN_ASSERT(1, archiveMember != NULL);
   elfext::ObjectModule module;
   if (!read(*archiveMember, nullptr, module)) return false;
-  return findAttributes(module, archiveMember->getSize(), useObjectAttributes, attributes);
+  AttributeRecords records(elfext::parseAttributeString);
+  return findAttributes(module, archiveMember->getSize(), useObjectAttributes, records, attributes);
 }
 
 } // namespace arlib

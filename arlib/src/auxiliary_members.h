@@ -43,6 +43,7 @@ private:
 
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;
+  AttributeRecords m_Records;
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
   uint32_t m_SymbolCount = 0;
   // By hosting member: whether it is in a group of minor variants.

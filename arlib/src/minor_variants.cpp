@@ -140,7 +140,7 @@ bool MinorVariants::decorate(const ArchiveMember& member, const elfext::FullAttr
   const std::string text = elfext::printAttributeString(difference);
   decoration = std::string(AttributeMarker) + text;
   elfext::FullAttr restored;
-  elfext::mergeFullAttr(restored, elfext::parseAttributeString(text), m_Common);
+  elfext::mergeFullAttr(restored, m_Records.get(text), m_Common);
   if (elfext::isSameBuild(restored, attributes)) return true;
   return m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, member, m_Members);
 }

@@ -43,8 +43,8 @@ findMinorVariants(std::span<const HostingMember> hostingMembers);
 class MinorVariants {
 public:
   // Decorated names go to the region.
-  MinorVariants(Archive& archive, alloclib::RegionGeneral& region)
-      : m_Archive(archive), m_Region(region) {}
+  MinorVariants(Archive& archive, alloclib::RegionGeneral& region, AttributeRecords& records)
+      : m_Archive(archive), m_Region(region), m_Records(records) {}
 
   // Appends the names of all members to the output, in the order of the group. False if a report
   // was answered so.
@@ -63,6 +63,7 @@ private:
 
   Archive& m_Archive;
   alloclib::RegionGeneral& m_Region;
+  AttributeRecords& m_Records;
   // Of the group at hand.
   std::vector<const ArchiveMember*> m_Members;
   std::vector<elfext::FullAttr> m_Attributes;
