@@ -131,6 +131,9 @@ void ObjectReport::printEntries() const {
 void reportObjects(Run& run, uint32_t flags) {
   if (isMissing(run)) return;
   ObjectReport(run.archive, flags).print();
+  // A member that somebody has cut short meanwhile looks like one that is no object. Too late to
+  // take anything back, but not to tell.
+  run.archive.checkOwnFile();
 }
 
 } // namespace quarn

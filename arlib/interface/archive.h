@@ -91,6 +91,9 @@ public:
   // none. When the archive is written, its name must still lead to this file.
   [[nodiscard]] const std::shared_ptr<support::SourceFile>& getOwnFile() const { return m_OwnFile; }
   void setOwnFile(std::shared_ptr<support::SourceFile> file) { m_OwnFile = std::move(file); }
+  // Makes sure that nobody has written to that file since: what was read of it could be old in one
+  // place and new in another. False after a report.
+  bool checkOwnFile();
   // Closes all of them; who wants bytes of them opens them again. False after a report of a close
   // that failed, now or since the last call.
   bool closeFiles();

@@ -129,6 +129,12 @@ support::SourceFile* Archive::hold(const std::shared_ptr<support::SourceFile>& f
   return file.get();
 }
 
+bool Archive::checkOwnFile() {
+  if (m_OwnFile == nullptr) return true;
+  const int error = m_OwnFile->checkUnchanged();
+  return error == 0 || end(&ErrorHandler::reportReadError, m_OwnFile->getName(), error);
+}
+
 int Archive::reportCloseErrors() {
   std::string name;
   const int error = m_SourceFiles.takeCloseError(name);

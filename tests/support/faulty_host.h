@@ -15,7 +15,7 @@
 
 namespace testsupport {
 
-class FaultyHost final : public support::Host {
+class FaultyHost : public support::Host {
 public:
   explicit FaultyHost(support::Host& host) : m_Host(host) {}
 

@@ -125,13 +125,17 @@ ToolRun ToolFolder::collect(int process, const std::string& notes) const {
 }
 
 ToolRun ToolFolder::run(const std::vector<std::string>& words) const {
+  return runOn(support::posixHost(), words);
+}
+
+ToolRun ToolFolder::runOn(support::Host& host, const std::vector<std::string>& words) const {
   std::fflush(nullptr);
   const pid_t process = fork();
   if (process == 0) {
     enter();
     support::installSignalCleanUp();
     const std::vector<const char*> arguments = argumentsOf("quarn", words);
-    quarn::startUp(static_cast<int>(arguments.size()) - 1, arguments.data(), support::posixHost());
+    quarn::startUp(static_cast<int>(arguments.size()) - 1, arguments.data(), host);
   }
   return collect(process);
 }

@@ -9,6 +9,10 @@
 #include <string>
 #include <vector>
 
+namespace support {
+class Host;
+}
+
 namespace testsupport {
 
 struct ToolRun {
@@ -43,6 +47,8 @@ public:
 
   // The words behind the tool's name. A run that takes long is ended.
   [[nodiscard]] ToolRun run(const std::vector<std::string>& words) const;
+  // The same on another host. What it does to itself stays in the other process.
+  [[nodiscard]] ToolRun runOn(support::Host& host, const std::vector<std::string>& words) const;
   // The same by the real program, as users start it.
   [[nodiscard]] ToolRun runProgram(const std::vector<std::string>& words) const;
 
