@@ -132,7 +132,9 @@ bool ArchiveMember::flushContents() {
   support::Host& host = m_Archive->getHost();
   std::string name;
   support::FileHandle file;
-  if (const int error = host.createUnnamedTemporary(name, file); error != 0) {
+  const int error =
+      m_Archive->m_SourceFiles.openOther([&] { return host.createUnnamedTemporary(name, file); });
+  if (error != 0) {
     return m_Archive->fail(&ErrorHandler::reportWriteError, name.c_str(), error);
   }
   const std::span<const uint8_t> bytes = getContents();

@@ -15,6 +15,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <deque>
+#include <functional>
 #include <memory>
 #include <span>
 #include <string>
@@ -56,6 +57,10 @@ public:
   // A file that is not opened before somebody wants its bytes; `status` is what it must be then.
   [[nodiscard]] std::shared_ptr<SourceFile> remember(const char* name, const FileStatus& status);
 
+  // Calls `open`, which opens a file that is none of these; where the process or the machine allows
+  // no more of them, some of these are closed to make room. The host's error number, or 0.
+  [[nodiscard]] HostError openOther(const std::function<HostError()>& open);
+
   // The first failure of a close that nobody has heard of yet: its error number, or 0, and the name
   // of the file. Reading went well all the same.
   [[nodiscard]] HostError takeCloseError(std::string& name);
@@ -91,8 +96,9 @@ public:
   // meanwhile: what was read of it may be old in one place and new in another.
   [[nodiscard]] HostError checkUnchanged();
 
-  // Waits until nobody else has locked the file; only for one that was opened for update. The
-  // host's error number where there are no locks.
+  // Waits until nobody else has locked the file; only for one that was opened for update and not
+  // read yet: what others have written to it while one waited is no change. The host's error number
+  // where there are no locks.
   [[nodiscard]] HostError lock();
 
   // Lets go of the file, and so of its lock. Who reads on opens it again.

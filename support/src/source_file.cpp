@@ -27,18 +27,21 @@ struct SourceFiles::Shared {
     return true;
   }
 
-  HostError openHandle(const char* name, bool isForUpdate, FileHandle& handle) {
-    return isForUpdate ? host.openForUpdate(name, handle) : host.openForReading(name, handle);
+  // The process or the machine may allow fewer files than the bound does.
+  template <class Open>
+  HostError openInRoom(const Open& openOne) {
+    HostError error = openOne();
+    while ((error == EMFILE || error == ENFILE) && closeOldest())
+      error = openOne();
+    return error;
   }
 
-  // The process or the machine may allow fewer files than the bound does.
   HostError openWithinBound(const char* name, bool isForUpdate, FileHandle& handle) {
     while (open.size() >= bound && closeOldest()) {
     }
-    HostError error = openHandle(name, isForUpdate, handle);
-    while ((error == EMFILE || error == ENFILE) && closeOldest())
-      error = openHandle(name, isForUpdate, handle);
-    return error;
+    return openInRoom([&] {
+      return isForUpdate ? host.openForUpdate(name, handle) : host.openForReading(name, handle);
+    });
   }
 
   void leave(SourceFile* file) {
@@ -91,6 +94,10 @@ std::shared_ptr<SourceFile> SourceFiles::remember(const char* name, const FileSt
   std::shared_ptr<SourceFile> file(new SourceFile(m_Shared, name));
   file->m_Status = status;
   return file;
+}
+
+HostError SourceFiles::openOther(const std::function<HostError()>& open) {
+  return m_Shared->openInRoom(open);
 }
 
 HostError SourceFiles::takeCloseError(std::string& name) {
@@ -166,7 +173,10 @@ HostError SourceFile::checkUnchanged() {
 }
 
 HostError SourceFile::lock() {
-  return m_Shared->host.lock(m_Handle);
+  if (const HostError error = m_Shared->host.lock(m_Handle); error != 0) return error;
+  FileStatus now;
+  if (m_Shared->host.statusOf(m_Handle, now) == 0) m_Status = now;
+  return 0;
 }
 
 FileHandle SourceFile::giveHandle() {

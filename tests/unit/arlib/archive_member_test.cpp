@@ -173,6 +173,14 @@ TEST_F(FailingContents, LeaveNoTemporaryFileBehind) {
   EXPECT_TRUE(m_InMemory->flushContents());
 }
 
+// The files that other members come from make room.
+TEST_F(FailingContents, HaveAPlaceToGoAlsoWhereTooManyFilesAreOpen) {
+  m_Host.failCall(1, EMFILE);
+  EXPECT_TRUE(m_InMemory->flushContents());
+  EXPECT_THAT(m_Handler.reports, IsEmpty());
+  EXPECT_TRUE(m_Member->loadContents());
+}
+
 // This is the order of the two steps; the report has told of the loss.
 TEST_F(FailingContents, AreLostIfDiscardedWithoutAPlaceToGo) {
   m_Host.failCall(2, ENOSPC);

@@ -53,6 +53,18 @@ TEST_F(WriterTurnTest, EndsWhereTheFileIsGoneWhenItsTurnHasCome) {
   EXPECT_EQ(m_Kind, support::FileKind::Nothing);
 }
 
+// It has read nothing yet, and so there is nothing that could be old.
+TEST_F(WriterTurnTest, ReadsWhatWasWrittenInPlaceWhileItWaited) {
+  put("first");
+  m_Host.setLocks([&] {
+    m_Host.at("lib.a").bytes = archive().member("a.o", "by another").bytes();
+    m_Host.at("lib.a").modificationTime += 1;
+    return 0;
+  });
+  EXPECT_EQ(readInTurn(), "by another");
+  EXPECT_TRUE(writeFile("lib.a", m_Archive));
+}
+
 // A file that appears behind the look is one that this writer has no turn at: he must not be told
 // of it as if he had.
 TEST_F(WriterTurnTest, TellsWhatWasThereWhenItLooked) {

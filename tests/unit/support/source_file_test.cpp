@@ -130,6 +130,37 @@ TEST_F(SourceFileTest, IsKeptOpenWhileItIsLocked) {
   EXPECT_EQ(textOf(*locked), "locked");
 }
 
+// Nothing has been read of it before.
+TEST_F(SourceFileTest, IsWhatItIsWhenItIsLocked) {
+  m_Disk.addFile("lib", "before");
+  m_Disk.setLocks([&] {
+    m_Disk.at("lib").bytes = "in the meantime";
+    m_Disk.at("lib").modificationTime += 1;
+    return 0;
+  });
+  std::shared_ptr<SourceFile> locked;
+  ASSERT_EQ(m_Files.openForUpdate("lib", locked), 0);
+  EXPECT_EQ(locked->lock(), 0);
+  EXPECT_EQ(locked->getStatus().size, 15);
+  EXPECT_EQ(locked->checkUnchanged(), 0);
+}
+
+TEST_F(SourceFileTest, MakesRoomForOtherFiles) {
+  const auto first = open("a", "first");
+  const auto second = open("b", "second");
+  std::vector<size_t> openHandles;
+  const auto lackRoom = [&] {
+    openHandles.push_back(m_Disk.openHandles());
+    return m_Disk.openHandles() < 2 ? 0 : EMFILE;
+  };
+  EXPECT_EQ(m_Files.openOther(lackRoom), 0);
+  EXPECT_EQ(openHandles, std::vector<size_t>({2, 1}));
+  EXPECT_EQ(m_Files.openOther([] { return ENFILE; }), ENFILE);
+  EXPECT_EQ(m_Disk.openHandles(), 0u);
+  EXPECT_EQ(m_Files.openOther([] { return EIO; }), EIO);
+  EXPECT_EQ(textOf(*first), "first");
+}
+
 TEST_F(SourceFileTest, MayBeRememberedBeforeItIsOpened) {
   m_Disk.addFile("a", "bytes");
   FileStatus status;
