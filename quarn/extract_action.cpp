@@ -25,8 +25,9 @@ constexpr size_t LongestHostName = 255; // of this one
 class Extraction final : public MemberRoutine {
 public:
   explicit Extraction(const Run& run)
-      : m_Settings(run.settings), m_Host(run.archive.getHost()),
-        m_ArchiveStatus(run.archive.getOwnFile()->getStatus()), m_Contents(run.archive) {}
+      : m_Settings(run.settings), m_Files(run.archive.getSourceFiles()),
+        m_Host(run.archive.getHost()), m_ArchiveStatus(run.archive.getOwnFile()->getStatus()),
+        m_Contents(run.archive) {}
 
   void operator()(ArchiveMember& member) override;
 
@@ -37,6 +38,7 @@ private:
   void write(const ArchiveMember& member, const std::string& name, support::FileHandle file);
 
   const Settings& m_Settings;
+  support::SourceFiles& m_Files;
   support::Host& m_Host;
   const support::FileStatus& m_ArchiveStatus;
   ContentsReader m_Contents;
@@ -65,7 +67,8 @@ void Extraction::operator()(ArchiveMember& member) {
     return;
   }
   support::FileHandle file;
-  if (const int error = m_Host.openForWriting(name.c_str(), file); error != 0) {
+  const int error = m_Files.openOther([&] { return m_Host.openForWriting(name.c_str(), file); });
+  if (error != 0) {
     reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
                   hostErrorText(error));
     return;

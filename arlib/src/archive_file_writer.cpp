@@ -165,7 +165,8 @@ bool ArchiveFileWriter::createTemporary() {
   int error = EEXIST;
   for (uint32_t number = 0; error == EEXIST; ++number) {
     m_TemporaryName = m_Target + "." + std::to_string(number);
-    error = m_Host.createTemporary(m_TemporaryName.c_str(), m_Temporary);
+    error = m_Archive.m_SourceFiles.openOther(
+        [this] { return m_Host.createTemporary(m_TemporaryName.c_str(), m_Temporary); });
   }
   return error == 0 || failToWrite(error);
 }
