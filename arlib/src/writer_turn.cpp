@@ -31,7 +31,8 @@ std::shared_ptr<SourceFile> takeTurn(support::SourceFiles& files, const char* fi
     const support::HostError error = files.openForUpdate(fileName, file);
     if (error == ENOENT) continue;
     if (error != 0) return files.remember(fileName, status);
-    // Without locks one goes on as best one can: the writer looks again before it replaces the file.
+    // Without locks one goes on as best one can: the writer looks again before it replaces the
+    // file.
     if (file->lock() != 0 || isStillThere(*file, fileName)) return file;
   }
 }

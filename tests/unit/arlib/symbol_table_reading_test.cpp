@@ -222,9 +222,8 @@ TEST(SymbolTableReading, KnowsTheTableOfTheFileAlsoAfterEdits) {
 }
 
 TEST(SymbolTableReading, LeavesOutWhatTheHandlerWentOnFrom) {
-  Reading reading(archive()
-                      .symbolTable({{"nowhere", 12345u}, {"a", "a.o"}, {"table", 8u}})
-                      .member("a.o", "1"));
+  Reading reading(
+      archive().symbolTable({{"nowhere", 12345u}, {"a", "a.o"}, {"table", 8u}}).member("a.o", "1"));
   EXPECT_TRUE(reading.isRead);
   EXPECT_EQ(reading.handler.take().size(), 2u);
   EXPECT_THAT(symbolNamesOf(reading.archive), ElementsAre("a"));
