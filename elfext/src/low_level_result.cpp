@@ -5,23 +5,36 @@
 
 namespace elfext {
 
-bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result) {
+namespace {
+
+template <class Teller>
+bool mapResult(const Teller& teller, LowLevelResult result) {
   switch (result) {
   case LowLevelResult::Success:
     return true;
   case LowLevelResult::OutsideImage:
-    return refuse(module, &ErrorHandler::ioErrorWriting, -1);
+    return refuse(teller, &ErrorHandler::ioErrorWriting, -1);
   case LowLevelResult::LayerFailure:
-    return refuse(module, &ErrorHandler::ioErrorReading, -1);
+    return refuse(teller, &ErrorHandler::ioErrorReading, -1);
   case LowLevelResult::WrongMagic:
-    return refuse(module, &ErrorHandler::wrongMagic);
+    return refuse(teller, &ErrorHandler::wrongMagic);
   case LowLevelResult::WrongClass:
-    return refuse(module, &ErrorHandler::wrongClass);
+    return refuse(teller, &ErrorHandler::wrongClass);
   case LowLevelResult::NoMemory:
-    return refuse(module, &ErrorHandler::outOfMemory);
+    return refuse(teller, &ErrorHandler::outOfMemory);
   }
   QUARN_ASSERT(1, !"Should never get here");
   return false;
+}
+
+} // namespace
+
+bool mapLowLevelResult(const ReadReporter& reporter, LowLevelResult result) {
+  return mapResult(reporter, result);
+}
+
+bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result) {
+  return mapResult(module, result);
 }
 
 } // namespace elfext

@@ -8,6 +8,7 @@
 namespace elfext {
 
 class ObjectModule;
+class ReadReporter;
 
 enum class LowLevelResult : uint8_t {
   Success = 0,
@@ -21,6 +22,7 @@ enum class LowLevelResult : uint8_t {
 };
 
 // Reports the failure, if it is one, to the module's handler. True for success only.
+[[nodiscard]] bool mapLowLevelResult(const ReadReporter& reporter, LowLevelResult result);
 [[nodiscard]] bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result);
 
 } // namespace elfext
