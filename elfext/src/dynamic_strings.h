@@ -3,20 +3,20 @@
 // The string table of a section with dynamic data.
 #pragma once
 
-#include "elfext/interface/elf_constants.h"
 #include "elfext/src/object_module_reader.h"
 
 namespace elfext {
 
 class DynamicStrings {
 public:
-  // Takes the linked section if it is a string table, which alone is sure to end with a zero byte;
-  // null is none. False, after a report, if its bytes can't be had.
-  [[nodiscard]] bool open(ReadContext& context, const Section* linked) {
-    if (linked == nullptr || linked->getType() != SHT_STRTAB) return true;
-    m_Text = reinterpret_cast<const char*>(context.viewSection(linked->getIndex()));
-    m_Size = linked->getSize();
-    return m_Text != nullptr;
+  // No strings at all.
+  DynamicStrings() = default;
+  // Those of the table that the section names, if it names one.
+  DynamicStrings(ReadContext& context, uint32_t section) {
+    const std::optional<uint32_t> table = context.stringTableOf(section);
+    if (!table) return;
+    m_Text = context.stringsOf(*table);
+    m_Size = context.stringSize(*table);
   }
 
   // Null for an offset that is not in the table.

@@ -23,6 +23,13 @@ struct RecordFormat {
   [[nodiscard]] bool operator==(const RecordFormat&) const = default;
 };
 
+// Places in `ident`.
+constexpr size_t EI_CLASS = 4;
+constexpr size_t EI_DATA = 5;
+constexpr size_t EI_VERSION = 6;
+constexpr size_t EI_OSABI = 7;
+constexpr size_t EI_ABIVERSION = 8;
+
 struct FileHeader {
   std::array<uint8_t, 16> ident = {};
   uint16_t type = 0;

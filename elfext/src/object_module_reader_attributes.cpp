@@ -46,7 +46,7 @@ bool readAttributeSections(ReadContext& context, bool& areSectionsRead) {
     if (!viewContents(context, *section, bytes)) return false;
     if (parseSection(context, bytes, budget)) continue;
     const uint32_t index = section->getIndex();
-    if (!goOn(module, &ErrorHandler::corruptBuildAttributes, index)) return false;
+    if (!goOn(context.reporter, &ErrorHandler::corruptBuildAttributes, index)) return false;
     module.dropBuildAttributes();
     return true;
   }

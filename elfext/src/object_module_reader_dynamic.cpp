@@ -1,37 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Dynamic sections: libraries, search paths, plain values, and the preemption map. Nothing here is
-// ever reported: what makes no sense is passed over.
+// From dynamic sections needed libraries, search paths, plain values, and the preemption maps.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/preemption.h"
 #include "elfext/src/dynamic_strings.h"
-#include "elfext/src/extents.h"
 #include "elfext/src/object_module_reader.h"
-
-#include <set>
 
 namespace elfext {
 
 namespace {
-
-// A tag and its value, of which only the first four bytes count in either class.
-struct DynamicTag {
-  uint32_t tag;
-  uint32_t value;
-};
-
-std::vector<DynamicTag> getTags(const ReadContext& context, const uint8_t* bytes, uint64_t size) {
-  const uint32_t fieldSize = context.format.isWide ? 8 : 4;
-  std::vector<DynamicTag> tags;
-  for (uint64_t pos = 0; size - pos >= 2 * fieldSize; pos += 2 * fieldSize) {
-    const DynamicTag tag = {context.get<uint32_t>(bytes + pos),
-                            context.get<uint32_t>(bytes + pos + fieldSize)};
-    if (tag.tag == DT_NULL) break;
-    tags.push_back(tag);
-  }
-  return tags;
-}
 
 void takeText(ObjectModule& module, const DynamicTag& tag, const DynamicStrings& strings) {
   if (tag.value == 0) return;
@@ -85,60 +63,18 @@ void takeTag(ReadContext& context, const DynamicTag& tag, const DynamicStrings& 
   }
 }
 
-// Where a dynamic section says that a preemption map is.
-struct MapPlace {
-  uint64_t value;
-  uint32_t dynamicSection;
-};
-
 class PreemptionMapReader {
 public:
   explicit PreemptionMapReader(ReadContext& context)
-      : m_Context(context), m_AreFileOffsets(context.module.getMachine() == EM_ZEV &&
-                                             context.module.getOsAbi() == ELFOSABI_ZEV),
-        m_BytesLeft(context.image.getSize()) {}
+      : m_Context(context), m_BytesLeft(context.image.getSize()) {}
 
-  // False if the file can't be read.
-  bool read(std::span<const MapPlace> places) {
-    if (places.empty()) return true;
-    std::vector<Extent> values;
-    for (const MapPlace& place : places)
-      values.push_back({place.value, place.value + 1, 0});
-    const std::vector<uint32_t> sections = findFirstHolders(getExtents(), values);
-    for (size_t i = 0; i < places.size(); ++i) {
-      if (sections[i] != NoExtent && !readAt(sections[i], places[i])) return false;
-    }
-    return true;
+  void read(const PreemptionMapPlace& place) {
+    m_Strings = DynamicStrings(m_Context, place.dynamicSection);
+    readMap(m_Context.viewSection(place.section) + place.start,
+            m_Context.sectionHeaders[place.section].size - place.start);
   }
 
 private:
-  // Values are places in the file for the system that has them so, else addresses.
-  [[nodiscard]] uint64_t startOf(const SectionHeader& header) const {
-    return m_AreFileOffsets ? header.offset : header.addr;
-  }
-
-  [[nodiscard]] std::vector<Extent> getExtents() const {
-    std::vector<Extent> extents;
-    for (uint32_t i = 0; i < m_Context.sectionCount(); ++i) {
-      const SectionHeader& header = m_Context.sectionHeaders[i];
-      if (header.type == SHT_NULL || (m_AreFileOffsets && header.type == SHT_NOBITS)) continue;
-      extents.push_back({startOf(header), endOf(startOf(header), header.size), i});
-    }
-    return extents;
-  }
-
-  bool readAt(uint32_t index, const MapPlace& place) {
-    const SectionHeader& header = m_Context.sectionHeaders[index];
-    if (!hasFileBytes(header)) return true;
-    const uint8_t* bytes = m_Context.viewSection(index);
-    const Section* dynamic = m_Context.module.getSection(place.dynamicSection);
-    m_Strings = {};
-    if (bytes == nullptr || !m_Strings.open(m_Context, dynamic->getLink())) return false;
-    const uint64_t start = place.value - startOf(header);
-    readMap(bytes + start, header.size - start);
-    return true;
-  }
-
   // Records, each a word with the number of preempted libraries and as many names behind two
   // more, up to one with the number 0. All maps together can't be larger than the file, unless
   // somebody made them run into one another.
@@ -173,48 +109,22 @@ private:
   }
 
   ReadContext& m_Context;
-  bool m_AreFileOffsets;
   DynamicStrings m_Strings;
   uint64_t m_BytesLeft;
 };
 
-// What is found on the way over all dynamic sections.
-struct DynamicState {
-  // Each value once: maps can be many and large, and reading one twice tells nothing new.
-  std::set<uint64_t> mapValues = {};
-  std::vector<MapPlace> maps = {};
-  // There is one set of version sections, and what it says is said once.
-  bool areVersionsRead = false;
-};
-
-bool readDynamicSection(ReadContext& context, uint32_t index, DynamicState& state) {
-  const SectionHeader& header = context.sectionHeaders[index];
-  if (header.size == 0) return true;
-  const uint8_t* bytes = context.viewSection(index);
-  if (bytes == nullptr) return false;
-  DynamicStrings strings;
-  if (!strings.open(context, context.module.getSection(index)->getLink())) return false;
-  const std::vector<DynamicTag> tags = getTags(context, bytes, header.size);
-  VersionCounts counts;
-  for (const DynamicTag& tag : tags) {
-    takeTag(context, tag, strings);
-    if (tag.tag == DT_VERDEFNUM && !counts.definitions) counts.definitions = tag.value;
-    if (tag.tag == DT_VERNEEDNUM && !counts.requirements) counts.requirements = tag.value;
-    if (tag.tag == DT_ZEV_PREEMPTMAP && state.mapValues.insert(tag.value).second)
-      state.maps.push_back({tag.value, index});
-  }
-  return state.areVersionsRead || readVersions(context, counts, state.areVersionsRead);
-}
-
 } // namespace
 
-bool readDynamicSections(ReadContext& context) {
-  DynamicState state;
-  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
-    if (context.typeOf(i) != SHT_DYNAMIC || context.isBroken[i]) continue;
-    if (!readDynamicSection(context, i, state)) return false;
+void takeDynamicTables(ReadContext& context) {
+  for (const DynamicTable& table : context.dynamicTables) {
+    const DynamicStrings strings(context, table.section);
+    for (const DynamicTag& tag : table.tags)
+      takeTag(context, tag, strings);
   }
-  return PreemptionMapReader(context).read(state.maps);
+  if (context.versions) takeVersions(context, *context.versions);
+  PreemptionMapReader maps(context);
+  for (const PreemptionMapPlace& place : context.preemptionMaps)
+    maps.read(place);
 }
 
 } // namespace elfext

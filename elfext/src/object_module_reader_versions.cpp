@@ -40,20 +40,18 @@ struct RecordSection {
   }
 };
 
-bool openSection(ReadContext& context, const Section* section, RecordSection& records) {
-  records.size = section->getSize();
-  if (records.size == 0) return true;
-  records.bytes = context.viewSection(section->getIndex());
-  return records.bytes != nullptr && records.strings.open(context, section->getLink());
+RecordSection openSection(ReadContext& context, uint32_t section) {
+  const uint64_t size = context.sectionHeaders[section].size;
+  if (size == 0) return {};
+  return {context.viewSection(section), size, DynamicStrings(context, section)};
 }
 
 class VersionReader {
 public:
   explicit VersionReader(ReadContext& context) : m_Context(context) {}
 
-  bool readDefinitions(const Section* section, uint32_t count) {
-    RecordSection records;
-    if (!openSection(m_Context, section, records)) return false;
+  void readDefinitions(uint32_t section, uint32_t count) {
+    const RecordSection records = openSection(m_Context, section);
     const uint64_t most = std::min<uint64_t>(count, records.size / VerdefSize);
     uint64_t pos = 0;
     for (uint64_t i = 0; i < most && records.contains(pos, VerdefSize); ++i) {
@@ -62,12 +60,10 @@ public:
       if (next == 0) break;
       pos += next;
     }
-    return true;
   }
 
-  bool readRequirements(const Section* section, uint32_t count) {
-    RecordSection records;
-    if (!openSection(m_Context, section, records)) return false;
+  void readRequirements(uint32_t section, uint32_t count) {
+    const RecordSection records = openSection(m_Context, section);
     // Chains that share records, which no good file has, would be walked again and again.
     m_RecordsLeft = records.size / VernauxSize;
     const uint64_t most = std::min<uint64_t>(count, records.size / VerneedSize);
@@ -78,17 +74,13 @@ public:
       if (next == 0) break;
       pos += next;
     }
-    return true;
   }
 
   // Gives each dynamic symbol the version that its word means.
-  bool apply(const Section* versym, std::span<Symbol* const> symbols) {
-    if (symbols.empty()) return true;
-    const uint8_t* words = m_Context.viewSection(versym->getIndex());
-    if (words == nullptr) return false;
+  void apply(uint32_t symbolVersions, std::span<Symbol* const> symbols) {
+    const uint8_t* words = symbols.empty() ? nullptr : m_Context.viewSection(symbolVersions);
     for (size_t i = 1; i < symbols.size(); ++i)
       applyTo(*symbols[i], m_Context.get<uint16_t>(words + 2 * i));
-    return true;
   }
 
 private:
@@ -149,30 +141,16 @@ private:
   uint64_t m_RecordsLeft = 0;
 };
 
-template <class SectionClass>
-const SectionClass* lastOf(std::span<SectionClass* const> sections) {
-  return sections.empty() ? nullptr : sections.back();
-}
-
 } // namespace
 
-bool readVersions(ReadContext& context, const VersionCounts& counts, bool& areVersionsRead) {
-  const ObjectModule& module = context.module;
-  const auto* verdef = lastOf(module.getVerdefSections());
-  const auto* verneed = lastOf(module.getVerneedSections());
-  const auto* versym = lastOf(module.getVersymSections());
-  const auto* dynsym = lastOf(module.getDynsymSections());
-  if (counts.definitions.has_value() != (verdef != nullptr)) return true;
-  if (counts.requirements.has_value() != (verneed != nullptr)) return true;
-  if (versym != nullptr && dynsym != nullptr &&
-      versym->getSize() / 2 != context.rowCount(dynsym->getIndex()))
-    return true;
-  areVersionsRead = true;
+void takeVersions(ReadContext& context, const VersionTables& versions) {
   VersionReader reader(context);
-  if (verdef != nullptr && !reader.readDefinitions(verdef, *counts.definitions)) return false;
-  if (versym == nullptr) return true;
-  if (verneed != nullptr && !reader.readRequirements(verneed, *counts.requirements)) return false;
-  return dynsym == nullptr || reader.apply(versym, context.symbols[dynsym->getIndex()]);
+  if (versions.definitions) reader.readDefinitions(*versions.definitions, versions.definitionCount);
+  if (!versions.symbolVersions) return;
+  if (versions.requirements)
+    reader.readRequirements(*versions.requirements, versions.requirementCount);
+  if (versions.dynamicSymbols)
+    reader.apply(*versions.symbolVersions, context.symbols[*versions.dynamicSymbols]);
 }
 
 } // namespace elfext

@@ -41,11 +41,8 @@ bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, Deferral
                const uint8_t* lentBytes = nullptr) {
   const alloclib::RegionOwner region(
       alloclib::RegionGeneral::Create(0x100000, "readElfFile() region"));
-  ReadContext context = {.module = module,
-                         .image = *image,
-                         .region = *region,
-                         .lentBytes = lentBytes,
-                         .deferral = deferral};
+  const ReadReporter reporter(module);
+  ReadContext context(reporter, *image, *region, module, lentBytes, deferral);
   const bool isRead =
       image->prepare() ? readObjectModule(context, std::move(image)) : context.failRead();
   if (isRead) return true;
