@@ -2,7 +2,6 @@
 #include "elfext/src/build_attributes_injector.h"
 
 #include "elfext/interface/build_attributes_cache.h"
-#include "elfext/interface/object_module.h"
 
 namespace elfext {
 
@@ -22,9 +21,9 @@ size_t costOfDecoding(size_t runSize, bool isZev, const BuildAttributes* start) 
 
 // One run of attributes, and what has come of it: the attributes of an object that had `key`.
 struct BuildAttributesInjector::Run {
-  Run(ObjectModule& module, std::string_view vendor, AttributeBytes bytes)
-      : block(module.getBuildAttributesCache().getBlock(vendor, bytes)),
-        isQobix(vendor == QobixVendor), isZev(vendor == ZevVendor) {}
+  Run(AttributeStore& store, std::string_view vendor, AttributeBytes bytes)
+      : block(store.getCache().getBlock(vendor, bytes)), isQobix(vendor == QobixVendor),
+        isZev(vendor == ZevVendor) {}
 
   const BuildAttributesBlock* block;
   bool isQobix;
@@ -32,22 +31,31 @@ struct BuildAttributesInjector::Run {
   std::unordered_map<const BuildAttributes*, const BuildAttributes*> results = {};
 };
 
-bool BuildAttributesInjector::parseFileSubSubsection(std::string_view vendor, AttributeBytes run) {
+// Nothing is opened for a store that keeps nothing.
+void BuildAttributesInjector::open(std::string_view vendor, AttributeBytes bytes,
+                                   std::optional<Run>& run) {
+  if (m_Store.isKept()) run.emplace(m_Store, vendor, bytes);
+}
+
+bool BuildAttributesInjector::parseFileSubSubsection(std::string_view vendor,
+                                                     AttributeBytes bytes) {
   if (m_Scope != Tag_File) return true;
-  Run fileRun(m_Module, vendor, run);
-  return inject(m_Module, fileRun);
+  std::optional<Run> run;
+  open(vendor, bytes, run);
+  return inject({}, run);
 }
 
 bool BuildAttributesInjector::parseSectionSubSubsection(std::string_view vendor,
                                                         std::span<const uint32_t> indices,
-                                                        AttributeBytes run) {
+                                                        AttributeBytes bytes) {
   if (m_Scope != Tag_Section) return true;
-  Run sectionRun(m_Module, vendor, run);
+  std::optional<Run> run;
+  open(vendor, bytes, run);
   bool areIndicesWell = true;
   for (const uint32_t index : indices) {
-    if (index == 0 || index >= m_Module.getSectionCount())
+    if (index == 0 || index >= m_Store.getSectionCount())
       areIndicesWell = false;
-    else if (!inject(*m_Module.getSection(index), sectionRun))
+    else if (!inject({AttributeHolder::Kind::Section, index}, run))
       return false;
   }
   return areIndicesWell;
@@ -55,34 +63,36 @@ bool BuildAttributesInjector::parseSectionSubSubsection(std::string_view vendor,
 
 bool BuildAttributesInjector::parseSymbolSubSubsection(std::string_view vendor,
                                                        std::span<const uint32_t> indices,
-                                                       AttributeBytes run) {
+                                                       AttributeBytes bytes) {
   if (m_Scope != Tag_Symbol) return true;
-  Run symbolRun(m_Module, vendor, run);
-  const std::span<Symbol* const> symbols = m_Module.getSymbols();
+  std::optional<Run> run;
+  open(vendor, bytes, run);
   bool areIndicesWell = true;
   for (const uint32_t index : indices) {
-    if (index == 0 || index > symbols.size())
+    if (index == 0 || index > m_Store.getSymbolCount())
       areIndicesWell = false;
-    else if (!inject(*symbols[index - 1], symbolRun))
+    else if (!inject({AttributeHolder::Kind::Symbol, index - 1}, run))
       return false;
   }
   return areIndicesWell;
 }
 
 // False when the budget is used up.
-bool BuildAttributesInjector::inject(ObjectWithBuildAttributes& object, Run& run) {
-  if (!m_Budget.take(object.getBlockCount())) return false;
-  object.setBlock(run.block);
-  if (!run.isQobix && !run.isZev) return true;
-  const BuildAttributes* start = object.getOwnBuildAttributes();
-  const auto [result, isNew] = run.results.try_emplace(start, nullptr);
+bool BuildAttributesInjector::inject(AttributeHolder holder, std::optional<Run>& run) {
+  if (!run) return true;
+  if (!m_Budget.take(m_Store.getBlockCount(holder))) return false;
+  m_Store.setBlock(holder, run->block);
+  if (!run->isQobix && !run->isZev) return true;
+  const BuildAttributes* start = m_Store.getOwn(holder);
+  const auto [result, isNew] = run->results.try_emplace(start, nullptr);
   if (isNew) {
-    if (!m_Budget.take(costOfDecoding(run.block->getData().size(), run.isZev, start))) return false;
-    result->second = decode(start, run);
+    const size_t cost = costOfDecoding(run->block->getData().size(), run->isZev, start);
+    if (!m_Budget.take(cost)) return false;
+    result->second = decode(start, *run);
   }
-  object.setOwnBuildAttributes(result->second);
-  if (run.isZev)
-    m_Module.raiseHighestTagsVersion(result->second->getNumericTag(ZevTag::Tag_ZV_version));
+  m_Store.setOwn(holder, result->second);
+  if (run->isZev)
+    m_Store.raiseHighestTagsVersion(result->second->getNumericTag(ZevTag::Tag_ZV_version));
   return true;
 }
 
@@ -96,7 +106,7 @@ const BuildAttributes* BuildAttributesInjector::decode(const BuildAttributes* st
   } else {
     static_cast<void>(ZevBuildAttributesDecodingParser(attributes).parse(run.block->getData()));
   }
-  return m_Module.getBuildAttributesCache().getBuildAttributes(attributes);
+  return m_Store.getCache().getBuildAttributes(attributes);
 }
 
 } // namespace elfext

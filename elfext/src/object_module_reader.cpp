@@ -55,7 +55,7 @@ void makeObjects(ReadContext& context) {
 bool readModule(ReadContext& context) {
   if (!checkTables(context)) return false;
   makeObjects(context);
-  return readBuildAttributes(context);
+  return giveBuildAttributes(context);
 }
 
 } // namespace

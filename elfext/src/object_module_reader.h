@@ -62,8 +62,7 @@ void takeDynamicTables(ReadContext& context);
 void takeVersions(ReadContext& context, const VersionTables& versions);
 void takeDebugOverlays(ReadContext& context);
 void takeSegmentMaps(ReadContext& context);
-// From attribute sections, then from decoration symbols.
-[[nodiscard]] bool readBuildAttributes(ReadContext& context);
+[[nodiscard]] bool giveBuildAttributes(ReadContext& context);
 [[nodiscard]] uint32_t computeReadConditions(const ReadContext& context);
 
 } // namespace elfext
