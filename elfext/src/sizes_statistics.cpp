@@ -9,43 +9,45 @@
 #include "elfext/interface/segment.h"
 #include "elfext/interface/sort.h"
 #include "elfext/src/compressed_section_extractor.h"
+#include "elfext/src/sizes_source.h"
 
 #include <algorithm>
 #include <array>
 #include <cstring>
-#include <vector>
+#include <span>
 
 namespace elfext {
 
 namespace {
 
-bool hasFlag(const Section& section, uint32_t flag) {
-  return (section.getFlags() & flag) != 0;
+using SectionSize = SizesSource::SectionSize;
+using MappingSymbol = SizesSource::MappingSymbol;
+using SegmentSize = SizesSource::SegmentSize;
+
+bool hasFlag(const SectionSize& section, uint32_t flag) {
+  return (section.flags & flag) != 0;
 }
 
-// The total that the mapping symbols at one place choose; the last of them decides.
-uint64_t* destinationOf(const SymbolList& symbols, bool isWritable, SizesStatistics& statistics,
+// The total that a mapping symbol chooses.
+uint64_t* destinationOf(const char* name, bool isWritable, SizesStatistics& statistics,
                         uint64_t& writable) {
-  const char* name = symbols[symbols.getSize() - 1]->getName();
   if (name[1] != 'd') return &statistics.m_Code;
   if (std::strcmp(name, "$d.realdata") != 0) return &statistics.m_LiteralPools;
   return isWritable ? &writable : &statistics.m_RoData;
 }
 
 // An executable section is code, literal pools and data in turn. What comes before the first
-// mapping symbol counts as literal pool.
-void countExecutable(Section& section, SizesStatistics& statistics) {
+// mapping symbol counts as literal pool; of several symbols at one place the last one decides.
+void countExecutable(const SectionSize& section, std::span<const MappingSymbol> symbols,
+                     SizesStatistics& statistics) {
   uint64_t writable = 0;
   uint64_t* destination = &statistics.m_LiteralPools;
-  const uint64_t size = section.getSize();
-  for (uint64_t cursor = 0; cursor < size;) {
-    SymbolList here;
-    if (section.getSymbolsInRange(cursor, cursor, &here))
-      destination = destinationOf(here, hasFlag(section, SHF_WRITE), statistics, writable);
-    SymbolList following;
-    uint64_t next = size;
-    if (section.getFollowingMappingSymbols(cursor + 1, &following))
-      next = std::min(size, following[0]->getHostedSymbolOffset());
+  auto symbol = symbols.begin();
+  for (uint64_t cursor = 0; cursor < section.size;) {
+    for (; symbol != symbols.end() && symbol->offset == cursor; ++symbol)
+      destination = destinationOf(symbol->name, hasFlag(section, SHF_WRITE), statistics, writable);
+    const uint64_t next =
+        symbol == symbols.end() ? section.size : std::min(section.size, symbol->offset);
     *destination += next - cursor;
     cursor = next;
   }
@@ -53,49 +55,38 @@ void countExecutable(Section& section, SizesStatistics& statistics) {
   statistics.m_RwDataCompressed += writable;
 }
 
-void countSection(Section& section, const CompressedSectionExtractor& extractor,
+// By section and offset; those of one place stay in their order. In good objects they are nearly so
+// from the start.
+void sortByPlace(std::vector<MappingSymbol>& symbols) {
+  const auto comesFirst = [](const MappingSymbol& left, const MappingSymbol& right) {
+    return left.section != right.section ? left.section < right.section
+                                         : left.offset < right.offset;
+  };
+  if (!std::is_sorted(symbols.begin(), symbols.end(), comesFirst))
+    std::stable_sort(symbols.begin(), symbols.end(), comesFirst);
+}
+
+void countSection(const SectionSize& section, std::span<const MappingSymbol> symbols,
                   SizesStatistics& statistics) {
-  const uint64_t size = section.getSize();
   if (!hasFlag(section, SHF_ALLOC)) {
-    if (isDebugSectionName(section.getName())) statistics.m_DebugInfo += size;
-  } else if (section.getType() == SHT_NOBITS) {
-    statistics.m_ZiData += size;
+    if (isDebugSectionName(section.name)) statistics.m_DebugInfo += section.size;
+  } else if (section.type == SHT_NOBITS) {
+    statistics.m_ZiData += section.size;
   } else if (hasFlag(section, SHF_EXECINSTR)) {
-    countExecutable(section, statistics);
+    countExecutable(section, symbols, statistics);
   } else if (hasFlag(section, SHF_WRITE)) {
-    uint64_t expanded = size;
-    if (extractor.isActive() && !extractor.isCompressed(section, &expanded)) expanded = size;
-    statistics.m_RwDataCompressed += size;
-    statistics.m_RwDataUncompressed += expanded;
+    statistics.m_RwDataCompressed += section.size;
+    statistics.m_RwDataUncompressed += section.expandedSize;
   } else {
-    statistics.m_RoData += size;
-  }
-}
-
-// Null for a block whose bytes can't be had, which has been told.
-uint64_t* totalFor(const RawDataBlock& block, SizesStatistics& statistics) {
-  std::array<uint8_t, 4096> bytes;
-  for (uint64_t offset = 0; offset < block.getSize();) {
-    const uint64_t count = std::min<uint64_t>(bytes.size(), block.getSize() - offset);
-    if (!block.read(offset, bytes.data(), count)) return nullptr;
-    if (std::any_of(bytes.begin(), bytes.begin() + static_cast<ptrdiff_t>(count),
-                    [](uint8_t byte) { return byte != 0; }))
-      return &statistics.m_RoData;
-    offset += count;
-  }
-  return &statistics.m_InternalPadding;
-}
-
-void countRawData(const ObjectModule& module, SizesStatistics& statistics) {
-  for (const RawDataBlock* block : module.getRawDataBlocks()) {
-    if (uint64_t* total = totalFor(*block, statistics)) *total += block->getSize();
+    statistics.m_RoData += section.size;
   }
 }
 
 // File offsets.
 struct Range {
-  Range(uint64_t offset, uint64_t size)
-      : start(offset), end(size > UINT64_MAX - offset ? UINT64_MAX : offset + size) {
+  explicit Range(const SizesSource::FileRange& range)
+      : start(range.offset),
+        end(range.size > UINT64_MAX - range.offset ? UINT64_MAX : range.offset + range.size) {
     QUARN_ASSERT(1, start <= end);
   }
 
@@ -109,45 +100,23 @@ void sortByStart(std::vector<Range>& ranges) {
   });
 }
 
-std::vector<Range> getSegmentRanges(const ObjectModule& module) {
+std::vector<Range> getSegmentRanges(const SizesSource& source) {
   std::vector<Range> ranges;
-  for (const Segment* segment : module.getSegments()) {
-    uint64_t offset = 0;
-    segment->getFileExtent(&offset, nullptr);
-    if (segment->getFileSize() != 0) ranges.emplace_back(offset, segment->getFileSize());
+  for (const SegmentSize& segment : source.segments) {
+    if (segment.range.size != 0) ranges.emplace_back(segment.range);
   }
-  sortByStart(ranges);
-  return ranges;
-}
-
-std::vector<Range> getOccupiedRanges(const ObjectModule& module) {
-  std::vector<Range> ranges;
-  const auto add = [&ranges](const FileRegion& region) {
-    uint64_t offset = 0;
-    uint64_t size = 0;
-    region.getFileExtent(&offset, &size);
-    if (size != 0) ranges.emplace_back(offset, size);
-  };
-  for (const Section* section : module.getSections())
-    add(*section);
-  for (const RawDataBlock* block : module.getRawDataBlocks())
-    add(*block);
-  // The headers count also where they are empty.
-  ranges.emplace_back(0, module.getElfHeaderSize());
-  ranges.emplace_back(module.getProgramHeaderOffset(),
-                      uint64_t{module.getProgramHeaderEntrySize()} * module.getSegmentCount());
-  ranges.emplace_back(module.getSectionHeaderOffset(),
-                      uint64_t{module.getSectionHeaderEntrySize()} * module.getSectionCount());
   sortByStart(ranges);
   return ranges;
 }
 
 // Bytes of segments that lie before or between occupied ranges. The place in the occupied ranges is
 // kept from one segment to the next, so a segment that starts before it counts what is there again.
-void countGaps(const ObjectModule& module, SizesStatistics& statistics) {
-  const std::vector<Range> occupied = getOccupiedRanges(module);
+void countGaps(const SizesSource& source, SizesStatistics& statistics) {
+  if (source.segments.empty()) return;
+  std::vector<Range> occupied(source.occupied.begin(), source.occupied.end());
+  sortByStart(occupied);
   size_t i = 0;
-  for (const Range& segment : getSegmentRanges(module)) {
+  for (const Range& segment : getSegmentRanges(source)) {
     uint64_t cursor = segment.start;
     for (; i < occupied.size(); ++i) {
       const uint64_t limit = std::min(occupied[i].start, segment.end);
@@ -158,20 +127,27 @@ void countGaps(const ObjectModule& module, SizesStatistics& statistics) {
   }
 }
 
-SizesStatistics countSections(ObjectModule& module) {
+SizesStatistics countSections(SizesSource& source) {
   SizesStatistics statistics;
-  const CompressedSectionExtractor extractor(module);
-  for (Section* section : module.getSections())
-    countSection(*section, extractor, statistics);
-  countRawData(module, statistics);
-  countGaps(module, statistics);
+  sortByPlace(source.mappingSymbols);
+  std::span<const MappingSymbol> symbols = source.mappingSymbols;
+  for (uint32_t i = 0; i < source.sections.size(); ++i) {
+    const auto isElsewhere = [i](const MappingSymbol& symbol) { return symbol.section != i; };
+    const auto end = std::find_if(symbols.begin(), symbols.end(), isElsewhere);
+    const auto count = static_cast<size_t>(end - symbols.begin());
+    countSection(source.sections[i], symbols.first(count), statistics);
+    symbols = symbols.subspan(count);
+  }
+  for (const SizesSource::RawData& data : source.rawData)
+    (data.isZero ? statistics.m_InternalPadding : statistics.m_RoData) += data.size;
+  countGaps(source, statistics);
   return statistics;
 }
 
-void countSegment(const Segment& segment, SizesStatistics& statistics) {
-  const uint64_t fileSize = segment.getFileSize();
-  const uint32_t access = segment.getFlags() & (PF_R | PF_W);
-  if ((segment.getFlags() & PF_X) != 0) {
+void countSegment(const SegmentSize& segment, SizesStatistics& statistics) {
+  const uint64_t fileSize = segment.range.size;
+  const uint32_t access = segment.flags & (PF_R | PF_W);
+  if ((segment.flags & PF_X) != 0) {
     statistics.m_Code += fileSize;
   } else if (access == (PF_R | PF_W)) {
     statistics.m_RwDataUncompressed += fileSize;
@@ -181,24 +157,105 @@ void countSegment(const Segment& segment, SizesStatistics& statistics) {
   } else {
     return;
   }
-  statistics.m_ZiData += segment.getMemorySize() - fileSize;
+  statistics.m_ZiData += segment.memorySize - fileSize;
 }
 
-SizesStatistics countSegments(const ObjectModule& module) {
+SizesStatistics countSegments(const SizesSource& source) {
   SizesStatistics statistics;
-  for (const Segment* segment : module.getSegments()) {
-    if (segment->getType() == PT_LOAD) countSegment(*segment, statistics);
+  for (const SegmentSize& segment : source.segments) {
+    if (segment.type == PT_LOAD) countSegment(segment, statistics);
   }
   return statistics;
 }
 
+// ---- From a model
+
+void addMappingSymbols(const Section& section, SizesSource& source) {
+  for (uint32_t i = 0; i < section.getHostedSymbolCount(); ++i) {
+    const Symbol& symbol = *section.getHostedSymbol(i);
+    if (symbol.getClass() == Symbol::Class_Mapping)
+      source.mappingSymbols.push_back(
+          {section.getIndex(), symbol.getHostedSymbolOffset(), symbol.getName()});
+  }
+}
+
+SizesSource::FileRange rangeOf(const FileRegion& region) {
+  SizesSource::FileRange range;
+  region.getFileExtent(&range.offset, &range.size);
+  return range;
+}
+
+void addOccupied(const SizesSource::FileRange& range, SizesSource& source) {
+  if (range.size != 0) source.occupied.push_back(range);
+}
+
+void addSections(ObjectModule& module, SizesSource& source) {
+  constexpr uint32_t CodeFlags = SHF_ALLOC | SHF_EXECINSTR;
+  const CompressedSectionExtractor extractor(module);
+  for (const Section* section : module.getSections()) {
+    const uint64_t size = section->getSize();
+    uint64_t expanded = size;
+    if (extractor.isActive() && !extractor.isCompressed(*section, &expanded)) expanded = size;
+    source.sections.push_back(
+        {section->getName(), section->getType(), section->getFlags(), size, expanded});
+    addOccupied(rangeOf(*section), source);
+    if ((section->getFlags() & CodeFlags) == CodeFlags) addMappingSymbols(*section, source);
+  }
+}
+
+// Blocks whose bytes can't be had, which has been told, are left out.
+void addRawData(const ObjectModule& module, SizesSource& source) {
+  std::array<uint8_t, 4096> bytes;
+  for (const RawDataBlock* block : module.getRawDataBlocks()) {
+    addOccupied(rangeOf(*block), source);
+    const std::optional<bool> isZero =
+        isAllZero(block->getSize(), [&](uint64_t offset, uint64_t count) {
+          return block->read(offset, bytes.data(), count) ? bytes.data() : nullptr;
+        });
+    if (isZero) source.rawData.push_back({block->getSize(), *isZero});
+  }
+}
+
+SizesSource getSizesSource(ObjectModule& module) {
+  SizesSource source;
+  addSections(module, source);
+  addRawData(module, source);
+  for (const Segment* segment : module.getSegments()) {
+    source.segments.push_back(
+        {segment->getType(), segment->getFlags(), rangeOf(*segment), segment->getMemorySize()});
+  }
+  source.occupied.push_back({0, module.getElfHeaderSize()});
+  source.occupied.push_back(
+      {module.getProgramHeaderOffset(),
+       uint64_t{module.getProgramHeaderEntrySize()} * module.getSegmentCount()});
+  source.occupied.push_back(
+      {module.getSectionHeaderOffset(),
+       uint64_t{module.getSectionHeaderEntrySize()} * module.getSectionCount()});
+  return source;
+}
+
 } // namespace
+
+std::optional<bool> isAllZero(uint64_t size,
+                              const std::function<const uint8_t*(uint64_t, uint64_t)>& view) {
+  constexpr uint64_t PieceSize = 4096;
+  for (uint64_t offset = 0; offset < size; offset += PieceSize) {
+    const uint64_t count = std::min(PieceSize, size - offset);
+    const uint8_t* bytes = view(offset, count);
+    if (bytes == nullptr) return std::nullopt;
+    if (std::any_of(bytes, bytes + count, [](uint8_t byte) { return byte != 0; })) return false;
+  }
+  return true;
+}
+
+SizesStatistics computeSizesStatistics(SizesSource source) {
+  const bool hasOnlySegments = source.sections.empty() && !source.segments.empty();
+  return hasOnlySegments ? countSegments(source) : countSections(source);
+}
 
 SizesStatistics computeSizesStatistics(ObjectModule* objectModule) {
   QUARN_ASSERT(1, objectModule != NULL);
-  const bool hasOnlySegments =
-      objectModule->getSectionCount() == 0 && objectModule->getSegmentCount() != 0;
-  return hasOnlySegments ? countSegments(*objectModule) : countSections(*objectModule);
+  return computeSizesStatistics(getSizesSource(*objectModule));
 }
 
 void printSizesStatistics(const SizesStatistics& statistics, std::FILE* f) {
