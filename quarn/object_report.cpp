@@ -5,15 +5,15 @@
 #include "quarn/actions.h"
 
 #include "arlib/interface/archive_member.h"
-#include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/elf_constants.h"
-#include "elfext/interface/object_module.h"
+#include "elfext/interface/object_outline.h"
 #include "elfext/interface/sizes_statistics.h"
 #include "quarn/reporting.h"
 #include "support/interface/shared_texts.h"
 
 #include <cstdint>
 #include <deque>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -50,7 +50,7 @@ public:
 private:
   [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
   void addMember(ArchiveMember& member);
-  void addEntries(const elfext::ObjectModule& module, const ArchiveMember& member);
+  void addEntries(const elfext::ObjectOutline& outline, const ArchiveMember& member);
   void addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member);
   void printEntries() const;
 
@@ -78,29 +78,31 @@ void ObjectReport::print() {
 
 void ObjectReport::addMember(ArchiveMember& member) {
   if (member.getType() != arlib::ElfImageArchiveMemberType::getInstance()) return;
-  elfext::ObjectModule module;
-  elfext::BySizeDeferredContentsSelector selector;
-  if (!member.readObjectModule(module, &selector)) return;
-  const elfext::SizesStatistics totals = elfext::computeSizesStatistics(&module);
-  if (module.hasLostContents()) return;
-  addEntries(module, member);
-  addSizes(totals, member);
+  if (!member.flushContents()) return;
+  const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();
+  elfext::ObjectOutline outline;
+  if (!outline.read(location.file->shared_from_this(), location.offset, member.getSize(), nullptr,
+                    nullptr))
+    return;
+  const std::optional<elfext::SizesStatistics> totals = outline.computeSizes();
+  if (!totals) return;
+  addEntries(outline, member);
+  addSizes(*totals, member);
 }
 
-void ObjectReport::addEntries(const elfext::ObjectModule& module, const ArchiveMember& member) {
+void ObjectReport::addEntries(const elfext::ObjectOutline& outline, const ArchiveMember& member) {
   constexpr uint32_t EntryFlags = elfext::SHF_ALLOC | EntryFlag;
   std::vector<const char*> names;
-  for (const elfext::Section* section : module.getSections()) {
-    if (section->getType() != elfext::SHT_PROGBITS) continue;
-    if ((section->getFlags() & EntryFlags) != EntryFlags) continue;
-    const char* name = section->getName();
-    names.push_back(name == nullptr ? "" : name);
+  for (const elfext::ObjectOutline::OutlinedSection& section : outline.getSections()) {
+    if (section.type != elfext::SHT_PROGBITS) continue;
+    if ((section.flags & EntryFlags) != EntryFlags) continue;
+    names.push_back(section.name == nullptr ? "" : section.name);
   }
   const auto copy = [this](std::string_view whole) -> std::string_view {
     return m_SectionNames.emplace_back(whole);
   };
   for (const std::string_view name : support::copyShared(names, copy))
-    m_Entries.push_back({static_cast<uint32_t>(module.getEntry()), name, member.getName()});
+    m_Entries.push_back({static_cast<uint32_t>(outline.getEntry()), name, member.getName()});
 }
 
 void ObjectReport::addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member) {

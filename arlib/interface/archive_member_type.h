@@ -16,7 +16,7 @@
 
 namespace elfext {
 class ErrorHandler;
-class ObjectModule;
+class ObjectOutline;
 } // namespace elfext
 
 namespace arlib {
@@ -101,9 +101,9 @@ public:
                     std::string& reason) const override;
 
 private:
-  // Reads the member into a fresh module, under that handler. False after a report, if any.
+  // Reads the member's tables, under that handler. False after a report, if any.
   static bool read(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
-                   elfext::ObjectModule& module);
+                   bool wantsAttributes, elfext::ObjectOutline& outline);
 };
 
 } // namespace arlib

@@ -6,13 +6,11 @@
 #include "checking/interface/checking.h"
 #include "elfext/interface/attribute_relations.h"
 #include "elfext/interface/attribute_string.h"
-#include "elfext/interface/build_attributes.h"
 #include "elfext/interface/debug_section_name.h"
-#include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/format_recognizer.h"
-#include "elfext/interface/object_module.h"
+#include "elfext/interface/object_outline.h"
 #include "support/interface/shared_texts.h"
 
 #include <algorithm>
@@ -69,15 +67,14 @@ bool ElfImageArchiveMemberType::isElfImage(const ArchiveMember* archiveMember) c
 
 namespace {
 
+using OutlinedSymbols = std::vector<elfext::ObjectOutline::OutlinedSymbol>;
+
 // Any definition that is not local; debug symbols only if the archive wants them.
-bool isPublished(const elfext::Symbol& symbol, bool includeDebugSymbols) {
-  if (symbol.getCategory() == elfext::Symbol::Category_Undefined) return false;
-  if (symbol.getBinding() == elfext::STB_LOCAL) return false;
-  if (!includeDebugSymbols && symbol.getCategory() == elfext::Symbol::Category_Hosted &&
-      elfext::isDebugSectionName(symbol.getHostedSymbolSection()->getName())) {
-    return false;
-  }
-  return symbol.getName() != nullptr && *symbol.getName() != '\0';
+bool isPublished(const elfext::ObjectOutline::OutlinedSymbol& symbol, bool includeDebugSymbols) {
+  if (symbol.category == elfext::Symbol::Category_Undefined) return false;
+  if (symbol.binding == elfext::STB_LOCAL) return false;
+  if (!includeDebugSymbols && elfext::isDebugSectionName(symbol.sectionName)) return false;
+  return symbol.name != nullptr && *symbol.name != '\0';
 }
 
 // Names that are more bytes than their object has in all must have bytes in common.
@@ -100,14 +97,14 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
 // All that the object's decoration symbols say, whatever else the symbols are. False if there are
 // none. Texts of a good object are no longer than the object; of those that share their bytes
 // thousands of times over, only the first ones are read.
-bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
+bool mergeDecorations(const OutlinedSymbols& symbols, uint64_t objectSize,
                       AttributeRecords& records, elfext::FullAttr& attributes) {
   constexpr std::string_view Prefix = elfext::DecorationPrefix;
   constexpr uint64_t AlwaysRead = 0x100000;
   uint64_t left = std::max<uint64_t>(2 * objectSize, AlwaysRead);
   bool isFirst = true;
-  for (const elfext::Symbol* symbol : module.getSymbols()) {
-    const char* name = symbol->getName();
+  for (const elfext::ObjectOutline::OutlinedSymbol& symbol : symbols) {
+    const char* name = symbol.name;
     if (name == nullptr || std::strncmp(name, Prefix.data(), Prefix.size()) != 0) continue;
     const std::string_view text(name + Prefix.size(), strnlen(name + Prefix.size(), left + 1));
     if (text.size() > left) break;
@@ -124,21 +121,21 @@ bool mergeDecorations(const elfext::ObjectModule& module, uint64_t objectSize,
 
 // What the object says of itself: in its decoration symbols, or as a whole. Then an object that
 // says nothing is of the default kind.
-bool findAttributes(const elfext::ObjectModule& module, uint64_t objectSize,
-                    bool useObjectAttributes, AttributeRecords& records,
+bool findAttributes(const elfext::ObjectOutline& outline, const OutlinedSymbols& symbols,
+                    uint64_t objectSize, bool useObjectAttributes, AttributeRecords& records,
                     elfext::FullAttr& attributes) {
-  if (!useObjectAttributes) return mergeDecorations(module, objectSize, records, attributes);
-  const elfext::BuildAttributes* own = module.getOwnBuildAttributes();
-  attributes = own == nullptr ? elfext::DefaultFullAttr : own->getFullAttr();
+  if (!useObjectAttributes) return mergeDecorations(symbols, objectSize, records, attributes);
+  const elfext::FullAttr* own = outline.getOwnAttributes();
+  attributes = own == nullptr ? elfext::DefaultFullAttr : *own;
   return true;
 }
 
-void findNames(const elfext::ObjectModule& module, const ArchiveMember& archiveMember,
+void findNames(const OutlinedSymbols& symbols, const ArchiveMember& archiveMember,
                SymbolNameList& names) {
   const bool includeDebugSymbols = archiveMember.getArchive()->getIncludeDebugSymbols();
   std::vector<const char*> published;
-  for (const elfext::Symbol* symbol : module.getSymbols()) {
-    if (isPublished(*symbol, includeDebugSymbols)) published.push_back(symbol->getName());
+  for (const elfext::ObjectOutline::OutlinedSymbol& symbol : symbols) {
+    if (isPublished(symbol, includeDebugSymbols)) published.push_back(symbol.name);
   }
   names.clear();
   addNames(published, archiveMember.getSize(), names);
@@ -147,12 +144,14 @@ void findNames(const elfext::ObjectModule& module, const ArchiveMember& archiveM
 } // namespace
 
 bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
-                                     elfext::ErrorHandler* errorHandler,
-                                     elfext::ObjectModule& module) {
-  elfext::BySizeDeferredContentsSelector selector;
-  module.setObjectName(std::string(archiveMember.getName()).c_str());
-  module.setErrorHandler(errorHandler);
-  if (!archiveMember.flushContents() || !archiveMember.readInto(module, &selector)) return false;
+                                     elfext::ErrorHandler* errorHandler, bool wantsAttributes,
+                                     elfext::ObjectOutline& outline) {
+  if (!archiveMember.flushContents()) return false;
+  const ArchiveMember::ContentsLocation& location = *archiveMember.getContentsLocation();
+  const std::string name(archiveMember.getName());
+  if (!outline.read(location.file->shared_from_this(), location.offset, archiveMember.getSize(),
+                    errorHandler, name.c_str(), wantsAttributes))
+    return false;
   archiveMember.discardContents();
   return true;
 }
@@ -169,18 +168,20 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember,
                                              std::optional<elfext::FullAttr>& attributes,
                                              std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
+  const bool useObjectAttributes = archiveMember->getArchive()->getUseObjectBuildAttributes();
   elfext::ElfextErrorStringCapture capture;
-  elfext::ObjectModule module;
+  elfext::ObjectOutline outline;
   reason.clear();
   attributes.reset();
-  if (!read(*archiveMember, &capture, module)) {
+  if (!read(*archiveMember, &capture, useObjectAttributes, outline)) {
     reason = capture.getText();
     return false;
   }
-  findNames(module, *archiveMember, names);
+  const OutlinedSymbols symbols = outline.getSymbols();
+  findNames(symbols, *archiveMember, names);
   elfext::FullAttr stated;
-  if (findAttributes(module, archiveMember->getSize(),
-                     archiveMember->getArchive()->getUseObjectBuildAttributes(), records, stated))
+  if (findAttributes(outline, symbols, archiveMember->getSize(), useObjectAttributes, records,
+                     stated))
     attributes = stated;
   return true;
 }
@@ -189,10 +190,11 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
                                                    elfext::FullAttr& attributes,
                                                    bool useObjectAttributes) const {
   QUARN_ASSERT(1, archiveMember != NULL);
-  elfext::ObjectModule module;
-  if (!read(*archiveMember, nullptr, module)) return false;
+  elfext::ObjectOutline outline;
+  if (!read(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
   AttributeRecords records(elfext::parseAttributeString);
-  return findAttributes(module, archiveMember->getSize(), useObjectAttributes, records, attributes);
+  return findAttributes(outline, outline.getSymbols(), archiveMember->getSize(),
+                        useObjectAttributes, records, attributes);
 }
 
 } // namespace arlib

@@ -10,6 +10,7 @@
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/symbol_version_definition.h"
 #include "elfext/interface/symbol_version_requirement.h"
+#include "elfext/src/symbol_class.h"
 
 #include <cstring>
 #include <string_view>
@@ -19,13 +20,18 @@ namespace elfext {
 
 static_assert(std::is_trivially_destructible_v<Symbol>, "it dies with its region");
 
-Symbol::Class Symbol::getClass() const {
+Symbol::Class classOf(const char* name) {
   constexpr std::string_view mappingLetters = "adtx";
   constexpr std::string_view tagLetters = "bfpv";
-  if (m_Name == nullptr || m_Name[0] != '$' || m_Name[1] == '\0') return Class_Ordinary;
-  const bool endsThere = m_Name[2] == '\0' || m_Name[2] == '.';
-  if (endsThere && mappingLetters.find(m_Name[1]) != mappingLetters.npos) return Class_Mapping;
-  return tagLetters.find(m_Name[1]) != tagLetters.npos ? Class_Tag : Class_Ordinary;
+  if (name == nullptr || name[0] != '$' || name[1] == '\0') return Symbol::Class_Ordinary;
+  const bool endsThere = name[2] == '\0' || name[2] == '.';
+  if (endsThere && mappingLetters.find(name[1]) != mappingLetters.npos)
+    return Symbol::Class_Mapping;
+  return tagLetters.find(name[1]) != tagLetters.npos ? Symbol::Class_Tag : Symbol::Class_Ordinary;
+}
+
+Symbol::Class Symbol::getClass() const {
+  return classOf(m_Name);
 }
 
 uint64_t Symbol::getAddress() const {

@@ -1,0 +1,66 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What an object file says of itself, for who wants no more than its symbols' names, the sizes of
+// its parts or its build attributes: found in its tables, where they lie, and no model is made. The
+// checks, and so the reports, are those of readElfFile. A program that uses it has an
+// alloclib::Session for as long as it does.
+#pragma once
+
+#include "elfext/interface/full_attr.h"
+#include "elfext/interface/sizes_statistics.h"
+#include "elfext/interface/symbol.h"
+#include "support/interface/source_file.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace elfext {
+
+class ErrorHandler;
+
+class ObjectOutline {
+public:
+  struct OutlinedSection {
+    const char* name; // null for none
+    uint32_t type;
+    uint64_t flags;
+  };
+  struct OutlinedSymbol {
+    const char* name; // null for none
+    Symbol::Category category;
+    uint32_t binding;
+    const char* sectionName; // of a hosted symbol; null for none
+  };
+
+  ObjectOutline();
+  ~ObjectOutline();
+  ObjectOutline(const ObjectOutline&) = delete;
+  ObjectOutline& operator=(const ObjectOutline&) = delete;
+
+  // Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
+  // to the handler, which may be null; the outline is then empty, as it is when the handler lets a
+  // foreign machine pass. The object's name, which may be null too, goes with reports. Attributes
+  // must be wanted beforehand.
+  [[nodiscard]] bool read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
+                          ErrorHandler* errorHandler, const char* objectName,
+                          bool wantsAttributes = false);
+
+  // Texts live until the next read.
+  [[nodiscard]] std::vector<OutlinedSection> getSections() const;
+  // The static ones, in their order, without the null symbol.
+  [[nodiscard]] std::vector<OutlinedSymbol> getSymbols() const;
+  [[nodiscard]] uint64_t getEntry() const;
+  // The attributes of the object as a whole; null if it has none, or if they were not wanted.
+  [[nodiscard]] const FullAttr* getOwnAttributes() const;
+  // Nothing, after a report, if bytes that have to be looked at can't be had.
+  [[nodiscard]] std::optional<SizesStatistics> computeSizes();
+
+private:
+  struct Content;
+
+  std::unique_ptr<Content> m_Content;
+};
+
+} // namespace elfext
