@@ -7,6 +7,7 @@
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
 #include "tests/systematic/tool_folder.h"
+#include "tests/systematic/two_roads.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -414,6 +415,14 @@ TEST_P(DamagedObject, IsReadOrRefusedAndKept) {
       SCOPED_TRACE(member.what);
       meet({member});
     }
+    if (HasFailure()) return;
+  }
+}
+
+TEST_P(DamagedObject, IsTheSameInItsTablesAndAsAModel) {
+  for (const Member& member : damagedForms(GetParam().make())) {
+    SCOPED_TRACE(member.what);
+    expectSameOnBothRoads(member.bytes);
     if (HasFailure()) return;
   }
 }

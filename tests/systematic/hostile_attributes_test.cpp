@@ -286,6 +286,10 @@ TEST_P(HostileAttributes, AreReadOrRefusedInLittleTimeAndMemory) {
   EXPECT_THAT(run.errors, testing::HasSubstr(GetParam().report));
 }
 
+TEST_P(HostileAttributes, AreTheSameInTablesAndOnAModel) {
+  expectSameOnBothRoads(GetParam().make());
+}
+
 INSTANTIATE_TEST_SUITE_P(Tool, HostileAttributes, testing::ValuesIn(HostileAttributeObjects),
                          [](const auto& instance) { return instance.param.name; });
 

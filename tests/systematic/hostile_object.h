@@ -8,6 +8,7 @@
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
 #include "tests/systematic/tool_folder.h"
+#include "tests/systematic/two_roads.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

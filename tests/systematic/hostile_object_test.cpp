@@ -449,6 +449,10 @@ TEST_P(HostileObject, IsReadOrRefusedInLittleTimeAndMemory) {
   expectHarmless(GetParam());
 }
 
+TEST_P(HostileObject, IsTheSameInItsTablesAndAsAModel) {
+  expectSameOnBothRoads(GetParam().make());
+}
+
 INSTANTIATE_TEST_SUITE_P(Tool, HostileObject, testing::ValuesIn(Hostiles),
                          [](const auto& instance) { return instance.param.name; });
 
