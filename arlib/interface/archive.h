@@ -223,6 +223,8 @@ private:
   // what is there.
   bool isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
                     uint32_t& offset, uint32_t& size, int64_t fileSize) const;
+  // Frees what the members hold outside the regions, and their bytes.
+  static void letGo(std::span<ArchiveMember* const> archiveMembers);
   void markEdited();
   void makeSymbols() const;
   void sortMembers();
@@ -257,6 +259,8 @@ private:
 
   // Bytes of tables that were read and then replaced: names and symbols are views of them.
   std::vector<std::span<uint8_t>> m_ViewedBytes;
+  // Tables that a rebuild has taken out of the list; clients may still hold them.
+  std::vector<ArchiveMember*> m_ForgottenTables;
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
   elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;

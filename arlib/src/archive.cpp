@@ -83,11 +83,17 @@ void Archive::setFileName(const char* name) {
   m_FileName = name == nullptr ? nullptr : copyToRegion(name);
 }
 
-void Archive::clear() {
-  for (ArchiveMember* member : m_ArchiveMembers) {
-    member->releaseContentsLocation();
-    member->freeContents();
+void Archive::letGo(std::span<ArchiveMember* const> archiveMembers) {
+  for (ArchiveMember* archiveMember : archiveMembers) {
+    archiveMember->releaseContentsLocation();
+    archiveMember->freeContents();
   }
+}
+
+void Archive::clear() {
+  letGo(getMembers());
+  letGo(m_ForgottenTables);
+  m_ForgottenTables.clear();
   for (const std::span<uint8_t> bytes : m_ViewedBytes)
     m_ContainerRegion->discard(bytes.data(), bytes.size());
   m_ViewedBytes.clear();
@@ -297,10 +303,7 @@ void Archive::removeMembers(std::span<ArchiveMember* const> archiveMembers) {
   takeOut(gone);
   forgetSymbolsOf(gone);
   markEdited();
-  for (ArchiveMember* archiveMember : archiveMembers) {
-    archiveMember->releaseContentsLocation();
-    archiveMember->freeContents();
-  }
+  letGo(archiveMembers);
 }
 
 void Archive::markMoved() {

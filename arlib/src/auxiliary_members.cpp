@@ -111,11 +111,13 @@ bool AuxiliaryMembers::resizeTable(ArchiveMember* table, uint32_t size) {
   return true;
 }
 
-// The object is only forgotten: names and symbols may be views of its bytes.
+// The object is only forgotten until the archive is cleared: names and symbols may be views of its
+// bytes.
 void AuxiliaryMembers::forgetTable(ArchiveMember*& table) {
   if (table == nullptr) return;
   m_Archive.m_ArchiveMembers.remove(m_Archive.getMemberIndex(table));
   m_Archive.m_SortedArchiveMembersUpToDate = false;
+  m_Archive.m_ForgottenTables.push_back(table);
   table = nullptr;
 }
 

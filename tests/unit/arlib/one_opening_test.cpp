@@ -244,4 +244,27 @@ TEST(OneOpening, ReadsAgainAndAgainInTheSameMemory) {
   EXPECT_LT(alloclib::getSystemSize(), before + 2'000'000);
 }
 
+// Also those of a table that the archive did without in between.
+TEST(OneOpening, ReadsAgainInTheSameMemoryBehindAnEditThatDropsATable) {
+  MemoryHost host;
+  host.addFile("lib.a", archive()
+                            .symbolTable({{std::string(500'000, 's'), "a.o"}})
+                            .longNamesText(std::string(500'000, 'n') + "/\n")
+                            .member("a.o", "x")
+                            .bytes());
+  Archive library(host);
+  const auto readAndEdit = [&] {
+    ASSERT_TRUE(readFile("lib.a", library));
+    library.setSymbolTableMode(SymbolTableMode::Never);
+    library.removeMember(library.getMembers().back());
+    ASSERT_TRUE(library.updateAuxiliaryMembers());
+    ASSERT_TRUE(library.getMembers().empty());
+  };
+  readAndEdit();
+  const uint64_t before = alloclib::getSystemSize();
+  for (int i = 0; i < 20; ++i)
+    readAndEdit();
+  EXPECT_LT(alloclib::getSystemSize(), before + 3'000'000);
+}
+
 } // namespace arlib
