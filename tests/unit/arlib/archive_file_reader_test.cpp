@@ -468,6 +468,8 @@ TEST(ArchiveFileReader, ReportsABadPaddingByte) {
                   "1 Padding byte at offset 71 has value 32 and not 0x0A as it should be");
   expectTolerable(archive().longNamesText("odd").badPadding('\0'),
                   "1 Padding byte at offset 71 has value 0 and not 0x0A as it should be");
+  expectTolerable(archive().member("a", "odd").badPadding('\xFF'),
+                  "1 Padding byte at offset 71 has value -1 and not 0x0A as it should be");
 }
 
 TEST(ArchiveFileReader, MarksAFileThatMayNotBeWritten) {
