@@ -86,7 +86,7 @@ void ObjectReport::addMember(ArchiveMember& member) {
     return;
   const std::optional<elfext::SizesStatistics> totals = outline.computeSizes();
   if (!totals) return;
-  addEntries(outline, member);
+  if (shows(Report_Entries)) addEntries(outline, member);
   addSizes(*totals, member);
 }
 

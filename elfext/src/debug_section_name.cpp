@@ -6,9 +6,11 @@
 namespace elfext {
 
 bool isDebugSectionName(const char* name) {
-  if (name == nullptr) return false;
-  return std::strncmp(name, ".debug", 6) == 0 || std::strncmp(name, ".line", 5) == 0 ||
-         std::strcmp(name, "C$$fpmap") == 0;
+  // Most names are told apart by their first two characters.
+  if (name == nullptr || (*name != '.' && *name != 'C')) return false;
+  if (*name == 'C') return std::strcmp(name, "C$$fpmap") == 0;
+  if (name[1] != 'd' && name[1] != 'l') return false;
+  return std::strncmp(name, ".debug", 6) == 0 || std::strncmp(name, ".line", 5) == 0;
 }
 
 } // namespace elfext

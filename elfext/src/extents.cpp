@@ -4,6 +4,7 @@
 #include "elfext/src/first_holders.h"
 
 #include <algorithm>
+#include <array>
 
 namespace elfext {
 
@@ -13,11 +14,39 @@ bool startsBefore(const Extent& left, const Extent& right) {
   return left.start != right.start ? left.start < right.start : left.id < right.id;
 }
 
-// Good files have their sections in the order of their offsets.
+constexpr size_t MostRuns = 4;
+constexpr size_t FewExtents = 64; // that are sorted sooner than dealt
+using Runs = std::array<std::vector<Extent>, MostRuns>;
+
+// False if there are more runs than it is worth to merge.
+bool dealIntoRuns(std::span<const Extent> extents, Runs& runs) {
+  for (const Extent& extent : extents) {
+    const auto run = std::find_if(runs.begin(), runs.end(), [&](const std::vector<Extent>& other) {
+      return other.empty() || startsBefore(other.back(), extent);
+    });
+    if (run == runs.end()) return false;
+    run->push_back(extent);
+  }
+  return true;
+}
+
+// Good files have their sections in the order of their offsets, or in a few such orders that take
+// turns, as code and the relocations for it do.
 std::vector<Extent> sortedByStart(std::span<const Extent> extents) {
   std::vector<Extent> sorted(extents.begin(), extents.end());
-  if (!std::is_sorted(sorted.begin(), sorted.end(), startsBefore))
+  if (std::is_sorted(sorted.begin(), sorted.end(), startsBefore)) return sorted;
+  Runs runs;
+  if (extents.size() <= FewExtents || !dealIntoRuns(extents, runs)) {
     std::sort(sorted.begin(), sorted.end(), startsBefore);
+    return sorted;
+  }
+  sorted = std::move(runs.back());
+  for (size_t i = MostRuns - 1; i > 0; --i) {
+    std::vector<Extent> merged(sorted.size() + runs[i - 1].size());
+    std::merge(sorted.begin(), sorted.end(), runs[i - 1].begin(), runs[i - 1].end(), merged.begin(),
+               startsBefore);
+    sorted = std::move(merged);
+  }
   return sorted;
 }
 

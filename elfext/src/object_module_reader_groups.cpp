@@ -24,7 +24,8 @@ void createGroups(ReadContext& context) {
     Group* group =
         module.createGroup(signatureOf(context, table.section), section->getName(), table.flags);
     group->setGroupSection(section);
-    for (const uint32_t member : table.members)
+    for (const uint32_t member :
+         std::span(context.groupMembers).subspan(table.firstMember, table.memberCount))
       group->addMember(module.getSection(member));
   }
 }

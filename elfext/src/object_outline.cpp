@@ -41,8 +41,7 @@ void forEachStaticSymbol(const ObjectTables& tables, Function function) {
   for (const SymbolTable& table : tables.symbolTables) {
     if (table.isDynamic) continue;
     for (uint32_t i = 1; i < table.rowCount; ++i) {
-      const SymbolRow row = tables.getSymbolRow(table, i);
-      function(table.nameOf(row), row, tables.homeOf(table, i, row));
+      function(table, i, tables.getSymbolRow(table, i));
     }
   }
 }
@@ -65,19 +64,20 @@ void addSections(const ObjectTables& tables, SizesSource& source) {
     const uint64_t size = sizeOf(tables, i);
     source.sections.push_back(
         {tables.nameOf(i), header.type, static_cast<uint32_t>(header.flags), size, size});
-    if (header.type != SHT_NOBITS && size != 0) source.occupied.push_back({header.offset, size});
   }
 }
 
 void addMappingSymbols(const ObjectTables& tables, SizesSource& source) {
-  const auto add = [&](const char* name, const SymbolRow& row, const SymbolHome& home) {
-    if (home.category != Symbol::Category_Hosted || classOf(name) != Symbol::Class_Mapping) return;
+  forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
+    const char* name = table.nameOf(row);
+    if (classOf(name) != Symbol::Class_Mapping) return;
+    const SymbolHome home = tables.homeOf(table, index, row);
+    if (home.category != Symbol::Category_Hosted) return;
     const SectionHeader& header = tables.sectionHeaders[home.section];
     if (!isCode(header)) return;
     const uint64_t base = tables.hasLaidOutAddresses() ? header.addr : 0;
     source.mappingSymbols.push_back({home.section, row.value - base, name});
-  };
-  forEachStaticSymbol(tables, add);
+  });
 }
 
 // False, after a report, if bytes can't be had.
@@ -94,15 +94,22 @@ bool addRawData(ObjectTables& tables, SizesSource& source) {
   return true;
 }
 
-void addHeaders(const ObjectTables& tables, SizesSource& source) {
-  const FileHeader& header = tables.fileHeader;
+// What is in the segments, of which an object that is still to be linked has none.
+bool addSegments(ObjectTables& tables, SizesSource& source) {
+  if (tables.programHeaders.empty()) return true;
   for (const ProgramHeader& segment : tables.programHeaders) {
     source.segments.push_back(
         {segment.type, segment.flags, {segment.offset, segment.filesz}, segment.memsz});
   }
+  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+    const uint64_t size = tables.typeOf(i) == SHT_NOBITS ? 0 : sizeOf(tables, i);
+    if (size != 0) source.occupied.push_back({tables.sectionHeaders[i].offset, size});
+  }
+  const FileHeader& header = tables.fileHeader;
   source.occupied.push_back({0, header.ehsize});
   source.occupied.push_back({header.phoff, uint64_t{header.phentsize} * tables.segmentCount()});
   source.occupied.push_back({header.shoff, uint64_t{header.shentsize} * tables.sectionCount()});
+  return addRawData(tables, source);
 }
 
 } // namespace
@@ -147,9 +154,10 @@ std::vector<ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() const {
   if (m_Content == nullptr) return symbols;
   const ObjectTables& tables = m_Content->tables;
   symbols.reserve(m_Content->attributes->getSymbolCount());
-  forEachStaticSymbol(tables, [&](const char* name, const SymbolRow& row, const SymbolHome& home) {
+  forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
+    const SymbolHome home = tables.homeOf(table, index, row);
     const bool isHosted = home.category == Symbol::Category_Hosted;
-    symbols.push_back({name, home.category, static_cast<uint32_t>(row.info >> 4),
+    symbols.push_back({table.nameOf(row), home.category, static_cast<uint32_t>(row.info >> 4),
                        isHosted ? tables.nameOf(home.section) : nullptr});
   });
   return symbols;
@@ -171,8 +179,7 @@ std::optional<SizesStatistics> ObjectOutline::computeSizes() {
   SizesSource source;
   addSections(tables, source);
   addMappingSymbols(tables, source);
-  if (!addRawData(tables, source)) return std::nullopt;
-  addHeaders(tables, source);
+  if (!addSegments(tables, source)) return std::nullopt;
   return computeSizesStatistics(std::move(source));
 }
 

@@ -70,11 +70,12 @@ struct RelocationTable {
   bool hasAddend = false;
 };
 
-// A group section, and what it may call its own.
+// A group section, and where the list of all groups' members has its own.
 struct GroupTable {
   uint32_t section = 0;
   uint32_t flags = 0;
-  std::vector<uint32_t> members = {};
+  size_t firstMember = 0;
+  size_t memberCount = 0;
 };
 
 // Bytes of a segment that belong to no section and no header; the offsets are those in the file.
@@ -160,6 +161,7 @@ struct ObjectTables {
   std::vector<SymbolTable> symbolTables = {};
   std::vector<RelocationTable> relocationTables = {};
   std::vector<GroupTable> groups = {};
+  std::vector<uint32_t> groupMembers = {};
   std::vector<SegmentGap> gaps = {};
   std::vector<DynamicTable> dynamicTables = {};
   std::optional<VersionTables> versions = {};

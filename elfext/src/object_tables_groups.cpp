@@ -14,17 +14,16 @@ namespace {
 constexpr uint32_t NoGroup = 0xFFFFFFFF;
 
 // The owners are, by section, the sections of the groups that they are in.
-bool checkMember(ObjectTables& tables, GroupTable& group, uint32_t member,
+bool checkMember(ObjectTables& tables, uint32_t group, uint32_t member,
                  std::vector<uint32_t>& owners) {
   if (member >= tables.sectionCount())
-    return goOn(tables.reporter, &ErrorHandler::groupMemberOutOfRange, group.section, member,
+    return goOn(tables.reporter, &ErrorHandler::groupMemberOutOfRange, group, member,
                 tables.lastSection());
   if (member == 0 && tables.typeOf(0) == SHT_NULL) return true;
   if (owners[member] != NoGroup)
-    return goOn(tables.reporter, &ErrorHandler::sectionInTwoGroups, member, owners[member],
-                group.section);
-  owners[member] = group.section;
-  group.members.push_back(member);
+    return goOn(tables.reporter, &ErrorHandler::sectionInTwoGroups, member, owners[member], group);
+  owners[member] = group;
+  tables.groupMembers.push_back(member);
   return true;
 }
 
@@ -32,12 +31,15 @@ bool checkGroup(ObjectTables& tables, uint32_t index, std::vector<uint32_t>& own
   const SectionHeader& header = tables.sectionHeaders[index];
   const uint8_t* words = header.size == 0 ? nullptr : tables.view(header.offset, header.size);
   if (header.size != 0 && words == nullptr) return false;
-  GroupTable group = {index, words == nullptr ? 0 : tables.get<uint32_t>(words)};
+  const size_t firstMember = tables.groupMembers.size();
   const uint64_t count = tables.rowCount(index);
   for (uint64_t i = 1; i < count; ++i) {
-    if (!checkMember(tables, group, tables.get<uint32_t>(words + i * 4), owners)) return false;
+    if (!checkMember(tables, index, tables.get<uint32_t>(words + i * 4), owners)) return false;
   }
-  tables.groups.push_back(std::move(group));
+  tables.groups.push_back({.section = index,
+                           .flags = words == nullptr ? 0 : tables.get<uint32_t>(words),
+                           .firstMember = firstMember,
+                           .memberCount = tables.groupMembers.size() - firstMember});
   return true;
 }
 

@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -127,11 +128,11 @@ bool checkDebugOverlays(ObjectTables& tables) {
 }
 
 bool checkSegmentMaps(ObjectTables& tables) {
-  const std::vector<uint32_t> allocated = findAllocatedSections(tables);
+  std::optional<std::vector<uint32_t>> allocated;
   for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
-    const bool hasNotes =
-        tables.typeOf(i) == SHT_NOTE && tables.sectionHeaders[i].size >= SmallestNote;
-    if (hasNotes && !checkNotes(tables, i, allocated)) return false;
+    if (tables.typeOf(i) != SHT_NOTE || tables.sectionHeaders[i].size < SmallestNote) continue;
+    if (!allocated) allocated = findAllocatedSections(tables);
+    if (!checkNotes(tables, i, *allocated)) return false;
   }
   return true;
 }

@@ -6,6 +6,7 @@
 #include "elfext/src/object_tables.h"
 #include "elfext/src/row_maximum.h"
 
+#include <algorithm>
 #include <limits>
 #include <optional>
 
@@ -13,28 +14,47 @@ namespace elfext {
 
 namespace {
 
-// The symbol index of the row's r_info.
-template <bool IsWide>
-uint32_t symbolOf(const uint8_t* row, bool isLittle) {
-  if constexpr (IsWide) return static_cast<uint32_t>(getWord<uint64_t>(row + 8, isLittle) >> 32);
-  return getWord<uint32_t>(row + 4, isLittle) >> 8;
+// Where r_info has the symbol: in the upper half of its 8 bytes, or above the type in its 4.
+uint32_t symbolWordPlace(RecordFormat format) {
+  if (!format.isWide) return 4;
+  return format.isLittle ? 12 : 8;
 }
 
-template <bool IsWide>
-bool checkRows(const ObjectTables& tables, const RelocationTable& table) {
-  const uint8_t* row = table.rows;
-  const uint32_t rowSize = relocationRowSize(IsWide, table.hasAddend);
-  for (uint32_t i = 0; i < table.rowCount; ++i, row += rowSize) {
-    const uint32_t symbol = symbolOf<IsWide>(row, tables.format.isLittle);
-    if (symbol >= table.symbolCount)
-      return stop(tables.reporter, &ErrorHandler::relocationSymbolOutOfRange, i, table.section,
-                  symbol, table.symbolSection, table.symbolCount);
-  }
-  return true;
+// The symbol index that the word is, or has above the type.
+uint32_t symbolOf(RecordFormat format, uint32_t word) {
+  return format.isWide ? word : word >> 8;
 }
 
+uint32_t symbolOf(RecordFormat format, const uint8_t* row) {
+  return symbolOf(format, getWord<uint32_t>(row + symbolWordPlace(format), format.isLittle));
+}
+
+template <bool IsLittle>
+uint32_t findGreatestWord(const uint8_t* words, uint32_t count, uint32_t distance) {
+  uint32_t greatest = 0;
+  for (uint32_t i = 0; i < count; ++i, words += distance)
+    greatest = std::max(greatest, getWord<uint32_t>(words, IsLittle));
+  return greatest;
+}
+
+bool hasBadSymbol(RecordFormat format, const RelocationTable& table, uint32_t rowSize) {
+  const uint8_t* words = table.rows + symbolWordPlace(format);
+  const uint32_t greatest = format.isLittle
+                                ? findGreatestWord<true>(words, table.rowCount, rowSize)
+                                : findGreatestWord<false>(words, table.rowCount, rowSize);
+  return table.rowCount != 0 && symbolOf(format, greatest) >= table.symbolCount;
+}
+
+// Which row it is that has a bad symbol is only looked for in a table that has one.
 bool checkRows(const ObjectTables& tables, const RelocationTable& table) {
-  return tables.format.isWide ? checkRows<true>(tables, table) : checkRows<false>(tables, table);
+  const uint32_t rowSize = relocationRowSize(tables.format.isWide, table.hasAddend);
+  if (!hasBadSymbol(tables.format, table, rowSize)) return true;
+  uint32_t row = 0;
+  while (symbolOf(tables.format, table.rows + uint64_t{row} * rowSize) < table.symbolCount)
+    ++row;
+  const uint32_t symbol = symbolOf(tables.format, table.rows + uint64_t{row} * rowSize);
+  return stop(tables.reporter, &ErrorHandler::relocationSymbolOutOfRange, row, table.section,
+              symbol, table.symbolSection, table.symbolCount);
 }
 
 // The greatest symbol index of any run of rows in a file with overlapping sections.
@@ -51,10 +71,8 @@ private:
   static RowMaximum makeMaximum(const ObjectTables& tables, std::span<const uint8_t> image,
                                 bool hasAddend) {
     const RecordFormat format = tables.format;
-    return {image, relocationRowSize(format.isWide, hasAddend), [format](const uint8_t* row) {
-              return format.isWide ? symbolOf<true>(row, format.isLittle)
-                                   : symbolOf<false>(row, format.isLittle);
-            }};
+    return {image, relocationRowSize(format.isWide, hasAddend),
+            [format](const uint8_t* row) { return symbolOf(format, row); }};
   }
 
   RowMaximum m_Rel;

@@ -49,7 +49,8 @@ struct SizesSource {
   std::vector<MappingSymbol> mappingSymbols = {};
   std::vector<SegmentSize> segments = {};
   std::vector<RawData> rawData = {};
-  // Of sections, raw data and the three headers, which count also where they are empty.
+  // Of sections, raw data and the three headers, which count also where they are empty; only looked
+  // at where there are segments.
   std::vector<FileRange> occupied = {};
 };
 
