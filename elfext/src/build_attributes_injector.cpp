@@ -39,7 +39,7 @@ void BuildAttributesInjector::open(std::string_view vendor, AttributeBytes bytes
 
 bool BuildAttributesInjector::parseFileSubSubsection(std::string_view vendor,
                                                      AttributeBytes bytes) {
-  if (m_Scope != Tag_File) return true;
+  if (!looksAt(Tag_File)) return true;
   std::optional<Run> run;
   open(vendor, bytes, run);
   return inject({}, run);
@@ -48,7 +48,7 @@ bool BuildAttributesInjector::parseFileSubSubsection(std::string_view vendor,
 bool BuildAttributesInjector::parseSectionSubSubsection(std::string_view vendor,
                                                         std::span<const uint32_t> indices,
                                                         AttributeBytes bytes) {
-  if (m_Scope != Tag_Section) return true;
+  if (!looksAt(Tag_Section)) return true;
   std::optional<Run> run;
   open(vendor, bytes, run);
   bool areIndicesWell = true;
@@ -64,7 +64,7 @@ bool BuildAttributesInjector::parseSectionSubSubsection(std::string_view vendor,
 bool BuildAttributesInjector::parseSymbolSubSubsection(std::string_view vendor,
                                                        std::span<const uint32_t> indices,
                                                        AttributeBytes bytes) {
-  if (m_Scope != Tag_Symbol) return true;
+  if (!looksAt(Tag_Symbol)) return true;
   std::optional<Run> run;
   open(vendor, bytes, run);
   bool areIndicesWell = true;

@@ -48,8 +48,9 @@ private:
 
 class BuildAttributesInjector final : public BuildAttributesSectionParser {
 public:
-  // Of the scopes, this walk looks at the given one only.
-  BuildAttributesInjector(AttributeStore& store, AttributeScope scope, InjectionBudget& budget)
+  // Of the scopes, this walk looks at the given one only, or without one at all of them.
+  BuildAttributesInjector(AttributeStore& store, std::optional<AttributeScope> scope,
+                          InjectionBudget& budget)
       : m_Store(store), m_Scope(scope), m_Budget(budget) {}
 
   bool parseFileSubSubsection(std::string_view vendor, AttributeBytes run) override;
@@ -62,12 +63,13 @@ public:
 private:
   struct Run;
 
+  [[nodiscard]] bool looksAt(AttributeScope scope) const { return !m_Scope || *m_Scope == scope; }
   bool inject(AttributeHolder holder, std::optional<Run>& run);
   void open(std::string_view vendor, AttributeBytes bytes, std::optional<Run>& run);
   [[nodiscard]] const BuildAttributes* decode(const BuildAttributes* start, const Run& run);
 
   AttributeStore& m_Store;
-  AttributeScope m_Scope;
+  std::optional<AttributeScope> m_Scope;
   InjectionBudget& m_Budget;
 };
 

@@ -16,8 +16,12 @@ namespace elfext {
 
 namespace {
 
+// Where nothing is kept, nothing has to be there before something else.
 bool parseSection(const ObjectTables& tables, AttributeStore& store, AttributeBytes bytes,
                   InjectionBudget& budget) {
+  if (!store.isKept())
+    return BuildAttributesInjector(store, std::nullopt, budget)
+        .parse(bytes, tables.format.isLittle);
   for (const AttributeScope scope : {Tag_File, Tag_Section, Tag_Symbol}) {
     BuildAttributesInjector injector(store, scope, budget);
     if (!injector.parse(bytes, tables.format.isLittle)) return false;
