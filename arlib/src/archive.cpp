@@ -144,7 +144,7 @@ bool Archive::checkOwnFile() {
 int Archive::reportCloseErrors() {
   std::string name;
   const int error = m_SourceFiles.takeCloseError(name);
-  if (error != 0) fail(&ErrorHandler::reportCloseError, name.c_str(), error);
+  if (error != 0) end(&ErrorHandler::reportCloseError, name.c_str(), error);
   return error;
 }
 
