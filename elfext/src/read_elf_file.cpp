@@ -106,15 +106,16 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   auto image = std::make_unique<ImageBytes>(deferral.host, deferral.file, 0, size, isOwnFile);
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
-  if (deferral.shared == nullptr) return isRead;
+  const bool isAnyDeferred = deferral.shared != nullptr;
+  // Of a file of its own the image may load the rest when somebody wants it.
+  if (isOwnFile && !isAnyDeferred) return isRead;
   if (isRead && !loadWhatIsNotDeferred(module)) {
     module.clear();
     isRead = false;
   }
-  if (isRead)
-    bytes.forgetFile();
-  else if (!isOwnFile)
-    deferral.shared->leaveFileOpen();
+  if (isRead) bytes.forgetFile();
+  if (!isAnyDeferred) return isRead;
+  if (!isRead && !isOwnFile) deferral.shared->leaveFileOpen();
   const support::HostError error = deferral.shared->release();
   return error == 0 || !isRead ? isRead : reportReadError(module, error);
 }

@@ -650,6 +650,23 @@ TEST_F(ReadDeferredTest, AFileOfWhichNothingIsDeferredIsClosedByWhoOpenedIt) {
   EXPECT_EQ(m_Host.openHandles(), 1U);
 }
 
+// He may close it at once, as where nobody was asked.
+TEST_F(ReadDeferredTest, ACallersFileOfWhichNothingIsDeferredIsNotNeededAfterwards) {
+  put(largeSample());
+  ListedSelector selector;
+  const support::FileHandle file = open("a.o");
+  ASSERT_TRUE(readElfFile(m_Host, file, *m_Module, &selector));
+  ASSERT_EQ(m_Host.close(file), 0);
+  m_Host.at("a.o").bytes.assign(m_Bytes.size(), 'x');
+  for (const Section* section : m_Module->getSections()) {
+    if (section->getType() != SHT_PROGBITS) continue;
+    ASSERT_NE(section->getContents(), nullptr);
+    const uint64_t size = section->getContentsSize();
+    EXPECT_EQ(textOf(*section), m_Bytes.substr(section->getFileOffset(), size));
+  }
+  EXPECT_THAT(m_Reports.m_Texts, IsEmpty());
+}
+
 TEST_F(ReadDeferredTest, ARemovedFileIsStillThereForItsContents) {
   put(largeSample());
   ListedSelector selector({Text});
