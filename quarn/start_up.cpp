@@ -12,7 +12,6 @@
 
 #include <array>
 #include <cstdlib>
-#include <optional>
 
 namespace quarn {
 
@@ -20,13 +19,14 @@ namespace {
 
 constexpr size_t DriverRegionSize = 1024;
 
-std::optional<alloclib::Session> session;
+// Never destroyed: the process may end anywhere, with regions alive.
+alloclib::Session* session = nullptr;
 alloclib::RegionGeneral* driverRegion = nullptr;
 
 } // namespace
 
 void startUp(int argc, const char* const* argv, support::Host& host) {
-  session.emplace();
+  session = new alloclib::Session;
   driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
   messages::initialise();
   messages::setExitHandler(shutDown);
