@@ -1,16 +1,21 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Any bytes read as an object, from memory and as a member of a file, under a handler that refuses
-// and one that goes on. What was read is counted, validated and looked at.
+// and one that goes on. What was read is counted, validated and looked at, and must be the same in
+// the object's tables.
 #include "alloclib/interface/region.h"
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/object_module.h"
+#include "elfext/interface/object_outline.h"
 #include "elfext/interface/read_elf_file.h"
 #include "elfext/interface/section.h"
 #include "elfext/interface/sizes_statistics.h"
+#include "support/interface/source_file.h"
 #include "tests/support/memory_host.h"
 
+#include <array>
+#include <bit>
 #include <cstdlib>
 #include <string>
 #include <string_view>
@@ -22,7 +27,10 @@ using namespace elfext;
 // Goes on wherever there is something to go on with.
 class AcceptingHandler final : public ErrorHandler {
 public:
-  bool report(const ObjectModule&, uint32_t, const std::string&) override { return true; }
+  bool report(const ObjectModule&, uint32_t, const std::string& text) override {
+    texts += text;
+    return true;
+  }
   bool outOfMemory(const ObjectModule&) override { return false; }
   bool ioErrorReading(const ObjectModule&, int) override { return false; }
   bool ioErrorWriting(const ObjectModule&, int) override { return false; }
@@ -31,6 +39,9 @@ public:
   bool unsupportedVersion(const ObjectModule&, uint32_t) override { return false; }
   bool wrongMagic(const ObjectModule&) override { return false; }
   bool wrongClass(const ObjectModule&) override { return false; }
+
+  // Of all reports that it goes on from.
+  std::string texts;
 };
 
 void lookAt(ObjectModule& module) {
@@ -64,6 +75,29 @@ void readAsMember(std::span<const uint8_t> bytes, ErrorHandler& handler) {
   if (readElfFile(host, "archive", Before, bytes.size(), module, &selector)) lookAt(module);
 }
 
+void compareRoads(std::span<const uint8_t> bytes) {
+  using Totals = std::array<uint64_t, 8>;
+  testsupport::MemoryHost host;
+  host.addFile("object", bytes);
+  support::SourceFiles files(host);
+  std::shared_ptr<support::SourceFile> file;
+  if (files.open("object", file) != 0) std::abort();
+  AcceptingHandler modelHandler;
+  AcceptingHandler outlineHandler;
+  ObjectModule module;
+  module.setErrorHandler(&modelHandler);
+  ObjectOutline outline;
+  const bool isRead = readElfFile(file, 0, bytes.size(), module, nullptr);
+  if (outline.read(file, 0, bytes.size(), &outlineHandler, nullptr) != isRead) std::abort();
+  if (outlineHandler.texts != modelHandler.texts) std::abort();
+  if (outline.getSymbols().size() != module.getSymbols().size()) std::abort();
+  if (!isRead) return;
+  const std::optional<SizesStatistics> sizes = outline.computeSizes();
+  if (!sizes ||
+      std::bit_cast<Totals>(*sizes) != std::bit_cast<Totals>(computeSizesStatistics(&module)))
+    std::abort();
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
@@ -76,5 +110,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     readFromMemory({data, size}, *handler);
     readAsMember({data, size}, *handler);
   }
+  compareRoads({data, size});
   return 0;
 }
