@@ -106,6 +106,8 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   auto image = std::make_unique<ImageBytes>(deferral.host, deferral.file, 0, size, isOwnFile);
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
+  // A handler that lets a foreign machine pass leaves the module as it was, and the image is gone.
+  if (isRead && module.getImageSource() != &bytes) return true;
   const bool isAnyDeferred = deferral.shared != nullptr;
   // Of a file of its own the image may load the rest when somebody wants it.
   if (isOwnFile && !isAnyDeferred) return isRead;
