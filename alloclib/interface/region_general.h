@@ -118,6 +118,8 @@ private:
   char* m_FastLimit = nullptr;
   char* m_WorkingEnd = nullptr;
   uint32_t m_FlagsState;
+  // No free chunk has more bytes than this.
+  uint16_t m_LargestChunk = 0;
   bool m_OwnedParent = false;
   Block* m_Blocks = nullptr;
   LargeBlock* m_LargeBlocks = nullptr;

@@ -223,7 +223,10 @@ void RegionGeneral::makeWorkingBlock(size_t bytes, size_t alignment) {
   noteBlock(m_Blocks, total, sizeof(Block));
 }
 
+// The first that fits. A search in vain shows that all chunks are smaller, and is not made again
+// before a larger one comes: else thousands of small chunks would be looked at for each new block.
 bool RegionGeneral::reuseFreeChunk(size_t bytes, size_t alignment) {
+  if (m_FreeChunks == nullptr || bytes > m_LargestChunk) return false;
   for (FreeChunk** link = &m_FreeChunks; *link != nullptr; link = &(*link)->next) {
     auto* start = reinterpret_cast<char*>(*link);
     const size_t size = (*link)->size;
@@ -235,6 +238,8 @@ bool RegionGeneral::reuseFreeChunk(size_t bytes, size_t alignment) {
     poison(start, size);
     return true;
   }
+  // At a larger alignment a chunk of the size may have been passed over for where it starts.
+  if (alignment <= 8) m_LargestChunk = static_cast<uint16_t>(bytes - 1);
   return false;
 }
 
@@ -292,6 +297,7 @@ void RegionGeneral::pushFreeChunk(char* piece, size_t bytes) {
   poison(piece, bytes);
   unpoison(piece, sizeof(FreeChunk));
   m_FreeChunks = ::new (static_cast<void*>(piece)) FreeChunk{bytes, m_FreeChunks};
+  m_LargestChunk = std::max(m_LargestChunk, static_cast<uint16_t>(bytes));
 }
 
 void RegionGeneral::SetBlockWorkingState() {

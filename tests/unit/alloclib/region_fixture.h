@@ -35,6 +35,7 @@ public:
   static void setCursor(RegionGeneral* region, char* cursor) { region->m_Cursor = cursor; }
   static char* getFastLimit(const RegionGeneral* region) { return region->m_FastLimit; }
   static char* getWorkingEnd(const RegionGeneral* region) { return region->m_WorkingEnd; }
+  static size_t getLargestChunk(const RegionGeneral* region) { return region->m_LargestChunk; }
   static bool hasLargeBlocks(const RegionGeneral* region) {
     return region->m_LargeBlocks != nullptr;
   }

@@ -182,6 +182,28 @@ TEST_F(RegionGeneralTest, TheFirstFreeChunkThatFitsIsTaken) {
   EXPECT_EQ(parent.allocations.size(), 1u);
 }
 
+TEST_F(RegionGeneralTest, ASearchInVainIsNotMadeAgainBeforeALargerChunkComes) {
+  char* small = allocate(200);
+  char* large = allocate(4800);
+  region->discard(small, 200);
+  EXPECT_EQ(Peer::getLargestChunk(region), 200u);
+  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
+  allocate(184, 256);
+  EXPECT_EQ(Peer::getLargestChunk(region), 200u) << "it is passed over for where it starts";
+  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
+  EXPECT_EQ(allocate(200), small);
+  allocate(8192);
+  EXPECT_EQ(Peer::getLargestChunk(region), 200u) << "larger than any, so none is looked at";
+  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
+  region->discard(allocate(160), 160);
+  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
+  allocate(168);
+  EXPECT_EQ(Peer::getLargestChunk(region), 167u) << "a search in vain";
+  allocate(static_cast<size_t>(Peer::getWorkingEnd(region) - Peer::getCursor(region)));
+  region->discard(large, 4800);
+  EXPECT_EQ(allocate(4000), large);
+}
+
 TEST_F(RegionGeneralTest, BucketsServeOnceTheyHoldMoreThan10240Bytes) {
   fillBucket(64);
   ASSERT_EQ(Peer::getBucketBytes(region), 10304u);
