@@ -19,6 +19,9 @@ public:
     QUARN_ASSERT(1, region != NULL);
   }
 
+  // Makes room for so many names in all.
+  void reserve(uint32_t count) { m_Names.reserve(count); }
+
   // Copies the name, so that the object it came from can go.
   void add(const char* name) {
     QUARN_ASSERT(1, name != NULL);

@@ -67,18 +67,19 @@ bool ElfImageArchiveMemberType::isElfImage(const ArchiveMember* archiveMember) c
 
 namespace {
 
-using OutlinedSymbols = std::vector<elfext::ObjectOutline::OutlinedSymbol>;
+using OutlinedSymbols = std::span<const elfext::ObjectOutline::OutlinedSymbol>;
 
 // Any definition that is not local; debug symbols only if the archive wants them.
 bool isPublished(const elfext::ObjectOutline::OutlinedSymbol& symbol, bool includeDebugSymbols) {
-  if (symbol.category == elfext::Symbol::Category_Undefined) return false;
   if (symbol.binding == elfext::STB_LOCAL) return false;
+  if (symbol.category == elfext::Symbol::Category_Undefined) return false;
   if (!includeDebugSymbols && elfext::isDebugSectionName(symbol.sectionName)) return false;
   return symbol.name != nullptr && *symbol.name != '\0';
 }
 
 // Names that are more bytes than their object has in all must have bytes in common.
 void addNames(std::span<const char* const> published, uint64_t objectSize, SymbolNameList& names) {
+  names.reserve(static_cast<uint32_t>(published.size()));
   uint64_t bytes = 0;
   for (const char* name : published) {
     const std::string_view text = name;
@@ -97,15 +98,17 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
 // All that the object's decoration symbols say, whatever else the symbols are. False if there are
 // none. Texts of a good object are no longer than the object; of those that share their bytes
 // thousands of times over, only the first ones are read.
-bool mergeDecorations(const OutlinedSymbols& symbols, uint64_t objectSize,
-                      AttributeRecords& records, elfext::FullAttr& attributes) {
+bool mergeDecorations(OutlinedSymbols symbols, uint64_t objectSize, AttributeRecords& records,
+                      elfext::FullAttr& attributes) {
   constexpr std::string_view Prefix = elfext::DecorationPrefix;
   constexpr uint64_t AlwaysRead = 0x100000;
   uint64_t left = std::max<uint64_t>(2 * objectSize, AlwaysRead);
   bool isFirst = true;
   for (const elfext::ObjectOutline::OutlinedSymbol& symbol : symbols) {
     const char* name = symbol.name;
-    if (name == nullptr || std::strncmp(name, Prefix.data(), Prefix.size()) != 0) continue;
+    // Nearly all names differ in their first character.
+    if (name == nullptr || *name != Prefix.front()) continue;
+    if (std::strncmp(name, Prefix.data(), Prefix.size()) != 0) continue;
     const std::string_view text(name + Prefix.size(), strnlen(name + Prefix.size(), left + 1));
     if (text.size() > left) break;
     left -= text.size();
@@ -121,7 +124,7 @@ bool mergeDecorations(const OutlinedSymbols& symbols, uint64_t objectSize,
 
 // What the object says of itself: in its decoration symbols, or as a whole. Then an object that
 // says nothing is of the default kind.
-bool findAttributes(const elfext::ObjectOutline& outline, const OutlinedSymbols& symbols,
+bool findAttributes(const elfext::ObjectOutline& outline, OutlinedSymbols symbols,
                     uint64_t objectSize, bool useObjectAttributes, AttributeRecords& records,
                     elfext::FullAttr& attributes) {
   if (!useObjectAttributes) return mergeDecorations(symbols, objectSize, records, attributes);
@@ -130,10 +133,10 @@ bool findAttributes(const elfext::ObjectOutline& outline, const OutlinedSymbols&
   return true;
 }
 
-void findNames(const OutlinedSymbols& symbols, const ArchiveMember& archiveMember,
-               SymbolNameList& names) {
+void findNames(OutlinedSymbols symbols, const ArchiveMember& archiveMember, SymbolNameList& names) {
   const bool includeDebugSymbols = archiveMember.getArchive()->getIncludeDebugSymbols();
   std::vector<const char*> published;
+  published.reserve(symbols.size());
   for (const elfext::ObjectOutline::OutlinedSymbol& symbol : symbols) {
     if (isPublished(symbol, includeDebugSymbols)) published.push_back(symbol.name);
   }

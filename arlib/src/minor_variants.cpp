@@ -7,7 +7,6 @@
 
 #include <algorithm>
 #include <cstring>
-#include <functional>
 #include <map>
 #include <unordered_map>
 
@@ -15,13 +14,32 @@ namespace arlib {
 
 namespace {
 
-// A few bytes of a name that tell most names apart, however long it is.
+void addWord(uint64_t& hash, uint64_t word) {
+  constexpr uint64_t OddFactor = 0x9E3779B97F4A7C15;
+  hash = (hash ^ word) * OddFactor;
+  hash ^= hash >> 32;
+}
+
+void addBytes(uint64_t& hash, std::string_view bytes) {
+  while (!bytes.empty()) {
+    uint64_t word = 0;
+    const size_t count = std::min(bytes.size(), sizeof word);
+    std::memcpy(&word, bytes.data(), count);
+    addWord(hash, word);
+    bytes.remove_prefix(count);
+  }
+}
+
+// Of a few bytes of a name that tell most names apart, however long it is. Names that have it in
+// common are compared whole, so that it needs to be no better than quick.
 uint64_t quickHash(std::string_view name) {
   constexpr size_t EndSize = 32;
-  const std::string_view start = name.substr(0, EndSize);
-  const std::string_view end = name.substr(name.size() - std::min(name.size(), EndSize));
-  const std::hash<std::string_view> hash;
-  return (hash(start) * 31 + hash(end)) * 31 + name.size();
+  uint64_t hash = name.size();
+  const size_t startSize = std::min(name.size(), EndSize);
+  const size_t endSize = std::min(name.size() - startSize, EndSize);
+  addBytes(hash, name.substr(0, startSize));
+  addBytes(hash, name.substr(name.size() - endSize));
+  return hash;
 }
 
 // What members with the same names agree in: many others don't, and need not be compared.

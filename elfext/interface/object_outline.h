@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <vector>
 
 namespace elfext {
@@ -49,8 +50,8 @@ public:
 
   // Texts live until the next read.
   [[nodiscard]] std::vector<OutlinedSection> getSections() const;
-  // The static ones, in their order, without the null symbol.
-  [[nodiscard]] std::vector<OutlinedSymbol> getSymbols() const;
+  // The static ones, in their order, without the null symbol; good until the next read.
+  [[nodiscard]] std::span<const OutlinedSymbol> getSymbols();
   [[nodiscard]] uint64_t getEntry() const;
   // The attributes of the object as a whole; null if it has none, or if they were not wanted.
   [[nodiscard]] const FullAttr* getOwnAttributes() const;
@@ -61,6 +62,8 @@ private:
   struct Content;
 
   std::unique_ptr<Content> m_Content;
+  // Its memory serves one object after the other.
+  std::vector<OutlinedSymbol> m_Symbols;
 };
 
 } // namespace elfext

@@ -117,6 +117,74 @@ void putWord(Word word, bool isLittle, uint8_t* bytes) {
   std::memcpy(bytes, &word, sizeof word);
 }
 
+// ---- How a record is taken apart and put together: told once for both directions, by a function
+// that names the fields in file order to a codec, which either loads a field or stores it.
+
+class FieldGetter {
+public:
+  FieldGetter(RecordFormat format, const uint8_t* bytes) : m_Format(format), m_Bytes(bytes) {}
+
+  [[nodiscard]] bool isWide() const { return m_Format.isWide; }
+
+  void field(uint8_t& value) { value = *m_Bytes++; }
+  template <class Word>
+  void field(Word& value) {
+    value = getWord<Word>(m_Bytes, m_Format.isLittle);
+    m_Bytes += sizeof value;
+  }
+
+  // A field of 4 bytes in class 1 and of 8 in class 2.
+  void wideField(uint64_t& value) {
+    if (isWide()) return field(value);
+    uint32_t narrow = 0;
+    field(narrow);
+    value = narrow;
+  }
+
+private:
+  RecordFormat m_Format;
+  const uint8_t* m_Bytes;
+};
+
+class FieldPutter {
+public:
+  FieldPutter(RecordFormat format, uint8_t* bytes) : m_Format(format), m_Bytes(bytes) {}
+
+  [[nodiscard]] bool isWide() const { return m_Format.isWide; }
+
+  void field(const uint8_t& value) { *m_Bytes++ = value; }
+  template <class Word>
+  void field(const Word& value) {
+    putWord(value, m_Format.isLittle, m_Bytes);
+    m_Bytes += sizeof value;
+  }
+
+  void wideField(const uint64_t& value) {
+    if (isWide()) return field(value);
+    field(static_cast<uint32_t>(value));
+  }
+
+private:
+  RecordFormat m_Format;
+  uint8_t* m_Bytes;
+};
+
+// The record is const when it is put.
+template <class Codec, class Record>
+void codeSymbol(Codec codec, Record& record) {
+  codec.field(record.name);
+  if (!codec.isWide()) {
+    codec.wideField(record.value);
+    codec.wideField(record.size);
+  }
+  codec.field(record.info);
+  codec.field(record.other);
+  codec.field(record.shndx);
+  if (!codec.isWide()) return;
+  codec.field(record.value);
+  codec.field(record.size);
+}
+
 // The record at the bytes, or the bytes of the record.
 void getRecord(RecordFormat format, const uint8_t* bytes, FileHeader& record);
 void putRecord(RecordFormat format, const FileHeader& record, uint8_t* bytes);
@@ -124,7 +192,10 @@ void getRecord(RecordFormat format, const uint8_t* bytes, SectionHeader& record)
 void putRecord(RecordFormat format, const SectionHeader& record, uint8_t* bytes);
 void getRecord(RecordFormat format, const uint8_t* bytes, ProgramHeader& record);
 void putRecord(RecordFormat format, const ProgramHeader& record, uint8_t* bytes);
-void getRecord(RecordFormat format, const uint8_t* bytes, SymbolRow& record);
+// Inline, as symbol rows are the most of what is read.
+inline void getRecord(RecordFormat format, const uint8_t* bytes, SymbolRow& record) {
+  codeSymbol(FieldGetter(format, bytes), record);
+}
 void putRecord(RecordFormat format, const SymbolRow& record, uint8_t* bytes);
 void getRecord(RecordFormat format, bool hasAddend, const uint8_t* bytes, RelocationRow& record);
 void putRecord(RecordFormat format, bool hasAddend, const RelocationRow& record, uint8_t* bytes);

@@ -149,18 +149,18 @@ std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
   return sections;
 }
 
-std::vector<ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() const {
-  std::vector<OutlinedSymbol> symbols;
-  if (m_Content == nullptr) return symbols;
+std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
+  m_Symbols.clear();
+  if (m_Content == nullptr) return {};
   const ObjectTables& tables = m_Content->tables;
-  symbols.reserve(m_Content->attributes->getSymbolCount());
+  m_Symbols.reserve(m_Content->attributes->getSymbolCount());
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
     const SymbolHome home = tables.homeOf(table, index, row);
     const bool isHosted = home.category == Symbol::Category_Hosted;
-    symbols.push_back({table.nameOf(row), home.category, static_cast<uint32_t>(row.info >> 4),
-                       isHosted ? tables.nameOf(home.section) : nullptr});
+    m_Symbols.push_back({table.nameOf(row), home.category, static_cast<uint32_t>(row.info >> 4),
+                         isHosted ? tables.nameOf(home.section) : nullptr});
   });
-  return symbols;
+  return m_Symbols;
 }
 
 uint64_t ObjectOutline::getEntry() const {

@@ -12,6 +12,7 @@
 // that check, so until then its tables are only checked for what would be reported before.
 #pragma once
 
+#include "elfext/interface/elf_constants.h"
 #include "elfext/src/elf_records.h"
 #include "elfext/src/go_on.h"
 #include "elfext/src/image_bytes.h"
@@ -204,9 +205,23 @@ struct ObjectTables {
     getRecord(format, table.rows + uint64_t{index} * symbolRowSize(format.isWide), row);
     return row;
   }
-  // Where the row of that index says that its symbol is.
+  // Where the row of that index says that its symbol is. Only the four special indexes have a
+  // meaning of their own; the rest of the reserved range names sections like any other number.
   [[nodiscard]] SymbolHome homeOf(const SymbolTable& table, uint32_t index,
-                                  const SymbolRow& row) const;
+                                  const SymbolRow& row) const {
+    switch (row.shndx) {
+    case SHN_UNDEF:
+      return {Symbol::Category_Undefined, 0};
+    case SHN_ABS:
+      return {Symbol::Category_Absolute, 0};
+    case SHN_COMMON:
+      return {Symbol::Category_Common, 0};
+    case SHN_XINDEX:
+      return {Symbol::Category_Hosted, get<uint32_t>(table.indexes + uint64_t{index} * 4)};
+    default:
+      return {Symbol::Category_Hosted, row.shndx};
+    }
+  }
 
   // The bytes, or null after a report that they can't be had.
   [[nodiscard]] const uint8_t* view(uint64_t offset, uint64_t size);

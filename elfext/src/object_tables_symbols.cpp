@@ -21,11 +21,6 @@ bool isSpecialIndex(uint16_t index) {
   return index == SHN_UNDEF || index == SHN_ABS || index == SHN_COMMON || index == SHN_XINDEX;
 }
 
-Symbol::Category specialCategory(uint16_t index) {
-  if (index == SHN_ABS) return Symbol::Category_Absolute;
-  return index == SHN_COMMON ? Symbol::Category_Common : Symbol::Category_Undefined;
-}
-
 bool checkRow(const ObjectTables& tables, const SymbolTable& table, uint32_t index) {
   const SymbolRow row = tables.getSymbolRow(table, index);
   const SymbolPlace place = {index, table.section, table.isDynamic};
@@ -144,16 +139,6 @@ bool checkOverlappingTable(ObjectTables& tables, const SymbolTable& table,
 }
 
 } // namespace
-
-// Only the four special indexes have a meaning of their own; the rest of the reserved range names
-// sections like any other number.
-SymbolHome ObjectTables::homeOf(const SymbolTable& table, uint32_t index,
-                                const SymbolRow& row) const {
-  if (row.shndx == SHN_XINDEX)
-    return {Symbol::Category_Hosted, get<uint32_t>(table.indexes + uint64_t{index} * 4)};
-  if (isSpecialIndex(row.shndx)) return {specialCategory(row.shndx), 0};
-  return {Symbol::Category_Hosted, row.shndx};
-}
 
 bool checkSymbols(ObjectTables& tables) {
   std::optional<OverlappingTables> overlappingTables;

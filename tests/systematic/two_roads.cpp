@@ -76,8 +76,8 @@ const char* sectionNameOf(const Symbol& symbol) {
              : nullptr;
 }
 
-void expectSameSymbols(const ObjectModule& module, const ObjectOutline& outline) {
-  const std::vector<ObjectOutline::OutlinedSymbol> symbols = outline.getSymbols();
+void expectSameSymbols(const ObjectModule& module, ObjectOutline& outline) {
+  const std::span<const ObjectOutline::OutlinedSymbol> symbols = outline.getSymbols();
   ASSERT_EQ(symbols.size(), module.getSymbols().size());
   for (size_t i = 0; i < symbols.size(); ++i) {
     const Symbol& symbol = *module.getSymbols()[i];
