@@ -9,7 +9,7 @@
 #include "elfext/interface/segment.h"
 #include "elfext/interface/sort.h"
 #include "elfext/src/compressed_section_extractor.h"
-#include "elfext/src/sizes_source.h"
+#include "elfext/src/tables/sizes_source.h"
 
 #include <algorithm>
 #include <array>

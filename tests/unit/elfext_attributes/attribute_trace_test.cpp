@@ -2,7 +2,7 @@
 #include "elfext/interface/attribute_trace.h"
 
 #include "checking/interface/checking.h"
-#include "elfext/src/checked_reader.h"
+#include "elfext/src/bytes/checked_reader.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

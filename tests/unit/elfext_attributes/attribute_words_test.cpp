@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The look-up of words, against the plain search through their tables.
-#include "elfext/src/attribute_words.h"
+#include "elfext/src/attributes/attribute_words.h"
 
-#include "elfext/src/attribute_tokens.h"
+#include "elfext/src/attributes/attribute_tokens.h"
 #include "support/interface/letters.h"
 #include "tests/unit/elfext_attributes/other_case.h"
 

@@ -2,7 +2,7 @@
 //
 // The tags that follow from a record, rule by rule.
 #include "elfext/interface/build_attributes.h"
-#include "elfext/src/architecture_number.h"
+#include "elfext/src/attributes/architecture_number.h"
 #include "tests/unit/elfext_attributes/attribute_sets.h"
 
 #include <gmock/gmock.h>

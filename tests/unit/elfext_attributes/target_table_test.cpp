@@ -2,7 +2,7 @@
 #include "elfext/interface/target_table.h"
 
 #include "elfext/interface/attribute_relations.h"
-#include "elfext/src/target_rows.h"
+#include "elfext/src/attributes/target_rows.h"
 #include "support/interface/letters.h"
 
 #include <gmock/gmock.h>

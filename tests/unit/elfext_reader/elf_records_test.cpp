@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "elfext/src/elf_records.h"
+#include "elfext/src/bytes/elf_records.h"
 
 #include <gtest/gtest.h>
 

@@ -6,7 +6,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/object_module.h"
-#include "elfext/src/low_level_result.h"
+#include "elfext/src/reports/low_level_result.h"
 
 #include <gtest/gtest.h>
 

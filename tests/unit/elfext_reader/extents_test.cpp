@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What sorting finds is what looking at all pairs finds.
-#include "elfext/src/extents.h"
+#include "elfext/src/bytes/extents.h"
 
 #include <gtest/gtest.h>
 

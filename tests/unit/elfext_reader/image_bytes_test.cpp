@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "elfext/src/image_bytes.h"
+#include "elfext/src/bytes/image_bytes.h"
 
 #include "tests/support/faulty_host.h"
 #include "tests/support/memory_host.h"

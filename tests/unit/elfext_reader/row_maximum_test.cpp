@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "elfext/src/row_maximum.h"
+#include "elfext/src/bytes/row_maximum.h"
 
 #include <gtest/gtest.h>
 

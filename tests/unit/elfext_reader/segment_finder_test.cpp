@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What sorting finds is what going through the segments in their order finds, for each section.
-#include "elfext/src/segment_finder.h"
+#include "elfext/src/reader/segment_finder.h"
 
 #include "elfext/interface/elf_constants.h"
-#include "elfext/src/extents.h"
+#include "elfext/src/bytes/extents.h"
 
 #include <gtest/gtest.h>
 

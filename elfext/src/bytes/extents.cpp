@@ -1,0 +1,114 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "elfext/src/bytes/extents.h"
+
+#include "elfext/src/bytes/first_holders.h"
+
+#include <algorithm>
+#include <array>
+
+namespace elfext {
+
+namespace {
+
+bool startsBefore(const Extent& left, const Extent& right) {
+  return left.start != right.start ? left.start < right.start : left.id < right.id;
+}
+
+constexpr size_t MostRuns = 4;
+constexpr size_t FewExtents = 64; // that are sorted sooner than dealt
+using Runs = std::array<std::vector<Extent>, MostRuns>;
+
+// False if there are more runs than it is worth to merge.
+bool dealIntoRuns(std::span<const Extent> extents, Runs& runs) {
+  for (const Extent& extent : extents) {
+    const auto run = std::find_if(runs.begin(), runs.end(), [&](const std::vector<Extent>& other) {
+      return other.empty() || startsBefore(other.back(), extent);
+    });
+    if (run == runs.end()) return false;
+    run->push_back(extent);
+  }
+  return true;
+}
+
+// Good files have their sections in the order of their offsets, or in a few such orders that take
+// turns, as code and the relocations for it do.
+std::vector<Extent> sortedByStart(std::span<const Extent> extents) {
+  std::vector<Extent> sorted(extents.begin(), extents.end());
+  if (std::is_sorted(sorted.begin(), sorted.end(), startsBefore)) return sorted;
+  Runs runs;
+  if (extents.size() <= FewExtents || !dealIntoRuns(extents, runs)) {
+    std::sort(sorted.begin(), sorted.end(), startsBefore);
+    return sorted;
+  }
+  sorted = std::move(runs.back());
+  for (size_t i = MostRuns - 1; i > 0; --i) {
+    std::vector<Extent> merged(sorted.size() + runs[i - 1].size());
+    std::merge(sorted.begin(), sorted.end(), runs[i - 1].begin(), runs[i - 1].end(), merged.begin(),
+               startsBefore);
+    sorted = std::move(merged);
+  }
+  return sorted;
+}
+
+bool hasOverlap(std::span<const Extent> sorted) {
+  uint64_t reached = 0;
+  for (const Extent& extent : sorted) {
+    if (extent.start < reached) return true;
+    reached = extent.end;
+  }
+  return false;
+}
+
+// How many of the sorted numbers are below the limit.
+size_t countBelow(const std::vector<uint64_t>& sorted, uint64_t limit) {
+  return static_cast<size_t>(std::lower_bound(sorted.begin(), sorted.end(), limit) -
+                             sorted.begin());
+}
+
+std::vector<uint64_t> sortedEnds(std::span<const Extent> extents) {
+  std::vector<uint64_t> ends;
+  ends.reserve(extents.size());
+  for (const Extent& extent : extents)
+    ends.push_back(extent.end);
+  std::sort(ends.begin(), ends.end());
+  return ends;
+}
+
+} // namespace
+
+// An extent overlaps another exactly when more extents than itself start below its end and do not
+// end at or before its start.
+std::optional<std::pair<uint32_t, uint32_t>> findFirstOverlap(std::span<const Extent> extents) {
+  const std::vector<Extent> sorted = sortedByStart(extents);
+  if (!hasOverlap(sorted)) return std::nullopt;
+  const std::vector<uint64_t> ends = sortedEnds(extents);
+  std::vector<uint64_t> starts;
+  starts.reserve(sorted.size());
+  for (const Extent& extent : sorted)
+    starts.push_back(extent.start);
+  const auto overlapsAny = [&](const Extent& extent) {
+    const size_t ended = static_cast<size_t>(
+        std::upper_bound(ends.begin(), ends.end(), extent.start) - ends.begin());
+    return countBelow(starts, extent.end) - ended > 1;
+  };
+  const auto first = std::find_if(extents.begin(), extents.end(), overlapsAny);
+  const auto second = std::find_if(first + 1, extents.end(), [&](const Extent& other) {
+    return other.start < first->end && first->start < other.end;
+  });
+  return std::pair(first->id, second->id);
+}
+
+std::vector<uint32_t> findFirstHolders(std::span<const Extent> outer,
+                                       std::span<const Extent> inner) {
+  std::vector<Holder> holders;
+  holders.reserve(outer.size());
+  for (const Extent& extent : outer)
+    holders.push_back({.start = extent.start, .size = extent.end - extent.start, .id = extent.id});
+  std::vector<Guest> guests;
+  guests.reserve(inner.size());
+  for (const Extent& extent : inner)
+    guests.push_back({.start = extent.start, .size = extent.end - extent.start});
+  return findFirstHolders(holders, guests);
+}
+
+} // namespace elfext

@@ -1,0 +1,109 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "elfext/src/bytes/image_bytes.h"
+
+#include <algorithm>
+#include <new>
+#include <utility>
+
+namespace elfext {
+
+namespace {
+
+constexpr uint64_t BlockSize = 0x1000;
+// Who looks behind what is loaded will mostly look on: so many blocks are read at once then.
+constexpr size_t BlocksAhead = 16;
+
+} // namespace
+
+ImageBytes::ImageBytes(std::span<const uint8_t> bytes)
+    : m_Bytes(bytes.data()), m_Size(bytes.size()) {}
+
+ImageBytes::ImageBytes(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size)
+    : m_Size(size), m_File(std::move(file)), m_FileOffset(offset) {
+  // What is in memory already is viewed there.
+  const std::span<const uint8_t> kept = m_File->getKept();
+  if (kept.data() != nullptr && offset <= kept.size() && size <= kept.size() - offset)
+    m_Bytes = kept.data() + offset;
+}
+
+ImageBytes::ImageBytes(support::Host& host, support::FileHandle file, uint64_t offset,
+                       uint64_t size, bool closesFile)
+    : m_Size(size), m_Host(&host), m_Handle(file), m_FileOffset(offset), m_ClosesFile(closesFile) {}
+
+ImageBytes::~ImageBytes() {
+  // What was read is right whatever a close says of it now.
+  if (m_ClosesFile && m_Handle.isOpen()) static_cast<void>(m_Host->close(m_Handle));
+}
+
+bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
+  m_Failure = failure;
+  m_HostError = error;
+  return false;
+}
+
+bool ImageBytes::prepare() {
+  if (m_Bytes != nullptr || m_Size == 0) return m_Failure == ImageFailure::None;
+  m_Loaded.reset(new (std::nothrow) uint8_t[m_Size]);
+  if (m_Loaded == nullptr) return fail(ImageFailure::NoMemory);
+  m_Bytes = m_Loaded.get();
+  m_MissingBlocks = (m_Size - 1) / BlockSize + 1;
+  m_IsBlockLoaded.resize(m_MissingBlocks);
+  return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
+}
+
+bool ImageBytes::loadAll() {
+  return m_MissingBlocks == 0 || load(0, m_Size);
+}
+
+const uint8_t* ImageBytes::view(uint64_t offset, uint64_t size) {
+  if (!contains(offset, size)) {
+    static_cast<void>(fail(ImageFailure::Outside));
+    return nullptr;
+  }
+  if (m_MissingBlocks != 0 && size != 0 && !load(offset, size)) return nullptr;
+  return m_Bytes + offset;
+}
+
+bool ImageBytes::load(uint64_t offset, uint64_t size) {
+  const size_t end = (offset + size - 1) / BlockSize + 1;
+  size_t block = offset / BlockSize;
+  while (block < end) {
+    if (m_IsBlockLoaded[block]) {
+      ++block;
+      continue;
+    }
+    const bool readsOn = block > 0 && m_IsBlockLoaded[block - 1];
+    const size_t wanted = readsOn ? std::max(end, block + BlocksAhead) : end;
+    const size_t runEnd = endOfMissing(block, std::min(wanted, m_IsBlockLoaded.size()));
+    if (!loadBlocks(block, runEnd)) return false;
+    block = runEnd;
+  }
+  return true;
+}
+
+size_t ImageBytes::endOfMissing(size_t first, size_t end) const {
+  while (first < end && !m_IsBlockLoaded[first])
+    ++first;
+  return first;
+}
+
+support::HostError ImageBytes::readAt(std::span<uint8_t> bytes, uint64_t offset, size_t& done) {
+  done = 0;
+  if (m_File != nullptr) return m_File->readAt(bytes, offset, done);
+  return m_Handle.isOpen() ? m_Host->readAt(m_Handle, bytes, offset, done) : 0;
+}
+
+bool ImageBytes::loadBlocks(size_t first, size_t end) {
+  const uint64_t offset = first * BlockSize;
+  const uint64_t size = std::min(end * BlockSize, m_Size) - offset;
+  size_t done = 0;
+  const support::HostError error =
+      readAt({m_Loaded.get() + offset, size}, m_FileOffset + offset, done);
+  if (error != 0 || done < size) return fail(ImageFailure::Unreadable, error);
+  std::fill(m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(first),
+            m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(end), true);
+  m_MissingBlocks -= end - first;
+  return true;
+}
+
+} // namespace elfext

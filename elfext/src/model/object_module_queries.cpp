@@ -1,0 +1,114 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Look-ups in a module, over views that are made anew at the first look-up after a change.
+#include "checking/interface/checking.h"
+#include "elfext/interface/group.h"
+#include "elfext/interface/object_module.h"
+#include "elfext/src/model/sorted_symbols.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace elfext {
+namespace {
+
+uint64_t getAddress(const Symbol& symbol) {
+  return symbol.getAddress();
+}
+
+} // namespace
+
+void ObjectModule::updateSortedViews() {
+  if (m_AreSortedViewsUpToDate) return;
+  m_SymbolsSortedByAddress.assign(m_Symbols);
+  m_DynamicSymbolsSortedByAddress.assign(m_DynamicSymbols);
+  m_SymbolsSortedByName.assign(m_Symbols);
+  m_DynamicSymbolsSortedByName.assign(m_DynamicSymbols);
+  sortByKey(m_SymbolsSortedByAddress.span(), getAddress);
+  sortByKey(m_DynamicSymbolsSortedByAddress.span(), getAddress);
+  sortByName(m_SymbolsSortedByName.span());
+  sortByName(m_DynamicSymbolsSortedByName.span());
+  m_AreSortedViewsUpToDate = true;
+}
+
+bool ObjectModule::getSectionsByName(const char* name, SectionList* sections) const {
+  QUARN_ASSERT(1, name != NULL);
+  QUARN_ASSERT(1, sections != NULL);
+  const auto isWanted = [name](const Section* section) {
+    return section->getName() != nullptr && std::strcmp(section->getName(), name) == 0;
+  };
+  sections->setSize(
+      static_cast<uint32_t>(std::count_if(m_Sections.begin(), m_Sections.end(), isWanted)));
+  uint32_t listIndex = 0;
+  for (Section* section : m_Sections)
+    if (isWanted(section)) sections->set(listIndex++, section);
+  return listIndex != 0;
+}
+
+bool ObjectModule::getSymbolsByName(const char* name, SymbolList* symbols) {
+  QUARN_ASSERT(1, name != NULL);
+  QUARN_ASSERT(1, symbols != NULL);
+  updateSortedViews();
+  const SymbolView view = m_SymbolsSortedByName.span();
+  return collect(view, findName(view, name), Symbol::Class_All, symbols);
+}
+
+bool ObjectModule::getDynamicSymbolsByName(const char* name, SymbolList* symbols) {
+  QUARN_ASSERT(1, name != NULL);
+  QUARN_ASSERT(1, symbols != NULL);
+  updateSortedViews();
+  const SymbolView view = m_DynamicSymbolsSortedByName.span();
+  return collect(view, findName(view, name), Symbol::Class_All, symbols);
+}
+
+bool ObjectModule::collectByAddress(uint32_t fromIndex, uint32_t toIndex, uint32_t mask,
+                                    SymbolList* symbols) const {
+  QUARN_ASSERT(1, fromIndex <= toIndex && toIndex < m_SymbolsSortedByAddress.getSize());
+  return collect(m_SymbolsSortedByAddress.span(), {true, fromIndex, toIndex}, mask, symbols);
+}
+
+bool ObjectModule::getSymbolsInRange(uint64_t fromAddress, uint64_t toAddress, uint32_t mask,
+                                     SymbolList* symbols) {
+  QUARN_ASSERT(1, symbols != NULL);
+  updateSortedViews();
+  symbols->setSize(0);
+  const SymbolRun run =
+      findRange(m_SymbolsSortedByAddress.span(), getAddress, fromAddress, toAddress);
+  return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
+}
+
+bool ObjectModule::getSymbolsAtAddress(uint64_t address, uint32_t mask, SymbolList* symbols) {
+  return getSymbolsInRange(address, address, mask, symbols);
+}
+
+bool ObjectModule::getPrecedingSymbols(uint64_t address, uint32_t mask, SymbolList* symbols) {
+  QUARN_ASSERT(1, symbols != NULL);
+  updateSortedViews();
+  symbols->setSize(0);
+  const SymbolRun run = findPreceding(m_SymbolsSortedByAddress.span(), getAddress, address, mask);
+  return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
+}
+
+bool ObjectModule::getFollowingSymbols(uint64_t address, uint32_t mask, SymbolList* symbols) {
+  QUARN_ASSERT(1, symbols != NULL);
+  updateSortedViews();
+  symbols->setSize(0);
+  const SymbolRun run = findFollowing(m_SymbolsSortedByAddress.span(), getAddress, address, mask);
+  return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
+}
+
+// Signatures may be long and all the same text: nobody should pay for them who does not ask.
+void ObjectModule::noteComdatGroups() {
+  for (Group* group : m_UnnotedGroups)
+    noteComdatGroup(group);
+  m_UnnotedGroups.setSize(0);
+}
+
+Group* ObjectModule::findComdatGroup(const char* signature) {
+  QUARN_ASSERT(1, signature != NULL);
+  noteComdatGroups();
+  Group* const* group = m_MapSignaturesToComdatGroups.find(Stringlett(signature));
+  return group == nullptr ? nullptr : *group;
+}
+
+} // namespace elfext

@@ -1,0 +1,81 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The order in which a model is made.
+#include "elfext/src/reader/object_module_reader.h"
+
+#include "elfext/interface/elf_constants.h"
+
+#include <utility>
+
+namespace elfext {
+
+namespace {
+
+// Clears the module and copies the header's fields in.
+void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
+  const FileHeader& header = context.fileHeader;
+  ObjectModule& module = context.module;
+  module.clear();
+  module.adoptImageSource(std::move(image));
+  module.setReadBuffer(context.lentBytes);
+  module.setMachine(header.machine);
+  module.setFileType(header.type);
+  module.setElfClass(header.ident[EI_CLASS]);
+  module.setDataEncoding(header.ident[EI_DATA]);
+  module.setOsAbi(header.ident[EI_OSABI]);
+  module.setAbiVersion(header.ident[EI_ABIVERSION]);
+  module.setEntry(header.entry);
+  module.setElfFlags(header.flags);
+  module.setIdentVersion(header.ident[EI_VERSION]);
+  module.setElfVersion(header.version);
+  module.setElfHeaderSize(header.ehsize);
+  module.setSectionHeaderOffset(header.shoff);
+  module.setProgramHeaderOffset(header.phoff);
+  module.setStoredSectionCount(header.shnum);
+  module.setStoredProgramHeaderCount(header.phnum);
+  module.setSectionHeaderEntrySize(header.shentsize);
+  module.setProgramHeaderEntrySize(header.phentsize);
+  module.reserveSections(context.sectionCount());
+}
+
+void makeObjects(ReadContext& context) {
+  createSections(context);
+  nameSections(context);
+  linkSections(context);
+  createSymbols(context);
+  giveRelocations(context);
+  createGroups(context);
+  placeRegions(context);
+  takeDynamicTables(context);
+  takeDebugOverlays(context);
+  takeSegmentMaps(context);
+}
+
+// Build attributes come last of all, when everything that they may hang on is there.
+bool readModule(ReadContext& context) {
+  if (!checkTables(context)) return false;
+  makeObjects(context);
+  return giveBuildAttributes(context);
+}
+
+} // namespace
+
+bool readObjectModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
+  ObjectModule& module = context.module;
+  bool isForeign = false;
+  if (!checkHeaders(context, isForeign)) return false;
+  if (isForeign) return true;
+
+  beginModule(context, std::move(image));
+  // Names are views of the image, which the module now owns.
+  const bool wereNamesInBuffer = module.areNamesInBuffer();
+  module.setNamesInBuffer(true);
+  const bool isRead = readModule(context);
+  module.setNamesInBuffer(wereNamesInBuffer);
+  if (!isRead) return false;
+  module.setReadConditions(computeReadConditions(context));
+  module.setAuxiliarySectionsUpToDate(false);
+  return true;
+}
+
+} // namespace elfext

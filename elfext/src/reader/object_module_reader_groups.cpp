@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// From checked group sections the groups.
+#include "elfext/interface/auxiliary_sections.h"
+#include "elfext/interface/group.h"
+#include "elfext/src/reader/object_module_reader.h"
+
+namespace elfext {
+
+namespace {
+
+const char* signatureOf(const ReadContext& context, uint32_t index) {
+  const SectionHeader& header = context.sectionHeaders[index];
+  const Symbol* symbol = context.symbols[header.link][header.info];
+  return symbol == nullptr || symbol->getName() == nullptr ? "" : symbol->getName();
+}
+
+} // namespace
+
+void createGroups(ReadContext& context) {
+  ObjectModule& module = context.module;
+  for (const GroupTable& table : context.groups) {
+    auto* section = static_cast<GroupSection*>(module.getSection(table.section));
+    Group* group =
+        module.createGroup(signatureOf(context, table.section), section->getName(), table.flags);
+    group->setGroupSection(section);
+    for (const uint32_t member :
+         std::span(context.groupMembers).subspan(table.firstMember, table.memberCount))
+      group->addMember(module.getSection(member));
+  }
+}
+
+} // namespace elfext

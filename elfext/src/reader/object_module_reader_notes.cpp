@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// From two tables of this system's own: the records of debug overlay sections, and the segments
+// that notes give to sections.
+#include "elfext/src/reader/object_module_reader.h"
+
+namespace elfext {
+
+void takeDebugOverlays(ReadContext& context) {
+  ObjectModule& module = context.module;
+  for (const DebugOverlayRow& row : context.debugOverlayRows)
+    module.addDebugOverlayRecord(
+        {row.word, module.getSection(row.debugSection), module.getSection(row.section)});
+}
+
+void takeSegmentMaps(ReadContext& context) {
+  for (uint32_t i = 0; i < context.notedSegments.size(); ++i) {
+    const uint32_t segment = context.notedSegments[i];
+    if (segment == NoSegment) continue;
+    context.module.getSection(i)->setSegment(context.module.getSegment(segment));
+  }
+}
+
+} // namespace elfext

@@ -1,0 +1,109 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// From checked section headers the sections: their contents, which stay where they are until
+// somebody looks, and their names.
+#include "elfext/interface/auxiliary_sections.h"
+#include "elfext/interface/deferred_contents.h"
+#include "elfext/interface/deferred_contents_selector.h"
+#include "elfext/interface/elf_constants.h"
+#include "elfext/interface/reference_counted_file.h"
+#include "elfext/src/reader/object_module_reader.h"
+
+namespace elfext {
+
+namespace {
+
+bool mayBeDeferred(uint32_t type) {
+  switch (type) {
+  case SHT_SYMTAB:
+  case SHT_STRTAB:
+  case SHT_RELA:
+  case SHT_HASH:
+  case SHT_DYNAMIC:
+  case SHT_NOTE:
+  case SHT_REL:
+  case SHT_DYNSYM:
+  case SHT_GROUP:
+  case SHT_SYMTAB_SHNDX:
+  case SHT_GNU_verdef:
+  case SHT_GNU_verneed:
+  case SHT_GNU_versym:
+  case SHT_ZEV_PREEMPTMAP:
+  case SHT_ZEV_ATTRIBUTES:
+  case SHT_ZEV_DEBUGOVERLAY:
+    return false;
+  default:
+    return true;
+  }
+}
+
+void deferSection(ReadContext& context, Section& section, const SectionHeader& header) {
+  DeferralFile& deferral = *context.deferral;
+  alloclib::RegionGeneral& region = section.getObjectModule()->getObjectRegion();
+  if (deferral.shared == nullptr) {
+    deferral.shared = alloclib::create<ReferenceCountedFile>(region, deferral.host, deferral.file);
+    deferral.shared->addReference();
+    context.image.leaveFileOpen();
+  }
+  section.deferContents(alloclib::create<DeferredContents>(region, deferral.shared, true, header));
+}
+
+void giveContents(ReadContext& context, Section& section, const SectionHeader& header) {
+  section.adoptSize(header.size);
+  if (context.deferral != nullptr && mayBeDeferred(header.type) &&
+      context.deferral->selector.isDeferred(section, header.size))
+    deferSection(context, section, header);
+  else
+    section.getBuffer().defer(context.image, header.offset, header.size);
+}
+
+// The section of a string table gets what the table of the read has.
+void mendStringTable(Section& section) {
+  section.setAuxiliary(false);
+  if (section.getSize() == 0) {
+    section.appendByte(0);
+  } else {
+    section.setByte(0, 0);
+    section.setByte(section.getSize() - 1, 0);
+  }
+  section.setAuxiliary(true);
+}
+
+} // namespace
+
+const char* ReadContext::stringsOf(uint32_t section) {
+  const uint8_t* bytes = mendedStrings.contains(section)
+                             ? module.getSection(section)->getBuffer().getContents()
+                             : viewSection(section);
+  return reinterpret_cast<const char*>(bytes);
+}
+
+void createSections(ReadContext& context) {
+  ObjectModule& module = context.module;
+  for (const SectionHeader& header : context.sectionHeaders) {
+    module.createSectionOfType(nullptr, header.type, static_cast<uint32_t>(header.flags))
+        ->adoptHeader(header);
+  }
+  QUARN_ASSERT(1, module.getSectionCount() == context.sectionHeaders.size());
+  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+    const SectionHeader& header = context.sectionHeaders[i];
+    if (header.type == SHT_NOBITS) module.getSection(i)->adoptSize(header.size);
+    if (hasFileBytes(header)) giveContents(context, *module.getSection(i), header);
+  }
+  for (const auto& [section, bytes] : context.mendedStrings)
+    mendStringTable(*module.getSection(section));
+}
+
+void nameSections(ReadContext& context) {
+  const uint32_t table = context.sectionNameTable;
+  if (table == 0) return;
+  QUARN_ASSERT(1, context.module.getSection(table)->getType() == SHT_STRTAB);
+  static_cast<StringTableSection*>(context.module.getSection(table))->markSectionNameTable();
+  const char* names = context.stringsOf(table);
+  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+    const uint32_t offset = context.sectionHeaders[i].name;
+    if (offset != 0) context.module.getSection(i)->adoptName(names + offset);
+  }
+}
+
+} // namespace elfext

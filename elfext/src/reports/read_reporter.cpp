@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "elfext/src/reports/read_reporter.h"
+
+#include "elfext/interface/object_module.h"
+
+namespace elfext {
+
+ReadReporter::ReadReporter(const ObjectModule& module)
+    : m_Handler(module.getErrorHandler()), m_Module(&module) {}
+
+ReadReporter::ReadReporter(ErrorHandler* handler, const char* objectName)
+    : m_Handler(handler), m_ObjectName(objectName) {}
+
+ReadReporter::~ReadReporter() = default;
+
+const ObjectModule& ReadReporter::getModule() const {
+  if (m_Module != nullptr) return *m_Module;
+  m_Carrier = std::make_unique<ObjectModule>();
+  if (m_ObjectName != nullptr) m_Carrier->setObjectName(m_ObjectName);
+  m_Module = m_Carrier.get();
+  return *m_Module;
+}
+
+} // namespace elfext

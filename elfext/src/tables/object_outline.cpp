@@ -1,0 +1,186 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "elfext/interface/object_outline.h"
+
+#include "alloclib/interface/region_objects.h"
+#include "elfext/interface/build_attributes.h"
+#include "elfext/interface/elf_constants.h"
+#include "elfext/src/model/symbol_class.h"
+#include "elfext/src/tables/build_attributes_reader.h"
+#include "elfext/src/tables/loose_attribute_store.h"
+#include "elfext/src/tables/object_tables.h"
+#include "elfext/src/tables/sizes_source.h"
+
+#include <string>
+#include <utility>
+
+namespace elfext {
+
+struct ObjectOutline::Content {
+  Content(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
+          ErrorHandler* errorHandler, const char* name)
+      : objectName(name == nullptr ? "" : name),
+        reporter(errorHandler, name == nullptr ? nullptr : objectName.c_str()),
+        image(std::move(file), offset, size),
+        region(alloclib::RegionGeneral::Create(0x1000, "Object outline region")),
+        tables(reporter, image, *region) {}
+
+  std::string objectName;
+  ReadReporter reporter;
+  ImageBytes image;
+  alloclib::RegionOwner region;
+  ObjectTables tables;
+  std::optional<LooseAttributeStore> attributes = {};
+  bool areAttributesWanted = false;
+};
+
+namespace {
+
+// Of a file with no overlapping sections.
+template <class Function>
+void forEachStaticSymbol(const ObjectTables& tables, Function function) {
+  for (const SymbolTable& table : tables.symbolTables) {
+    if (table.isDynamic) continue;
+    for (uint32_t i = 1; i < table.rowCount; ++i) {
+      function(table, i, tables.getSymbolRow(table, i));
+    }
+  }
+}
+
+// Bytes of a section as a model would have them.
+uint64_t sizeOf(const ObjectTables& tables, uint32_t section) {
+  if (tables.typeOf(section) == SHT_NULL) return 0;
+  return tables.stringSize(section);
+}
+
+bool isCode(const SectionHeader& header) {
+  constexpr uint64_t CodeFlags = SHF_ALLOC | SHF_EXECINSTR;
+  return (header.flags & CodeFlags) == CodeFlags;
+}
+
+void addSections(const ObjectTables& tables, SizesSource& source) {
+  source.sections.reserve(tables.sectionCount());
+  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+    const SectionHeader& header = tables.sectionHeaders[i];
+    const uint64_t size = sizeOf(tables, i);
+    source.sections.push_back(
+        {tables.nameOf(i), header.type, static_cast<uint32_t>(header.flags), size, size});
+  }
+}
+
+void addMappingSymbols(const ObjectTables& tables, SizesSource& source) {
+  forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
+    const char* name = table.nameOf(row);
+    if (classOf(name) != Symbol::Class_Mapping) return;
+    const SymbolHome home = tables.homeOf(table, index, row);
+    if (home.category != Symbol::Category_Hosted) return;
+    const SectionHeader& header = tables.sectionHeaders[home.section];
+    if (!isCode(header)) return;
+    const uint64_t base = tables.hasLaidOutAddresses() ? header.addr : 0;
+    source.mappingSymbols.push_back({home.section, row.value - base, name});
+  });
+}
+
+// False, after a report, if bytes can't be had.
+bool addRawData(ObjectTables& tables, SizesSource& source) {
+  for (const SegmentGap& gap : tables.gaps) {
+    const uint64_t size = gap.end - gap.start;
+    source.occupied.push_back({gap.start, size});
+    const std::optional<bool> isZero = isAllZero(size, [&](uint64_t offset, uint64_t count) {
+      return tables.view(gap.start + offset, count);
+    });
+    if (!isZero) return false;
+    source.rawData.push_back({size, *isZero});
+  }
+  return true;
+}
+
+// What is in the segments, of which an object that is still to be linked has none.
+bool addSegments(ObjectTables& tables, SizesSource& source) {
+  if (tables.programHeaders.empty()) return true;
+  for (const ProgramHeader& segment : tables.programHeaders) {
+    source.segments.push_back(
+        {segment.type, segment.flags, {segment.offset, segment.filesz}, segment.memsz});
+  }
+  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+    const uint64_t size = tables.typeOf(i) == SHT_NOBITS ? 0 : sizeOf(tables, i);
+    if (size != 0) source.occupied.push_back({tables.sectionHeaders[i].offset, size});
+  }
+  const FileHeader& header = tables.fileHeader;
+  source.occupied.push_back({0, header.ehsize});
+  source.occupied.push_back({header.phoff, uint64_t{header.phentsize} * tables.segmentCount()});
+  source.occupied.push_back({header.shoff, uint64_t{header.shentsize} * tables.sectionCount()});
+  return addRawData(tables, source);
+}
+
+} // namespace
+
+ObjectOutline::ObjectOutline() = default;
+ObjectOutline::~ObjectOutline() = default;
+
+bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
+                         ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
+  m_Content.reset();
+  const auto available = static_cast<uint64_t>(file->getStatus().size);
+  auto content = std::make_unique<Content>(std::move(file), offset, size, errorHandler, objectName);
+  ObjectTables& tables = content->tables;
+  if (offset > available || size > available - offset)
+    return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
+  bool isForeign = false;
+  if (!content->image.prepare()) return tables.failRead();
+  if (!checkHeaders(tables, isForeign)) return false;
+  if (isForeign) return true;
+  if (!checkTables(tables)) return false;
+  content->attributes.emplace(tables, wantsAttributes);
+  content->areAttributesWanted = wantsAttributes;
+  if (!readBuildAttributes(tables, *content->attributes)) return false;
+  m_Content = std::move(content);
+  return true;
+}
+
+std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
+  std::vector<OutlinedSection> sections;
+  if (m_Content == nullptr) return sections;
+  const ObjectTables& tables = m_Content->tables;
+  sections.reserve(tables.sectionCount());
+  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+    const SectionHeader& header = tables.sectionHeaders[i];
+    sections.push_back({tables.nameOf(i), header.type, header.flags});
+  }
+  return sections;
+}
+
+std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
+  m_Symbols.clear();
+  if (m_Content == nullptr) return {};
+  const ObjectTables& tables = m_Content->tables;
+  m_Symbols.reserve(m_Content->attributes->getSymbolCount());
+  forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
+    const SymbolHome home = tables.homeOf(table, index, row);
+    const bool isHosted = home.category == Symbol::Category_Hosted;
+    m_Symbols.push_back({table.nameOf(row), home.category, static_cast<uint32_t>(row.info >> 4),
+                         isHosted ? tables.nameOf(home.section) : nullptr});
+  });
+  return m_Symbols;
+}
+
+uint64_t ObjectOutline::getEntry() const {
+  return m_Content == nullptr ? 0 : m_Content->tables.fileHeader.entry;
+}
+
+const FullAttr* ObjectOutline::getOwnAttributes() const {
+  if (m_Content == nullptr || !m_Content->areAttributesWanted) return nullptr;
+  const BuildAttributes* own = m_Content->attributes->getOwnOfFile();
+  return own == nullptr ? nullptr : &own->getFullAttr();
+}
+
+std::optional<SizesStatistics> ObjectOutline::computeSizes() {
+  if (m_Content == nullptr) return SizesStatistics();
+  ObjectTables& tables = m_Content->tables;
+  SizesSource source;
+  addSections(tables, source);
+  addMappingSymbols(tables, source);
+  if (!addSegments(tables, source)) return std::nullopt;
+  return computeSizesStatistics(std::move(source));
+}
+
+} // namespace elfext
