@@ -50,13 +50,14 @@ public:
 private:
   [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
   void addMember(ArchiveMember& member);
-  void addEntries(const elfext::ObjectOutline& outline, const ArchiveMember& member);
+  void addEntries(const ArchiveMember& member);
   void addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member);
   void printEntries() const;
 
   arlib::Archive& m_Archive;
   uint32_t m_Flags;
   ObjectSizes m_Totals;
+  elfext::ObjectOutline m_Outline;
   std::vector<EntryRecord> m_Entries;
   std::deque<std::string> m_SectionNames;
 };
@@ -80,20 +81,19 @@ void ObjectReport::addMember(ArchiveMember& member) {
   if (member.getType() != arlib::ElfImageArchiveMemberType::getInstance()) return;
   if (!member.flushContents()) return;
   const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();
-  elfext::ObjectOutline outline;
-  if (!outline.read(location.file->shared_from_this(), location.offset, member.getSize(), nullptr,
-                    nullptr))
+  if (!m_Outline.read(location.file->shared_from_this(), location.offset, member.getSize(), nullptr,
+                      nullptr))
     return;
-  const std::optional<elfext::SizesStatistics> totals = outline.computeSizes();
+  const std::optional<elfext::SizesStatistics> totals = m_Outline.computeSizes();
   if (!totals) return;
-  if (shows(Report_Entries)) addEntries(outline, member);
+  if (shows(Report_Entries)) addEntries(member);
   addSizes(*totals, member);
 }
 
-void ObjectReport::addEntries(const elfext::ObjectOutline& outline, const ArchiveMember& member) {
+void ObjectReport::addEntries(const ArchiveMember& member) {
   constexpr uint32_t EntryFlags = elfext::SHF_ALLOC | EntryFlag;
   std::vector<const char*> names;
-  for (const elfext::ObjectOutline::OutlinedSection& section : outline.getSections()) {
+  for (const elfext::ObjectOutline::OutlinedSection& section : m_Outline.getSections()) {
     if (section.type != elfext::SHT_PROGBITS) continue;
     if ((section.flags & EntryFlags) != EntryFlags) continue;
     names.push_back(section.name == nullptr ? "" : section.name);
@@ -102,7 +102,7 @@ void ObjectReport::addEntries(const elfext::ObjectOutline& outline, const Archiv
     return m_SectionNames.emplace_back(whole);
   };
   for (const std::string_view name : support::copyShared(names, copy))
-    m_Entries.push_back({static_cast<uint32_t>(outline.getEntry()), name, member.getName()});
+    m_Entries.push_back({static_cast<uint32_t>(m_Outline.getEntry()), name, member.getName()});
 }
 
 void ObjectReport::addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member) {

@@ -8,6 +8,7 @@
 #include "arlib/interface/symbol_name_list.h"
 #include "elfext/interface/attribute_text_cache.h"
 #include "elfext/interface/full_attr.h"
+#include "elfext/interface/object_outline.h"
 
 #include <cstdint>
 #include <optional>
@@ -16,8 +17,7 @@
 
 namespace elfext {
 class ErrorHandler;
-class ObjectOutline;
-} // namespace elfext
+}
 
 namespace arlib {
 
@@ -25,6 +25,14 @@ class ArchiveMember;
 
 // What decoration texts say: members of a library have thousands of them, of which few differ.
 using AttributeRecords = elfext::AttributeTextCache<elfext::FullAttr>;
+
+// What serves all objects that are read one after the other, for one is like the next.
+struct ObjectReading {
+  ObjectReading();
+
+  AttributeRecords records;
+  elfext::ObjectOutline outline;
+};
 
 class ArchiveMemberType {
 public:
@@ -82,8 +90,8 @@ public:
                                   bool useObjectAttributes) const = 0;
 
   // Both at the cost of one read, as the archive wants its objects' attributes. Without attributes
-  // the object says nothing. The records serve all objects of a rebuild.
-  virtual bool getPublished(ArchiveMember* archiveMember, AttributeRecords& records,
+  // the object says nothing.
+  virtual bool getPublished(ArchiveMember* archiveMember, ObjectReading& reading,
                             SymbolNameList& names, std::optional<elfext::FullAttr>& attributes,
                             std::string& reason) const = 0;
 };
@@ -96,7 +104,7 @@ public:
                       std::string& reason) const override;
   bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                           bool useObjectAttributes) const override;
-  bool getPublished(ArchiveMember* archiveMember, AttributeRecords& records, SymbolNameList& names,
+  bool getPublished(ArchiveMember* archiveMember, ObjectReading& reading, SymbolNameList& names,
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
 

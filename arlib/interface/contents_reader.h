@@ -12,12 +12,11 @@
 #include <span>
 
 namespace support {
+class ReadWindow;
 class SourceFile;
-}
+} // namespace support
 
 namespace arlib {
-
-class ReadWindow;
 
 class ContentsReader {
 public:
@@ -52,7 +51,7 @@ private:
 
   Archive& m_Archive;
   support::SourceFile* m_File = nullptr; // that was read last, and is still to be looked at
-  std::unique_ptr<ReadWindow> m_Window;
+  std::unique_ptr<support::ReadWindow> m_Window;
   const uint8_t* m_Memory = nullptr; // the rest of a member that is in memory
   uint64_t m_Offset = 0;             // of the rest of a member that is on disk
   uint64_t m_Remaining = 0;

@@ -27,22 +27,31 @@ public:
     QUARN_ASSERT(1, name != NULL);
     add(std::string_view(name));
   }
-  void add(std::string_view name) { m_Names.append(copy(name)); }
+  void add(std::string_view name) { addCopied(copy(name)); }
 
   // The same in two steps, for names that share a copy: a text of as long a life as the list, and a
   // name that is a part of one.
   [[nodiscard]] std::string_view copy(std::string_view text) {
     return {alloclib::copyString(*m_Region, text), text.size()};
   }
-  void addCopied(std::string_view name) { m_Names.append(name); }
+  void addCopied(std::string_view name) {
+    m_Names.append(name);
+    m_TextSize += name.size();
+  }
 
   [[nodiscard]] uint32_t getSize() const { return m_Names.getSize(); }
   [[nodiscard]] std::string_view operator[](uint32_t index) const { return m_Names[index]; }
-  void clear() { m_Names.setSize(0); }
+  // Of all names, in bytes.
+  [[nodiscard]] uint64_t getTextSize() const { return m_TextSize; }
+  void clear() {
+    m_Names.setSize(0);
+    m_TextSize = 0;
+  }
 
 private:
   alloclib::RegionGeneral* m_Region;
   elfext::FastArray<std::string_view> m_Names;
+  uint64_t m_TextSize = 0;
 };
 
 } // namespace arlib

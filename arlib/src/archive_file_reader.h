@@ -6,7 +6,7 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
-#include "arlib/src/read_window.h"
+#include "support/interface/read_window.h"
 
 #include <cstdint>
 #include <span>
@@ -59,7 +59,7 @@ private:
   Archive& m_Archive;
   support::Host& m_Host;
   std::shared_ptr<support::SourceFile> m_File;
-  ReadWindow m_Window;
+  support::ReadWindow m_Window;
   support::FileStatus m_Status; // as the file was when it was opened
   bool m_HostFileIsChecked = false;
 

@@ -146,6 +146,8 @@ void findNames(OutlinedSymbols symbols, const ArchiveMember& archiveMember, Symb
 
 } // namespace
 
+ObjectReading::ObjectReading() : records(elfext::parseAttributeString) {}
+
 bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
                                      elfext::ErrorHandler* errorHandler, bool wantsAttributes,
                                      elfext::ObjectOutline& outline) {
@@ -162,18 +164,18 @@ bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                                                std::string& reason) const {
   std::optional<elfext::FullAttr> attributes;
-  AttributeRecords records(elfext::parseAttributeString);
-  return getPublished(archiveMember, records, names, attributes, reason);
+  ObjectReading reading;
+  return getPublished(archiveMember, reading, names, attributes, reason);
 }
 
-bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember,
-                                             AttributeRecords& records, SymbolNameList& names,
+bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, ObjectReading& reading,
+                                             SymbolNameList& names,
                                              std::optional<elfext::FullAttr>& attributes,
                                              std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   const bool useObjectAttributes = archiveMember->getArchive()->getUseObjectBuildAttributes();
   elfext::ElfextErrorStringCapture capture;
-  elfext::ObjectOutline outline;
+  elfext::ObjectOutline& outline = reading.outline;
   reason.clear();
   attributes.reset();
   if (!read(*archiveMember, &capture, useObjectAttributes, outline)) {
@@ -183,8 +185,8 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember,
   const OutlinedSymbols symbols = outline.getSymbols();
   findNames(symbols, *archiveMember, names);
   elfext::FullAttr stated;
-  if (findAttributes(outline, symbols, archiveMember->getSize(), useObjectAttributes, records,
-                     stated))
+  if (findAttributes(outline, symbols, archiveMember->getSize(), useObjectAttributes,
+                     reading.records, stated))
     attributes = stated;
   return true;
 }
@@ -193,11 +195,11 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
                                                    elfext::FullAttr& attributes,
                                                    bool useObjectAttributes) const {
   QUARN_ASSERT(1, archiveMember != NULL);
-  elfext::ObjectOutline outline;
+  ObjectReading reading;
+  elfext::ObjectOutline& outline = reading.outline;
   if (!read(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
-  AttributeRecords records(elfext::parseAttributeString);
   return findAttributes(outline, outline.getSymbols(), archiveMember->getSize(),
-                        useObjectAttributes, records, attributes);
+                        useObjectAttributes, reading.records, attributes);
 }
 
 } // namespace arlib

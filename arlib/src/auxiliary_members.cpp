@@ -2,13 +2,11 @@
 #include "arlib/src/auxiliary_members.h"
 
 #include "arlib/interface/archive_format.h"
-#include "elfext/interface/attribute_string.h"
 
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <string>
-#include <unordered_set>
 
 namespace arlib {
 
@@ -30,8 +28,7 @@ AuxiliaryMembers::AuxiliaryMembers(Archive& archive)
     : m_Archive(archive),
       m_Region(alloclib::RegionGeneral::Create(ScratchRegionSize,
                                                "arlib::Archive::updateAuxiliaryMembers() region")),
-      m_Records(elfext::parseAttributeString), m_SymbolHostingMembers(m_Region.get()),
-      m_Output(m_Region.get()) {}
+      m_SymbolHostingMembers(m_Region.get()), m_Output(m_Region.get()) {}
 
 bool AuxiliaryMembers::update() {
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
@@ -171,7 +168,6 @@ bool AuxiliaryMembers::updateSymbolTable() {
     removeSymbolTable();
     return true;
   }
-  m_Output.reserve(m_SymbolCount);
   if (!addVariantSymbols()) return false;
   addPlainSymbols();
   return makeSymbolTable(computeTableSize());
@@ -180,7 +176,7 @@ bool AuxiliaryMembers::updateSymbolTable() {
 // A member that can't be read is told of and has no entries. A handler that says to stop there
 // leaves the table with the members collected so far.
 void AuxiliaryMembers::collectSymbolHostingMembers() {
-  const elfext::FullAttr nothingStated = m_Records.get("");
+  const elfext::FullAttr nothingStated = m_Reading.records.get("");
   QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
     if (!member->m_Type->isObjectModule()) continue;
@@ -188,13 +184,13 @@ void AuxiliaryMembers::collectSymbolHostingMembers() {
     auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
     std::optional<elfext::FullAttr> attributes;
     std::string reason;
-    if (!type->getPublished(member, m_Records, *names, attributes, reason) &&
+    if (!type->getPublished(member, m_Reading, *names, attributes, reason) &&
         !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
       return;
     }
     if (names->getSize() == 0) continue;
-    m_SymbolHostingMembers.append({member, names, attributes.value_or(nothingStated)});
-    m_SymbolCount += names->getSize();
+    m_SymbolHostingMembers.append(
+        {member, names, NamesKey(*names), attributes.value_or(nothingStated)});
   }
 }
 
@@ -202,7 +198,7 @@ void AuxiliaryMembers::collectSymbolHostingMembers() {
 // other names may not.
 bool AuxiliaryMembers::addVariantSymbols() {
   m_IsMinorVariant.resize(m_SymbolHostingMembers.getSize());
-  MinorVariants variants(m_Archive, *m_Region, m_Records);
+  MinorVariants variants(m_Archive, *m_Region, m_Reading.records);
   std::vector<HostingMember> members;
   for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.span())) {
     members.clear();
@@ -220,18 +216,25 @@ void AuxiliaryMembers::addPlainSymbols() {
   for (uint32_t index = 0; index < m_SymbolHostingMembers.getSize(); ++index) {
     if (m_IsMinorVariant[index]) continue;
     const HostingMember& hosting = m_SymbolHostingMembers[index];
-    for (uint32_t i = 0; i < hosting.names->getSize(); ++i) {
-      const std::string_view name = (*hosting.names)[i];
-      if (m_Archive.m_UniqueSymbolsOnly && !seenNames.insert(name).second) continue;
-      m_Output.append({name, hosting.member});
-    }
+    const SymbolNameList* names = hosting.names;
+    if (m_Archive.m_UniqueSymbolsOnly) names = dropSeenNames(*names, seenNames);
+    m_Output.append({hosting.member, names});
   }
+}
+
+const SymbolNameList* AuxiliaryMembers::dropSeenNames(const SymbolNameList& names,
+                                                      std::unordered_set<std::string_view>& seen) {
+  auto* fresh = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+  for (uint32_t i = 0; i < names.getSize(); ++i) {
+    if (seen.insert(names[i]).second) fresh->addCopied(names[i]);
+  }
+  return fresh;
 }
 
 uint64_t AuxiliaryMembers::computeTableSize() const {
   uint64_t size = 4;
-  for (const SymbolTableEntry& entry : m_Output)
-    size += 4 + entry.name.size() + 1;
+  for (const SymbolTableEntries& entries : m_Output)
+    size += (4 + 1) * uint64_t{entries.names->getSize()} + entries.names->getTextSize();
   return size;
 }
 
@@ -264,19 +267,23 @@ void AuxiliaryMembers::computeMemberOffsets(uint64_t tableSize) {
   m_Archive.m_ArchiveMemberOffsetsUpToDate = true;
 }
 
+// The count, the offset of each name's member, and the names.
 void AuxiliaryMembers::fillSymbolTable(std::span<uint8_t> bytes) const {
-  const size_t symbolTableSize = bytes.size();
-  putBigEndian32(bytes.data(), m_Output.getSize());
-  size_t offsetPosition = 4;
-  size_t symbolTablePosition = 4 + 4 * size_t{m_Output.getSize()};
-  for (const SymbolTableEntry& entry : m_Output) {
-    putBigEndian32(bytes.data() + offsetPosition, entry.member->m_Offset);
-    offsetPosition += 4;
-    std::memcpy(bytes.data() + symbolTablePosition, entry.name.data(), entry.name.size());
-    symbolTablePosition += entry.name.size();
-    bytes[symbolTablePosition++] = 0;
+  size_t position = 4;
+  for (const auto& [member, names] : m_Output) {
+    for (uint32_t i = 0; i < names->getSize(); ++i, position += 4)
+      putBigEndian32(bytes.data() + position, member->m_Offset);
   }
-  QUARN_ASSERT(1, symbolTablePosition == symbolTableSize);
+  putBigEndian32(bytes.data(), static_cast<uint32_t>(position / 4 - 1));
+  for (const auto& [member, names] : m_Output) {
+    for (uint32_t i = 0; i < names->getSize(); ++i) {
+      const std::string_view name = (*names)[i];
+      std::memcpy(bytes.data() + position, name.data(), name.size());
+      position += name.size();
+      bytes[position++] = 0;
+    }
+  }
+  QUARN_ASSERT(1, position == bytes.size());
 }
 
 } // namespace arlib

@@ -11,6 +11,8 @@
 #include "elfext/interface/fast_array.h"
 
 #include <cstdint>
+#include <string_view>
+#include <unordered_set>
 #include <vector>
 
 namespace arlib {
@@ -30,6 +32,8 @@ private:
   void collectSymbolHostingMembers();
   bool addVariantSymbols();
   void addPlainSymbols();
+  [[nodiscard]] const SymbolNameList* dropSeenNames(const SymbolNameList& names,
+                                                    std::unordered_set<std::string_view>& seen);
   [[nodiscard]] uint64_t computeTableSize() const;
   bool makeSymbolTable(uint64_t tableSize);
   void computeMemberOffsets(uint64_t tableSize);
@@ -43,12 +47,11 @@ private:
 
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;
-  AttributeRecords m_Records;
+  ObjectReading m_Reading;
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
-  uint32_t m_SymbolCount = 0;
   // By hosting member: whether it is in a group of minor variants.
   std::vector<bool> m_IsMinorVariant;
-  elfext::FastArray<SymbolTableEntry> m_Output;
+  elfext::FastArray<SymbolTableEntries> m_Output; // in the order of the table
 };
 
 } // namespace arlib

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "arlib/interface/contents_reader.h"
 
-#include "arlib/src/read_window.h"
+#include "support/interface/read_window.h"
 #include "support/interface/source_file.h"
 
 #include <algorithm>
@@ -9,7 +9,7 @@
 namespace arlib {
 
 ContentsReader::ContentsReader(Archive& archive)
-    : m_Archive(archive), m_Window(std::make_unique<ReadWindow>()) {}
+    : m_Archive(archive), m_Window(std::make_unique<support::ReadWindow>()) {}
 
 ContentsReader::~ContentsReader() = default;
 

@@ -42,31 +42,17 @@ uint64_t quickHash(std::string_view name) {
   return hash;
 }
 
-// What members with the same names agree in: many others don't, and need not be compared.
-struct NamesKey {
-  uint64_t hash = 0; // in no order
-  uint32_t count;
-  uint64_t size = 0; // of all names, in bytes
-
-  explicit NamesKey(const SymbolNameList& names) : count(names.getSize()) {
-    for (uint32_t i = 0; i < count; ++i) {
-      hash += quickHash(names[i]);
-      size += names[i].size();
-    }
-  }
-  bool operator==(const NamesKey&) const = default;
-};
-
 struct NamesKeyHash {
   size_t operator()(const NamesKey& key) const { return key.hash ^ key.count; }
 };
 
 // Names of a good object are about as long as the object, at most. Those that share their bytes a
 // thousand times over are a trap for whoever compares them.
-bool isComparable(const HostingMember& hosting, const NamesKey& key) {
+bool isComparable(const HostingMember& hosting) {
   constexpr uint64_t LargestExcess = 4;
   constexpr uint64_t AlwaysFine = 0x100000;
-  return key.size <= AlwaysFine || key.size / LargestExcess <= hosting.member->getSize();
+  const uint64_t size = hosting.key.textSize;
+  return size <= AlwaysFine || size / LargestExcess <= hosting.member->getSize();
 }
 
 using SortedNames = std::vector<std::string_view>;
@@ -93,11 +79,16 @@ void splitByNames(std::span<const HostingMember> hostingMembers,
 
 } // namespace
 
+NamesKey::NamesKey(const SymbolNameList& names)
+    : count(names.getSize()), textSize(names.getTextSize()) {
+  for (uint32_t i = 0; i < count; ++i)
+    hash += quickHash(names[i]);
+}
+
 std::vector<VariantGroup> findMinorVariants(std::span<const HostingMember> hostingMembers) {
   std::unordered_map<NamesKey, std::vector<uint32_t>, NamesKeyHash> byKey;
   for (uint32_t i = 0; i < hostingMembers.size(); ++i) {
-    const NamesKey key(*hostingMembers[i].names);
-    if (isComparable(hostingMembers[i], key)) byKey[key].push_back(i);
+    if (isComparable(hostingMembers[i])) byKey[hostingMembers[i].key].push_back(i);
   }
   std::vector<VariantGroup> groups;
   for (const auto& [key, candidates] : byKey) {
@@ -110,7 +101,7 @@ std::vector<VariantGroup> findMinorVariants(std::span<const HostingMember> hosti
 }
 
 bool MinorVariants::addSymbols(std::span<const HostingMember> group,
-                               elfext::FastArray<SymbolTableEntry>& output) {
+                               elfext::FastArray<SymbolTableEntries>& output) {
   m_Members.clear();
   m_Attributes.clear();
   for (const HostingMember& hosting : group) {
@@ -128,7 +119,7 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
       baseVariants.push_back(group[i].member);
     else if (!decorate(*group[i].member, attributes, decoration))
       return false;
-    publish(group[i], decoration, output);
+    output.append({group[i].member, decorateNames(*group[i].names, decoration)});
   }
   return reportBases(baseVariants);
 }
@@ -163,19 +154,20 @@ bool MinorVariants::decorate(const ArchiveMember& member, const elfext::FullAttr
   return m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, member, m_Members);
 }
 
-void MinorVariants::publish(const HostingMember& hosting, std::string_view decoration,
-                            elfext::FastArray<SymbolTableEntry>& output) const {
-  for (uint32_t i = 0; i < hosting.names->getSize(); ++i) {
-    std::string_view name = (*hosting.names)[i];
-    if (!decoration.empty()) {
-      const size_t size = name.size() + decoration.size();
-      auto* bytes = static_cast<char*>(m_Region.allocate(size, 1));
-      std::memcpy(bytes, name.data(), name.size());
-      std::memcpy(bytes + name.size(), decoration.data(), decoration.size());
-      name = {bytes, size};
-    }
-    output.append({name, hosting.member});
+const SymbolNameList* MinorVariants::decorateNames(const SymbolNameList& names,
+                                                   std::string_view decoration) const {
+  if (decoration.empty()) return &names;
+  auto* decorated = alloclib::create<SymbolNameList>(m_Region, &m_Region);
+  decorated->reserve(names.getSize());
+  for (uint32_t i = 0; i < names.getSize(); ++i) {
+    const std::string_view name = names[i];
+    const size_t size = name.size() + decoration.size();
+    auto* bytes = static_cast<char*>(m_Region.allocate(size, 1));
+    std::memcpy(bytes, name.data(), name.size());
+    std::memcpy(bytes + name.size(), decoration.data(), decoration.size());
+    decorated->addCopied({bytes, size});
   }
+  return decorated;
 }
 
 bool MinorVariants::reportBases(const std::vector<const ArchiveMember*>& baseVariants) const {

@@ -18,17 +18,29 @@
 
 namespace arlib {
 
+// What members with the same names agree in: many others don't, and need not be compared.
+struct NamesKey {
+  // Best taken while the names are still at hand.
+  explicit NamesKey(const SymbolNameList& names);
+  bool operator==(const NamesKey&) const = default;
+
+  uint64_t hash = 0; // whatever their order
+  uint32_t count;
+  uint64_t textSize;
+};
+
 // A member with names to publish.
 struct HostingMember {
   ArchiveMember* member;
   const SymbolNameList* names;
+  NamesKey key;
   elfext::FullAttr attributes = {};
 };
 
-// Entry i of the table to come: the text of its name, and the member that defines it.
-struct SymbolTableEntry {
-  std::string_view name;
+// Neighbours in the table to come: names that lead to one member.
+struct SymbolTableEntries {
   const ArchiveMember* member;
+  const SymbolNameList* names;
 };
 
 // Indices of hosting members, at least two, in file order.
@@ -49,7 +61,7 @@ public:
   // Appends the names of all members to the output, in the order of the group. False if a report
   // was answered so.
   bool addSymbols(std::span<const HostingMember> group,
-                  elfext::FastArray<SymbolTableEntry>& output);
+                  elfext::FastArray<SymbolTableEntries>& output);
 
 private:
   [[nodiscard]] bool findCommon();
@@ -57,8 +69,8 @@ private:
                                           elfext::FullAttr& attributes) const;
   [[nodiscard]] bool decorate(const ArchiveMember& member, const elfext::FullAttr& attributes,
                               std::string& decoration) const;
-  void publish(const HostingMember& hosting, std::string_view decoration,
-               elfext::FastArray<SymbolTableEntry>& output) const;
+  [[nodiscard]] const SymbolNameList* decorateNames(const SymbolNameList& names,
+                                                    std::string_view decoration) const;
   [[nodiscard]] bool reportBases(const std::vector<const ArchiveMember*>& baseVariants) const;
 
   Archive& m_Archive;

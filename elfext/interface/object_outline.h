@@ -9,6 +9,7 @@
 #include "elfext/interface/full_attr.h"
 #include "elfext/interface/sizes_statistics.h"
 #include "elfext/interface/symbol.h"
+#include "support/interface/read_window.h"
 #include "support/interface/source_file.h"
 
 #include <cstdint>
@@ -21,6 +22,8 @@ namespace elfext {
 
 class ErrorHandler;
 
+// One outline serves any number of objects, one after the other; that is quicker than a new one for
+// each.
 class ObjectOutline {
 public:
   struct OutlinedSection {
@@ -61,6 +64,10 @@ public:
 private:
   struct Content;
 
+  // The file that was read last, and what was read ahead of it: objects of an archive are
+  // neighbours.
+  std::shared_ptr<support::SourceFile> m_File;
+  support::ReadWindow m_Window;
   std::unique_ptr<Content> m_Content;
   // Its memory serves one object after the other.
   std::vector<OutlinedSymbol> m_Symbols;

@@ -51,6 +51,16 @@ bool ImageBytes::prepare() {
   return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
 }
 
+bool ImageBytes::prepare(support::ReadWindow& window) {
+  if (m_Bytes != nullptr || m_Size > WholeReadLimit) return prepare();
+  support::HostError error = 0;
+  const std::span<const uint8_t> bytes =
+      window.fetch(m_FileOffset, static_cast<size_t>(m_Size), error);
+  if (bytes.size() < m_Size) return fail(ImageFailure::Unreadable, error);
+  m_Bytes = bytes.data();
+  return true;
+}
+
 bool ImageBytes::loadAll() {
   return m_MissingBlocks == 0 || load(0, m_Size);
 }

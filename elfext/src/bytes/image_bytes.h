@@ -8,6 +8,7 @@
 #pragma once
 
 #include "elfext/interface/image_source.h"
+#include "support/interface/read_window.h"
 #include "support/interface/source_file.h"
 
 #include <cstdint>
@@ -45,6 +46,9 @@ public:
   // Gets the memory for a file's bytes, and those of a small image; once is enough. False for a
   // failure.
   [[nodiscard]] bool prepare();
+  // The same, but for the bytes of a small image, which are viewed in the window: that is one of
+  // this file, and stays as it is as long as somebody looks for bytes.
+  [[nodiscard]] bool prepare(support::ReadWindow& window);
 
   // Reads all that was not looked at yet. False for a failure.
   [[nodiscard]] bool loadAll();

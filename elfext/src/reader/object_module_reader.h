@@ -29,10 +29,9 @@ struct DeferralFile {
 
 // The tables of an object, and what is made of them.
 struct ReadContext : ObjectTables {
-  ReadContext(const ReadReporter& readReporter, ImageBytes& bytes,
-              alloclib::RegionGeneral& readRegion, ObjectModule& objectModule, const uint8_t* lent,
-              DeferralFile* deferralFile)
-      : ObjectTables(readReporter, bytes, readRegion), module(objectModule), lentBytes(lent),
+  ReadContext(const ReadReporter& readReporter, ImageBytes& bytes, ObjectModule& objectModule,
+              const uint8_t* lent, DeferralFile* deferralFile)
+      : ObjectTables(readReporter, bytes), module(objectModule), lentBytes(lent),
         deferral(deferralFile) {}
 
   ObjectModule& module;

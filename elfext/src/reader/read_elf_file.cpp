@@ -39,10 +39,8 @@ bool reportReadError(ObjectModule& module, support::HostError error) {
 // The core of every form. The image goes to the module, unless the read fails.
 bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, DeferralFile* deferral,
                const uint8_t* lentBytes = nullptr) {
-  const alloclib::RegionOwner region(
-      alloclib::RegionGeneral::Create(0x100000, "readElfFile() region"));
   const ReadReporter reporter(module);
-  ReadContext context(reporter, *image, *region, module, lentBytes, deferral);
+  ReadContext context(reporter, *image, module, lentBytes, deferral);
   const bool isRead =
       image->prepare() ? readObjectModule(context, std::move(image)) : context.failRead();
   if (isRead) return true;

@@ -20,14 +20,11 @@ struct ObjectOutline::Content {
           ErrorHandler* errorHandler, const char* name)
       : objectName(name == nullptr ? "" : name),
         reporter(errorHandler, name == nullptr ? nullptr : objectName.c_str()),
-        image(std::move(file), offset, size),
-        region(alloclib::RegionGeneral::Create(0x1000, "Object outline region")),
-        tables(reporter, image, *region) {}
+        image(std::move(file), offset, size), tables(reporter, image) {}
 
   std::string objectName;
   ReadReporter reporter;
   ImageBytes image;
-  alloclib::RegionOwner region;
   ObjectTables tables;
   std::optional<LooseAttributeStore> attributes = {};
   bool areAttributesWanted = false;
@@ -120,13 +117,15 @@ ObjectOutline::~ObjectOutline() = default;
 bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
                          ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
   m_Content.reset();
+  if (m_File != file) m_Window.setFile(file.get());
+  m_File = file;
   const auto available = static_cast<uint64_t>(file->getStatus().size);
   auto content = std::make_unique<Content>(std::move(file), offset, size, errorHandler, objectName);
   ObjectTables& tables = content->tables;
   if (offset > available || size > available - offset)
     return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
   bool isForeign = false;
-  if (!content->image.prepare()) return tables.failRead();
+  if (!content->image.prepare(m_Window)) return tables.failRead();
   if (!checkHeaders(tables, isForeign)) return false;
   if (isForeign) return true;
   if (!checkTables(tables)) return false;

@@ -125,22 +125,19 @@ struct DebugOverlayRow {
 constexpr uint32_t NoSegment = 0xFFFFFFFF;
 
 struct ObjectTables {
-  ObjectTables(const ReadReporter& readReporter, ImageBytes& bytes,
-               alloclib::RegionGeneral& readRegion)
-      : reporter(readReporter), image(bytes), region(readRegion) {}
+  ObjectTables(const ReadReporter& readReporter, ImageBytes& bytes)
+      : reporter(readReporter), image(bytes) {}
   ObjectTables(const ObjectTables&) = delete;
   ObjectTables& operator=(const ObjectTables&) = delete;
 
   const ReadReporter& reporter;
   ImageBytes& image;
-  // For what goes with the end of the read.
-  alloclib::RegionGeneral& region;
 
   RecordFormat format = {};
   FileHeader fileHeader = {};
   // A name that can't be had is 0.
-  std::span<SectionHeader> sectionHeaders = {};
-  std::span<ProgramHeader> programHeaders = {};
+  std::vector<SectionHeader> sectionHeaders = {};
+  std::vector<ProgramHeader> programHeaders = {};
   // By segment: whether its bytes are known to be in the image.
   std::vector<bool> isSegmentThere = {};
   // By section: the first PT_LOAD segment that holds its bytes.

@@ -30,13 +30,13 @@ bool readSectionCount(ObjectTables& tables, uint64_t& count) {
 // Rows have the size of the class, whatever the file says of it.
 template <class Record>
 bool readTable(ObjectTables& tables, uint64_t offset, uint64_t count, uint32_t rowSize,
-               std::span<Record>& records) {
+               std::vector<Record>& records) {
   constexpr uint64_t mostRows = std::numeric_limits<uint32_t>::max();
   const bool fits = count <= tables.image.getSize() / rowSize && count < mostRows;
   if (!fits) return mapLowLevelResult(tables.reporter, LowLevelResult::OutsideImage);
   const uint8_t* bytes = tables.view(offset, count * rowSize);
   if (bytes == nullptr) return false;
-  records = {static_cast<Record*>(tables.region.allocate(count * sizeof(Record))), count};
+  records.resize(count);
   for (Record& record : records) {
     getRecord(tables.format, bytes, record);
     bytes += rowSize;

@@ -10,12 +10,12 @@
 #include <span>
 #include <vector>
 
-namespace arlib {
+namespace support {
 
 class ReadWindow {
 public:
   // What has been read of another file is forgotten. The file stays the caller's.
-  void setFile(support::SourceFile* file) {
+  void setFile(SourceFile* file) {
     m_File = file;
     m_Start = 0;
     m_Used = 0;
@@ -25,10 +25,10 @@ public:
 
   // Makes up to `size` bytes at `offset` available; fewer only where the file ends, or on an error.
   // The view holds until the next call.
-  std::span<const uint8_t> fetch(uint64_t offset, size_t size, support::HostError& error);
+  std::span<const uint8_t> fetch(uint64_t offset, size_t size, HostError& error);
 
 private:
-  support::HostError read(uint64_t offset, size_t size);
+  HostError read(uint64_t offset, size_t size);
 
   // A step over at most so many bytes is part of a walk, and worth reading ahead for. A longer one
   // is a leap: reading what it leaps over would cost more than the host call that it saves.
@@ -37,7 +37,7 @@ private:
   // What a leap reads at least: room for a header, its neighbours and a body's first bytes.
   static constexpr size_t LeapSize = 0x200;
 
-  support::SourceFile* m_File = nullptr;
+  SourceFile* m_File = nullptr;
   std::vector<uint8_t> m_Bytes;
   uint64_t m_Start = 0; // file offset of the first byte
   size_t m_Used = 0;
@@ -45,4 +45,4 @@ private:
   bool m_EndsFile = false; // the file has nothing behind the bytes held
 };
 
-} // namespace arlib
+} // namespace support

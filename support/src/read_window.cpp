@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "arlib/src/read_window.h"
+#include "support/interface/read_window.h"
 
 #include <algorithm>
 
-namespace arlib {
+namespace support {
 
-std::span<const uint8_t> ReadWindow::fetch(uint64_t offset, size_t size,
-                                           support::HostError& error) {
+std::span<const uint8_t> ReadWindow::fetch(uint64_t offset, size_t size, HostError& error) {
   error = 0;
   const uint64_t end = m_Start + m_Used;
   const bool isHeld = offset >= m_Start && offset <= end && (size <= end - offset || m_EndsFile);
@@ -16,15 +15,15 @@ std::span<const uint8_t> ReadWindow::fetch(uint64_t offset, size_t size,
   return std::span<const uint8_t>(m_Bytes).subspan(skipped, std::min(size, m_Used - skipped));
 }
 
-support::HostError ReadWindow::read(uint64_t offset, size_t size) {
+HostError ReadWindow::read(uint64_t offset, size_t size) {
   const bool isWalk = offset >= m_LastEnd && offset - m_LastEnd <= WalkStep;
   const size_t wanted = std::max(size, isWalk ? AheadSize : LeapSize);
   if (m_Bytes.size() < wanted) m_Bytes.resize(wanted);
   m_Start = offset;
-  const support::HostError error = m_File->readAt(std::span(m_Bytes).first(wanted), offset, m_Used);
+  const HostError error = m_File->readAt(std::span(m_Bytes).first(wanted), offset, m_Used);
   if (error != 0) m_Used = 0;
   m_EndsFile = error == 0 && m_Used < wanted;
   return error;
 }
 
-} // namespace arlib
+} // namespace support
