@@ -17,8 +17,6 @@ class ShndxSection;
 
 // Whether sections of the type have a class of their own, one of those below.
 [[nodiscard]] bool hasOwnSectionClass(uint32_t type);
-// What sh_entsize should be in a table of fixed rows; 0 for all other types. Bytes.
-[[nodiscard]] uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass);
 
 class NullSection final : public Section {
 public:

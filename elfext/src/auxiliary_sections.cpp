@@ -2,6 +2,7 @@
 #include "elfext/interface/auxiliary_sections.h"
 
 #include "elfext/interface/object_module.h"
+#include "elfext/src/bytes/elf_records.h"
 
 #include <utility>
 
@@ -28,24 +29,6 @@ bool hasOwnSectionClass(uint32_t type) {
     return true;
   default:
     return false;
-  }
-}
-
-uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass) {
-  const bool isWide = elfClass == ELFCLASS64;
-  switch (type) {
-  case SHT_SYMTAB:
-  case SHT_DYNSYM:
-    return isWide ? 24 : 16;
-  case SHT_REL:
-    return isWide ? 16 : 8;
-  case SHT_RELA:
-    return isWide ? 24 : 12;
-  case SHT_GROUP:
-  case SHT_SYMTAB_SHNDX:
-    return 4;
-  default:
-    return 0;
   }
 }
 

@@ -4,6 +4,8 @@
 // field or stores it.
 #include "elfext/src/bytes/elf_records.h"
 
+#include "elfext/interface/elf_constants.h"
+
 namespace elfext {
 
 namespace {
@@ -57,6 +59,23 @@ void codeProgramHeader(Codec codec, Record& record) {
 }
 
 } // namespace
+
+uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass) {
+  const bool isWide = elfClass == ELFCLASS64;
+  switch (type) {
+  case SHT_SYMTAB:
+  case SHT_DYNSYM:
+    return symbolRowSize(isWide);
+  case SHT_REL:
+  case SHT_RELA:
+    return relocationRowSize(isWide, type == SHT_RELA);
+  case SHT_GROUP:
+  case SHT_SYMTAB_SHNDX:
+    return sizeof(uint32_t);
+  default:
+    return 0;
+  }
+}
 
 void getRecord(RecordFormat format, const uint8_t* bytes, FileHeader& record) {
   codeFileHeader(FieldGetter(format, bytes), record);

@@ -91,6 +91,8 @@ struct RelocationRow {
 [[nodiscard]] constexpr uint32_t relocationRowSize(bool isWide, bool hasAddend) {
   return (isWide ? 8U : 4U) * (hasAddend ? 3U : 2U);
 }
+// What sh_entsize should be in a table of fixed rows; 0 for all other types. Bytes.
+[[nodiscard]] uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass);
 
 [[nodiscard]] inline uint16_t swapBytes(uint16_t word) {
   return static_cast<uint16_t>(word << 8 | word >> 8);

@@ -10,28 +10,18 @@
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/symbol_version_definition.h"
 #include "elfext/interface/symbol_version_requirement.h"
-#include "elfext/src/model/symbol_class.h"
+#include "elfext/src/bytes/symbol_names.h"
 
 #include <cstring>
-#include <string_view>
 #include <type_traits>
 
 namespace elfext {
 
 static_assert(std::is_trivially_destructible_v<Symbol>, "it dies with its region");
 
-Symbol::Class classOf(const char* name) {
-  constexpr std::string_view mappingLetters = "adtx";
-  constexpr std::string_view tagLetters = "bfpv";
-  if (name == nullptr || name[0] != '$' || name[1] == '\0') return Symbol::Class_Ordinary;
-  const bool endsThere = name[2] == '\0' || name[2] == '.';
-  if (endsThere && mappingLetters.find(name[1]) != mappingLetters.npos)
-    return Symbol::Class_Mapping;
-  return tagLetters.find(name[1]) != tagLetters.npos ? Symbol::Class_Tag : Symbol::Class_Ordinary;
-}
-
 Symbol::Class Symbol::getClass() const {
-  return classOf(m_Name);
+  if (isMappingSymbolName(m_Name)) return Class_Mapping;
+  return isTagSymbolName(m_Name) ? Class_Tag : Class_Ordinary;
 }
 
 uint64_t Symbol::getAddress() const {

@@ -5,6 +5,7 @@
 // made, are checked while they are given.
 #pragma once
 
+#include "elfext/interface/object_module.h"
 #include "elfext/src/tables/object_tables.h"
 
 #include <cstdint>

@@ -6,7 +6,6 @@
 
 #include "checking/interface/checking.h"
 #include "elfext/interface/error_handler.h"
-#include "elfext/interface/object_module.h"
 #include "elfext/src/reports/read_reporter.h"
 
 #include <type_traits>

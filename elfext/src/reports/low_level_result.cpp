@@ -5,36 +5,23 @@
 
 namespace elfext {
 
-namespace {
-
-template <class Teller>
-bool mapResult(const Teller& teller, LowLevelResult result) {
+bool mapLowLevelResult(const ReadReporter& reporter, LowLevelResult result) {
   switch (result) {
   case LowLevelResult::Success:
     return true;
   case LowLevelResult::OutsideImage:
-    return refuse(teller, &ErrorHandler::ioErrorWriting, -1);
+    return refuse(reporter, &ErrorHandler::ioErrorWriting, -1);
   case LowLevelResult::LayerFailure:
-    return refuse(teller, &ErrorHandler::ioErrorReading, -1);
+    return refuse(reporter, &ErrorHandler::ioErrorReading, -1);
   case LowLevelResult::WrongMagic:
-    return refuse(teller, &ErrorHandler::wrongMagic);
+    return refuse(reporter, &ErrorHandler::wrongMagic);
   case LowLevelResult::WrongClass:
-    return refuse(teller, &ErrorHandler::wrongClass);
+    return refuse(reporter, &ErrorHandler::wrongClass);
   case LowLevelResult::NoMemory:
-    return refuse(teller, &ErrorHandler::outOfMemory);
+    return refuse(reporter, &ErrorHandler::outOfMemory);
   }
   QUARN_ASSERT(1, !"Should never get here");
   return false;
-}
-
-} // namespace
-
-bool mapLowLevelResult(const ReadReporter& reporter, LowLevelResult result) {
-  return mapResult(reporter, result);
-}
-
-bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result) {
-  return mapResult(module, result);
 }
 
 } // namespace elfext

@@ -7,7 +7,6 @@
 
 namespace elfext {
 
-class ObjectModule;
 class ReadReporter;
 
 enum class LowLevelResult : uint8_t {
@@ -21,8 +20,7 @@ enum class LowLevelResult : uint8_t {
   NoMemory = 6,
 };
 
-// Reports the failure, if it is one, to the module's handler. True for success only.
+// Reports the failure, if it is one, to the handler. True for success only.
 [[nodiscard]] bool mapLowLevelResult(const ReadReporter& reporter, LowLevelResult result);
-[[nodiscard]] bool mapLowLevelResult(const ObjectModule& module, LowLevelResult result);
 
 } // namespace elfext

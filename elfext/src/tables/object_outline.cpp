@@ -4,7 +4,7 @@
 #include "alloclib/interface/region_objects.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/elf_constants.h"
-#include "elfext/src/model/symbol_class.h"
+#include "elfext/src/bytes/symbol_names.h"
 #include "elfext/src/tables/build_attributes_reader.h"
 #include "elfext/src/tables/loose_attribute_store.h"
 #include "elfext/src/tables/object_tables.h"
@@ -67,7 +67,7 @@ void addSections(const ObjectTables& tables, SizesSource& source) {
 void addMappingSymbols(const ObjectTables& tables, SizesSource& source) {
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
     const char* name = table.nameOf(row);
-    if (classOf(name) != Symbol::Class_Mapping) return;
+    if (!isMappingSymbolName(name)) return;
     const SymbolHome home = tables.homeOf(table, index, row);
     if (home.category != Symbol::Category_Hosted) return;
     const SectionHeader& header = tables.sectionHeaders[home.section];

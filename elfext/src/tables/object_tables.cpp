@@ -3,7 +3,6 @@
 // The order of the checks, and the ELF header.
 #include "elfext/src/tables/object_tables.h"
 
-#include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 
 #include <algorithm>

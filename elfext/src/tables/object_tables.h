@@ -12,7 +12,9 @@
 // that check, so until then its tables are only checked for what would be reported before.
 #pragma once
 
+#include "alloclib/interface/region_general.h"
 #include "elfext/interface/elf_constants.h"
+#include "elfext/interface/symbol.h"
 #include "elfext/src/bytes/elf_records.h"
 #include "elfext/src/bytes/image_bytes.h"
 #include "elfext/src/reports/go_on.h"

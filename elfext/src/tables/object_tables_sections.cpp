@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The header tables, and what the section headers say of sizes, contents and names.
-#include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/extents.h"
 #include "elfext/src/tables/object_tables.h"

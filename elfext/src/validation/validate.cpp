@@ -8,6 +8,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/fast_hash_set.h"
 #include "elfext/interface/group.h"
+#include "elfext/interface/object_module.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/src/reports/go_on.h"
 #include "elfext/src/validation/relocation_places.h"

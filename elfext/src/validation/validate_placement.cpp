@@ -3,6 +3,7 @@
 // The checks of how sections and segments lie in the file and in memory.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/hash_table.h"
+#include "elfext/interface/object_module.h"
 #include "elfext/interface/segment.h"
 #include "elfext/interface/sort.h"
 #include "elfext/src/reports/go_on.h"

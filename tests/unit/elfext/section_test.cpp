@@ -3,6 +3,7 @@
 // Sections: their attributes, their contents, and the classes of the auxiliary ones.
 #include "elfext/interface/group.h"
 #include "elfext/interface/segment.h"
+#include "elfext/src/bytes/elf_records.h"
 #include "module_fixture.h"
 
 namespace elfext {

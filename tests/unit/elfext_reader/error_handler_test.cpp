@@ -7,6 +7,7 @@
 #include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/src/reports/low_level_result.h"
+#include "elfext/src/reports/read_reporter.h"
 
 #include <gtest/gtest.h>
 
@@ -319,7 +320,7 @@ TEST_F(ErrorHandlerTest, CaptureStartsEmptyAndKeepsTheLastText) {
 
 TEST_F(ErrorHandlerTest, LowLevelResultsBecomeReports) {
   m_Module.setErrorHandler(&m_Capture);
-  EXPECT_TRUE(mapLowLevelResult(m_Module, LowLevelResult::Success));
+  EXPECT_TRUE(mapLowLevelResult(ReadReporter(m_Module), LowLevelResult::Success));
   EXPECT_EQ(m_Capture.getText(), "");
   const std::pair<uint8_t, const char*> results[] = {
       {1, "I/O error writing file 'a.o': Unknown error -1"},
@@ -329,13 +330,13 @@ TEST_F(ErrorHandlerTest, LowLevelResultsBecomeReports) {
       {6, "Out of memory"},
   };
   for (const auto& [code, text] : results) {
-    EXPECT_FALSE(mapLowLevelResult(m_Module, LowLevelResult{code}));
+    EXPECT_FALSE(mapLowLevelResult(ReadReporter(m_Module), LowLevelResult{code}));
     EXPECT_EQ(m_Capture.getText(), text);
   }
 }
 
 TEST_F(ErrorHandlerTest, ALowLevelFailureWithoutHandlerIsStillAFailure) {
-  EXPECT_FALSE(mapLowLevelResult(m_Module, LowLevelResult::OutsideImage));
+  EXPECT_FALSE(mapLowLevelResult(ReadReporter(m_Module), LowLevelResult::OutsideImage));
 }
 
 using ErrorHandlerDeathTest = ErrorHandlerTest;
@@ -343,10 +344,10 @@ using ErrorHandlerDeathTest = ErrorHandlerTest;
 TEST_F(ErrorHandlerDeathTest, NobodyMayGoOnAfterALowLevelFailure) {
   m_Module.setErrorHandler(&m_Agreeing);
   for (const uint8_t code : std::initializer_list<uint8_t>{1, 2, 3, 5, 6}) {
-    EXPECT_DEATH(static_cast<void>(mapLowLevelResult(m_Module, LowLevelResult{code})),
+    EXPECT_DEATH(static_cast<void>(mapLowLevelResult(ReadReporter(m_Module), LowLevelResult{code})),
                  "!err_response");
   }
-  EXPECT_DEATH(static_cast<void>(mapLowLevelResult(m_Module, LowLevelResult{4})),
+  EXPECT_DEATH(static_cast<void>(mapLowLevelResult(ReadReporter(m_Module), LowLevelResult{4})),
                "Should never get here");
 }
 
