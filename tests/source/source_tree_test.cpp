@@ -37,6 +37,35 @@ const std::map<std::string, Names> Arrows = {
      {"arlib", "elfext", "messages", "tabledrivenparser", "support", "alloclib", "checking"}},
 };
 
+// A room of elfext's sources: from which others it may include, and of which it may see the public
+// headers besides.
+struct InnerRoom {
+  std::string name;
+  Names mayInclude;
+  Names maySee;
+};
+
+// Lowest first. A report carries a module, and tables speak of symbols' categories and of sizes in
+// the words that users know; more than these public words goes up nowhere.
+const std::vector<InnerRoom> ElfextRooms = {
+    {"containers", {}, {}},
+    {"bytes", {"containers"}, {}},
+    {"reports", {"bytes"}, {"model"}},
+    {"attributes", {"bytes"}, {}},
+    {"tables", {"containers", "bytes", "reports", "attributes"}, {"model", "sizes"}},
+    {"model", {"containers", "bytes", "reports", "attributes"}, {}},
+    {"sizes", {"containers", "bytes", "tables", "model"}, {}},
+    {"reader", {"containers", "bytes", "attributes", "tables", "model"}, {}},
+    {"validation", {"containers", "bytes", "reports", "model"}, {}},
+};
+
+// Files that others look for in elfext/src itself, and the rooms that they are of.
+const std::map<std::string, std::string> ElfextsPromisedPlaces = {
+    {"auxiliary_sections", "model"}, {"compressed_section_extractor", "sizes"},
+    {"error_handler", "reports"},    {"format_recognizer", "bytes"},
+    {"sizes_statistics", "sizes"},   {"sort", "containers"},
+};
+
 const fs::path Root = QUARN_SOURCE_DIR;
 
 std::string contentsOf(const fs::path& file) {
@@ -87,6 +116,74 @@ TEST(SourceTree, OnlyInterfacesAreIncludedFromOutside) {
             << file << " includes " << include;
       }
     }
+  }
+}
+
+// The room of a file of elfext/src, by its path from there; empty for a file in a wrong place.
+std::string roomOfSource(const fs::path& file) {
+  if (file.has_parent_path()) return file.parent_path().string();
+  const auto promised = ElfextsPromisedPlaces.find(file.stem().string());
+  return promised == ElfextsPromisedPlaces.end() ? "" : promised->second;
+}
+
+// A public header is of the room that has its other half. One that has none is of no room.
+std::map<std::string, std::string> roomsOfInterfaces() {
+  std::map<std::string, std::string> rooms;
+  for (const fs::path& file : sourcesOf("elfext/src")) {
+    if (file.extension() == ".cpp")
+      rooms[file.stem().string()] = roomOfSource(fs::relative(file, Root / "elfext/src"));
+  }
+  return rooms;
+}
+
+// The room that a path from the root leads into: none outside of elfext.
+std::string elfextRoomOf(const fs::path& file) {
+  static const std::map<std::string, std::string> interfaces = roomsOfInterfaces();
+  const std::string name = file.string();
+  if (name.starts_with("elfext/src/")) return roomOfSource(fs::relative(file, "elfext/src"));
+  if (!name.starts_with("elfext/interface/")) return "";
+  const auto found = interfaces.find(file.stem().string());
+  return found == interfaces.end() ? "" : found->second;
+}
+
+// Who includes a public header of no room includes what that one does.
+bool mayInclude(const InnerRoom& room, const std::string& include) {
+  const std::string from = elfextRoomOf(include);
+  if (from == room.name || room.mayInclude.count(from) != 0) return true;
+  if (!include.starts_with("elfext/")) return true;
+  if (include.starts_with("elfext/src/")) return false;
+  if (!from.empty()) return room.maySee.count(from) != 0;
+  const std::vector<std::string> behind = includesOf(Root / include);
+  return std::all_of(behind.begin(), behind.end(),
+                     [&room](const std::string& name) { return mayInclude(room, name); });
+}
+
+TEST(SourceTree, EveryFileOfElfextHasARoom) {
+  Names names;
+  for (const InnerRoom& room : ElfextRooms)
+    names.insert(room.name);
+  for (const fs::path& file : sourcesOf("elfext/src"))
+    EXPECT_EQ(names.count(elfextRoomOf(fs::relative(file, Root))), 1u) << file;
+}
+
+TEST(SourceTree, IncludesFollowTheArrowsOfElfextsRooms) {
+  for (const fs::path& file : sourcesOf("elfext")) {
+    const std::string name = elfextRoomOf(fs::relative(file, Root));
+    const auto isOfName = [&name](const InnerRoom& room) { return room.name == name; };
+    const auto room = std::find_if(ElfextRooms.begin(), ElfextRooms.end(), isOfName);
+    if (room == ElfextRooms.end()) continue;
+    for (const std::string& include : includesOf(file))
+      EXPECT_TRUE(mayInclude(*room, include)) << file << " of " << name << " includes " << include;
+  }
+}
+
+TEST(SourceTree, ElfextsRoomsIncludeOnlyFromLowerOnes) {
+  Names lower;
+  for (const InnerRoom& room : ElfextRooms) {
+    EXPECT_TRUE(
+        std::includes(lower.begin(), lower.end(), room.mayInclude.begin(), room.mayInclude.end()))
+        << room.name;
+    lower.insert(room.name);
   }
 }
 
