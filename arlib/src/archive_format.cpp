@@ -46,9 +46,9 @@ bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uin
   while (position < text.size() && isDigit(text[position])) {
     const uint32_t value = static_cast<uint32_t>(text[position++] - '0');
     if (value >= base) break;
-    const uint32_t next = result * base + value;
-    if (next / base != result) return false;
-    result = next;
+    const uint64_t next = uint64_t{result} * base + value;
+    if (next > UINT32_MAX) return false;
+    result = static_cast<uint32_t>(next);
   }
   position = std::min(text.find_first_not_of(' ', position), text.size());
   return position == text.size() && position == width;

@@ -20,25 +20,28 @@ void addWord(uint64_t& hash, uint64_t word) {
   hash ^= hash >> 32;
 }
 
-void addBytes(uint64_t& hash, std::string_view bytes) {
-  while (!bytes.empty()) {
-    uint64_t word = 0;
-    const size_t count = std::min(bytes.size(), sizeof word);
-    std::memcpy(&word, bytes.data(), count);
-    addWord(hash, word);
-    bytes.remove_prefix(count);
-  }
+// Eight bytes of the name; the last ones where there are fewer at the place, and those of a shorter
+// name are filled up.
+uint64_t wordAt(std::string_view name, size_t position) {
+  uint64_t word = 0;
+  if (name.size() >= sizeof word)
+    std::memcpy(&word, name.data() + std::min(position, name.size() - sizeof word), sizeof word);
+  else
+    std::memcpy(&word, name.data(), name.size());
+  return word;
 }
 
 // Of a few bytes of a name that tell most names apart, however long it is. Names that have it in
 // common are compared whole, so that it needs to be no better than quick.
 uint64_t quickHash(std::string_view name) {
-  constexpr size_t EndSize = 32;
-  uint64_t hash = name.size();
-  const size_t startSize = std::min(name.size(), EndSize);
-  const size_t endSize = std::min(name.size() - startSize, EndSize);
-  addBytes(hash, name.substr(0, startSize));
-  addBytes(hash, name.substr(name.size() - endSize));
+  constexpr size_t WordSize = sizeof(uint64_t);
+  constexpr size_t EndSize = 4 * WordSize;
+  const size_t size = name.size();
+  uint64_t hash = size;
+  for (size_t i = 0; i < std::min(size, EndSize); i += WordSize)
+    addWord(hash, wordAt(name, i));
+  for (size_t i = std::max(size, 2 * EndSize) - EndSize; i < size; i += WordSize)
+    addWord(hash, wordAt(name, i));
   return hash;
 }
 

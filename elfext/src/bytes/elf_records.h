@@ -119,6 +119,20 @@ void putWord(Word word, bool isLittle, uint8_t* bytes) {
   std::memcpy(bytes, &word, sizeof word);
 }
 
+// Calls the function with a format that the compiler knows, as a constant of a type of its own:
+// loops over rows then have no more to decide for each of them.
+template <class Function>
+auto withFixedFormat(RecordFormat format, Function function) {
+  constexpr RecordFormat wideLittle = {true, true};
+  constexpr RecordFormat wideBig = {true, false};
+  constexpr RecordFormat narrowLittle = {false, true};
+  constexpr RecordFormat narrowBig = {false, false};
+  if (format == wideLittle) return function(std::integral_constant<RecordFormat, wideLittle>());
+  if (format == wideBig) return function(std::integral_constant<RecordFormat, wideBig>());
+  if (format == narrowLittle) return function(std::integral_constant<RecordFormat, narrowLittle>());
+  return function(std::integral_constant<RecordFormat, narrowBig>());
+}
+
 // ---- How a record is taken apart and put together: told once for both directions, by a function
 // that names the fields in file order to a codec, which either loads a field or stores it.
 

@@ -37,9 +37,10 @@ template <class Function>
 void forEachStaticSymbol(const ObjectTables& tables, Function function) {
   for (const SymbolTable& table : tables.symbolTables) {
     if (table.isDynamic) continue;
-    for (uint32_t i = 1; i < table.rowCount; ++i) {
-      function(table, i, tables.getSymbolRow(table, i));
-    }
+    tables.forEachSymbolRow(table, [&](uint32_t index, const SymbolRow& row) {
+      function(table, index, row);
+      return true;
+    });
   }
 }
 

@@ -12,7 +12,6 @@
 // that check, so until then its tables are only checked for what would be reported before.
 #pragma once
 
-#include "alloclib/interface/region_general.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/symbol.h"
 #include "elfext/src/bytes/elf_records.h"
@@ -203,6 +202,22 @@ struct ObjectTables {
     SymbolRow row;
     getRecord(format, table.rows + uint64_t{index} * symbolRowSize(format.isWide), row);
     return row;
+  }
+  // Calls the function with index and row of each symbol but the null one, as long as it answers
+  // true. Answers whether it always did.
+  template <class Function>
+  bool forEachSymbolRow(const SymbolTable& table, Function function) const {
+    return withFixedFormat(format, [&](auto fixedFormat) {
+      constexpr RecordFormat rowFormat = fixedFormat;
+      const uint8_t* bytes = table.rows;
+      for (uint32_t index = 1; index < table.rowCount; ++index) {
+        bytes += symbolRowSize(rowFormat.isWide);
+        SymbolRow row;
+        getRecord(rowFormat, bytes, row);
+        if (!function(index, row)) return false;
+      }
+      return true;
+    });
   }
   // Where the row of that index says that its symbol is. Only the four special indexes have a
   // meaning of their own; the rest of the reserved range names sections like any other number.

@@ -21,28 +21,45 @@ bool isSpecialIndex(uint16_t index) {
   return index == SHN_UNDEF || index == SHN_ABS || index == SHN_COMMON || index == SHN_XINDEX;
 }
 
-bool checkRow(const ObjectTables& tables, const SymbolTable& table, uint32_t index) {
-  const SymbolRow row = tables.getSymbolRow(table, index);
-  const SymbolPlace place = {index, table.section, table.isDynamic};
-  if (row.name != 0 && row.name >= table.stringSize)
-    return stop(tables.reporter, &ErrorHandler::symbolNameOutOfRange, place, row.name,
-                table.stringSection, table.stringSize);
-  if (row.shndx == SHN_XINDEX && table.indexes == nullptr)
-    return stop(tables.reporter, &ErrorHandler::symbolWithoutShndxSection, place);
+enum class RowFault : uint8_t { None, Name, NoIndexes, NotHosted, Section };
+
+// The first rule that the row breaks. It is looked for in every row of every object, so the report
+// stands apart.
+RowFault findFault(const ObjectTables& tables, const SymbolTable& table, uint32_t index,
+                   const SymbolRow& row) {
+  if (row.name != 0 && row.name >= table.stringSize) return RowFault::Name;
+  if (row.shndx == SHN_XINDEX && table.indexes == nullptr) return RowFault::NoIndexes;
   const SymbolHome home = tables.homeOf(table, index, row);
   if (home.category != Symbol::Category_Hosted)
-    return typeOf(row) != STT_SECTION ||
-           stop(tables.reporter, &ErrorHandler::sectionSymbolNotHosted, place);
-  return home.section < tables.sectionCount() ||
-         stop(tables.reporter, &ErrorHandler::symbolSectionOutOfRange, place, home.section,
-              tables.lastSection());
+    return typeOf(row) == STT_SECTION ? RowFault::NotHosted : RowFault::None;
+  return home.section >= tables.sectionCount() ? RowFault::Section : RowFault::None;
+}
+
+bool reportFault(const ObjectTables& tables, const SymbolTable& table, uint32_t index,
+                 const SymbolRow& row, RowFault fault) {
+  const SymbolPlace place = {index, table.section, table.isDynamic};
+  switch (fault) {
+  case RowFault::None:
+    break;
+  case RowFault::Name:
+    return stop(tables.reporter, &ErrorHandler::symbolNameOutOfRange, place, row.name,
+                table.stringSection, table.stringSize);
+  case RowFault::NoIndexes:
+    return stop(tables.reporter, &ErrorHandler::symbolWithoutShndxSection, place);
+  case RowFault::NotHosted:
+    return stop(tables.reporter, &ErrorHandler::sectionSymbolNotHosted, place);
+  case RowFault::Section:
+    return stop(tables.reporter, &ErrorHandler::symbolSectionOutOfRange, place,
+                tables.homeOf(table, index, row).section, tables.lastSection());
+  }
+  return true;
 }
 
 bool checkRows(const ObjectTables& tables, const SymbolTable& table) {
-  for (uint32_t i = 1; i < table.rowCount; ++i) {
-    if (!checkRow(tables, table, i)) return false;
-  }
-  return true;
+  return tables.forEachSymbolRow(table, [&](uint32_t index, const SymbolRow& row) {
+    const RowFault fault = findFault(tables, table, index, row);
+    return fault == RowFault::None || reportFault(tables, table, index, row, fault);
+  });
 }
 
 // Answers for a whole table of a file with overlapping sections whether a row needs a closer look.
