@@ -17,7 +17,11 @@ std::span<const uint8_t> ReadWindow::fetch(uint64_t offset, size_t size, HostErr
 
 HostError ReadWindow::read(uint64_t offset, size_t size) {
   const bool isWalk = offset >= m_LastEnd && offset - m_LastEnd <= WalkStep;
-  const size_t wanted = std::max(size, isWalk ? AheadSize : LeapSize);
+  // Nothing is read ahead from behind the end that the file had when it was opened.
+  const auto fileSize = static_cast<uint64_t>(m_File->getStatus().size);
+  const uint64_t ahead =
+      std::min<uint64_t>(isWalk ? AheadSize : LeapSize, fileSize - std::min(offset, fileSize));
+  const size_t wanted = std::max(size, static_cast<size_t>(ahead));
   if (m_Bytes.size() < wanted) m_Bytes.resize(wanted);
   m_Start = offset;
   const HostError error = m_File->readAt(std::span(m_Bytes).first(wanted), offset, m_Used);
