@@ -9,7 +9,6 @@
 #include "elfext/interface/full_attr.h"
 #include "elfext/interface/sizes_statistics.h"
 #include "elfext/interface/symbol.h"
-#include "support/interface/read_window.h"
 #include "support/interface/source_file.h"
 
 #include <cstdint>
@@ -21,6 +20,7 @@
 namespace elfext {
 
 class ErrorHandler;
+struct ImageMemory;
 
 // One outline serves any number of objects, one after the other; that is quicker than a new one for
 // each.
@@ -64,13 +64,12 @@ public:
 private:
   struct Content;
 
-  // The file that was read last, and what was read ahead of it: objects of an archive are
-  // neighbours.
-  std::shared_ptr<support::SourceFile> m_File;
-  support::ReadWindow m_Window;
-  std::unique_ptr<Content> m_Content;
-  // Its memory serves one object after the other.
+  // What serves one object after the other: objects of an archive are neighbours, and much alike.
+  std::shared_ptr<support::SourceFile> m_File; // that was read last
+  std::unique_ptr<ImageMemory> m_Memory;
   std::vector<OutlinedSymbol> m_Symbols;
+
+  std::unique_ptr<Content> m_Content;
 };
 
 } // namespace elfext

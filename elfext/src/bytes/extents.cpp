@@ -25,6 +25,7 @@ bool dealIntoRuns(std::span<const Extent> extents, Runs& runs) {
       return other.empty() || startsBefore(other.back(), extent);
     });
     if (run == runs.end()) return false;
+    if (run->empty()) run->reserve(extents.size());
     run->push_back(extent);
   }
   return true;
@@ -50,6 +51,7 @@ std::vector<Extent> sortedByStart(std::span<const Extent> extents) {
   return sorted;
 }
 
+// Also true of extents that are in no order.
 bool hasOverlap(std::span<const Extent> sorted) {
   uint64_t reached = 0;
   for (const Extent& extent : sorted) {
@@ -79,6 +81,7 @@ std::vector<uint64_t> sortedEnds(std::span<const Extent> extents) {
 // An extent overlaps another exactly when more extents than itself start below its end and do not
 // end at or before its start.
 std::optional<std::pair<uint32_t, uint32_t>> findFirstOverlap(std::span<const Extent> extents) {
+  if (!hasOverlap(extents)) return std::nullopt;
   const std::vector<Extent> sorted = sortedByStart(extents);
   if (!hasOverlap(sorted)) return std::nullopt;
   const std::vector<uint64_t> ends = sortedEnds(extents);

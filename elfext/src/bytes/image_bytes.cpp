@@ -15,6 +15,11 @@ constexpr size_t BlocksAhead = 16;
 
 } // namespace
 
+uint8_t* ImageMemory::reserve() {
+  if (bytes == nullptr) bytes.reset(new (std::nothrow) uint8_t[LargestImage]);
+  return bytes.get();
+}
+
 ImageBytes::ImageBytes(std::span<const uint8_t> bytes)
     : m_Bytes(bytes.data()), m_Size(bytes.size()) {}
 
@@ -43,22 +48,28 @@ bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
 
 bool ImageBytes::prepare() {
   if (m_Bytes != nullptr || m_Size == 0) return m_Failure == ImageFailure::None;
-  m_Loaded.reset(new (std::nothrow) uint8_t[m_Size]);
-  if (m_Loaded == nullptr) return fail(ImageFailure::NoMemory);
-  m_Bytes = m_Loaded.get();
-  m_MissingBlocks = (m_Size - 1) / BlockSize + 1;
-  m_IsBlockLoaded.resize(m_MissingBlocks);
-  return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
+  m_OwnMemory.reset(new (std::nothrow) uint8_t[m_Size]);
+  return beginLoading(m_OwnMemory.get());
 }
 
-bool ImageBytes::prepare(support::ReadWindow& window) {
-  if (m_Bytes != nullptr || m_Size > WholeReadLimit) return prepare();
+bool ImageBytes::prepare(ImageMemory& memory) {
+  if (m_Bytes != nullptr || m_Size > ImageMemory::LargestImage) return prepare();
+  if (m_Size > WholeReadLimit) return beginLoading(memory.reserve());
   support::HostError error = 0;
   const std::span<const uint8_t> bytes =
-      window.fetch(m_FileOffset, static_cast<size_t>(m_Size), error);
+      memory.window.fetch(m_FileOffset, static_cast<size_t>(m_Size), error);
   if (bytes.size() < m_Size) return fail(ImageFailure::Unreadable, error);
   m_Bytes = bytes.data();
   return true;
+}
+
+bool ImageBytes::beginLoading(uint8_t* memory) {
+  if (memory == nullptr) return fail(ImageFailure::NoMemory);
+  m_Loaded = memory;
+  m_Bytes = memory;
+  m_MissingBlocks = (m_Size - 1) / BlockSize + 1;
+  m_IsBlockLoaded.resize(m_MissingBlocks);
+  return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
 }
 
 bool ImageBytes::loadAll() {
@@ -107,8 +118,7 @@ bool ImageBytes::loadBlocks(size_t first, size_t end) {
   const uint64_t offset = first * BlockSize;
   const uint64_t size = std::min(end * BlockSize, m_Size) - offset;
   size_t done = 0;
-  const support::HostError error =
-      readAt({m_Loaded.get() + offset, size}, m_FileOffset + offset, done);
+  const support::HostError error = readAt({m_Loaded + offset, size}, m_FileOffset + offset, done);
   if (error != 0 || done < size) return fail(ImageFailure::Unreadable, error);
   std::fill(m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(first),
             m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(end), true);

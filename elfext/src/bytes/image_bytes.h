@@ -26,6 +26,19 @@ enum class ImageFailure : uint8_t {
   NoMemory,
 };
 
+// What serves the images of one object after the other, where each is gone when the next comes.
+struct ImageMemory {
+  // Larger images get memory of their own, so that only what is looked at of them costs anything.
+  static constexpr uint64_t LargestImage = 0x400000;
+
+  support::ReadWindow window;
+  // Of that size once there is any: what is never looked at costs nothing.
+  std::unique_ptr<uint8_t[]> bytes;
+
+  // Null if there is no memory.
+  [[nodiscard]] uint8_t* reserve();
+};
+
 class ImageBytes final : public ImageSource {
 public:
   // Images up to this size, in bytes, are read whole.
@@ -46,9 +59,9 @@ public:
   // Gets the memory for a file's bytes, and those of a small image; once is enough. False for a
   // failure.
   [[nodiscard]] bool prepare();
-  // The same, but for the bytes of a small image, which are viewed in the window: that is one of
-  // this file, and stays as it is as long as somebody looks for bytes.
-  [[nodiscard]] bool prepare(support::ReadWindow& window);
+  // The same with memory of the caller's, which stays as it is as long as somebody looks for bytes:
+  // a small image is viewed in its window, which is one of this file.
+  [[nodiscard]] bool prepare(ImageMemory& memory);
 
   // Reads all that was not looked at yet. False for a failure.
   [[nodiscard]] bool loadAll();
@@ -71,6 +84,7 @@ public:
   [[nodiscard]] support::HostError getHostError() const override { return m_HostError; }
 
 private:
+  [[nodiscard]] bool beginLoading(uint8_t* memory);
   [[nodiscard]] bool fail(ImageFailure failure, support::HostError error = 0);
   [[nodiscard]] bool load(uint64_t offset, uint64_t size);
   [[nodiscard]] bool loadBlocks(size_t first, size_t end);
@@ -85,7 +99,9 @@ private:
   support::FileHandle m_Handle;
   uint64_t m_FileOffset = 0;
   bool m_ClosesFile = false;
-  std::unique_ptr<uint8_t[]> m_Loaded;
+  // Where blocks are read to: memory of its own, or lent.
+  uint8_t* m_Loaded = nullptr;
+  std::unique_ptr<uint8_t[]> m_OwnMemory;
   std::vector<bool> m_IsBlockLoaded;
   size_t m_MissingBlocks = 0;
   ImageFailure m_Failure = ImageFailure::None;

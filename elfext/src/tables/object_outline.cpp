@@ -112,21 +112,22 @@ bool addSegments(ObjectTables& tables, SizesSource& source) {
 
 } // namespace
 
-ObjectOutline::ObjectOutline() = default;
+ObjectOutline::ObjectOutline() : m_Memory(std::make_unique<ImageMemory>()) {}
 ObjectOutline::~ObjectOutline() = default;
 
 bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
                          ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
-  m_Content.reset();
-  if (m_File != file) m_Window.setFile(file.get());
+  if (m_File != file) m_Memory->window.setFile(file.get());
   m_File = file;
   const auto available = static_cast<uint64_t>(file->getStatus().size);
   auto content = std::make_unique<Content>(std::move(file), offset, size, errorHandler, objectName);
   ObjectTables& tables = content->tables;
+  if (m_Content != nullptr) tables.takeMemory(m_Content->tables);
+  m_Content.reset();
   if (offset > available || size > available - offset)
     return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
   bool isForeign = false;
-  if (!content->image.prepare(m_Window)) return tables.failRead();
+  if (!content->image.prepare(*m_Memory)) return tables.failRead();
   if (!checkHeaders(tables, isForeign)) return false;
   if (isForeign) return true;
   if (!checkTables(tables)) return false;

@@ -64,6 +64,20 @@ bool checkTables(ObjectTables& tables) {
          checkDebugOverlays(tables) && checkSegmentMaps(tables);
 }
 
+void ObjectTables::takeMemory(ObjectTables& former) {
+  const auto take = [](auto& array, auto& formerArray) {
+    array = std::move(formerArray);
+    array.clear();
+  };
+  take(sectionHeaders, former.sectionHeaders);
+  take(programHeaders, former.programHeaders);
+  take(links, former.links);
+  take(symbolTables, former.symbolTables);
+  take(relocationTables, former.relocationTables);
+  take(groups, former.groups);
+  take(groupMembers, former.groupMembers);
+}
+
 uint64_t ObjectTables::rowCount(uint32_t section) const {
   const SectionHeader& header = sectionHeaders[section];
   return header.size / expectedEntrySize(header.type, fileHeader.ident[EI_CLASS]);

@@ -170,6 +170,10 @@ struct ObjectTables {
   // such notes.
   std::vector<uint32_t> notedSegments = {};
 
+  // Takes over the memory of arrays that were those of another object, which then has none left.
+  // Only of the large ones: without this, each object's arrays would be new memory to the process.
+  void takeMemory(ObjectTables& former);
+
   [[nodiscard]] uint32_t sectionCount() const {
     return static_cast<uint32_t>(sectionHeaders.size());
   }

@@ -35,11 +35,9 @@ bool readTable(ObjectTables& tables, uint64_t offset, uint64_t count, uint32_t r
   if (!fits) return mapLowLevelResult(tables.reporter, LowLevelResult::OutsideImage);
   const uint8_t* bytes = tables.view(offset, count * rowSize);
   if (bytes == nullptr) return false;
-  records.resize(count);
-  for (Record& record : records) {
-    getRecord(tables.format, bytes, record);
-    bytes += rowSize;
-  }
+  records.reserve(count);
+  for (uint64_t i = 0; i < count; ++i, bytes += rowSize)
+    getRecord(tables.format, bytes, records.emplace_back());
   return true;
 }
 
