@@ -61,6 +61,10 @@ public:
   void setUseObjectBuildAttributes(bool use) { m_UseObjectBuildAttributes = use; }
   [[nodiscard]] bool getUseObjectBuildAttributes() const { return m_UseObjectBuildAttributes; }
 
+  // Whether the symbols of a table that is read will be asked for, as they may be unless somebody
+  // says no before the read: then the table is checked as ever, and its bytes are not kept.
+  void setSymbolsWanted(bool wanted) { m_AreSymbolsWanted = wanted; }
+
   // What the library as a whole needs of its target; null for nothing. It stays when the archive is
   // cleared. Set it before a read: it makes the symbol table stale, until one is read.
   void setLibraryAttributes(const elfext::FullAttr& attributes);
@@ -108,6 +112,7 @@ public:
   }
   // The symbol table's contents as read, in table order. They are made when somebody first asks.
   [[nodiscard]] std::span<Symbol* const> getSymbols() const {
+    QUARN_ASSERT(1, m_AreSymbolsWanted);
     if (m_ReadSymbolTable != nullptr) makeSymbols();
     return {m_Symbols.begin(), m_Symbols.getSize()};
   }
@@ -255,6 +260,7 @@ private:
   bool m_IncludeDebugSymbols = false;
   bool m_UniqueSymbolsOnly = false;
   bool m_UseObjectBuildAttributes = false;
+  bool m_AreSymbolsWanted = true;
   std::optional<elfext::FullAttr> m_LibraryAttributes;
 
   // Bytes of tables that were read and then replaced: names and symbols are views of them.

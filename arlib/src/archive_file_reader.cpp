@@ -129,7 +129,8 @@ ArchiveFileReader::Pass ArchiveFileReader::readMember() {
     m_Archive.m_FileNameTable = member;
     member->m_Type = FileNameTableArchiveMemberType::getInstance();
   }
-  if (!(member->isAuxiliary() ? takeAuxiliaryContents(member) : skipContents()) || !skipPadding()) {
+  if (!(areContentsTaken(member) ? takeAuxiliaryContents(member) : skipContents()) ||
+      !skipPadding()) {
     return Pass::Failure;
   }
   m_Offset = nextHeaderOffset(m_Offset, m_Numbers.size);
@@ -267,6 +268,11 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   return member;
 }
 
+bool ArchiveFileReader::areContentsTaken(const ArchiveMember* member) const {
+  return member == m_Archive.m_FileNameTable ||
+         (member == m_Archive.m_SymbolTable && m_Archive.m_AreSymbolsWanted);
+}
+
 bool ArchiveFileReader::takeAuxiliaryContents(ArchiveMember* member) {
   const std::span<uint8_t> bytes = member->replaceContents(member->m_Size);
   member->m_ContentsAreViewed = true;
@@ -309,11 +315,19 @@ bool ArchiveFileReader::readSymbolTable() {
   m_Archive.m_SortedSymbolsUpToDate = false;
   m_Archive.m_DefinedSymbolsUpToDate = false;
   if (m_Archive.m_SymbolTable == nullptr) return true;
-  auto table = std::make_unique<ReadSymbolTable>(m_Archive.m_SymbolTable->getContents(),
-                                                 m_Archive.getMembers());
+  auto table = std::make_unique<ReadSymbolTable>(symbolTableSource(), m_Archive.getMembers());
   if (!table->check(m_Archive)) return false;
+  // Bytes that have only passed by may be newer than the headers.
+  if (!m_Archive.m_AreSymbolsWanted) return checkUnchanged();
   m_Archive.m_ReadSymbolTable = std::move(table);
   return true;
+}
+
+TableSource ArchiveFileReader::symbolTableSource() const {
+  const ArchiveMember* table = m_Archive.m_SymbolTable;
+  const uint64_t size = table->getSize();
+  if (table->hasContents()) return {.text = asText(table->getContents()), .size = size};
+  return {.file = m_File.get(), .offset = table->getContentsLocation()->offset, .size = size};
 }
 
 } // namespace arlib

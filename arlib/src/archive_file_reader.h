@@ -6,6 +6,7 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
+#include "arlib/src/table_cursor.h"
 #include "support/interface/read_window.h"
 
 #include <cstdint>
@@ -45,12 +46,14 @@ private:
   bool findLongNameEnd(std::string_view table, uint32_t index, size_t& end);
   bool checkHostFile();
   ArchiveMember* addMember(std::string_view name);
+  [[nodiscard]] bool areContentsTaken(const ArchiveMember* member) const;
   bool takeAuxiliaryContents(ArchiveMember* member);
   bool skipContents();
   bool skipPadding();
   bool checkUnchanged();
 
   bool readSymbolTable();
+  [[nodiscard]] TableSource symbolTableSource() const;
 
   [[nodiscard]] std::string_view field(HeaderField which) const {
     return m_Header.substr(which.position, which.width);

@@ -100,8 +100,10 @@ ArchiveMember* AuxiliaryMembers::appendTable(const ArchiveMemberType* type) {
   return table;
 }
 
+// Bytes that nobody wanted at the read are not read to be replaced.
 bool AuxiliaryMembers::resizeTable(ArchiveMember* table, uint32_t size) {
-  if (!table->loadContents()) return false;
+  const bool isTaken = table != m_Archive.m_SymbolTable || m_Archive.m_AreSymbolsWanted;
+  if (isTaken && !table->loadContents()) return false;
   table->replaceContents(size);
   table->releaseContentsLocation();
   table->m_Size = size;

@@ -9,10 +9,16 @@
 
 namespace arlib {
 
-ReadSymbolTable::ReadSymbolTable(std::span<const uint8_t> bytes,
-                                 std::span<ArchiveMember* const> members)
-    : m_Text(reinterpret_cast<const char*>(bytes.data()), bytes.size()),
-      m_Members(members.begin(), members.end()) {
+namespace {
+
+bool failToRead(const Archive& archive, const TableCursor& cursor) {
+  return archive.end(&ErrorHandler::reportReadError, nullptr, cursor.getError());
+}
+
+} // namespace
+
+ReadSymbolTable::ReadSymbolTable(const TableSource& source, std::span<ArchiveMember* const> members)
+    : m_Source(source), m_Members(members.begin(), members.end()) {
   // Where the members would stand if each had the size that it has, which is where they do stand
   // but for members that were cut.
   uint64_t offset = ArchiveMagic.size();
@@ -25,56 +31,61 @@ ReadSymbolTable::ReadSymbolTable(std::span<const uint8_t> bytes,
 
 bool ReadSymbolTable::check(const Archive& archive) {
   if (!checkCount(archive)) return false;
-  size_t position = namesStart();
-  for (uint32_t i = 0; i < m_Count; ++i) {
-    const size_t end = m_Text.find('\0', position);
-    if (end == m_Text.npos) {
-      return archive.end(&ErrorHandler::reportSymbolNameUnterminated, i, m_Count);
-    }
-    if (!checkEntry(archive, i, m_Text.substr(position, end - position))) return false;
-    position = end + 1;
-  }
+  TableCursor names(m_Source, namesStart());
+  if (!checkEntries(archive, names)) return false;
   // A member's type may change later, and the tables have no symbols.
   for (ArchiveMember*& member : m_Members) {
     if (member->isAuxiliary()) member = nullptr;
   }
-  return checkRest(archive, position);
+  return checkRest(archive, names);
 }
 
 // Before anything is looked at behind the count, and in 64 bits: a count near 2^30 would wrap to a
 // small size.
 bool ReadSymbolTable::checkCount(const Archive& archive) {
-  const auto size = static_cast<uint32_t>(m_Text.size());
-  if (size < 4) return archive.end(&ErrorHandler::reportSymbolTableTooShort, size);
-  m_Count = getBigEndian32(reinterpret_cast<const uint8_t*>(m_Text.data()));
-  const uint64_t required = 4 + 4 * uint64_t{m_Count};
+  const auto size = static_cast<uint32_t>(m_Source.size);
+  if (size < CountSize) return archive.end(&ErrorHandler::reportSymbolTableTooShort, size);
+  TableCursor cursor(m_Source, 0);
+  const std::optional<uint32_t> count = cursor.takeWord();
+  if (!count) return failToRead(archive, cursor);
+  m_Count = *count;
+  const uint64_t required = namesStart();
   if (size >= required) return true;
   return archive.end(&ErrorHandler::reportSymbolTableCountTooLarge, size, m_Count, required);
 }
 
-bool ReadSymbolTable::checkEntry(const Archive& archive, uint32_t index, std::string_view name) {
-  const ArchiveMember* member = memberOf(index);
-  if (member == nullptr) {
-    return archive.goOn(&ErrorHandler::reportSymbolAtNoMember, index, name, offsetOf(index));
+bool ReadSymbolTable::checkEntries(const Archive& archive, TableCursor& names) {
+  TableCursor offsets(m_Source, CountSize);
+  for (uint32_t i = 0; i < m_Count; ++i) {
+    const std::optional<std::string_view> name = names.takeName();
+    if (!name && names.hasFailed()) return failToRead(archive, names);
+    if (!name) return archive.end(&ErrorHandler::reportSymbolNameUnterminated, i, m_Count);
+    const std::optional<uint32_t> offset = offsets.takeWord();
+    if (!offset) return failToRead(archive, offsets);
+    if (!checkEntry(archive, i, *name, *offset)) return false;
   }
+  return true;
+}
+
+bool ReadSymbolTable::checkEntry(const Archive& archive, uint32_t index, std::string_view name,
+                                 uint32_t offset) {
+  const ArchiveMember* member = memberAt(offset);
+  if (member == nullptr)
+    return archive.goOn(&ErrorHandler::reportSymbolAtNoMember, index, name, offset);
   if (member != archive.getSymbolTable() && member != archive.getFileNameTable()) return true;
-  return archive.goOn(&ErrorHandler::reportSymbolInNonObject, index, name, offsetOf(index));
+  return archive.goOn(&ErrorHandler::reportSymbolInNonObject, index, name, offset);
 }
 
-bool ReadSymbolTable::checkRest(const Archive& archive, size_t position) const {
-  const size_t trailing = m_Text.find_first_not_of('\0', position);
-  if (trailing == m_Text.npos) return true;
-  return archive.goOn(&ErrorHandler::reportSymbolTableTrailingData, static_cast<uint32_t>(trailing),
-                      static_cast<uint32_t>(position));
-}
-
-uint32_t ReadSymbolTable::offsetOf(uint32_t index) const {
-  return getBigEndian32(reinterpret_cast<const uint8_t*>(m_Text.data()) + 4 + 4 * size_t{index});
+bool ReadSymbolTable::checkRest(const Archive& archive, TableCursor& names) {
+  const auto end = static_cast<uint32_t>(names.getPosition());
+  if (names.findData())
+    return archive.goOn(&ErrorHandler::reportSymbolTableTrailingData,
+                        static_cast<uint32_t>(names.getPosition()), end);
+  return !names.hasFailed() || failToRead(archive, names);
 }
 
 // Symbols of one member stand together in most tables, so the last answer is tried first.
-ArchiveMember* ReadSymbolTable::memberOf(uint32_t index) {
-  const uint32_t offset = offsetOf(index);
+ArchiveMember* ReadSymbolTable::memberAt(uint32_t offset) {
   if (m_LastMember >= m_Offsets.size() || m_Offsets[m_LastMember] != offset) {
     const auto found = std::lower_bound(m_Offsets.begin(), m_Offsets.end(), offset);
     if (found == m_Offsets.end() || *found != offset) return nullptr;

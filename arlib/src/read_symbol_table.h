@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The symbol table as it stood in the file. It is checked when the archive is read, since a broken
-// one ends the read; the symbols are made of it when somebody asks, which most runs never do.
+// one ends the read. The symbols are made of it when somebody asks, which most runs never do: they
+// say so beforehand, and the table's bytes are not kept.
 #pragma once
 
 #include "arlib/interface/archive.h"
+#include "arlib/src/table_cursor.h"
 
 #include <cstdint>
 #include <span>
@@ -15,8 +17,8 @@ namespace arlib {
 
 class ReadSymbolTable {
 public:
-  // The bytes, and the members as they stand in the file, in file order.
-  ReadSymbolTable(std::span<const uint8_t> bytes, std::span<ArchiveMember* const> members);
+  // The members are those of the file, in file order.
+  ReadSymbolTable(const TableSource& source, std::span<ArchiveMember* const> members);
 
   // Goes through the whole table. Entries that lead to no object's member are left out if the
   // archive's handler says so. False ends the read, after a report.
@@ -26,37 +28,35 @@ public:
   void forgetSymbolsOf(std::span<ArchiveMember* const> members);
 
   // Hands each entry that is left, in table order, to `add`(name, member). Only of a table that was
-  // found to be sound.
+  // found to be sound, and whose bytes are in memory.
   template <class Add>
   void forEachSymbol(Add add) {
     const std::vector<ArchiveMember*> forgotten = takeForgotten();
-    size_t position = namesStart();
+    TableCursor offsets(m_Source, CountSize);
+    TableCursor names(m_Source, namesStart());
     for (uint32_t i = 0; i < m_Count; ++i) {
-      const std::string_view name = nameAt(position);
-      position += name.size() + 1;
-      ArchiveMember* member = memberOf(i);
+      const std::string_view name = names.takeName().value();
+      ArchiveMember* member = memberAt(offsets.takeWord().value());
       if (isLeft(member, forgotten)) add(name, member);
     }
   }
 
 private:
   [[nodiscard]] bool checkCount(const Archive& archive);
-  [[nodiscard]] bool checkEntry(const Archive& archive, uint32_t index, std::string_view name);
-  [[nodiscard]] bool checkRest(const Archive& archive, size_t position) const;
+  [[nodiscard]] bool checkEntries(const Archive& archive, TableCursor& names);
+  [[nodiscard]] bool checkEntry(const Archive& archive, uint32_t index, std::string_view name,
+                                uint32_t offset);
+  [[nodiscard]] static bool checkRest(const Archive& archive, TableCursor& names);
 
-  [[nodiscard]] size_t namesStart() const { return 4 + 4 * size_t{m_Count}; }
-  [[nodiscard]] std::string_view nameAt(size_t position) const {
-    return m_Text.substr(position, m_Text.find('\0', position) - position);
-  }
-  // The header offset that the entry holds.
-  [[nodiscard]] uint32_t offsetOf(uint32_t index) const;
+  static constexpr uint64_t CountSize = 4;
+  [[nodiscard]] uint64_t namesStart() const { return CountSize + 4 * uint64_t{m_Count}; }
   // The member whose header stands there, or null.
-  [[nodiscard]] ArchiveMember* memberOf(uint32_t index);
+  [[nodiscard]] ArchiveMember* memberAt(uint32_t offset);
   [[nodiscard]] std::vector<ArchiveMember*> takeForgotten();
   [[nodiscard]] static bool isLeft(const ArchiveMember* member,
                                    std::span<ArchiveMember* const> forgotten);
 
-  std::string_view m_Text; // the bytes
+  TableSource m_Source;
   uint32_t m_Count = 0;
   // Members and their header offsets, ascending.
   std::vector<ArchiveMember*> m_Members;

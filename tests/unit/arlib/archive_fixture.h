@@ -56,12 +56,26 @@ inline std::string contentsOf(ArchiveMember* member) {
 }
 
 // What one attempt to read "lib.a" came to.
+// Nothing else comes of it where the symbols are not wanted, and their table only passes by.
+inline void expectSameWithoutSymbols(std::string_view bytes, Answer answer, bool isRead,
+                                     const std::vector<std::string>& reports) {
+  MemoryHost host;
+  host.addFile("lib.a", bytes);
+  RecordingHandler handler(answer);
+  Archive archive(host);
+  archive.setErrorHandler(&handler);
+  archive.setSymbolsWanted(false);
+  EXPECT_EQ(readFile("lib.a", archive), isRead);
+  EXPECT_EQ(handler.reports, reports);
+}
+
 struct Reading {
   explicit Reading(std::string_view bytes, Answer answer = Answer::GoOnIfTolerable)
       : handler(answer) {
     host.addFile("lib.a", bytes);
     archive.setErrorHandler(&handler);
     isRead = readFile("lib.a", archive);
+    expectSameWithoutSymbols(bytes, answer, isRead, handler.reports);
   }
   explicit Reading(const ArchiveBuilder& builder, Answer answer = Answer::GoOnIfTolerable)
       : Reading(std::string_view(builder.bytes()), answer) {}
