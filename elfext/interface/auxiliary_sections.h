@@ -34,12 +34,10 @@ public:
   [[nodiscard]] bool isLinkedBySymtab() const { return m_IsLinkedBySymtab; }
   [[nodiscard]] bool isLinkedByDynsym() const { return m_IsLinkedByDynsym; }
   [[nodiscard]] bool isLinkedByOther() const { return m_IsLinkedByOther; }
-  void markSectionNameTable() { m_IsSectionNameTable = true; }
-  void markLinkedBySymtab() { m_IsLinkedBySymtab = true; }
-  void markLinkedByDynsym() { m_IsLinkedByDynsym = true; }
-  void markLinkedByOther() { m_IsLinkedByOther = true; }
 
 private:
+  friend class ModuleBuilder;
+
   bool m_IsSectionNameTable = false;
   bool m_IsLinkedBySymtab = false;
   bool m_IsLinkedByDynsym = false;
@@ -54,10 +52,9 @@ public:
   // Null for a table without.
   [[nodiscard]] ShndxSection* getShndxSection() const { return m_ShndxSection; }
   [[nodiscard]] HashSection* getHashSection() const { return m_HashSection; }
-  void setShndxSection(ShndxSection* section) { m_ShndxSection = section; }
-  void setHashSection(HashSection* section) { m_HashSection = section; }
 
 private:
+  friend class ModuleBuilder;
   friend class Pruner;
 
   ShndxSection* m_ShndxSection = nullptr;
@@ -74,12 +71,6 @@ public:
   // Whether its symbols are the dynamic ones.
   [[nodiscard]] bool isDynamic() const { return m_IsDynamic; }
   [[nodiscard]] bool hasAddends() const { return getType() == SHT_RELA; }
-  // Joins the target's list of static or dynamic relocation sections.
-  void setTarget(Section* target, bool isDynamic);
-
-  // The rows that a reader has checked and whose relocations are still to be made. They live as
-  // long as the module. The target must be known.
-  void setRows(RelocationRows* rows, uint32_t rowCount);
   // Rows that are not relocations yet.
   [[nodiscard]] uint32_t getPendingRowCount() const { return m_RowCount; }
 
@@ -87,9 +78,12 @@ public:
   [[nodiscard]] const RelocationSection* asRelocationSection() const override { return this; }
 
 private:
+  friend class ModuleBuilder;
   friend class Pruner;
   friend class Section;
 
+  void setTarget(Section* target, bool isDynamic);
+  void setRows(RelocationRows* rows, uint32_t rowCount);
   RelocationRows* takeRows();
 
   Section* m_Target = nullptr;
@@ -105,9 +99,10 @@ public:
 
   // In the symbol table that the section links to.
   [[nodiscard]] uint32_t getSignatureSymbolIndex() const { return m_SignatureSymbolIndex; }
-  void setSignatureSymbolIndex(uint32_t index) { m_SignatureSymbolIndex = index; }
 
 private:
+  friend class ModuleBuilder;
+
   uint32_t m_SignatureSymbolIndex = 0;
 };
 

@@ -32,7 +32,6 @@ public:
 
   // The section that the group was read from; null for a new group.
   [[nodiscard]] GroupSection* getGroupSection() const { return m_GroupSection; }
-  void setGroupSection(GroupSection* section) { m_GroupSection = section; }
 
   [[nodiscard]] uint32_t getMemberCount() const { return m_Members.getSize(); }
   [[nodiscard]] Section* getMember(uint32_t index) const { return m_Members[index]; }
@@ -41,6 +40,7 @@ public:
   void removeMember(Section* section);
 
 private:
+  friend class ModuleBuilder;
   friend class ObjectModule;
   friend class Pruner;
 

@@ -8,7 +8,7 @@
 // A program that uses modules has an alloclib::Session (alloclib/interface/session.h) for as long
 // as it does: all that a module holds lives in regions.
 //
-// Texts that are handed in are copied, unless the module is told to keep names as they are.
+// Texts that are handed in are copied.
 //
 // `getX(index)`, `getXCount()`, `getXIndex(x)` and `setXIndex(x, index)` come in families, one for
 // each list. Indexes count from 0, but for the two symbol tables: there the null symbol, which is
@@ -30,7 +30,6 @@
 #include "elfext/interface/symbol.h"
 #include "elfext/interface/symbol_list.h"
 
-#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <memory>
@@ -129,24 +128,9 @@ public:
 
   // The file's bytes as long as the module needs them, where they are all in memory; null if not.
   [[nodiscard]] const uint8_t* getReadBuffer() const { return m_ReadBuffer; }
-  void setReadBuffer(const uint8_t* readBuffer) { m_ReadBuffer = readBuffer; }
-  // While set, the names of what is made are kept as they are and not copied; they must live as
-  // long as the module's contents.
-  [[nodiscard]] bool areNamesInBuffer() const { return m_AreNamesInBuffer; }
-  void setNamesInBuffer(bool areNamesInBuffer) { m_AreNamesInBuffer = areNamesInBuffer; }
-  // The source that buffers of the module refer to. It goes with the module, or when it is cleared.
-  [[nodiscard]] ImageSource* getImageSource() const { return m_ImageSource.get(); }
-  void adoptImageSource(std::unique_ptr<ImageSource> imageSource) {
-    m_ImageSource = std::move(imageSource);
-  }
-  // Tells the handler that the file could not give bytes which somebody wanted to look at only now.
-  void reportLostContents(support::HostError error);
-  // Whether that has happened: what was made of the contents since is not to be trusted.
+  // Whether the file could not give bytes which somebody wanted to look at after the read. The
+  // handler has been told; what was made of the contents since is not to be trusted.
   [[nodiscard]] bool hasLostContents() const { return m_HasLostContents; }
-  // The text, or a copy of it in the object region, as setNamesInBuffer says. Null stays null.
-  [[nodiscard]] const char* keepText(const char* text) const;
-  // A copy of the text in the object region. Null stays null.
-  [[nodiscard]] const char* copyText(const char* text) const;
 
   // ---- Header fields, under the ELF standard's names
 
@@ -181,8 +165,7 @@ public:
   // Whether addresses are laid out: ET_EXEC, ET_DYN and ET_CORE.
   [[nodiscard]] bool hasLaidOutAddresses() const;
 
-  // What the file's header says of the headers. The entry sizes also set those of the two regions;
-  // all in bytes.
+  // What the file's header says of the headers; sizes in bytes.
   [[nodiscard]] uint32_t getElfHeaderSize() const { return m_ElfHeaderSize; }
   [[nodiscard]] uint64_t getSectionHeaderOffset() const { return m_SectionHeaderOffset; }
   [[nodiscard]] uint64_t getProgramHeaderOffset() const { return m_ProgramHeaderOffset; }
@@ -190,13 +173,6 @@ public:
   [[nodiscard]] uint16_t getStoredProgramHeaderCount() const { return m_StoredProgramHeaderCount; }
   [[nodiscard]] uint32_t getSectionHeaderEntrySize() const { return m_SectionHeaderEntrySize; }
   [[nodiscard]] uint32_t getProgramHeaderEntrySize() const { return m_ProgramHeaderEntrySize; }
-  void setElfHeaderSize(uint32_t size);
-  void setSectionHeaderOffset(uint64_t offset) { change(m_SectionHeaderOffset, offset); }
-  void setProgramHeaderOffset(uint64_t offset) { change(m_ProgramHeaderOffset, offset); }
-  void setStoredSectionCount(uint16_t count) { change(m_StoredSectionCount, count); }
-  void setStoredProgramHeaderCount(uint16_t count) { change(m_StoredProgramHeaderCount, count); }
-  void setSectionHeaderEntrySize(uint32_t size);
-  void setProgramHeaderEntrySize(uint32_t size);
 
   // The three fixed regions of the file.
   [[nodiscard]] ELFHeader& getElfHeader() { return m_ElfHeader; }
@@ -205,7 +181,6 @@ public:
 
   // ReadCondition bits.
   [[nodiscard]] uint32_t getReadConditions() const { return m_ReadConditions; }
-  void setReadConditions(uint32_t conditions) { m_ReadConditions = conditions; }
 
   // ---- Dynamic data
 
@@ -247,17 +222,11 @@ public:
   void setIndexesFrozen(bool areFrozen) { m_IndexesFrozen = areFrozen; }
   // Whether the bytes of auxiliary sections say what the objects do. Any change clears it.
   [[nodiscard]] bool areAuxiliarySectionsUpToDate() const { return m_AreAuxiliarySectionsUpToDate; }
-  void setAuxiliarySectionsUpToDate(bool areUpToDate) {
-    m_AreAuxiliarySectionsUpToDate = areUpToDate;
-  }
   [[nodiscard]] bool areSortedViewsUpToDate() const { return m_AreSortedViewsUpToDate; }
   // Whether the attribute section's bytes say what the blocks and attributes of all objects do. Any
   // change of these clears it.
   [[nodiscard]] bool isBuildAttributesSectionUpToDate() const {
     return m_IsBuildAttributesSectionUpToDate;
-  }
-  void setBuildAttributesSectionUpToDate(bool isUpToDate) {
-    m_IsBuildAttributesSectionUpToDate = isUpToDate;
   }
 
   // No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
@@ -275,11 +244,6 @@ public:
   [[nodiscard]] BuildAttributesCache& getBuildAttributesCache();
   // The highest Tag_ZV_version of all objects' attributes; 0 for none.
   [[nodiscard]] uint32_t getHighestTagsVersion() const { return m_HighestTagsVersion; }
-  void raiseHighestTagsVersion(uint32_t version) {
-    m_HighestTagsVersion = std::max(m_HighestTagsVersion, version);
-  }
-  // No object has attributes of its own any more; blocks stay.
-  void dropBuildAttributes();
 
   // ---- Sections
 
@@ -527,7 +491,11 @@ public:
   void getInheritedBuildAttributes(BuildAttributes& result) const override;
 
 private:
+  friend class Buffer;
   friend class Group;
+  friend class ModuleBuilder;
+  friend class ObjectWithBuildAttributes;
+  friend class Preemption;
   friend class Pruner;
   friend class Relocation;
   friend class Section;
@@ -551,10 +519,23 @@ private:
     markChanged();
   }
   void markChanged() { m_AreAuxiliarySectionsUpToDate = false; }
+  void markBuildAttributesChanged() { m_IsBuildAttributesSectionUpToDate = false; }
   void markSymbolsChanged() {
     m_AreSortedViewsUpToDate = false;
     markChanged();
   }
+
+  // The text, or a copy of it in the object region, as the builder has said of names. Null stays
+  // null.
+  [[nodiscard]] const char* keepText(const char* text) const;
+  // A copy of the text in the object region. Null stays null.
+  [[nodiscard]] const char* copyText(const char* text) const;
+  void reportLostContents(support::HostError error);
+
+  // The sizes also become those of the regions.
+  void setElfHeaderSize(uint32_t size);
+  void setSectionHeaderEntrySize(uint32_t size);
+  void setProgramHeaderEntrySize(uint32_t size);
 
   template <class SectionClass, class... Arguments>
   SectionClass* makeSection(const char* name, Arguments... arguments);
@@ -578,6 +559,7 @@ private:
   void deleteOne(const Object* object);
   void clearDynamicData();
   void clearHeaderTables();
+  void dropBuildAttributes();
   void clearBuildAttributes();
   void forgetPlacement();
 

@@ -14,13 +14,11 @@ class Segment;
 class RawDataBlock final : public FileRegion, public DataStore {
 public:
   // Made by ObjectModule::createRawDataBlock. The size, in bytes, is fixed; the bytes are the
-  // caller's to give, through getBuffer.
+  // caller's to give.
   RawDataBlock(ObjectModule* objectModule, Segment* segment, uint64_t size);
 
   // The segment that the bytes belong to; the block goes with it.
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
-  // What is put here must be of the block's size.
-  [[nodiscard]] Buffer& getBuffer() { return m_Contents; }
 
   [[nodiscard]] uint64_t getFileSize() const override { return m_Size; }
   void getAlignment(uint64_t* remainder, uint64_t* alignment) const override;
@@ -34,6 +32,8 @@ public:
   [[nodiscard]] uint64_t getSize() const override { return m_Size; }
 
 private:
+  friend class ModuleBuilder;
+
   uint64_t m_Size;
   Segment* m_Segment;
   Buffer m_Contents;

@@ -4,9 +4,6 @@
 // string tables, relocation sections and the like) are bookkeeping: their bytes are consumed into
 // the model's objects when a file is read, and from then on are only a cache of what the objects
 // say. So nobody may write to them: all edits go to the objects.
-//
-// The operations named `adopt...` and the switches beside them are for who builds a module from a
-// file: they take what the file says as it stands, auxiliary section or not.
 #pragma once
 
 #include "elfext/interface/buffer.h"
@@ -78,7 +75,6 @@ public:
   }
   // The segment that a section/segment note names; null if there is none.
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
-  void setSegment(Segment* segment) { m_Segment = segment; }
 
   // The text is copied. Null clears it.
   void setName(const char* name);
@@ -99,18 +95,6 @@ public:
   void increaseAlignment(uint64_t alignment);
   // Makes it a SHT_PROGBITS section with contents of its size, for the caller to fill.
   void makeProgBits();
-
-  // What the file says, as it stands: address, offset, entry size, info and alignment.
-  void adoptHeader(const SectionHeader& header);
-  // Text that lives as long as the module's contents.
-  void adoptName(const char* name) { m_Name = name; }
-  void adoptSize(uint64_t size) { m_Size = size; }
-  void adoptLink(Section* link);
-  void setAuxiliary(bool isAuxiliary) { m_IsAuxiliary = isAuxiliary; }
-  void setRelocatable(bool isRelocatable) { m_IsRelocatable = isRelocatable; }
-  // The contents, without a look at whether they may be changed.
-  [[nodiscard]] Buffer& getBuffer() { return m_Contents; }
-  [[nodiscard]] const Buffer& getBuffer() const { return m_Contents; }
 
   // Contents. Reading needs them to be here; writing also needs an ordinary section whose contents
   // are in memory. Offsets and sizes are in bytes; words have the module's byte order. See Buffer.
@@ -145,8 +129,6 @@ public:
 
   // Contents that are still in a file that stays open for them.
   [[nodiscard]] bool isContentsDeferred() const { return m_DeferredContents != nullptr; }
-  // The record is of the module's object region; the section ends it.
-  void deferContents(DeferredContents* deferredContents);
   // True if the contents are here now. A failure is reported to the module's error handler, and
   // the file is closed.
   [[nodiscard]] bool loadDeferredContents();
@@ -236,11 +218,16 @@ public:
 
 private:
   friend class Group;
+  friend class ModuleBuilder;
   friend class ObjectModule;
   friend class Pruner;
   friend class Relocation;
   friend class RelocationSection;
   friend class Symbol;
+
+  void adoptHeader(const SectionHeader& header);
+  void adoptLink(Section* link);
+  void deferContents(DeferredContents* deferredContents);
 
   void markChanged();
   void markHostedChanged();

@@ -51,7 +51,7 @@ void RelocationSection::setTarget(Section* target, bool isDynamic) {
   m_Target = target;
   m_IsDynamic = isDynamic;
   target->getRelocationSections(isDynamic).append(getObjectModule()->getContainerRegion(), this);
-  getObjectModule()->setAuxiliarySectionsUpToDate(false);
+  markChanged();
 }
 
 void RelocationSection::setRows(RelocationRows* rows, uint32_t rowCount) {

@@ -6,6 +6,7 @@
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/prune_criterion.h"
 #include "elfext/src/bytes/leb128.h"
+#include "elfext/src/model/module_builder.h"
 
 #include <algorithm>
 #include <string>
@@ -188,10 +189,10 @@ void updateBuildAttributesSection(ObjectModule& module) {
   if (module.isBuildAttributesSectionUpToDate()) return;
   BuildAttributesSection& section = onlySection(module);
   const std::string bytes = SectionImage(module).make();
-  section.adoptSize(bytes.size());
-  section.getBuffer().setSize(bytes.size());
-  section.getBuffer().write(0, bytes.data(), bytes.size());
-  module.setBuildAttributesSectionUpToDate(true);
+  ModuleBuilder::adoptSize(section, bytes.size());
+  ModuleBuilder::getBuffer(section).setSize(bytes.size());
+  ModuleBuilder::getBuffer(section).write(0, bytes.data(), bytes.size());
+  ModuleBuilder::setBuildAttributesSectionUpToDate(module, true);
 }
 
 } // namespace elfext

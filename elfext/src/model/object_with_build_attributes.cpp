@@ -22,7 +22,7 @@ void ObjectWithBuildAttributes::getEffectiveBuildAttributes(BuildAttributes& res
 
 void ObjectWithBuildAttributes::setOwnBuildAttributes(const BuildAttributes* attributes) {
   m_BuildAttributes = attributes;
-  m_ObjectModule->setBuildAttributesSectionUpToDate(false);
+  m_ObjectModule->markBuildAttributesChanged();
 }
 
 void ObjectWithBuildAttributes::forgetBuildAttributes() {
@@ -68,13 +68,13 @@ void ObjectWithBuildAttributes::setBlock(const BuildAttributesBlock* block) {
     (*m_Blocks)[index] = block;
   else
     m_Blocks->append(block);
-  m_ObjectModule->setBuildAttributesSectionUpToDate(false);
+  m_ObjectModule->markBuildAttributesChanged();
 }
 
 bool ObjectWithBuildAttributes::removeBlockAt(uint32_t index) {
   if (index >= getBlockCount()) return false;
   m_Blocks->remove(index);
-  m_ObjectModule->setBuildAttributesSectionUpToDate(false);
+  m_ObjectModule->markBuildAttributesChanged();
   return true;
 }
 

@@ -11,7 +11,7 @@ namespace elfext {
 void Preemption::addPreemptedDll(const char* name) {
   QUARN_ASSERT(1, name != NULL);
   m_PreemptedDllNames.append(m_ObjectModule->getContainerRegion(), m_ObjectModule->keepText(name));
-  m_ObjectModule->setAuxiliarySectionsUpToDate(false);
+  m_ObjectModule->markChanged();
 }
 
 } // namespace elfext

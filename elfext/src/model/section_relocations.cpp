@@ -66,7 +66,7 @@ void Section::materializeRelocations() {
   }
   m_IsRelocatable = isRelocatable;
   m_ObjectModule->m_IndexesFrozen = areFrozen;
-  m_ObjectModule->setAuxiliarySectionsUpToDate(areUpToDate);
+  m_ObjectModule->m_AreAuxiliarySectionsUpToDate = areUpToDate;
 }
 
 uint32_t Section::getRelocationCount() const {

@@ -4,6 +4,7 @@
 #include "elfext/src/reader/object_module_reader.h"
 
 #include "elfext/interface/elf_constants.h"
+#include "elfext/src/model/module_builder.h"
 
 #include <utility>
 
@@ -16,8 +17,8 @@ void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
   const FileHeader& header = context.fileHeader;
   ObjectModule& module = context.module;
   module.clear();
-  module.adoptImageSource(std::move(image));
-  module.setReadBuffer(context.lentBytes);
+  ModuleBuilder::adoptImageSource(module, std::move(image));
+  ModuleBuilder::setReadBuffer(module, context.lentBytes);
   module.setMachine(header.machine);
   module.setFileType(header.type);
   module.setElfClass(header.ident[EI_CLASS]);
@@ -28,13 +29,13 @@ void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
   module.setElfFlags(header.flags);
   module.setIdentVersion(header.ident[EI_VERSION]);
   module.setElfVersion(header.version);
-  module.setElfHeaderSize(header.ehsize);
-  module.setSectionHeaderOffset(header.shoff);
-  module.setProgramHeaderOffset(header.phoff);
-  module.setStoredSectionCount(header.shnum);
-  module.setStoredProgramHeaderCount(header.phnum);
-  module.setSectionHeaderEntrySize(header.shentsize);
-  module.setProgramHeaderEntrySize(header.phentsize);
+  ModuleBuilder::setElfHeaderSize(module, header.ehsize);
+  ModuleBuilder::setSectionHeaderOffset(module, header.shoff);
+  ModuleBuilder::setProgramHeaderOffset(module, header.phoff);
+  ModuleBuilder::setStoredSectionCount(module, header.shnum);
+  ModuleBuilder::setStoredProgramHeaderCount(module, header.phnum);
+  ModuleBuilder::setSectionHeaderEntrySize(module, header.shentsize);
+  ModuleBuilder::setProgramHeaderEntrySize(module, header.phentsize);
   module.reserveSections(context.sectionCount());
 }
 
@@ -68,13 +69,12 @@ bool readObjectModule(ReadContext& context, std::unique_ptr<ImageSource> image) 
 
   beginModule(context, std::move(image));
   // Names are views of the image, which the module now owns.
-  const bool wereNamesInBuffer = module.areNamesInBuffer();
-  module.setNamesInBuffer(true);
+  ModuleBuilder::setNamesInBuffer(module, true);
   const bool isRead = readModule(context);
-  module.setNamesInBuffer(wereNamesInBuffer);
+  ModuleBuilder::setNamesInBuffer(module, false);
   if (!isRead) return false;
-  module.setReadConditions(computeReadConditions(context));
-  module.setAuxiliarySectionsUpToDate(false);
+  ModuleBuilder::setReadConditions(module, computeReadConditions(context));
+  ModuleBuilder::setAuxiliarySectionsUpToDate(module, false);
   return true;
 }
 

@@ -2,6 +2,7 @@
 //
 // A module as what build attributes hang on.
 #include "elfext/interface/build_attributes_cache.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 #include "elfext/src/tables/build_attributes_reader.h"
 
@@ -39,13 +40,15 @@ public:
   void setOwn(AttributeHolder holder, const BuildAttributes* attributes) override {
     get(holder).setOwnBuildAttributes(attributes);
   }
-  void markSectionsTaken() override { m_Module.setBuildAttributesSectionUpToDate(true); }
-  void drop() override { m_Module.dropBuildAttributes(); }
+  void markSectionsTaken() override {
+    ModuleBuilder::setBuildAttributesSectionUpToDate(m_Module, true);
+  }
+  void drop() override { ModuleBuilder::dropBuildAttributes(m_Module); }
   [[nodiscard]] uint32_t getHighestTagsVersion() const override {
     return m_Module.getHighestTagsVersion();
   }
   void raiseHighestTagsVersion(uint32_t version) override {
-    m_Module.raiseHighestTagsVersion(version);
+    ModuleBuilder::raiseHighestTagsVersion(m_Module, version);
   }
 
 private:

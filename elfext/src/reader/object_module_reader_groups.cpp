@@ -3,6 +3,7 @@
 // From checked group sections the groups.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/group.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -23,7 +24,7 @@ void createGroups(ReadContext& context) {
     auto* section = static_cast<GroupSection*>(module.getSection(table.section));
     Group* group =
         module.createGroup(signatureOf(context, table.section), section->getName(), table.flags);
-    group->setGroupSection(section);
+    ModuleBuilder::setGroupSection(*group, section);
     for (const uint32_t member :
          std::span(context.groupMembers).subspan(table.firstMember, table.memberCount))
       group->addMember(module.getSection(member));

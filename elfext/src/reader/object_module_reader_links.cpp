@@ -3,6 +3,7 @@
 // From checked link and info fields to sections that know one another.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -11,18 +12,18 @@ namespace {
 
 void markLinked(StringTableSection& strings, uint32_t userType) {
   if (userType == SHT_SYMTAB)
-    strings.markLinkedBySymtab();
+    ModuleBuilder::markLinkedBySymtab(strings);
   else if (userType == SHT_DYNSYM)
-    strings.markLinkedByDynsym();
+    ModuleBuilder::markLinkedByDynsym(strings);
   else
-    strings.markLinkedByOther();
+    ModuleBuilder::markLinkedByOther(strings);
 }
 
 void linkRelocations(ReadContext& context, RelocationSection& section, const Section& symbols) {
   const uint32_t index = section.getIndex();
   if (context.links[index] == LinkState::WithoutTarget) return;
-  section.setTarget(context.module.getSection(context.sectionHeaders[index].info),
-                    symbols.getType() == SHT_DYNSYM);
+  ModuleBuilder::setTarget(section, context.module.getSection(context.sectionHeaders[index].info),
+                           symbols.getType() == SHT_DYNSYM);
 }
 
 // What a section that is linked by its type's own rule is to the section that it names.
@@ -32,14 +33,14 @@ void linkByType(ReadContext& context, Section& section, Section& link) {
   case SHT_RELA:
     return linkRelocations(context, static_cast<RelocationSection&>(section), link);
   case SHT_HASH:
-    return static_cast<SymbolTableSection&>(link).setHashSection(
-        static_cast<HashSection*>(&section));
+    return ModuleBuilder::setHashSection(static_cast<SymbolTableSection&>(link),
+                                         static_cast<HashSection*>(&section));
   case SHT_GROUP:
-    return static_cast<GroupSection&>(section).setSignatureSymbolIndex(
-        context.sectionHeaders[section.getIndex()].info);
+    return ModuleBuilder::setSignatureSymbolIndex(static_cast<GroupSection&>(section),
+                                                  context.sectionHeaders[section.getIndex()].info);
   case SHT_SYMTAB_SHNDX:
-    return static_cast<SymbolTableSection&>(link).setShndxSection(
-        static_cast<ShndxSection*>(&section));
+    return ModuleBuilder::setShndxSection(static_cast<SymbolTableSection&>(link),
+                                          static_cast<ShndxSection*>(&section));
   default:
     return markLinked(static_cast<StringTableSection&>(link), section.getType());
   }
@@ -53,7 +54,7 @@ void linkSections(ReadContext& context) {
       if (!context.hasLink(i) || isLinkedByType(context.typeOf(i)) != isByType) continue;
       Section& section = *context.module.getSection(i);
       Section& link = *context.module.getSection(context.sectionHeaders[i].link);
-      section.adoptLink(&link);
+      ModuleBuilder::adoptLink(section, &link);
       if (isByType)
         linkByType(context, section, link);
       else if (link.getType() == SHT_STRTAB)

@@ -2,6 +2,7 @@
 //
 // From two tables of this system's own: the records of debug overlay sections, and the segments
 // that notes give to sections.
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -17,7 +18,7 @@ void takeSegmentMaps(ReadContext& context) {
   for (uint32_t i = 0; i < context.notedSegments.size(); ++i) {
     const uint32_t segment = context.notedSegments[i];
     if (segment == NoSegment) continue;
-    context.module.getSection(i)->setSegment(context.module.getSegment(segment));
+    ModuleBuilder::setSegment(*context.module.getSection(i), context.module.getSegment(segment));
   }
 }
 

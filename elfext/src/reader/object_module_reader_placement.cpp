@@ -8,6 +8,7 @@
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/bytes/extents.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 #include "elfext/src/reader/segment_finder.h"
 
@@ -119,7 +120,7 @@ void createRawDataBlocks(ReadContext& context) {
     Segment* segment = context.module.getSegment(gap.segment);
     RawDataBlock* block = context.module.createRawDataBlock(segment, gap.end - gap.start);
     block->setFileOffset(gap.start);
-    block->getBuffer().defer(context.image, gap.start, gap.end - gap.start);
+    ModuleBuilder::getBuffer(*block).defer(context.image, gap.start, gap.end - gap.start);
     const uint64_t distance = gap.start - context.programHeaders[gap.segment].offset;
     [[maybe_unused]] const bool ret = FileRegion::link(*segment, *block, distance);
     QUARN_ASSERT(1, ret);

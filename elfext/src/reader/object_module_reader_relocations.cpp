@@ -4,6 +4,7 @@
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/relocation_rows.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -47,7 +48,7 @@ void giveRelocations(ReadContext& context) {
     auto* rows = alloclib::create<LoadedRelocationRows>(
         context.module.getObjectRegion(), context.format, *section, table.rows, table.rowCount,
         context.symbols[table.symbolSection]);
-    section->setRows(rows, table.rowCount);
+    ModuleBuilder::setRows(*section, rows, table.rowCount);
   }
 }
 

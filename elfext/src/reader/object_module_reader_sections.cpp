@@ -7,6 +7,7 @@
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/reference_counted_file.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -45,35 +46,36 @@ void deferSection(ReadContext& context, Section& section, const SectionHeader& h
     deferral.shared->addReference();
     context.image.leaveFileOpen();
   }
-  section.deferContents(alloclib::create<DeferredContents>(region, deferral.shared, true, header));
+  ModuleBuilder::deferContents(
+      section, alloclib::create<DeferredContents>(region, deferral.shared, true, header));
 }
 
 void giveContents(ReadContext& context, Section& section, const SectionHeader& header) {
-  section.adoptSize(header.size);
+  ModuleBuilder::adoptSize(section, header.size);
   if (context.deferral != nullptr && mayBeDeferred(header.type) &&
       context.deferral->selector.isDeferred(section, header.size))
     deferSection(context, section, header);
   else
-    section.getBuffer().defer(context.image, header.offset, header.size);
+    ModuleBuilder::getBuffer(section).defer(context.image, header.offset, header.size);
 }
 
 // The section of a string table gets what the table of the read has.
 void mendStringTable(Section& section) {
-  section.setAuxiliary(false);
+  ModuleBuilder::setAuxiliary(section, false);
   if (section.getSize() == 0) {
     section.appendByte(0);
   } else {
     section.setByte(0, 0);
     section.setByte(section.getSize() - 1, 0);
   }
-  section.setAuxiliary(true);
+  ModuleBuilder::setAuxiliary(section, true);
 }
 
 } // namespace
 
 const char* ReadContext::stringsOf(uint32_t section) {
   const uint8_t* bytes = mendedStrings.contains(section)
-                             ? module.getSection(section)->getBuffer().getContents()
+                             ? ModuleBuilder::getBuffer(*module.getSection(section)).getContents()
                              : viewSection(section);
   return reinterpret_cast<const char*>(bytes);
 }
@@ -81,13 +83,14 @@ const char* ReadContext::stringsOf(uint32_t section) {
 void createSections(ReadContext& context) {
   ObjectModule& module = context.module;
   for (const SectionHeader& header : context.sectionHeaders) {
-    module.createSectionOfType(nullptr, header.type, static_cast<uint32_t>(header.flags))
-        ->adoptHeader(header);
+    Section& section =
+        *module.createSectionOfType(nullptr, header.type, static_cast<uint32_t>(header.flags));
+    ModuleBuilder::adoptHeader(section, header);
   }
   QUARN_ASSERT(1, module.getSectionCount() == context.sectionHeaders.size());
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
     const SectionHeader& header = context.sectionHeaders[i];
-    if (header.type == SHT_NOBITS) module.getSection(i)->adoptSize(header.size);
+    if (header.type == SHT_NOBITS) ModuleBuilder::adoptSize(*module.getSection(i), header.size);
     if (hasFileBytes(header)) giveContents(context, *module.getSection(i), header);
   }
   for (const auto& [section, bytes] : context.mendedStrings)
@@ -98,11 +101,12 @@ void nameSections(ReadContext& context) {
   const uint32_t table = context.sectionNameTable;
   if (table == 0) return;
   QUARN_ASSERT(1, context.module.getSection(table)->getType() == SHT_STRTAB);
-  static_cast<StringTableSection*>(context.module.getSection(table))->markSectionNameTable();
+  ModuleBuilder::markSectionNameTable(
+      *static_cast<StringTableSection*>(context.module.getSection(table)));
   const char* names = context.stringsOf(table);
   for (uint32_t i = 0; i < context.sectionCount(); ++i) {
     const uint32_t offset = context.sectionHeaders[i].name;
-    if (offset != 0) context.module.getSection(i)->adoptName(names + offset);
+    if (offset != 0) ModuleBuilder::adoptName(*context.module.getSection(i), names + offset);
   }
 }
 

@@ -6,6 +6,7 @@
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/reference_counted_file.h"
 #include "elfext/interface/section.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
 
 #include <string>
@@ -45,7 +46,7 @@ bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, Deferral
       image->prepare() ? readObjectModule(context, std::move(image)) : context.failRead();
   if (isRead) return true;
   module.clear();
-  module.setReadBuffer(nullptr);
+  ModuleBuilder::setReadBuffer(module, nullptr);
   return false;
 }
 
@@ -94,7 +95,7 @@ bool loadWhatIsNotDeferred(const ObjectModule& module) {
     if (!section->isContentsDeferred()) static_cast<void>(section->getContents());
   }
   for (RawDataBlock* block : module.getRawDataBlocks())
-    static_cast<void>(block->getBuffer().getContents());
+    static_cast<void>(ModuleBuilder::getBuffer(*block).getContents());
   return !module.hasLostContents();
 }
 
@@ -105,7 +106,7 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
   // A handler that lets a foreign machine pass leaves the module as it was, and the image is gone.
-  if (isRead && module.getImageSource() != &bytes) return true;
+  if (isRead && ModuleBuilder::getImageSource(module) != &bytes) return true;
   const bool isAnyDeferred = deferral.shared != nullptr;
   // Of a file of its own the image may load the rest when somebody wants it.
   if (isOwnFile && !isAnyDeferred) return isRead;

@@ -10,6 +10,7 @@
 #include "elfext/interface/group.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/relocation.h"
+#include "elfext/src/model/module_builder.h"
 #include "elfext/src/reports/go_on.h"
 #include "elfext/src/validation/relocation_places.h"
 
@@ -41,14 +42,14 @@ bool isBlank(const Section& section) {
 }
 
 void blank(Section& section) {
-  section.setAuxiliary(false);
+  ModuleBuilder::setAuxiliary(section, false);
   section.setName(nullptr);
   section.setFlags(0);
   section.setAddress(0);
-  section.adoptSize(0);
-  section.adoptLink(nullptr);
+  ModuleBuilder::adoptSize(section, 0);
+  ModuleBuilder::adoptLink(section, nullptr);
   section.setInfo(0);
-  section.setAuxiliary(true);
+  ModuleBuilder::setAuxiliary(section, true);
 }
 
 bool validateNullSections(ObjectModule& module) {

@@ -29,9 +29,9 @@ protected:
     header.offset = offset;
     header.size = size;
     Section* section = makeSection();
-    section->adoptSize(size);
-    section->deferContents(
-        alloclib::create<DeferredContents>(module.getObjectRegion(), file.get(), true, header));
+    ModuleBuilder::adoptSize(*section, size);
+    ModuleBuilder::deferContents(*section, alloclib::create<DeferredContents>(
+                                               module.getObjectRegion(), file.get(), true, header));
     return section;
   }
 
@@ -72,7 +72,7 @@ TEST_F(DeferredContentsTest, AreLoadedForADataStore) {
 TEST_F(DeferredContentsTest, AreReadFromWhereTheHeaderSaid) {
   Section* section = makeDeferred(2, 3);
   section->setFileOffset(7);
-  section->adoptSize(1);
+  ModuleBuilder::adoptSize(*section, 1);
   EXPECT_TRUE(section->loadDeferredContents());
   EXPECT_EQ(textOf(*section), "234");
 }
@@ -169,8 +169,9 @@ TEST_F(DeferredContentsTest, NeedAFile) {
 
 TEST_F(DeferredContentsTest, AreNowhereElseThanInTheFile) {
   Section* section = makeSection();
-  section->deferContents(alloclib::create<DeferredContents>(module.getObjectRegion(), file.get(),
-                                                            false, SectionHeader()));
+  ModuleBuilder::deferContents(
+      *section, alloclib::create<DeferredContents>(module.getObjectRegion(), file.get(), false,
+                                                   SectionHeader()));
   EXPECT_ASSERTION((void)section->loadDeferredContents(), "false");
 }
 
@@ -200,9 +201,9 @@ TEST(DeferredContentsOfAModuleTest, CloseTheFileWhenTheModuleGoes) {
   {
     ObjectModule module;
     for (int count = 0; count < 3; ++count)
-      module.createSection("", SHT_PROGBITS, 0)
-          ->deferContents(alloclib::create<DeferredContents>(module.getObjectRegion(), &file, true,
-                                                             SectionHeader()));
+      ModuleBuilder::deferContents(*module.createSection("", SHT_PROGBITS, 0),
+                                   alloclib::create<DeferredContents>(
+                                       module.getObjectRegion(), &file, true, SectionHeader()));
     ASSERT_TRUE(FileRegion::link(*module.getSection(0), *module.getSection(1), 4));
     EXPECT_TRUE(file.isOpen());
   }

@@ -53,7 +53,7 @@ TEST_F(FileRegionTest, PutsTheElfHeaderAtTheStart) {
   ELFHeader& header = module.getElfHeader();
   EXPECT_EQ(alignmentOf(header), Alignment(0, 4));
   EXPECT_EQ(header.getFileSize(), 60u);
-  module.setElfHeaderSize(52);
+  ModuleBuilder::setElfHeaderSize(module, 52);
   EXPECT_EQ(header.getFileSize(), 52u);
   header.setFileOffset(0);
   EXPECT_TRUE(header.getFileExtent(nullptr, nullptr));
@@ -165,7 +165,7 @@ TEST_F(FileRegionTest, KeepsTheBytesOfARawDataBlock) {
 TEST_F(FileRegionTest, ShowsTheBytesThatARawDataBlockIsGiven) {
   const uint8_t bytes[] = {1, 2, 3, 4};
   RawDataBlock* block = module.createRawDataBlock(makeSegment(0, 100), 4);
-  block->getBuffer().borrow(bytes, 4);
+  ModuleBuilder::getBuffer(*block).borrow(bytes, 4);
   uint8_t read[2] = {};
   EXPECT_TRUE(block->read(2, read, 2));
   EXPECT_THAT(read, testing::ElementsAre(3, 4));

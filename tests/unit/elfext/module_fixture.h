@@ -9,6 +9,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
+#include "elfext/src/model/module_builder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -70,7 +71,7 @@ protected:
   // Whether the change clears the flag of the auxiliary sections.
   template <class Change>
   bool makesStale(Change change) {
-    module.setAuxiliarySectionsUpToDate(true);
+    ModuleBuilder::setAuxiliarySectionsUpToDate(module, true);
     change();
     return !module.areAuxiliarySectionsUpToDate();
   }

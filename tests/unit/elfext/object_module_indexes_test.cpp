@@ -50,7 +50,7 @@ void expectFamilyWorks(Family<Object> family, Make make) {
   expectOrder(family, {3, 1, 2, 0});
   family.move(1, first + 1);
   expectOrder(family, {3, 1, 2, 0});
-  family.module.setAuxiliarySectionsUpToDate(true);
+  ModuleBuilder::setAuxiliarySectionsUpToDate(family.module, true);
   family.move(3, first + 3);
   expectOrder(family, {1, 2, 0, 3});
   EXPECT_FALSE(family.module.areAuxiliarySectionsUpToDate());

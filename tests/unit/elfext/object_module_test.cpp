@@ -44,8 +44,7 @@ TEST_F(ObjectModuleTest, StartsWithTheHeaderOfANewFile) {
 
 TEST_F(ObjectModuleTest, StartsWithoutNamesOrDynamicData) {
   EXPECT_EQ(module.getReadBuffer(), nullptr);
-  EXPECT_FALSE(module.areNamesInBuffer());
-  EXPECT_EQ(module.getImageSource(), nullptr);
+  EXPECT_EQ(ModuleBuilder::getImageSource(module), nullptr);
   EXPECT_EQ(module.getErrorHandler(), nullptr);
   EXPECT_EQ(module.getFileName(), nullptr);
   EXPECT_EQ(module.getObjectName(), nullptr);
@@ -121,11 +120,14 @@ TEST_F(ObjectModuleTest, IsCalledByItsPathOrByArchiveAndMember) {
 
 TEST_F(ObjectModuleTest, KeepsTextsAsCopiesOrAsTheyAre) {
   const char text[] = "text";
-  EXPECT_EQ(module.keepText(nullptr), nullptr);
-  EXPECT_NE(module.keepText(text), text);
-  EXPECT_STREQ(module.keepText(text), text);
-  module.setNamesInBuffer(true);
-  EXPECT_EQ(module.keepText(text), text);
+  const auto keepText = [this](const char* name) {
+    return module.createSection(name, SHT_PROGBITS, 0)->getName();
+  };
+  EXPECT_EQ(keepText(nullptr), nullptr);
+  EXPECT_NE(keepText(text), text);
+  EXPECT_STREQ(keepText(text), text);
+  ModuleBuilder::setNamesInBuffer(module, true);
+  EXPECT_EQ(keepText(text), text);
 }
 
 class NotedSource final : public ImageSource {
@@ -141,12 +143,12 @@ private:
 
 TEST_F(ObjectModuleTest, EndsItsImageWhenItIsCleared) {
   int ends = 0;
-  module.adoptImageSource(std::make_unique<NotedSource>(ends));
-  EXPECT_NE(module.getImageSource(), nullptr);
+  ModuleBuilder::adoptImageSource(module, std::make_unique<NotedSource>(ends));
+  EXPECT_NE(ModuleBuilder::getImageSource(module), nullptr);
   EXPECT_EQ(ends, 0);
   module.clear();
   EXPECT_EQ(ends, 1);
-  EXPECT_EQ(module.getImageSource(), nullptr);
+  EXPECT_EQ(ModuleBuilder::getImageSource(module), nullptr);
 }
 
 TEST(ObjectModuleImageTest, EndsWithTheModule) {
@@ -154,7 +156,7 @@ TEST(ObjectModuleImageTest, EndsWithTheModule) {
   int ends = 0;
   {
     ObjectModule module;
-    module.adoptImageSource(std::make_unique<NotedSource>(ends));
+    ModuleBuilder::adoptImageSource(module, std::make_unique<NotedSource>(ends));
   }
   EXPECT_EQ(ends, 1);
 }
@@ -244,13 +246,13 @@ TEST_F(ObjectModuleTest, MakesTheAuxiliarySectionsStaleWithEachHeaderField) {
 }
 
 TEST_F(ObjectModuleTest, TakesWhatAFileSaysOfItsHeaders) {
-  module.setElfHeaderSize(52);
-  module.setSectionHeaderOffset(uint64_t{1} << 40);
-  module.setProgramHeaderOffset(uint64_t{1} << 41);
-  module.setStoredSectionCount(3);
-  module.setStoredProgramHeaderCount(4);
-  module.setSectionHeaderEntrySize(41);
-  module.setProgramHeaderEntrySize(33);
+  ModuleBuilder::setElfHeaderSize(module, 52);
+  ModuleBuilder::setSectionHeaderOffset(module, uint64_t{1} << 40);
+  ModuleBuilder::setProgramHeaderOffset(module, uint64_t{1} << 41);
+  ModuleBuilder::setStoredSectionCount(module, 3);
+  ModuleBuilder::setStoredProgramHeaderCount(module, 4);
+  ModuleBuilder::setSectionHeaderEntrySize(module, 41);
+  ModuleBuilder::setProgramHeaderEntrySize(module, 33);
   EXPECT_EQ(module.getElfHeaderSize(), 52u);
   EXPECT_EQ(module.getElfHeader().getFileSize(), 52u);
   EXPECT_EQ(module.getSectionHeaderOffset(), uint64_t{1} << 40);
@@ -375,7 +377,7 @@ TEST_F(ObjectModuleTest, MakesGroupsAndKnowsTheComdatOnes) {
   EXPECT_EQ(second->getIndex(), 2u);
   EXPECT_EQ(second->getGroupSection(), nullptr);
   GroupSection* section = module.createGroupSection(".group", 0);
-  second->setGroupSection(section);
+  ModuleBuilder::setGroupSection(*second, section);
   EXPECT_EQ(second->getGroupSection(), section);
   EXPECT_ASSERTION((void)module.findComdatGroup(nullptr), "signature != NULL");
 }

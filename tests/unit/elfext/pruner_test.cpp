@@ -22,7 +22,7 @@ protected:
 
   RelocationSection* makeRelocationSection(Section* target, bool isDynamic = false) {
     RelocationSection* section = module.createRelocationSection("", SHT_REL, 0);
-    section->setTarget(target, isDynamic);
+    ModuleBuilder::setTarget(*section, target, isDynamic);
     return section;
   }
   Segment* makeSegment(uint64_t filesz = 100) {
@@ -116,8 +116,8 @@ TEST_F(PrunerTest, LetsGoOfTheHelpersOfASymbolTable) {
     SymbolTableSection* table = module.createSymbolTableSection("", type, 0);
     ShndxSection* shndx = module.createShndxSection("", 0);
     HashSection* hash = module.createHashSection("", 0);
-    table->setShndxSection(shndx);
-    table->setHashSection(hash);
+    ModuleBuilder::setShndxSection(*table, shndx);
+    ModuleBuilder::setHashSection(*table, hash);
     module.deleteSection(shndx);
     EXPECT_EQ(table->getShndxSection(), nullptr);
     EXPECT_EQ(table->getHashSection(), hash);
@@ -220,7 +220,7 @@ TEST_F(PrunerTest, LetsGoOfAnAssociatedSymbol) {
 TEST_F(PrunerTest, TakesTheSectionOfAGroupAlongAndFreesItsMembers) {
   Group* doomed = module.createGroup("sig", "", GRP_COMDAT);
   GroupSection* groupSection = module.createGroupSection(".group", 0);
-  doomed->setGroupSection(groupSection);
+  ModuleBuilder::setGroupSection(*doomed, groupSection);
   Section* member = makeSection();
   doomed->addMember(member);
   Group* second = module.createGroup("sig", "", GRP_COMDAT);
@@ -240,7 +240,7 @@ TEST_F(PrunerTest, TakesTheSectionOfAGroupAlongAndFreesItsMembers) {
 TEST_F(PrunerTest, LeavesAGroupWithoutASectionOfIts) {
   Group* group = module.createGroup("sig", "", 0);
   GroupSection* groupSection = module.createGroupSection(".group", 0);
-  group->setGroupSection(groupSection);
+  ModuleBuilder::setGroupSection(*group, groupSection);
   Section* member = makeSection();
   Section* doomed = makeSection();
   group->addMember(doomed);
@@ -259,8 +259,8 @@ TEST_F(PrunerTest, TakesRawDataBlocksAlongWithTheirSegment) {
   Segment* segment = makeSegment();
   Section* section = makeSection();
   Section* other = makeSection();
-  section->setSegment(doomed);
-  other->setSegment(segment);
+  ModuleBuilder::setSegment(*section, doomed);
+  ModuleBuilder::setSegment(*other, segment);
   RawDataBlock* going = module.createRawDataBlock(doomed, 4);
   RawDataBlock* staying = module.createRawDataBlock(segment, 4);
   ASSERT_TRUE(FileRegion::link(*doomed, *going, 4));
@@ -372,9 +372,9 @@ TEST_F(PrunerTest, ClearsEverything) {
   module.setSoname("so");
   module.addDynamicFlags(1);
   module.setDynamicValue(DynamicValue_Init, 4);
-  module.setReadConditions(ReadCondition_WasRead);
-  module.setSectionHeaderOffset(100);
-  module.setStoredSectionCount(3);
+  ModuleBuilder::setReadConditions(module, ReadCondition_WasRead);
+  ModuleBuilder::setSectionHeaderOffset(module, 100);
+  ModuleBuilder::setStoredSectionCount(module, 3);
   module.getSectionHeaderTable().setEntryCount(3);
   module.getSectionHeaderTable().setFileOffset(100);
   module.clear();

@@ -42,7 +42,7 @@ TEST_F(SectionRelocationsTest, ApplyToRelocatableSectionsOnly) {
   Section* note = makeSection(".note", SHT_NOTE);
   EXPECT_ASSERTION(note->addRelocation(0, 0, symbol), "m_IsRelocatable");
   EXPECT_ASSERTION(note->addRelocation(0, 0, symbol, 1), "m_IsRelocatable");
-  note->setRelocatable(true);
+  ModuleBuilder::setRelocatable(*note, true);
   note->addRelocation(0, 0, symbol);
   EXPECT_EQ(note->getRelocationCount(), 1u);
 }
@@ -168,7 +168,7 @@ class TestRows final : public RelocationRows {
 public:
   TestRows(RelocationSection* section, std::vector<uint64_t> offsets)
       : m_Section(section), m_Offsets(std::move(offsets)) {
-    section->setRows(this, static_cast<uint32_t>(m_Offsets.size()));
+    ModuleBuilder::setRows(*section, this, static_cast<uint32_t>(m_Offsets.size()));
   }
 
   void appendTo(Section& target) override {
@@ -193,7 +193,7 @@ class PendingRowsTest : public SectionRelocationsTest {
 protected:
   RelocationSection* makeRelocationSection(uint32_t type, bool isDynamic) {
     RelocationSection* relocationSection = module.createRelocationSection("", type, 0);
-    relocationSection->setTarget(section, isDynamic);
+    ModuleBuilder::setTarget(*relocationSection, section, isDynamic);
     return relocationSection;
   }
 
@@ -249,9 +249,9 @@ TEST_F(PendingRowsTest, BecomeObjectsForASearch) {
 }
 
 TEST_F(PendingRowsTest, BecomeObjectsWhereNothingMayChange) {
-  section->setRelocatable(false);
+  ModuleBuilder::setRelocatable(*section, false);
   module.setIndexesFrozen(true);
-  module.setAuxiliarySectionsUpToDate(true);
+  ModuleBuilder::setAuxiliarySectionsUpToDate(module, true);
   EXPECT_THAT(offsets(), testing::ElementsAre(10, 11, 20, 30, 31));
   EXPECT_FALSE(section->isRelocatable());
   EXPECT_TRUE(module.indexesAreFrozen());
@@ -268,7 +268,7 @@ TEST_F(PendingRowsTest, GoUnseenWithAllRelocations) {
 
 TEST_F(PendingRowsTest, BecomeObjectsBeforeTheirSectionTurnsElsewhere) {
   Section* other = makeSection();
-  staticRel->setTarget(other, true);
+  ModuleBuilder::setTarget(*staticRel, other, true);
   EXPECT_EQ(second.calls, 1);
   EXPECT_EQ(section->getRelocationCount(), 5u);
   EXPECT_THAT(elements(section->getStaticRelocationSections()), testing::ElementsAre(secondRel));
@@ -309,7 +309,7 @@ TEST_F(PendingRowsTest, NeedATarget) {
   RelocationSection* loose = module.createRelocationSection("", SHT_REL, 0);
   EXPECT_ASSERTION(TestRows(loose, {1}), "m_Target != NULL");
   EXPECT_ASSERTION(TestRows(staticRel, {1}), "m_Rows == NULL");
-  EXPECT_ASSERTION(loose->setTarget(nullptr, false), "target != NULL");
+  EXPECT_ASSERTION(ModuleBuilder::setTarget(*loose, nullptr, false), "target != NULL");
 }
 
 } // namespace

@@ -121,16 +121,16 @@ TEST_F(SectionTest, TellsWhoUsesAStringTable) {
   EXPECT_FALSE(table->isLinkedBySymtab());
   EXPECT_FALSE(table->isLinkedByDynsym());
   EXPECT_FALSE(table->isLinkedByOther());
-  table->markSectionNameTable();
+  ModuleBuilder::markSectionNameTable(*table);
   EXPECT_TRUE(table->isSectionNameTable());
   EXPECT_FALSE(table->isLinkedBySymtab());
-  table->markLinkedBySymtab();
+  ModuleBuilder::markLinkedBySymtab(*table);
   EXPECT_TRUE(table->isLinkedBySymtab());
   EXPECT_FALSE(table->isLinkedByDynsym());
-  table->markLinkedByDynsym();
+  ModuleBuilder::markLinkedByDynsym(*table);
   EXPECT_TRUE(table->isLinkedByDynsym());
   EXPECT_FALSE(table->isLinkedByOther());
-  table->markLinkedByOther();
+  ModuleBuilder::markLinkedByOther(*table);
   EXPECT_TRUE(table->isLinkedByOther());
 }
 
@@ -140,15 +140,15 @@ TEST_F(SectionTest, TiesASymbolTableToItsHelpers) {
   EXPECT_EQ(table->getHashSection(), nullptr);
   ShndxSection* shndx = module.createShndxSection(".symtab_shndx", 0);
   HashSection* hash = module.createHashSection(".hash", 0);
-  table->setShndxSection(shndx);
-  table->setHashSection(hash);
+  ModuleBuilder::setShndxSection(*table, shndx);
+  ModuleBuilder::setHashSection(*table, hash);
   EXPECT_EQ(table->getShndxSection(), shndx);
   EXPECT_EQ(table->getHashSection(), hash);
 }
 
 TEST_F(SectionTest, KeepsTheSignatureSymbolOfAGroupSection) {
   GroupSection* section = module.createGroupSection(".group", 0);
-  section->setSignatureSymbolIndex(7);
+  ModuleBuilder::setSignatureSymbolIndex(*section, 7);
   EXPECT_EQ(section->getSignatureSymbolIndex(), 7u);
 }
 
@@ -211,7 +211,7 @@ TEST_F(SectionTest, KeepsTheOldTextForAnEqualName) {
 
 TEST_F(SectionTest, CopiesItsNameUnlessItIsInTheBuffer) {
   char name[] = "name";
-  module.setNamesInBuffer(true);
+  ModuleBuilder::setNamesInBuffer(module, true);
   Section* section = module.createSection(name, SHT_PROGBITS, 0);
   EXPECT_EQ(section->getName(), name);
   // A name that is set later is the client's, not the buffer's.
@@ -319,10 +319,10 @@ TEST_F(SectionTest, IsNotEditedWhenAuxiliary) {
   EXPECT_ASSERTION(section->setByte(0, 1), "!m_IsAuxiliary");
   EXPECT_ASSERTION(section->appendByte(1), "!m_IsAuxiliary");
   EXPECT_FALSE(section->isModifiable());
-  section->setAuxiliary(false);
+  ModuleBuilder::setAuxiliary(*section, false);
   EXPECT_TRUE(section->isModifiable());
   section->appendByte(1);
-  section->setAuxiliary(true);
+  ModuleBuilder::setAuxiliary(*section, true);
   EXPECT_EQ(section->getByte(0), 1u);
 }
 
@@ -335,9 +335,9 @@ TEST_F(SectionTest, AdoptsWhatAFileSaysAsItStands) {
   header.info = 3;
   header.addralign = 12;
   header.entsize = 4;
-  section->adoptHeader(header);
-  section->adoptSize(5);
-  section->adoptLink(target);
+  ModuleBuilder::adoptHeader(*section, header);
+  ModuleBuilder::adoptSize(*section, 5);
+  ModuleBuilder::adoptLink(*section, target);
   EXPECT_EQ(section->getAddress(), 1u);
   EXPECT_TRUE(section->getFileExtent(nullptr, nullptr));
   EXPECT_EQ(section->getFileOffset(), 2u);
@@ -352,7 +352,7 @@ TEST_F(SectionTest, AdoptsWhatAFileSaysAsItStands) {
 TEST_F(SectionTest, RemembersItsSegment) {
   Segment* segment = module.createSegment(PT_LOAD, 0, 0, 0, 0, 0, 0, 0);
   Section* section = makeSection();
-  section->setSegment(segment);
+  ModuleBuilder::setSegment(*section, segment);
   EXPECT_EQ(section->getSegment(), segment);
 }
 

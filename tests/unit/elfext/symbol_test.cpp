@@ -170,7 +170,7 @@ TEST_F(SymbolTest, CopiesItsNameUnlessItIsInTheBuffer) {
   Symbol* symbol = makeAbsolute(name);
   EXPECT_NE(symbol->getName(), name);
   EXPECT_STREQ(symbol->getName(), "name");
-  module.setNamesInBuffer(true);
+  ModuleBuilder::setNamesInBuffer(module, true);
   EXPECT_EQ(makeAbsolute(name)->getName(), name);
   // A name that is set later is the client's, not the buffer's.
   symbol->setName(name + 1);

@@ -2,6 +2,7 @@
 #include "elfext/interface/build_attributes_writer.h"
 
 #include "elfext/interface/auxiliary_sections.h"
+#include "elfext/src/model/module_builder.h"
 #include "tests/unit/elfext_attributes/attribute_module_fixture.h"
 
 namespace elfext {
@@ -70,7 +71,7 @@ TEST_F(ObjectBlocksTest, KeepTheirOrderWhenOneGoes) {
 
 TEST_F(ObjectBlocksTest, MakeTheSectionStale) {
   const auto makesStale = [this](auto change) {
-    m_Module.setBuildAttributesSectionUpToDate(true);
+    ModuleBuilder::setBuildAttributesSectionUpToDate(m_Module, true);
     change();
     return !m_Module.isBuildAttributesSectionUpToDate();
   };
@@ -178,7 +179,7 @@ TEST_F(BuildAttributesWriterTest, WritesTheVersionAloneWithoutBlocks) {
 
 TEST_F(BuildAttributesWriterTest, LeavesWhatIsUpToDate) {
   m_Module.setBlock("v", bytesOf("x"));
-  m_Module.setBuildAttributesSectionUpToDate(true);
+  ModuleBuilder::setBuildAttributesSectionUpToDate(m_Module, true);
   updateBuildAttributesSection(m_Module);
   EXPECT_THAT(m_Module.getBuildAttributesSections(), SizeIs(0));
 }

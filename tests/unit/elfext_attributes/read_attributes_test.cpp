@@ -5,6 +5,7 @@
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/build_attributes_writer.h"
+#include "elfext/src/model/module_builder.h"
 #include "tests/support/faulty_host.h"
 #include "tests/unit/elfext_attributes/attribute_bytes.h"
 #include "tests/unit/elfext_reader/reader_fixture.h"
@@ -128,7 +129,7 @@ TEST_P(ReadAttributesOfEachFormTest, ASectionThatIsMadeAnewIsTheSame) {
                         vendorPart("other", {filePart("x"), symbolPart({1, 2}, "")})},
                        isLittle);
   const ReadResult result = readGood(withAttributes(section, ThreeSymbols, GetParam().object()));
-  result.module->setBuildAttributesSectionUpToDate(false);
+  ModuleBuilder::setBuildAttributesSectionUpToDate(*result.module, false);
   updateBuildAttributesSection(*result.module);
   const Section& made = *result.section(6);
   EXPECT_EQ(textOf({made.getContents(), made.getContentsSize()}), section);

@@ -5,6 +5,7 @@
 
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
+#include "elfext/src/model/module_builder.h"
 #include "tests/unit/elfext_reader/reader_fixture.h"
 
 #include <cstdio>
@@ -256,15 +257,15 @@ class SizesOfSegmentsTest : public testing::Test {
 protected:
   // The header tables are behind everything else.
   SizesOfSegmentsTest() {
-    m_Module.setElfHeaderSize(0);
-    m_Module.setSectionHeaderOffset(1000);
-    m_Module.setProgramHeaderOffset(1500);
+    ModuleBuilder::setElfHeaderSize(m_Module, 0);
+    ModuleBuilder::setSectionHeaderOffset(m_Module, 1000);
+    ModuleBuilder::setProgramHeaderOffset(m_Module, 1500);
     addSection(0, 0);
   }
 
   void addSection(uint64_t offset, uint64_t size, uint32_t type = SHT_PROGBITS) {
     Section* section = m_Module.createSection(".x", type, 0);
-    section->adoptSize(size);
+    ModuleBuilder::adoptSize(*section, size);
     section->setFileOffset(offset);
   }
 
@@ -288,17 +289,17 @@ TEST_F(SizesOfSegmentsTest, PaddingLiesBetweenOccupiedRanges) {
 TEST_F(SizesOfSegmentsTest, NothingIsCountedBehindTheLastOccupiedRange) {
   addSection(10, 10);
   addSegment(10, 100);
-  m_Module.setSectionHeaderOffset(0);
-  m_Module.setProgramHeaderOffset(0);
+  ModuleBuilder::setSectionHeaderOffset(m_Module, 0);
+  ModuleBuilder::setProgramHeaderOffset(m_Module, 0);
   EXPECT_EQ(padding(), 0U);
 }
 
 TEST_F(SizesOfSegmentsTest, HeadersAreOccupied) {
   addSection(190, 10);
   addSegment(0, 200);
-  m_Module.setElfHeaderSize(52);
-  m_Module.setProgramHeaderOffset(60);  // one row, to 92
-  m_Module.setSectionHeaderOffset(100); // two rows, to 180
+  ModuleBuilder::setElfHeaderSize(m_Module, 52);
+  ModuleBuilder::setProgramHeaderOffset(m_Module, 60);  // one row, to 92
+  ModuleBuilder::setSectionHeaderOffset(m_Module, 100); // two rows, to 180
   for (const uint32_t type : {ET_EXEC, ET_REL}) {
     m_Module.setFileType(type);
     EXPECT_EQ(padding(), 8U + 8U + 10U);
@@ -422,7 +423,7 @@ TEST_F(SizesStatisticsTest, NothingIsKnownToBeCompressed) {
 TEST_F(SizesStatisticsTest, CountingChangesNothing) {
   const ReadResult result = readGood(marked(CodeFlags, 16, {{"$a", 0}, {"$d", 8}}));
   ObjectModule& module = *result.module;
-  module.setAuxiliarySectionsUpToDate(true);
+  ModuleBuilder::setAuxiliarySectionsUpToDate(module, true);
   const SizesStatistics first = computeSizesStatistics(&module);
   EXPECT_TRUE(module.areAuxiliarySectionsUpToDate());
   EXPECT_EQ(nonZeroTotals(computeSizesStatistics(&module)), nonZeroTotals(first));

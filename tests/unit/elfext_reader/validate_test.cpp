@@ -4,6 +4,7 @@
 #include "elfext/interface/group.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/segment.h"
+#include "elfext/src/model/module_builder.h"
 #include "tests/unit/elfext_reader/reader_fixture.h"
 
 #include <algorithm>
@@ -84,7 +85,7 @@ protected:
 
   Group* makeGroup(const std::vector<Section*>& members) {
     Group* group = m_Module.createGroup("signature", ".group", GRP_COMDAT);
-    group->setGroupSection(m_Module.createGroupSection(".group", 0));
+    ModuleBuilder::setGroupSection(*group, m_Module.createGroupSection(".group", 0));
     for (Section* member : members) {
       group->addMember(member);
       member->addFlags(SHF_GROUP);
@@ -128,12 +129,12 @@ TEST_F(ValidateTest, ANullSectionIsBlank) {
       [](Section& section) { section.setName("name"); },
       [](Section& section) { section.setFlags(SHF_WRITE); },
       [](Section& section) { section.setAddress(4); },
-      [](Section& section) { section.adoptSize(4); },
-      [this](Section& section) { section.adoptLink(m_Text); },
+      [](Section& section) { ModuleBuilder::adoptSize(section, 4); },
+      [this](Section& section) { ModuleBuilder::adoptLink(section, m_Text); },
       [](Section& section) {
-        section.setAuxiliary(false);
+        ModuleBuilder::setAuxiliary(section, false);
         section.setInfo(4);
-        section.setAuxiliary(true);
+        ModuleBuilder::setAuxiliary(section, true);
       },
   };
   for (uint32_t index : {0U, 2U}) {
@@ -171,10 +172,10 @@ TEST_F(ValidateTest, AuxiliarySectionsHaveNoSymbols) {
   EXPECT_THAT(validateWith(m_Module, true),
               ElementsAre("Auxiliary section #2 has at least one symbol defined in it",
                           "Auxiliary section #3 has at least one symbol defined in it"));
-  m_Module.setReadConditions(ReadCondition_HasRelocationInAuxiliarySection);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_HasRelocationInAuxiliarySection);
   EXPECT_THAT(validateWith(m_Module, false),
               ElementsAre("Auxiliary section #2 has at least one symbol defined in it"));
-  m_Module.setReadConditions(ReadCondition_HasSymbolInAuxiliarySection);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_HasSymbolInAuxiliarySection);
   expectGood(m_Module);
 }
 
@@ -182,9 +183,9 @@ TEST_F(ValidateTest, AuxiliarySectionsHaveNoRelocations) {
   Section* attributes = m_Module.createBuildAttributesSection(".attributes", 0);
   addRelocation(attributes, 0, false);
   expectReport(m_Module, "Auxiliary section #2 has at least one relocation in it");
-  m_Module.setReadConditions(ReadCondition_HasSymbolInAuxiliarySection);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_HasSymbolInAuxiliarySection);
   expectReport(m_Module, "Auxiliary section #2 has at least one relocation in it");
-  m_Module.setReadConditions(ReadCondition_HasRelocationInAuxiliarySection);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_HasRelocationInAuxiliarySection);
   expectGood(m_Module);
 }
 
@@ -195,7 +196,7 @@ TEST_F(ValidateTest, OffsetsOfRelocationsRepeatOnlyIfNobodyMinds) {
     addRelocation(section, 4, true);
     addRelocation(section, 8, false);
   }
-  m_Module.setReadConditions(ReadCondition_ChecksRepeatedRelocations);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_ChecksRepeatedRelocations);
   expectGood(m_Module);
   addRelocation(data, 8, false);
   expectReport(m_Module, "Multiple static relocations at offset 8 in section #2");
@@ -205,7 +206,7 @@ TEST_F(ValidateTest, OffsetsOfRelocationsRepeatOnlyIfNobodyMinds) {
               ElementsAre("Multiple dynamic relocations at offset 4 in section #1",
                           "Multiple dynamic relocations at offset 4 in section #1",
                           "Multiple static relocations at offset 8 in section #2"));
-  m_Module.setReadConditions(~ReadCondition_ChecksRepeatedRelocations);
+  ModuleBuilder::setReadConditions(m_Module, ~ReadCondition_ChecksRepeatedRelocations);
   expectGood(m_Module);
 }
 
@@ -264,7 +265,7 @@ TEST_F(ValidateTest, OnlyItsGroupRefersToALocalSymbolOfAGroup) {
   Section* data = m_Module.createSection(".data", SHT_PROGBITS, SHF_ALLOC);
   Section* debug = m_Module.createSection(".debug", SHT_PROGBITS, 0);
   RelocationSection* relocations = m_Module.createRelocationSection(".rel", SHT_REL, 0);
-  relocations->setTarget(debug, false);
+  ModuleBuilder::setTarget(*relocations, debug, false);
   Group* group = makeGroup({m_Text, data});
   Symbol* local = makeLocal(m_Text);
   data->addRelocation(0, 2, local);
@@ -298,7 +299,7 @@ TEST_F(ValidateTest, ALocalSymbolOfAGroupIsNoneOfAnotherGroup) {
 
 TEST_F(ValidateTest, ARelocationInNoSectionIsNamedByItsPlaceAmongThoseOfItsTarget) {
   Section* data = m_Module.createSection(".data", SHT_PROGBITS, SHF_ALLOC);
-  m_Module.createRelocationSection(".rel", SHT_REL, 0)->setTarget(data, false);
+  ModuleBuilder::setTarget(*m_Module.createRelocationSection(".rel", SHT_REL, 0), data, false);
   makeGroup({m_Text});
   Symbol* local = makeLocal(m_Text);
   addRelocation(data, 0, false);
@@ -313,24 +314,24 @@ TEST_F(ValidateTest, ARelocationInNoSectionIsNamedByItsPlaceAmongThoseOfItsTarge
 TEST_F(ValidateTest, SomeSectionsAreNotRelocated) {
   Section* note = m_Module.createSection(".note", SHT_NOTE, 0);
   RelocationSection* relocations = m_Module.createRelocationSection(".rel", SHT_REL, 0);
-  relocations->setTarget(note, false);
+  ModuleBuilder::setTarget(*relocations, note, false);
   m_Module.createRelocationSection(".rel", SHT_REL, 0);
-  note->setRelocatable(true);
+  ModuleBuilder::setRelocatable(*note, true);
   expectGood(m_Module);
-  note->setRelocatable(false);
+  ModuleBuilder::setRelocatable(*note, false);
   const std::string end =
       " in section #3 has target section #2 which should not be relocated at all";
   // Of a section without relocations, the first row stands for all of it.
   expectReport(m_Module, "Relocation #0" + end);
-  note->setRelocatable(true);
+  ModuleBuilder::setRelocatable(*note, true);
   addRelocation(note, 0, false);
   expectGood(m_Module);
-  note->setRelocatable(false);
+  ModuleBuilder::setRelocatable(*note, false);
   expectReport(m_Module, "Relocation #0" + end);
-  note->setRelocatable(true);
+  ModuleBuilder::setRelocatable(*note, true);
   addRelocation(note, 4, false);
   addRelocation(note, 4, true);
-  note->setRelocatable(false);
+  ModuleBuilder::setRelocatable(*note, false);
   EXPECT_THAT(validateWith(m_Module, true),
               ElementsAre("Relocation #0" + end, "Relocation #1" + end));
 }
@@ -380,7 +381,7 @@ TEST_F(ValidateTest, ALocalSymbolIsDefined) {
 TEST_F(ValidateTest, ChecksHaveAnOrderAndEndAtARefusal) {
   const auto makeFaults = [](ObjectModule& module) {
     module.setFileType(ET_REL);
-    module.setReadConditions(ReadCondition_ChecksRepeatedRelocations);
+    ModuleBuilder::setReadConditions(module, ReadCondition_ChecksRepeatedRelocations);
     Section* text = module.createSection(".text", SHT_PROGBITS, CodeFlags | SHF_GROUP);
     module.createNullSection("null", 0);
     Section* auxiliary = module.createBuildAttributesSection(".attributes", 0);
@@ -394,10 +395,10 @@ TEST_F(ValidateTest, ChecksHaveAnOrderAndEndAtARefusal) {
     Symbol* local = module.createHostedSymbol("l", 0, STT_SECTION, STB_LOCAL, 0, note);
     local->setSize(1);
     text->addRelocation(0, 2, local);
-    note->setRelocatable(true);
+    ModuleBuilder::setRelocatable(*note, true);
     note->addRelocation(0, 2, nullptr);
-    note->setRelocatable(false);
-    module.createRelocationSection(".rel", SHT_REL, 0)->setTarget(note, false);
+    ModuleBuilder::setRelocatable(*note, false);
+    ModuleBuilder::setTarget(*module.createRelocationSection(".rel", SHT_REL, 0), note, false);
     module.createUndefinedSymbol("u", 0, STT_SECTION, STB_LOCAL, 0);
     module.createUndefinedDynamicSymbol("u", 0, STT_SECTION, STB_LOCAL, 0);
   };
@@ -513,7 +514,7 @@ TEST_F(ValidateRelocationsTest, ItIsInASectionOfItsKind) {
   result.module->deleteSection(result.section(7));
   EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(1, 7), leaves(3, 7)));
   auto* other = static_cast<RelocationSection*>(result.section(7));
-  other->setTarget(result.section(1), false);
+  ModuleBuilder::setTarget(*other, result.section(1), false);
   EXPECT_THAT(validateWith(*result.module, true), ElementsAre(leaves(1, 0), leaves(3, 0)));
 }
 
@@ -524,7 +525,7 @@ TEST_F(ValidateRelocationsTest, EachRowOfASectionThatIsNotRelocatedIsTold) {
   relocationSection(Note, {0}, SHT_RELA);
   relocationSection(3, {});
   const ReadResult result = readGood(m_File);
-  result.module->setReadConditions(ReadCondition_HasRelocationInAuxiliarySection);
+  ModuleBuilder::setReadConditions(*result.module, ReadCondition_HasRelocationInAuxiliarySection);
   const std::vector<std::string> inOrder = {isNotAllowed(0, 7), isNotAllowed(0, 8),
                                             isNotAllowed(1, 8), isNotAllowed(0, 10),
                                             isNotAllowed(0, 11, 3)};
@@ -652,17 +653,17 @@ TEST_F(ValidateLinkedTest, ALargeSegmentMayOverlapSeveral) {
 
 TEST_F(ValidateLinkedTest, SectionsOfOneTreeShareNoBytes) {
   const ReadResult result = readGood(linked({load(0, 32)}));
-  result.section(1)->adoptSize(17);
+  ModuleBuilder::adoptSize(*result.section(1), 17);
   expectReport(*result.module, "Sections #1 and #2 overlap in the file");
 }
 
 TEST_F(ValidateLinkedTest, SectionsOfOtherTreesHideNothing) {
   const ReadResult result = readGood(linked({load(0, 32)}));
   Section* large = result.module->createSection(".large", SHT_PROGBITS, 0);
-  large->adoptSize(1000);
+  ModuleBuilder::adoptSize(*large, 1000);
   large->setFileOffset(0);
   expectGood(*result.module);
-  result.section(1)->adoptSize(17);
+  ModuleBuilder::adoptSize(*result.section(1), 17);
   expectReport(*result.module, "Sections #1 and #2 overlap in the file");
 }
 
@@ -721,14 +722,14 @@ TEST_F(ValidateLinkedTest, HeadersThatAreLoadedHaveRoomInFrontOfTheFirstSection)
   SegmentSpec whole = inFront(PT_LOAD, 0, textOffset(1) + 32, 1);
   expectReports(linked({whole}), {});
   const ReadResult result = readGood(linked({whole}));
-  result.module->setElfHeaderSize(85);
+  ModuleBuilder::setElfHeaderSize(*result.module, 85);
   expectReport(*result.module,
                "First loadable segment #0 has 84 bytes unmapped at the start, but 85 are needed");
-  result.module->setElfHeaderSize(52);
-  result.module->setProgramHeaderOffset(60);
+  ModuleBuilder::setElfHeaderSize(*result.module, 52);
+  ModuleBuilder::setProgramHeaderOffset(*result.module, 60);
   expectReport(*result.module,
                "First loadable segment #0 has 84 bytes unmapped at the start, but 92 are needed");
-  result.module->setReadConditions(0);
+  ModuleBuilder::setReadConditions(*result.module, 0);
   expectGood(*result.module);
 }
 
@@ -756,7 +757,7 @@ TEST_F(ValidateLinkedTest, PlacementIsCheckedInOneOrder) {
                                inFront(PT_PHDR, 52, 8, count), more, text});
   file.section(".lost", SHT_PROGBITS).flags(SHF_ALLOC).zeros(4);
   const ReadResult result = readGood(file);
-  result.section(2)->adoptSize(17);
+  ModuleBuilder::adoptSize(*result.section(2), 17);
   result.section(2)->setAlignment(64);
   EXPECT_THAT(
       validateWith(*result.module, true),
