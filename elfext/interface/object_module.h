@@ -34,6 +34,7 @@
 #include <cstdint>
 #include <memory>
 #include <span>
+#include <vector>
 
 namespace elfext {
 
@@ -418,6 +419,9 @@ public:
   [[nodiscard]] uint32_t getSegmentIndex(const Segment* segment) const;
   void setSegmentIndex(Segment* segment, uint32_t index);
   [[nodiscard]] std::span<Segment* const> getSegments() const { return m_Segments.span(); }
+  // For each section, by its index: the first of these segments that wholly contains it at a known
+  // distance, or null. For all sections at once, where Section::isInSegment is for one.
+  [[nodiscard]] std::vector<Segment*> findHolders(std::span<Segment* const> segments) const;
   Segment* createSegment(uint32_t type, uint64_t offset, uint64_t vaddr, uint64_t paddr,
                          uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align);
 

@@ -201,7 +201,8 @@ public:
   bool getDynamicSymbolsByName(const char* name, SymbolList* symbols);
 
   // Whether a segment at a known distance wholly contains the section; the index of the first
-  // such segment goes to the pointer, which may be null.
+  // such segment goes to the pointer, which may be null. Looks through the segments: who asks for
+  // many sections has ObjectModule::findHolders.
   bool isInSegment(uint32_t* segmentIndex);
 
   [[nodiscard]] virtual RelocationSection* asRelocationSection() { return nullptr; }

@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Look-ups in a module, over views that are made anew at the first look-up after a change.
+// Look-ups in a module: those of symbols over views that are made anew at the first look-up after
+// a change.
 #include "checking/interface/checking.h"
 #include "elfext/interface/group.h"
 #include "elfext/interface/object_module.h"
+#include "elfext/interface/segment.h"
+#include "elfext/src/bytes/first_holders.h"
 #include "elfext/src/model/sorted_symbols.h"
 
 #include <algorithm>
@@ -14,6 +17,22 @@ namespace {
 
 uint64_t getAddress(const Symbol& symbol) {
   return symbol.getAddress();
+}
+
+// Where a region lies: the place is its tree, told by the root, and the start counts from there.
+Guest placeOf(FileRegion& region) {
+  uint64_t start = 0;
+  const PlacementNode* tree = region.getPlacement().find(&start);
+  return {.place = reinterpret_cast<uintptr_t>(tree), .start = start, .size = region.getFileSize()};
+}
+
+Holder asHolder(Segment& segment, uint32_t id) {
+  const Guest place = placeOf(segment);
+  return {.firstPlace = place.place,
+          .lastPlace = place.place,
+          .start = place.start,
+          .size = place.size,
+          .id = id};
 }
 
 } // namespace
@@ -95,6 +114,22 @@ bool ObjectModule::getFollowingSymbols(uint64_t address, uint32_t mask, SymbolLi
   symbols->setSize(0);
   const SymbolRun run = findFollowing(m_SymbolsSortedByAddress.span(), getAddress, address, mask);
   return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
+}
+
+std::vector<Segment*> ObjectModule::findHolders(std::span<Segment* const> segments) const {
+  std::vector<Holder> holders;
+  holders.reserve(segments.size());
+  for (Segment* segment : segments)
+    holders.push_back(asHolder(*segment, static_cast<uint32_t>(holders.size())));
+  std::vector<Guest> guests;
+  guests.reserve(m_Sections.getSize());
+  for (Section* section : m_Sections)
+    guests.push_back(placeOf(*section));
+  std::vector<Segment*> found;
+  found.reserve(guests.size());
+  for (const uint32_t id : findFirstHolders(holders, guests))
+    found.push_back(id == NoExtent ? nullptr : segments[id]);
+  return found;
 }
 
 // Signatures may be long and all the same text: nobody should pay for them who does not ask.

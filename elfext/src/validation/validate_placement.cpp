@@ -36,26 +36,21 @@ bool isLoadable(const Section& section) {
   return (section.getFlags() & SHF_ALLOC) != 0;
 }
 
-Segment* findHolder(Section& section, const Segments& loads) {
-  const auto found = std::find_if(loads.begin(), loads.end(),
-                                  [&](Segment* load) { return section.isWithin(*load); });
-  return found == loads.end() ? nullptr : *found;
-}
-
-bool validateLoadableSections(const ObjectModule& module, const Segments& loads) {
-  for (Section* section : module.getSections()) {
+// The holders are, by section, the loadable segments that hold them.
+bool validateLoadableSections(const ObjectModule& module, const Segments& holders) {
+  for (const Section* section : module.getSections()) {
     const bool counts = isLoadable(*section) && section->getSize() != 0;
-    if (counts && findHolder(*section, loads) == nullptr &&
+    if (counts && holders[section->getIndex()] == nullptr &&
         !goOn(module, &ErrorHandler::loadableSectionOutsideSegments, section->getIndex()))
       return false;
   }
   return true;
 }
 
-bool validateOtherSections(const ObjectModule& module, const Segments& loads) {
-  for (Section* section : module.getSections()) {
+bool validateOtherSections(const ObjectModule& module, const Segments& holders) {
+  for (const Section* section : module.getSections()) {
     if (isLoadable(*section) || section->getFileSize() == 0) continue;
-    const Segment* holder = findHolder(*section, loads);
+    const Segment* holder = holders[section->getIndex()];
     if (holder != nullptr && !goOn(module, &ErrorHandler::otherSectionInLoadableSegment,
                                    section->getIndex(), holder->getIndex()))
       return false;
@@ -221,11 +216,12 @@ bool validateLinkedFile(ObjectModule& module) {
   const Segments loads = getSegments(module, PT_LOAD);
   const Segments interpreters = getSegments(module, PT_INTERP);
   const Segments headerTables = getSegments(module, PT_PHDR);
+  const Segments holders = module.findHolders(loads);
   Segments loadsByOffset = loads;
   std::stable_sort(
       loadsByOffset.begin(), loadsByOffset.end(),
       [](const Segment* left, const Segment* right) { return offsetOf(*left) < offsetOf(*right); });
-  return validateLoadableSections(module, loads) && validateOtherSections(module, loads) &&
+  return validateLoadableSections(module, holders) && validateOtherSections(module, holders) &&
          validateMemoryOrder(module, loadsByOffset) && validateMemoryOverlap(module, loads) &&
          validateSectionOverlap(module) &&
          validateOnlyOne(module, interpreters, &ErrorHandler::secondInterpreterSegment) &&

@@ -4,7 +4,10 @@
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/relocation_list.h"
 #include "elfext/interface/section_list.h"
+#include "elfext/interface/segment.h"
 #include "module_fixture.h"
+
+#include <random>
 
 namespace elfext {
 namespace {
@@ -205,6 +208,98 @@ TEST_F(QueryTest, PutsNoNullIntoLists) {
   EXPECT_ASSERTION(sections.set(0, nullptr), "section != NULL");
   EXPECT_ASSERTION(symbols.set(0, nullptr), "symbol != NULL");
   EXPECT_ASSERTION(relocations.set(0, nullptr), "relocation != NULL");
+}
+
+// ---- Segments
+
+// Segments and sections in a few trees, some alone, of few different places and sizes.
+class HoldersTest : public ModuleTest {
+protected:
+  void place(uint32_t seed) {
+    std::mt19937 random(seed);
+    module.clear();
+    m_Roots.clear();
+    for (uint64_t i = random() % 4; i > 0; --i)
+      m_Roots.push_back(module.createSegment(PT_NULL, 0, 0, 0, 0, 0, 0, 0));
+    for (uint64_t i = random() % 12; i > 0; --i)
+      tie(random, *module.createSegment(PT_LOAD, 0, 0, 0, random() % 12, 0, 0, 0));
+    for (uint64_t i = random() % 12; i > 0; --i) {
+      Section* section = makeSection(".x", random() % 4 == 0 ? SHT_NOBITS : SHT_PROGBITS);
+      ModuleBuilder::adoptSize(*section, random() % 5);
+      tie(random, *section);
+    }
+  }
+
+  static Segment* plainHolder(Section& section, std::span<Segment* const> segments) {
+    for (Segment* segment : segments) {
+      if (section.isWithin(*segment)) return segment;
+    }
+    return nullptr;
+  }
+
+  // Returns how many sections have a holder.
+  size_t expectPlainHolders(std::span<Segment* const> segments) {
+    std::vector<Segment*> expected;
+    for (Section* section : module.getSections())
+      expected.push_back(plainHolder(*section, segments));
+    EXPECT_EQ(module.findHolders(segments), expected);
+    const auto none = std::count(expected.begin(), expected.end(), nullptr);
+    return expected.size() - static_cast<size_t>(none);
+  }
+
+private:
+  void tie(std::mt19937& random, FileRegion& region) {
+    const size_t root = random() % (m_Roots.size() + 1);
+    if (root == m_Roots.size()) return;
+    EXPECT_TRUE(FileRegion::link(*m_Roots[root], region, random() % 8));
+  }
+
+  std::vector<Segment*> m_Roots;
+};
+
+TEST_F(HoldersTest, AreNoneWhereThereIsNothing) {
+  EXPECT_THAT(module.findHolders({}), testing::IsEmpty());
+  makeSection();
+  EXPECT_THAT(module.findHolders({}), testing::ElementsAre(nullptr));
+}
+
+TEST_F(HoldersTest, MayReachTheLastPlace) {
+  Segment* segment = module.createSegment(PT_LOAD, 0, 0, 0, UINT64_MAX, 0, 0, 0);
+  Section* section = makeSection();
+  ModuleBuilder::adoptSize(*section, 2);
+  ASSERT_TRUE(FileRegion::link(*segment, *section, UINT64_MAX - 2));
+  EXPECT_THAT(module.findHolders(module.getSegments()), testing::ElementsAre(segment));
+  ModuleBuilder::adoptSize(*section, 3);
+  EXPECT_THAT(module.findHolders(module.getSegments()), testing::ElementsAre(nullptr));
+}
+
+TEST_F(HoldersTest, AreThoseThatGoingThroughTheSegmentsFinds) {
+  size_t foundCount = 0;
+  size_t sectionCount = 0;
+  for (uint32_t round = 0; round < 1000; ++round) {
+    SCOPED_TRACE("round " + std::to_string(round));
+    place(round);
+    const std::span<Segment* const> all = module.getSegments();
+    expectPlainHolders(all.subspan(all.size() / 2));
+    foundCount += expectPlainHolders(all);
+    sectionCount += module.getSectionCount();
+  }
+  // The forests are neither hopeless nor trivial.
+  EXPECT_GT(foundCount, sectionCount / 10);
+  EXPECT_LT(foundCount, sectionCount * 9 / 10);
+}
+
+TEST_F(HoldersTest, AreThoseOfEachSectionAskedByItself) {
+  for (uint32_t round = 0; round < 100; ++round) {
+    place(round);
+    const std::vector<Segment*> holders = module.findHolders(module.getSegments());
+    for (Section* section : module.getSections()) {
+      const Segment* holder = holders[section->getIndex()];
+      uint32_t index = 99;
+      EXPECT_EQ(section->isInSegment(&index), holder != nullptr);
+      EXPECT_EQ(index, holder == nullptr ? 99 : holder->getIndex());
+    }
+  }
 }
 
 } // namespace

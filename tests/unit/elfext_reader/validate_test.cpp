@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <functional>
+#include <random>
 
 namespace elfext {
 
@@ -618,6 +619,70 @@ TEST_F(ValidateLinkedTest, SectionsThatAreLoadedLieInLoadableSegments) {
 TEST_F(ValidateLinkedTest, OtherSectionsDoNot) {
   expectReports(linked({load(0, 16), load(16, 20)}),
                 {"Non-loadable section #4 is contained in loadable segment #1"});
+}
+
+// Random segments, of which each section is held against each.
+class ValidateHoldersTest : public ReaderTest {
+protected:
+  static std::string randomFile(uint32_t seed) {
+    std::mt19937 random(seed);
+    ObjectBuilder file = object().type(ET_EXEC);
+    for (uint64_t i = random() % 8 + 1; i > 0; --i) {
+      const uint32_t type = random() % 6 == 0 ? SHT_NOBITS : SHT_PROGBITS;
+      SectionBuilder& section = file.section(".x", type).flags(random() % 2 * SHF_ALLOC);
+      type == SHT_NOBITS ? section.size(random() % 3) : section.zeros(random() % 12);
+    }
+    const uint64_t segmentCount = random() % 8;
+    const uint64_t start = 52 + 32 * segmentCount;
+    for (uint64_t i = 0; i < segmentCount; ++i) {
+      const uint64_t size = random() % 32;
+      file.segment({.type = random() % 5 == 0 ? PT_NOTE : PT_LOAD,
+                    .offset = start + random() % 24,
+                    .filesz = size,
+                    .memsz = size});
+    }
+    return file.tail(std::string(64, 'x')).bytes();
+  }
+
+  static Segment* plainHolder(const ObjectModule& module, Section& section) {
+    for (Segment* segment : module.getSegments()) {
+      if (segment->getType() == PT_LOAD && section.isWithin(*segment)) return segment;
+    }
+    return nullptr;
+  }
+
+  static std::vector<std::string> plainReports(const ObjectModule& module) {
+    std::vector<std::string> outside;
+    std::vector<std::string> inside;
+    for (Section* section : module.getSections()) {
+      const bool isLoadable = (section->getFlags() & SHF_ALLOC) != 0;
+      const Segment* holder = plainHolder(module, *section);
+      const std::string number = std::to_string(section->getIndex());
+      if (isLoadable && section->getSize() != 0 && holder == nullptr)
+        outside.push_back("Loadable section #" + number +
+                          " is not contained in a loadable segment");
+      if (!isLoadable && section->getFileSize() != 0 && holder != nullptr)
+        inside.push_back("Non-loadable section #" + number + " is contained in loadable segment #" +
+                         std::to_string(holder->getIndex()));
+    }
+    outside.insert(outside.end(), inside.begin(), inside.end());
+    return outside;
+  }
+};
+
+TEST_F(ValidateHoldersTest, ReportsAreThoseOfHoldingEachSectionAgainstEachSegment) {
+  size_t reportCount = 0;
+  for (uint32_t round = 0; round < 500; ++round) {
+    SCOPED_TRACE("round " + std::to_string(round));
+    const ReadResult result = readGood(randomFile(round));
+    const std::vector<std::string> expected = plainReports(*result.module);
+    std::vector<std::string> texts = validateWith(*result.module, true);
+    std::erase_if(texts,
+                  [](const std::string& text) { return text.find(" contained in ") == text.npos; });
+    EXPECT_EQ(texts, expected);
+    reportCount += expected.size();
+  }
+  EXPECT_GT(reportCount, 500U);
 }
 
 TEST_F(ValidateLinkedTest, LoadableSegmentsHaveOneOrderInFileAndMemory) {

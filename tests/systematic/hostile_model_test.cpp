@@ -1,0 +1,104 @@
+// SPDX-License-Identifier: Apache-2.0
+// Objects of one or two megabytes that were made to keep busy who has a model of them: what is
+// asked of all sections, segments or relocations of one takes little time.
+#include "alloclib/interface/session.h"
+#include "elfext/interface/error_handler.h"
+#include "elfext/interface/object_module.h"
+#include "elfext/interface/read_elf_file.h"
+#include "elfext/interface/segment.h"
+#include "tests/support/memory_host.h"
+#include "tests/systematic/hostile_object.h"
+
+#include <algorithm>
+#include <ctime>
+#include <functional>
+
+namespace testsupport {
+
+namespace {
+
+using namespace elfext;
+
+// Wants to see all that there is.
+class CountingReports final : public ErrorHandler {
+public:
+  bool report(const ObjectModule&, uint32_t, const std::string&) override {
+    ++m_Count;
+    return true;
+  }
+
+  size_t m_Count = 0;
+};
+
+class HostileModel : public testing::Test {
+protected:
+  HostileModel() { m_Module.setErrorHandler(&m_Reports); }
+
+  void read(const std::string& bytes) {
+    ASSERT_LT(bytes.size(), 3 * Megabyte);
+    m_Host.addFile("x.o", bytes);
+    ASSERT_TRUE(readElfFile(m_Host, "x.o", 0, bytes.size(), m_Module, nullptr));
+    ASSERT_EQ(m_Reports.m_Count, 0U);
+  }
+
+  // Of the processor, so that neighbours on it count for little.
+  static void expectLittleTime(const std::function<void()>& work) {
+    const std::clock_t start = std::clock();
+    work();
+    const double seconds = static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC;
+    if (!IsSanitized) {
+      EXPECT_LT(seconds, MostSeconds);
+    }
+  }
+
+  // Returns how many reports there are.
+  size_t validate() {
+    expectLittleTime([this] { EXPECT_TRUE(m_Module.validate()); });
+    return m_Reports.m_Count;
+  }
+
+private:
+  alloclib::Session m_Session;
+  MemoryHost m_Host;
+  CountingReports m_Reports;
+
+protected:
+  ObjectModule m_Module;
+};
+
+// Each of the sections has 4 bytes. All segments lie over each other and have `size` bytes, from
+// the first section on.
+constexpr uint32_t SectionCount = 20000;
+constexpr uint32_t SegmentCount = 40000;
+
+std::string segmentsOverSections(uint64_t size) {
+  ObjectBuilder file = object().type(ET_EXEC);
+  for (uint32_t i = 0; i < SegmentCount; ++i)
+    file.segment({.offset = 52 + 32 * SegmentCount, .filesz = size, .memsz = size});
+  for (uint32_t i = 0; i < SectionCount; ++i)
+    file.section("", SHT_PROGBITS).flags(SHF_ALLOC).bytes("4321");
+  return file.bytes();
+}
+
+} // namespace
+
+TEST_F(HostileModel, HasSegmentsOfWhichNoneHoldsASection) {
+  read(segmentsOverSections(2));
+  // All but one of the segments overlap one.
+  EXPECT_EQ(validate(), SectionCount + SegmentCount - 1);
+  expectLittleTime([this] {
+    const std::vector<Segment*> holders = m_Module.findHolders(m_Module.getSegments());
+    EXPECT_THAT(holders, testing::Each(nullptr));
+  });
+}
+
+TEST_F(HostileModel, HasSegmentsThatAllHoldAllSections) {
+  read(segmentsOverSections(4 * SectionCount));
+  EXPECT_EQ(validate(), SegmentCount - 1);
+  expectLittleTime([this] {
+    const std::vector<Segment*> holders = m_Module.findHolders(m_Module.getSegments());
+    EXPECT_EQ(std::count(holders.begin(), holders.end(), m_Module.getSegment(0)), SectionCount);
+  });
+}
+
+} // namespace testsupport
