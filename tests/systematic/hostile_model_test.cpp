@@ -1,11 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// Objects of one or two megabytes that were made to keep busy who has a model of them: what is
-// asked of all sections, segments or relocations of one takes little time.
+// Objects of a few megabytes that were made to keep busy who has a model of them: what is asked of
+// all sections, segments or relocations of one takes little time.
 #include "alloclib/interface/session.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/read_elf_file.h"
 #include "elfext/interface/segment.h"
+#include "elfext/src/model/module_builder.h"
 #include "tests/support/memory_host.h"
 #include "tests/systematic/hostile_object.h"
 
@@ -35,7 +36,7 @@ protected:
   HostileModel() { m_Module.setErrorHandler(&m_Reports); }
 
   void read(const std::string& bytes) {
-    ASSERT_LT(bytes.size(), 3 * Megabyte);
+    ASSERT_LT(bytes.size(), 5 * Megabyte);
     m_Host.addFile("x.o", bytes);
     ASSERT_TRUE(readElfFile(m_Host, "x.o", 0, bytes.size(), m_Module, nullptr));
     ASSERT_EQ(m_Reports.m_Count, 0U);
@@ -80,6 +81,19 @@ std::string segmentsOverSections(uint64_t size) {
   return file.bytes();
 }
 
+// Both halves of an offset are the same number, so that they cancel each other out.
+std::string relocationsAtDoubledOffsets() {
+  std::string rows;
+  for (uint32_t i = 0; i < 65000; ++i)
+    put(rows, {i, i, 0, 0});
+  ObjectBuilder file = object(ElfClass::Class64);
+  file.section(".text", SHT_PROGBITS).flags(SHF_ALLOC | SHF_EXECINSTR).zeros(4);
+  file.section("", SHT_STRTAB).zeros(1);
+  file.section("", SHT_SYMTAB).link(2).zeros(24);
+  file.section("", SHT_REL).link(3).info(1).bytes(rows);
+  return file.bytes();
+}
+
 } // namespace
 
 TEST_F(HostileModel, HasSegmentsOfWhichNoneHoldsASection) {
@@ -99,6 +113,12 @@ TEST_F(HostileModel, HasSegmentsThatAllHoldAllSections) {
     const std::vector<Segment*> holders = m_Module.findHolders(m_Module.getSegments());
     EXPECT_EQ(std::count(holders.begin(), holders.end(), m_Module.getSegment(0)), SectionCount);
   });
+}
+
+TEST_F(HostileModel, HasRelocationsAtOffsetsThatHashAlike) {
+  read(relocationsAtDoubledOffsets());
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_ChecksRepeatedRelocations);
+  EXPECT_EQ(validate(), 0U);
 }
 
 } // namespace testsupport

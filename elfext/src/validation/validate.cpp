@@ -6,7 +6,7 @@
 
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
-#include "elfext/interface/fast_hash_set.h"
+#include "elfext/interface/fast_array.h"
 #include "elfext/interface/group.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/relocation.h"
@@ -15,6 +15,7 @@
 #include "elfext/src/validation/relocation_places.h"
 
 #include <algorithm>
+#include <tuple>
 #include <unordered_map>
 #include <vector>
 
@@ -93,18 +94,42 @@ bool validateRelocationsOfAuxiliarySections(const ObjectModule& module) {
   return true;
 }
 
-bool validateRelocationOffsets(Section& section, alloclib::RegionGeneral& region) {
-  const ObjectModule& module = *section.getObjectModule();
-  FastHashSet<uint64_t> staticOffsets(&region);
-  FastHashSet<uint64_t> dynamicOffsets(&region);
-  for (uint32_t i = 0; i < section.getRelocationCount(); ++i) {
+struct PlacedRelocation {
+  uint64_t offset;
+  uint32_t index; // in the list of its section
+  bool isDynamic;
+};
+
+// For each relocation of the section, whether an earlier one of its kind has its offset. By
+// sorting: no choice of offsets makes that slow.
+std::vector<bool> findRepeats(Section& section, alloclib::RegionGeneral& region) {
+  const uint32_t count = section.getRelocationCount();
+  FastArray<PlacedRelocation> placed(&region);
+  placed.reserve(count);
+  for (uint32_t i = 0; i < count; ++i) {
     const Relocation* relocation = section.getRelocation(i);
-    const uint64_t offset = relocation->getOffset();
-    FastHashSet<uint64_t>& offsets = relocation->isDynamic() ? dynamicOffsets : staticOffsets;
-    if (offsets.add(offset)) continue;
+    placed.append({relocation->getOffset(), i, relocation->isDynamic()});
+  }
+  placed.sort([](const PlacedRelocation& left, const PlacedRelocation& right) {
+    return std::tie(left.isDynamic, left.offset, left.index) <
+           std::tie(right.isDynamic, right.offset, right.index);
+  });
+  std::vector<bool> repeats(count);
+  for (uint32_t i = 1; i < count; ++i)
+    repeats[placed[i].index] =
+        placed[i].isDynamic == placed[i - 1].isDynamic && placed[i].offset == placed[i - 1].offset;
+  return repeats;
+}
+
+bool validateRelocationOffsets(Section& section, alloclib::RegionGeneral& region) {
+  const std::vector<bool> repeats = findRepeats(section, region);
+  for (uint32_t i = 0; i < repeats.size(); ++i) {
+    if (!repeats[i]) continue;
+    const Relocation* relocation = section.getRelocation(i);
     const auto report = relocation->isDynamic() ? &ErrorHandler::repeatedDynamicRelocation
                                                 : &ErrorHandler::repeatedStaticRelocation;
-    if (!goOn(module, report, offset, section.getIndex())) return false;
+    if (!goOn(*section.getObjectModule(), report, relocation->getOffset(), section.getIndex()))
+      return false;
   }
   return true;
 }

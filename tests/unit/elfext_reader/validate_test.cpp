@@ -10,6 +10,8 @@
 #include <algorithm>
 #include <functional>
 #include <random>
+#include <set>
+#include <utility>
 
 namespace elfext {
 
@@ -209,6 +211,25 @@ TEST_F(ValidateTest, OffsetsOfRelocationsRepeatOnlyIfNobodyMinds) {
                           "Multiple static relocations at offset 8 in section #2"));
   ModuleBuilder::setReadConditions(m_Module, ~ReadCondition_ChecksRepeatedRelocations);
   expectGood(m_Module);
+}
+
+TEST_F(ValidateTest, OffsetsRepeatWhereAnEarlierRelocationOfTheKindHasThem) {
+  std::mt19937 random(1);
+  ModuleBuilder::setReadConditions(m_Module, ReadCondition_ChecksRepeatedRelocations);
+  for (uint32_t round = 0; round < 200; ++round) {
+    m_Text->removeAllRelocations();
+    std::set<std::pair<bool, uint64_t>> known;
+    std::vector<std::string> expected;
+    for (uint64_t i = random() % 16; i > 0; --i) {
+      const bool isDynamic = random() % 2 == 0;
+      const uint64_t offset = UINT64_MAX - random() % 8;
+      addRelocation(m_Text, offset, isDynamic);
+      if (!known.emplace(isDynamic, offset).second)
+        expected.push_back(std::string("Multiple ") + (isDynamic ? "dynamic" : "static") +
+                           " relocations at offset " + std::to_string(offset) + " in section #1");
+    }
+    EXPECT_EQ(validateWith(m_Module, true), expected);
+  }
 }
 
 TEST_F(ValidateTest, AnObjectHasNoSegments) {
