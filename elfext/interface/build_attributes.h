@@ -13,6 +13,7 @@
 #include "elfext/interface/owned_value.h"
 
 #include <array>
+#include <compare>
 #include <cstddef>
 #include <cstdint>
 #include <map>
@@ -29,7 +30,7 @@ struct CompatibilityTag {
   uint32_t flag = 0;
   std::string vendor;
 
-  friend bool operator==(const CompatibilityTag&, const CompatibilityTag&) = default;
+  friend auto operator<=>(const CompatibilityTag&, const CompatibilityTag&) = default;
 };
 
 // An instance of Tag_also_compatible_with: another attribute, under which the code could be used
@@ -45,7 +46,7 @@ struct AlsoCompatibilityTag {
   std::optional<uint32_t> number;
   std::optional<std::string> text;
 
-  friend bool operator==(const AlsoCompatibilityTag&, const AlsoCompatibilityTag&) = default;
+  friend auto operator<=>(const AlsoCompatibilityTag&, const AlsoCompatibilityTag&) = default;
 };
 
 // What code built for one more architecture number says of itself.
@@ -155,6 +156,8 @@ private:
   void followStackAlignment();
   void encodeOtherTags(std::string& bytes) const;
   void copyMissingNumbers(const BuildAttributes& other);
+  void addCompatibilityTags(const std::vector<CompatibilityTag>& entries);
+  void addMissingAlsoCompatibilityTags(const std::vector<AlsoCompatibilityTag>& entries);
   void copyMissingOthers(const BuildAttributes& other);
   void copyDifferentOthers(const BuildAttributes& from, const BuildAttributes& against);
 

@@ -13,9 +13,9 @@
 #include "elfext/interface/build_attributes.h"
 
 #include <cstdint>
+#include <set>
 #include <span>
 #include <string_view>
-#include <unordered_set>
 
 namespace elfext {
 
@@ -84,17 +84,12 @@ public:
   bool nestedNumericAndStringTag(uint32_t tag, uint32_t value, std::string_view text) override;
 
 private:
-  struct EntryHash {
-    size_t operator()(const CompatibilityTag& entry) const;
-    size_t operator()(const AlsoCompatibilityTag& entry) const;
-  };
-
   bool addAlsoCompatible(AlsoCompatibilityTag entry);
 
   BuildAttributes& m_Attributes;
-  // The entries of the set: a run may have thousands.
-  std::unordered_set<CompatibilityTag, EntryHash> m_Compatible;
-  std::unordered_set<AlsoCompatibilityTag, EntryHash> m_AlsoCompatible;
+  // The entries of the set: a run may have thousands, and be made so that they all hash alike.
+  std::set<CompatibilityTag> m_Compatible;
+  std::set<AlsoCompatibilityTag> m_AlsoCompatible;
 };
 
 class ZevBuildAttributesDecodingParser : public ZevBuildAttributesSubSubsectionParser {

@@ -139,6 +139,13 @@ std::string listOfTheSame() {
       vendor("qobix", file(repeated(350000, [](uint32_t) { return tag(32, 1, ""); }))));
 }
 
+// Two lists of multiples of a number that a hash table of so many entries may well divide by.
+std::string listsOfMultiples() {
+  const std::string list =
+      repeated(42000, [](uint32_t i) { return tag(Tag_compatibility, i * 42043, ""); });
+  return withAttributes(vendor("qobix", section(1, list) + section(2, list)), 2);
+}
+
 std::string longListOfOthers() {
   return withAttributes(vendor("qobix", file(repeated(200000, alsoCompatible))));
 }
@@ -258,6 +265,7 @@ const Hostile HostileAttributeObjects[] = {
   {"AttributeSections",             attributeSections,             ""},
   {"LongList",                      longList,                      ""},
   {"ListOfTheSame",                 listOfTheSame,                 ""},
+  {"ListsOfMultiples",              listsOfMultiples,              ""},
   {"LongListOfOthers",              longListOfOthers,              ""},
   {"RunsBehindALongList",           runsBehindALongList,           Corrupted},
   {"SectionsBehindALongList",       sectionsBehindALongList,       Corrupted},

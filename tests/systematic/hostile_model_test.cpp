@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Objects of a few megabytes that were made to keep busy who has a model of them: what is asked of
-// all sections, segments or relocations of one takes little time.
+// all sections, segments or relocations of one, or of long lists, takes little time.
 #include "alloclib/interface/session.h"
+#include "elfext/interface/auxiliary_sections.h"
+#include "elfext/interface/build_attributes.h"
+#include "elfext/interface/build_attributes_writer.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/read_elf_file.h"
@@ -9,6 +12,7 @@
 #include "elfext/src/model/module_builder.h"
 #include "tests/support/memory_host.h"
 #include "tests/systematic/hostile_object.h"
+#include "tests/unit/elfext_attributes/attribute_bytes.h"
 
 #include <algorithm>
 #include <ctime>
@@ -94,6 +98,35 @@ std::string relocationsAtDoubledOffsets() {
   return file.bytes();
 }
 
+std::string withAttributes(uint32_t sectionCount, const std::string& subsections) {
+  ObjectBuilder file = object();
+  for (uint32_t i = 0; i < sectionCount; ++i)
+    file.section("", SHT_PROGBITS);
+  file.section("", SHT_ZEV_ATTRIBUTES).bytes("A" + subsections);
+  return file.bytes();
+}
+
+// Lists of the file and of section 1, of which no entry is like another.
+std::string listsOfCompatibility(std::string (*makeEntry)(uint32_t number)) {
+  constexpr uint32_t count = 60000;
+  std::string ofFile;
+  std::string ofSection;
+  for (uint32_t i = 1; i <= count; ++i) {
+    ofFile += makeEntry(i);
+    ofSection += makeEntry(count + i);
+  }
+  return withAttributes(1, subsection(ntbs(QobixVendor) + subSubsection({Tag_File, ofFile}, true) +
+                                      subSubsection(sectionPart({1}, ofSection), true)));
+}
+
+std::string compatible(uint32_t number) {
+  return tag(Tag_compatibility, number, "");
+}
+
+std::string alsoCompatible(uint32_t number) {
+  return uleb(Tag_also_compatible_with) + tag(Tag_CPU_arch, number) + '\0';
+}
+
 } // namespace
 
 TEST_F(HostileModel, HasSegmentsOfWhichNoneHoldsASection) {
@@ -119,6 +152,17 @@ TEST_F(HostileModel, HasRelocationsAtOffsetsThatHashAlike) {
   read(relocationsAtDoubledOffsets());
   ModuleBuilder::setReadConditions(m_Module, ReadCondition_ChecksRepeatedRelocations);
   EXPECT_EQ(validate(), 0U);
+}
+
+TEST_F(HostileModel, HasLongListsToUnite) {
+  for (std::string (*makeEntry)(uint32_t) : {compatible, alsoCompatible}) {
+    read(listsOfCompatibility(makeEntry));
+    BuildAttributes effective;
+    expectLittleTime([&] { m_Module.getSection(1)->getEffectiveBuildAttributes(effective); });
+    EXPECT_EQ(effective.getCompatibilityTagCount() + effective.getAlsoCompatibilityTagCount(),
+              2 * 60000U);
+    expectLittleTime([&] { updateBuildAttributesBlocks(m_Module); });
+  }
 }
 
 } // namespace testsupport

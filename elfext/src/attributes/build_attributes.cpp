@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <functional>
+#include <set>
 
 namespace elfext {
 
@@ -27,16 +28,55 @@ bool contains(const OwnedValue<List>& list, const typename List::value_type& ent
   return list && std::ranges::find(*list, entry) != list->end();
 }
 
-template <class List>
-uint32_t countOf(const OwnedValue<List>& list) {
-  return list ? static_cast<uint32_t>(list->size()) : 0;
-}
-
 template <class Map>
 bool hasEntry(const OwnedValue<Map>& map, const typename Map::value_type& entry) {
   if (!map) return false;
   const auto found = map->find(entry.first);
   return found != map->end() && found->second == entry.second;
+}
+
+// For who looks for many: lists may have thousands.
+template <class Entry>
+std::set<Entry> entriesOf(const OwnedValue<std::vector<Entry>>& list) {
+  return list ? std::set<Entry>(list->begin(), list->end()) : std::set<Entry>();
+}
+
+// In their order, as often as they are there.
+template <class Entry>
+std::vector<Entry> entriesBeyond(const OwnedValue<std::vector<Entry>>& list,
+                                 const OwnedValue<std::vector<Entry>>& other) {
+  std::vector<Entry> beyond;
+  if (!list) return beyond;
+  const std::set<Entry> known = entriesOf(other);
+  for (const Entry& entry : *list) {
+    if (!known.contains(entry)) beyond.push_back(entry);
+  }
+  return beyond;
+}
+
+template <class Entry>
+void keepCommon(OwnedValue<std::vector<Entry>>& kept, const OwnedValue<std::vector<Entry>>& left,
+                const OwnedValue<std::vector<Entry>>& right) {
+  if (!left || !right) return;
+  const std::set<Entry> known = entriesOf(right);
+  for (const Entry& entry : *left) {
+    if (known.contains(entry)) kept.make().push_back(entry);
+  }
+}
+
+template <class Value>
+void keepCommon(OwnedValue<std::map<uint32_t, Value>>& kept,
+                const OwnedValue<std::map<uint32_t, Value>>& left,
+                const OwnedValue<std::map<uint32_t, Value>>& right) {
+  if (!left) return;
+  for (const auto& entry : *left) {
+    if (hasEntry(right, entry)) kept.make().insert(entry);
+  }
+}
+
+template <class List>
+uint32_t countOf(const OwnedValue<List>& list) {
+  return list ? static_cast<uint32_t>(list->size()) : 0;
 }
 
 void addToHash(size_t& hash, size_t value) {
@@ -218,6 +258,15 @@ void BuildAttributes::appendCompatibilityTag(CompatibilityTag entry) {
   m_CompatibilityTags.make().push_back(std::move(entry));
 }
 
+// As one by one, but in one walk.
+void BuildAttributes::addCompatibilityTags(const std::vector<CompatibilityTag>& entries) {
+  std::set<CompatibilityTag> present = entriesOf(m_CompatibilityTags);
+  for (const CompatibilityTag& entry : entries) {
+    m_Texts[textPlaceOf(Tag_conformance)].reset();
+    if (present.insert(entry).second) appendCompatibilityTag(entry);
+  }
+}
+
 uint32_t BuildAttributes::removeCompatibilityTag(std::string_view vendor) {
   if (!m_CompatibilityTags) return 0;
   return static_cast<uint32_t>(std::erase_if(
@@ -235,6 +284,14 @@ void BuildAttributes::getCompatibilityTag(uint32_t index, CompatibilityTag& resu
 
 void BuildAttributes::addAlsoCompatibilityTag(AlsoCompatibilityTag entry) {
   m_AlsoCompatibilityTags.make().push_back(std::move(entry));
+}
+
+void BuildAttributes::addMissingAlsoCompatibilityTags(
+    const std::vector<AlsoCompatibilityTag>& entries) {
+  std::set<AlsoCompatibilityTag> present = entriesOf(m_AlsoCompatibilityTags);
+  for (const AlsoCompatibilityTag& entry : entries) {
+    if (present.insert(entry).second) addAlsoCompatibilityTag(entry);
+  }
 }
 
 bool BuildAttributes::hasAlsoCompatibilityTag(const AlsoCompatibilityTag& entry) const {
@@ -314,15 +371,9 @@ void BuildAttributes::copyMissingNumbers(const BuildAttributes& other) {
 }
 
 void BuildAttributes::copyMissingOthers(const BuildAttributes& other) {
-  if (other.m_CompatibilityTags) {
-    for (const CompatibilityTag& entry : *other.m_CompatibilityTags)
-      addCompatibilityTag(entry.flag, entry.vendor);
-  }
-  if (other.m_AlsoCompatibilityTags) {
-    for (const AlsoCompatibilityTag& entry : *other.m_AlsoCompatibilityTags) {
-      if (!hasAlsoCompatibilityTag(entry)) addAlsoCompatibilityTag(entry);
-    }
-  }
+  if (other.m_CompatibilityTags) addCompatibilityTags(*other.m_CompatibilityTags);
+  if (other.m_AlsoCompatibilityTags)
+    addMissingAlsoCompatibilityTags(*other.m_AlsoCompatibilityTags);
   if (other.m_OtherNumericTags) {
     for (const auto& entry : *other.m_OtherNumericTags)
       m_OtherNumericTags.make().insert(entry);
@@ -348,17 +399,10 @@ BuildAttributes BuildAttributes::getUnion(const BuildAttributes& a, const BuildA
 
 void BuildAttributes::copyDifferentOthers(const BuildAttributes& from,
                                           const BuildAttributes& against) {
-  if (from.m_CompatibilityTags) {
-    for (const CompatibilityTag& entry : *from.m_CompatibilityTags) {
-      if (!contains(against.m_CompatibilityTags, entry))
-        addCompatibilityTag(entry.flag, entry.vendor);
-    }
-  }
-  if (from.m_AlsoCompatibilityTags) {
-    for (const AlsoCompatibilityTag& entry : *from.m_AlsoCompatibilityTags) {
-      if (!against.hasAlsoCompatibilityTag(entry)) addAlsoCompatibilityTag(entry);
-    }
-  }
+  addCompatibilityTags(entriesBeyond(from.m_CompatibilityTags, against.m_CompatibilityTags));
+  for (AlsoCompatibilityTag& entry :
+       entriesBeyond(from.m_AlsoCompatibilityTags, against.m_AlsoCompatibilityTags))
+    addAlsoCompatibilityTag(std::move(entry));
   if (from.m_OtherNumericTags) {
     for (const auto& entry : *from.m_OtherNumericTags) {
       if (!hasEntry(against.m_OtherNumericTags, entry)) m_OtherNumericTags.make().insert(entry);
@@ -400,12 +444,6 @@ BuildAttributes BuildAttributes::getIntersection(const BuildAttributes& a,
   for (uint32_t place = 0; place < TextCount; ++place) {
     if (a.m_Texts[place] == b.m_Texts[place]) result.m_Texts[place] = a.m_Texts[place];
   }
-  const auto keepCommon = [](auto& kept, const auto& left, const auto& right) {
-    if (!left || !right) return;
-    for (const auto& entry : *left) {
-      if (std::ranges::find(*right, entry) != right->end()) kept.make().insert(kept->end(), entry);
-    }
-  };
   keepCommon(result.m_CompatibilityTags, a.m_CompatibilityTags, b.m_CompatibilityTags);
   keepCommon(result.m_AlsoCompatibilityTags, a.m_AlsoCompatibilityTags, b.m_AlsoCompatibilityTags);
   keepCommon(result.m_OtherNumericTags, a.m_OtherNumericTags, b.m_OtherNumericTags);

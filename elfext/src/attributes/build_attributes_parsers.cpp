@@ -6,7 +6,6 @@
 #include "elfext/src/bytes/leb128.h"
 
 #include <algorithm>
-#include <functional>
 #include <vector>
 
 namespace elfext {
@@ -167,17 +166,6 @@ QobixBuildAttributesDecodingParser::QobixBuildAttributesDecodingParser(BuildAttr
     attributes.getAlsoCompatibilityTag(i, entry);
     m_AlsoCompatible.insert(std::move(entry));
   }
-}
-
-size_t
-QobixBuildAttributesDecodingParser::EntryHash::operator()(const CompatibilityTag& entry) const {
-  return std::hash<std::string>{}(entry.vendor) * 31 + entry.flag;
-}
-
-size_t
-QobixBuildAttributesDecodingParser::EntryHash::operator()(const AlsoCompatibilityTag& entry) const {
-  const size_t text = entry.text ? std::hash<std::string>{}(*entry.text) : 0;
-  return (text * 31 + entry.number.value_or(0)) * 31 + entry.tag;
 }
 
 bool QobixBuildAttributesDecodingParser::numericTag(uint32_t tag, uint32_t value) {

@@ -7,9 +7,12 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <optional>
+#include <random>
 #include <string>
 #include <utility>
+#include <vector>
 
 namespace elfext {
 namespace {
@@ -322,6 +325,68 @@ TEST(BuildAttributes, CombineOnlyWhatGoesTogether) {
   EXPECT_TRUE(BuildAttributes::getCheckedCombination(checked, checked).isValid());
   EXPECT_FALSE(BuildAttributes::getCheckedCombination(invalid(), {}).isValid());
   EXPECT_FALSE(BuildAttributes::getCheckedCombination({}, invalid()).isValid());
+}
+
+// ---- Lists, held against going through one for each entry of the other
+
+template <class Entry>
+bool isIn(const std::vector<Entry>& list, const Entry& entry) {
+  return std::find(list.begin(), list.end(), entry) != list.end();
+}
+
+// The entries of the one and behind them those of the other, each where it is not there yet.
+template <class Entry>
+std::vector<Entry> plainUnion(std::vector<Entry> united, const std::vector<Entry>& others) {
+  for (const Entry& entry : others) {
+    if (!isIn(united, entry)) united.push_back(entry);
+  }
+  return united;
+}
+
+template <class Entry>
+std::vector<Entry> plainSelection(const std::vector<Entry>& list, const std::vector<Entry>& other,
+                                  bool areWantedIn) {
+  std::vector<Entry> selection;
+  for (const Entry& entry : list) {
+    if (isIn(other, entry) == areWantedIn) selection.push_back(entry);
+  }
+  return selection;
+}
+
+// Of few different entries, some of them more than once where that may be.
+BuildAttributes randomLists(std::mt19937& random) {
+  BuildAttributes attributes;
+  for (uint64_t i = random() % 10; i > 0; --i)
+    attributes.addCompatibilityTag(static_cast<uint32_t>(random() % 3),
+                                   std::string(1, "abc"[random() % 3]));
+  for (uint64_t i = random() % 10; i > 0; --i) {
+    const std::string text(1, "abc"[random() % 3]);
+    if (random() % 2 == 0)
+      attributes.addAlsoCompatibilityTag({6, static_cast<uint32_t>(random() % 4), {}});
+    else
+      attributes.addAlsoCompatibilityTag({65, {}, text});
+  }
+  return attributes;
+}
+
+TEST(BuildAttributes, HaveTheListsThatComparingAllEntriesGives) {
+  std::mt19937 random(1);
+  for (uint32_t round = 0; round < 1000; ++round) {
+    SCOPED_TRACE(round);
+    const BuildAttributes a = randomLists(random);
+    const BuildAttributes b = randomLists(random);
+    const BuildAttributes both = BuildAttributes::getUnion(a, b);
+    EXPECT_EQ(compatibleOf(both), plainUnion(compatibleOf(b), compatibleOf(a)));
+    EXPECT_EQ(alsoCompatibleOf(both), plainUnion(alsoCompatibleOf(b), alsoCompatibleOf(a)));
+    const BuildAttributes difference = BuildAttributes::getDifference(a, b);
+    EXPECT_EQ(compatibleOf(difference), plainSelection(compatibleOf(b), compatibleOf(a), false));
+    EXPECT_EQ(alsoCompatibleOf(difference),
+              plainSelection(alsoCompatibleOf(b), alsoCompatibleOf(a), false));
+    const BuildAttributes common = BuildAttributes::getIntersection(a, b);
+    EXPECT_EQ(compatibleOf(common), plainSelection(compatibleOf(a), compatibleOf(b), true));
+    EXPECT_EQ(alsoCompatibleOf(common),
+              plainSelection(alsoCompatibleOf(a), alsoCompatibleOf(b), true));
+  }
 }
 
 } // namespace
