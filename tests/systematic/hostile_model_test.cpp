@@ -127,6 +127,21 @@ std::string alsoCompatible(uint32_t number) {
   return uleb(Tag_also_compatible_with) + tag(Tag_CPU_arch, number) + '\0';
 }
 
+std::string sectionsOfAVendorEach() {
+  constexpr uint32_t count = 25000;
+  std::string subsections;
+  for (uint32_t i = 1; i <= count; ++i)
+    subsections += subsection(ntbs(std::to_string(i)) + subSubsection(sectionPart({i}, ""), true));
+  return withAttributes(count, subsections);
+}
+
+std::string attributeSections() {
+  ObjectBuilder file = object().extendedNumbering();
+  for (uint32_t i = 0; i < 110000; ++i)
+    file.section("", SHT_ZEV_ATTRIBUTES).bytes("A");
+  return file.bytes();
+}
+
 } // namespace
 
 TEST_F(HostileModel, HasSegmentsOfWhichNoneHoldsASection) {
@@ -163,6 +178,21 @@ TEST_F(HostileModel, HasLongListsToUnite) {
               2 * 60000U);
     expectLittleTime([&] { updateBuildAttributesBlocks(m_Module); });
   }
+}
+
+TEST_F(HostileModel, HasAVendorForEachSection) {
+  read(sectionsOfAVendorEach());
+  ModuleBuilder::setBuildAttributesSectionUpToDate(m_Module, false);
+  const uint64_t size = m_Module.getBuildAttributesSections().front()->getSize();
+  expectLittleTime([this] { updateBuildAttributesSection(m_Module); });
+  EXPECT_EQ(m_Module.getBuildAttributesSections().front()->getSize(), size);
+}
+
+TEST_F(HostileModel, HasManyAttributeSections) {
+  read(attributeSections());
+  ModuleBuilder::setBuildAttributesSectionUpToDate(m_Module, false);
+  expectLittleTime([this] { updateBuildAttributesSection(m_Module); });
+  EXPECT_THAT(m_Module.getBuildAttributesSections(), testing::SizeIs(1));
 }
 
 } // namespace testsupport

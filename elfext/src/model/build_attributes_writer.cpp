@@ -10,7 +10,9 @@
 
 #include <algorithm>
 #include <string>
+#include <string_view>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 namespace elfext {
@@ -53,81 +55,108 @@ void updateBlocks(ObjectWithBuildAttributes& object) {
   putBlock(object, ZevVendor, zev);
 }
 
+// A block, and the indices, from 1, of all that have it.
+struct Run {
+  const BuildAttributesBlock* block;
+  std::vector<uint32_t> indices = {};
+};
+
+// What the objects of a module have from one vendor.
+struct Subsection {
+  std::string_view vendor;
+  const BuildAttributesBlock* ofFile = nullptr;
+  std::vector<Run> ofSections = {};
+  std::vector<Run> ofSymbols = {};
+};
+
+// Vendors and their blocks in the order in which they are met. Both may be as many as the objects,
+// so these are gone through once, and not for each vendor.
+class SubsectionList {
+public:
+  explicit SubsectionList(const ObjectModule& module) {
+    for (uint32_t i = 0; i < module.getBlockCount(); ++i)
+      find(module.getBlock(i)->getVendor()).ofFile = module.getBlock(i);
+    add(listedSections(module), &Subsection::ofSections);
+    add(module.getSymbols(), &Subsection::ofSymbols);
+  }
+
+  // The public ABI's comes first.
+  [[nodiscard]] std::vector<Subsection> take() {
+    const auto publicVendor = std::ranges::find(m_Subsections, QobixVendor, &Subsection::vendor);
+    if (publicVendor != m_Subsections.end())
+      std::rotate(m_Subsections.begin(), publicVendor, publicVendor + 1);
+    return std::move(m_Subsections);
+  }
+
+private:
+  // All but the null section: in a list, its index would be the end.
+  static std::span<Section* const> listedSections(const ObjectModule& module) {
+    const std::span<Section* const> sections = module.getSections();
+    return sections.empty() ? sections : sections.subspan(1);
+  }
+
+  Subsection& find(std::string_view vendor) {
+    const auto [place, isNew] = m_Places.emplace(vendor, m_Subsections.size());
+    if (isNew) m_Subsections.push_back({.vendor = vendor});
+    return m_Subsections[place->second];
+  }
+
+  template <class Object>
+  void add(std::span<Object* const> objects, std::vector<Run> Subsection::*scope) {
+    std::unordered_map<const BuildAttributesBlock*, size_t> places; // among their vendor's runs
+    for (uint32_t i = 0; i < objects.size(); ++i) {
+      for (uint32_t j = 0; j < objects[i]->getBlockCount(); ++j) {
+        const BuildAttributesBlock* block = objects[i]->getBlock(j);
+        std::vector<Run>& runs = find(block->getVendor()).*scope;
+        const auto [place, isNew] = places.emplace(block, runs.size());
+        if (isNew) runs.push_back({block});
+        runs[place->second].indices.push_back(i + 1);
+      }
+    }
+  }
+
+  std::vector<Subsection> m_Subsections;
+  std::unordered_map<std::string_view, size_t> m_Places; // by vendor
+};
+
 // The bytes of a whole attribute section.
 class SectionImage {
 public:
   explicit SectionImage(const ObjectModule& module) : m_Module(module) {}
 
   [[nodiscard]] std::string make() {
-    collectVendors();
     m_Bytes = "A";
-    for (const std::string_view vendor : m_Vendors)
-      appendSubsection(vendor);
+    for (const Subsection& subsection : SubsectionList(m_Module).take())
+      appendSubsection(subsection);
     return std::move(m_Bytes);
   }
 
 private:
-  // In the order in which they are met, but the public ABI's first.
-  void collectVendors() {
-    collectVendors(m_Module);
-    for (const Section* section : listedSections())
-      collectVendors(*section);
-    for (const Symbol* symbol : m_Module.getSymbols())
-      collectVendors(*symbol);
-    const auto publicVendor = std::ranges::find(m_Vendors, QobixVendor);
-    if (publicVendor != m_Vendors.end())
-      std::rotate(m_Vendors.begin(), publicVendor, publicVendor + 1);
-  }
-
-  void collectVendors(const ObjectWithBuildAttributes& object) {
-    for (uint32_t i = 0; i < object.getBlockCount(); ++i) {
-      const std::string_view vendor = object.getBlock(i)->getVendor();
-      if (std::ranges::find(m_Vendors, vendor) == m_Vendors.end()) m_Vendors.push_back(vendor);
-    }
-  }
-
-  void appendSubsection(std::string_view vendor) {
+  void appendSubsection(const Subsection& subsection) {
     const size_t start = m_Bytes.size();
     appendWord(0);
-    m_Bytes += vendor;
+    m_Bytes += subsection.vendor;
     m_Bytes += '\0';
-    if (const BuildAttributesBlock* block = m_Module.findBlock(vendor); block != nullptr) {
+    if (subsection.ofFile != nullptr) {
       appendUleb(m_Bytes, Tag_File);
-      appendWord(static_cast<uint32_t>(block->getData().size() + 5));
-      appendData(*block);
+      appendWord(static_cast<uint32_t>(subsection.ofFile->getData().size() + 5));
+      appendData(*subsection.ofFile);
     }
-    appendScope(Tag_Section, vendor, listedSections());
-    appendScope(Tag_Symbol, vendor, m_Module.getSymbols());
+    appendScope(Tag_Section, subsection.ofSections);
+    appendScope(Tag_Symbol, subsection.ofSymbols);
     patchSize(start, start);
   }
 
-  // All but the null section: in a list, its index would be the end.
-  [[nodiscard]] std::span<Section* const> listedSections() const {
-    const std::span<Section* const> sections = m_Module.getSections();
-    return sections.empty() ? sections : sections.subspan(1);
-  }
-
-  // A sub-subsection for each block, with the indices, from 1, of all that have it.
-  template <class Object>
-  void appendScope(AttributeScope scope, std::string_view vendor,
-                   std::span<Object* const> objects) {
-    std::vector<const BuildAttributesBlock*> blocks;
-    std::unordered_map<const BuildAttributesBlock*, std::vector<uint32_t>> indices;
-    for (uint32_t i = 0; i < objects.size(); ++i) {
-      const BuildAttributesBlock* block = objects[i]->findBlock(vendor);
-      if (block == nullptr) continue;
-      std::vector<uint32_t>& ofBlock = indices[block];
-      if (ofBlock.empty()) blocks.push_back(block);
-      ofBlock.push_back(i + 1);
-    }
-    for (const BuildAttributesBlock* block : blocks) {
+  // A sub-subsection for each block.
+  void appendScope(AttributeScope scope, std::span<const Run> runs) {
+    for (const Run& run : runs) {
       const size_t start = m_Bytes.size();
       appendUleb(m_Bytes, scope);
       appendWord(0);
-      for (const uint32_t index : indices[block])
+      for (const uint32_t index : run.indices)
         appendUleb(m_Bytes, index);
       m_Bytes += '\0';
-      appendData(*block);
+      appendData(*run.block);
       patchSize(start + 1, start);
     }
   }
@@ -154,24 +183,23 @@ private:
   }
 
   const ObjectModule& m_Module;
-  std::vector<std::string_view> m_Vendors;
   std::string m_Bytes;
 };
 
 // The module's first attribute section, which is then its only one.
 BuildAttributesSection& onlySection(ObjectModule& module) {
   struct Surplus final : PruneCriterion {
-    explicit Surplus(std::span<BuildAttributesSection* const> sections) : m_Sections(sections) {}
+    explicit Surplus(const Section& first) : m_First(first) {}
     using PruneCriterion::goes;
     bool goes(const Section& section) const override {
-      return std::ranges::find(m_Sections.subspan(1), &section) != m_Sections.end();
+      return section.getType() == SHT_ZEV_ATTRIBUTES && &section != &m_First;
     }
-    std::span<BuildAttributesSection* const> m_Sections;
+    const Section& m_First;
   };
   const auto sections = module.getBuildAttributesSections();
   if (sections.empty()) return *module.createBuildAttributesSection(".ZEV.attributes", 0);
   BuildAttributesSection& first = *sections.front();
-  if (sections.size() > 1) module.prune(Surplus(sections));
+  if (sections.size() > 1) module.prune(Surplus(first));
   return first;
 }
 

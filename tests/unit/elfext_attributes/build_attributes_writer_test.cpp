@@ -5,6 +5,9 @@
 #include "elfext/src/model/module_builder.h"
 #include "tests/unit/elfext_attributes/attribute_module_fixture.h"
 
+#include <algorithm>
+#include <random>
+
 namespace elfext {
 namespace {
 
@@ -246,6 +249,91 @@ TEST_F(BuildAttributesWriterTest, WritesLessThanThereWas) {
   EXPECT_EQ(written().size(), 5012u);
   m_Module.removeBlock("v");
   EXPECT_EQ(written(), "A");
+}
+
+// ---- Held against going through all objects for each vendor
+
+class PlainWriterTest : public BuildAttributesWriterTest {
+protected:
+  using Objects = std::vector<const ObjectWithBuildAttributes*>;
+
+  void makeObjects(std::mt19937& random) {
+    m_Module.clear();
+    m_Module.createNullSection("", 0);
+    setBlocks(random, m_Module);
+    for (uint64_t i = random() % 6; i > 0; --i)
+      setBlocks(random, *makeSection());
+    for (uint64_t i = random() % 6; i > 0; --i)
+      setBlocks(random, *makeAbsolute("x"));
+  }
+
+  [[nodiscard]] std::string plainlyWritten() const {
+    std::vector<VendorPart> parts;
+    for (const std::string& vendor : plainVendors()) {
+      parts.push_back(vendorPart(vendor, {}));
+      const BuildAttributesBlock* ofFile = m_Module.findBlock(vendor);
+      if (ofFile != nullptr) parts.back().parts.push_back(filePart(textOf(ofFile->getData())));
+      addPlainParts(Tag_Section, listedSections(), parts.back());
+      addPlainParts(Tag_Symbol, symbols(), parts.back());
+    }
+    return attributeSection(parts);
+  }
+
+private:
+  static void setBlocks(std::mt19937& random, ObjectWithBuildAttributes& object) {
+    for (uint64_t i = random() % 4; i > 0; --i) {
+      const char* const vendors[] = {"a", "b", "qobix", "ZEV"};
+      object.setBlock(vendors[random() % 4], bytesOf(std::string(1, "xyz"[random() % 3])));
+    }
+  }
+
+  [[nodiscard]] Objects listedSections() const {
+    const auto sections = m_Module.getSections().subspan(1);
+    return {sections.begin(), sections.end()};
+  }
+  [[nodiscard]] Objects symbols() const {
+    return {m_Module.getSymbols().begin(), m_Module.getSymbols().end()};
+  }
+
+  [[nodiscard]] std::vector<std::string> plainVendors() const {
+    std::vector<std::string> vendors;
+    Objects objects = {&m_Module};
+    for (const Objects& more : {listedSections(), symbols()})
+      objects.insert(objects.end(), more.begin(), more.end());
+    for (const ObjectWithBuildAttributes* object : objects) {
+      for (uint32_t i = 0; i < object->getBlockCount(); ++i) {
+        const std::string vendor(object->getBlock(i)->getVendor());
+        if (std::ranges::find(vendors, vendor) == vendors.end()) vendors.push_back(vendor);
+      }
+    }
+    std::stable_partition(vendors.begin(), vendors.end(),
+                          [](const std::string& vendor) { return vendor == "qobix"; });
+    return vendors;
+  }
+
+  static void addPlainParts(uint32_t kind, const Objects& objects, VendorPart& vendor) {
+    std::vector<const BuildAttributesBlock*> written = {nullptr};
+    for (const ObjectWithBuildAttributes* object : objects) {
+      const BuildAttributesBlock* block = object->findBlock(vendor.vendor);
+      if (std::ranges::find(written, block) != written.end()) continue;
+      std::vector<uint32_t> indices;
+      for (uint32_t i = 0; i < objects.size(); ++i) {
+        if (objects[i]->findBlock(vendor.vendor) == block) indices.push_back(i + 1);
+      }
+      vendor.parts.push_back(indexedPart(kind, indices, textOf(block->getData())));
+      written.push_back(block);
+    }
+  }
+};
+
+TEST_F(PlainWriterTest, TheBytesAreTheSame) {
+  std::mt19937 random(1);
+  for (uint32_t round = 0; round < 500; ++round) {
+    SCOPED_TRACE(round);
+    makeObjects(random);
+    const std::string expected = plainlyWritten();
+    EXPECT_EQ(written(), expected);
+  }
 }
 
 } // namespace
