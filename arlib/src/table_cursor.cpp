@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "arlib/src/table_cursor.h"
 
-#include "arlib/interface/archive_format.h"
 #include "checking/interface/checking.h"
 
 #include <algorithm>
@@ -17,7 +16,7 @@ TableCursor::TableCursor(const TableSource& source, uint64_t position)
     m_Window.setFile(source.file);
 }
 
-// Widens the view, which holds too little for who asks. A name longer than any piece is read again
+// A name longer than any piece is read again
 // in pieces that double, so that none is read more than twice.
 bool TableCursor::viewMore() {
   constexpr uint64_t PieceSize = 0x10000;
@@ -31,30 +30,17 @@ bool TableCursor::viewMore() {
   return !m_HasFailed;
 }
 
-void TableCursor::skip(size_t count) {
-  m_View.remove_prefix(count);
-  m_Position += count;
+bool TableCursor::viewWord() {
+  return viewMore() && m_View.size() >= WordSize;
 }
 
-std::optional<uint32_t> TableCursor::takeWord() {
-  constexpr size_t WordSize = 4;
-  if (m_View.size() < WordSize && !viewMore()) return std::nullopt;
-  if (m_View.size() < WordSize) return std::nullopt;
-  const uint32_t word = getBigEndian32(reinterpret_cast<const uint8_t*>(m_View.data()));
-  skip(WordSize);
-  return word;
-}
-
-std::optional<std::string_view> TableCursor::takeName() {
-  size_t end = m_View.find('\0');
+bool TableCursor::viewName(size_t& end) {
   while (end == m_View.npos) {
     const size_t searched = m_View.size();
-    if (!viewMore()) return std::nullopt;
+    if (!viewMore()) return false;
     end = m_View.find('\0', searched);
   }
-  const std::string_view name = m_View.substr(0, end);
-  skip(end + 1);
-  return name;
+  return true;
 }
 
 bool TableCursor::findData() {
