@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
 
 namespace elfext {
 
@@ -31,23 +32,30 @@ bool dealIntoRuns(std::span<const Extent> extents, Runs& runs) {
   return true;
 }
 
+// Takes the runs apart.
+std::vector<Extent> mergeRuns(Runs& runs) {
+  std::vector<Extent> sorted;
+  for (std::vector<Extent>& run : runs) {
+    if (sorted.empty()) {
+      sorted = std::move(run);
+    } else if (!run.empty()) {
+      std::vector<Extent> merged;
+      merged.reserve(sorted.size() + run.size());
+      std::merge(sorted.begin(), sorted.end(), run.begin(), run.end(), std::back_inserter(merged),
+                 startsBefore);
+      sorted = std::move(merged);
+    }
+  }
+  return sorted;
+}
+
 // Good files have their sections in the order of their offsets, or in a few such orders that take
 // turns, as code and the relocations for it do.
 std::vector<Extent> sortedByStart(std::span<const Extent> extents) {
-  std::vector<Extent> sorted(extents.begin(), extents.end());
-  if (std::is_sorted(sorted.begin(), sorted.end(), startsBefore)) return sorted;
   Runs runs;
-  if (extents.size() <= FewExtents || !dealIntoRuns(extents, runs)) {
-    std::sort(sorted.begin(), sorted.end(), startsBefore);
-    return sorted;
-  }
-  sorted = std::move(runs.back());
-  for (size_t i = MostRuns - 1; i > 0; --i) {
-    std::vector<Extent> merged(sorted.size() + runs[i - 1].size());
-    std::merge(sorted.begin(), sorted.end(), runs[i - 1].begin(), runs[i - 1].end(), merged.begin(),
-               startsBefore);
-    sorted = std::move(merged);
-  }
+  if (extents.size() > FewExtents && dealIntoRuns(extents, runs)) return mergeRuns(runs);
+  std::vector<Extent> sorted(extents.begin(), extents.end());
+  std::sort(sorted.begin(), sorted.end(), startsBefore);
   return sorted;
 }
 
