@@ -70,16 +70,16 @@ void listSymbolTable(Run& run) {
   }
   elfext::AttributeTextCache<std::string> attributes(reprinted);
   std::string shownName;
-  for (const arlib::Symbol* symbol : run.archive.getSymbols()) {
-    shownName = symbol->getName();
-    if (symbol->hasBuildAttributes()) {
+  run.archive.visitSymbols([&](const arlib::Symbol& symbol) {
+    shownName = symbol.getName();
+    if (symbol.hasBuildAttributes()) {
       shownName += arlib::AttributeMarker;
-      shownName += attributes.get(symbol->getAttributeText());
+      shownName += attributes.get(symbol.getAttributeText());
     }
-    const ArchiveMember* member = symbol->getDefiningMember();
+    const ArchiveMember* member = symbol.getDefiningMember();
     messages::listingMessage(messages::ListedSymbol, shownName, member->getName(),
                              member->getOffset());
-  }
+  });
 }
 
 } // namespace quarn

@@ -224,7 +224,7 @@ RunEnd runOnce(support::Host& host, const char* archiveName, Settings& settings,
   archive.setIncludeDebugSymbols(settings.includeDebugSymbols);
   archive.setUniqueSymbolsOnly(settings.uniqueSymbolsOnly);
   archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
-  archive.setSymbolsWanted(settings.action == Action_SymbolTable);
+  archive.setSymbolsWanted(false);
   setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
   ArchiveOpenStatus openStatus;
   Run run = {archive, settings, openStatus};

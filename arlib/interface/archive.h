@@ -21,6 +21,7 @@
 #include "support/interface/source_file.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <span>
@@ -61,8 +62,8 @@ public:
   void setUseObjectBuildAttributes(bool use) { m_UseObjectBuildAttributes = use; }
   [[nodiscard]] bool getUseObjectBuildAttributes() const { return m_UseObjectBuildAttributes; }
 
-  // Whether the symbols of a table that is read will be asked for, as they may be unless somebody
-  // says no before the read: then the table is checked as ever, and its bytes are not kept.
+  // Whether getSymbols and what builds on it will be called, as they may be unless somebody says no
+  // before the read: then the table is checked as ever, and its bytes are not kept.
   void setSymbolsWanted(bool wanted) { m_AreSymbolsWanted = wanted; }
 
   // What the library as a whole needs of its target; null for nothing. It stays when the archive is
@@ -116,6 +117,10 @@ public:
     if (m_ReadSymbolTable != nullptr) makeSymbols();
     return {m_Symbols.begin(), m_Symbols.getSize()};
   }
+  // Hands the same symbols to the visitor, one after the other, wanted or not; each is gone when
+  // the next one comes. Where they are not wanted, a write of the archive leaves none. False after
+  // a report, if the table's bytes can't be had any more.
+  bool visitSymbols(const std::function<void(const Symbol&)>& visit) const;
   [[nodiscard]] const ArchiveMember* getSymbolTable() const { return m_SymbolTable; }
   [[nodiscard]] const ArchiveMember* getFileNameTable() const { return m_FileNameTable; }
 
@@ -231,6 +236,7 @@ private:
   // Frees what the members hold outside the regions, and their bytes.
   static void letGo(std::span<ArchiveMember* const> archiveMembers);
   void markEdited();
+  [[nodiscard]] Symbol symbolOf(std::string_view name, ArchiveMember* member) const;
   void makeSymbols() const;
   void sortMembers();
   void sortSymbols();

@@ -269,16 +269,40 @@ void Archive::takeOut(std::span<ArchiveMember* const> sortedMembers) {
   m_ArchiveMembers.setSize(static_cast<uint32_t>(end - m_ArchiveMembers.begin()));
 }
 
+Symbol Archive::symbolOf(std::string_view name, ArchiveMember* member) const {
+  const size_t marker = name.find(AttributeMarker);
+  const std::string_view attributes =
+      marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
+  return {name.substr(0, marker), attributes, this, member};
+}
+
 // Asking for what was read changes nothing, though it is written down now.
 void Archive::makeSymbols() const {
   const std::unique_ptr<ReadSymbolTable> table = std::move(m_ReadSymbolTable);
-  table->forEachSymbol([this](std::string_view name, ArchiveMember* member) {
-    const size_t marker = name.find(AttributeMarker);
-    const std::string_view attributes =
-        marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
-    m_Symbols.append(alloclib::create<Symbol>(*m_ObjectRegion, name.substr(0, marker), attributes,
-                                              this, member));
-  });
+  const auto add = [this](std::string_view name, ArchiveMember* member) {
+    m_Symbols.append(alloclib::create<Symbol>(*m_ObjectRegion, symbolOf(name, member)));
+  };
+  support::HostError error = 0;
+  [[maybe_unused]] const bool isWhole = table->forEachSymbol(add, error);
+  QUARN_ASSERT(1, isWhole);
+}
+
+bool Archive::visitSymbols(const std::function<void(const Symbol&)>& visit) const {
+  if (m_ReadSymbolTable == nullptr) {
+    for (const Symbol* symbol : m_Symbols)
+      visit(*symbol);
+    return true;
+  }
+  const auto hand = [&](std::string_view name, ArchiveMember* member) {
+    visit(symbolOf(name, member));
+  };
+  support::HostError error = 0;
+  bool isWhole = m_ReadSymbolTable->forEachSymbol(hand, error);
+  if (isWhole && !m_AreSymbolsWanted) {
+    error = m_OwnFile->checkUnchanged();
+    isWhole = error == 0;
+  }
+  return isWhole || fail(&ErrorHandler::reportReadError, m_OwnFile->getName(), error);
 }
 
 void Archive::forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers) {

@@ -317,10 +317,9 @@ bool ArchiveFileReader::readSymbolTable() {
   if (m_Archive.m_SymbolTable == nullptr) return true;
   auto table = std::make_unique<ReadSymbolTable>(symbolTableSource(), m_Archive.getMembers());
   if (!table->check(m_Archive)) return false;
-  // Bytes that have only passed by may be newer than the headers.
-  if (!m_Archive.m_AreSymbolsWanted) return checkUnchanged();
   m_Archive.m_ReadSymbolTable = std::move(table);
-  return true;
+  // Bytes that have only passed by may be newer than the headers.
+  return m_Archive.m_AreSymbolsWanted || checkUnchanged();
 }
 
 TableSource ArchiveFileReader::symbolTableSource() const {

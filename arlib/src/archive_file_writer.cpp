@@ -7,6 +7,7 @@
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
 #include "arlib/interface/contents_reader.h"
+#include "arlib/src/read_symbol_table.h"
 
 #include <array>
 #include <cerrno>
@@ -271,6 +272,7 @@ void ArchiveFileWriter::relocateMembers() {
     member->setLocation(file, static_cast<uint32_t>(offset + MemberHeaderSize), false);
     offset = nextHeaderOffset(offset, member->m_Size);
   }
+  if (!m_Archive.m_AreSymbolsWanted) m_Archive.m_ReadSymbolTable.reset();
   m_Archive.m_HeldFiles.assign(1, file);
   m_Archive.m_OwnFile = std::move(file);
   // They have been read to the end, and the archive is written.

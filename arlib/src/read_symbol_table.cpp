@@ -3,10 +3,6 @@
 
 #include "arlib/interface/archive_format.h"
 
-#include <algorithm>
-#include <functional>
-#include <utility>
-
 namespace arlib {
 
 namespace {
@@ -98,16 +94,9 @@ void ReadSymbolTable::forgetSymbolsOf(std::span<ArchiveMember* const> members) {
   m_Forgotten.insert(m_Forgotten.end(), members.begin(), members.end());
 }
 
-std::vector<ArchiveMember*> ReadSymbolTable::takeForgotten() {
-  std::vector<ArchiveMember*> forgotten = std::move(m_Forgotten);
-  std::sort(forgotten.begin(), forgotten.end(), std::less<>());
-  return forgotten;
-}
-
-bool ReadSymbolTable::isLeft(const ArchiveMember* member,
-                             std::span<ArchiveMember* const> forgotten) {
+bool ReadSymbolTable::isLeft(const ArchiveMember* member) const {
   return member != nullptr &&
-         !std::binary_search(forgotten.begin(), forgotten.end(), member, std::less<>());
+         !std::binary_search(m_Forgotten.begin(), m_Forgotten.end(), member, std::less<>());
 }
 
 } // namespace arlib

@@ -1,14 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The symbol table as it stood in the file. It is checked when the archive is read, since a broken
-// one ends the read. The symbols are made of it when somebody asks, which most runs never do: they
-// say so beforehand, and the table's bytes are not kept.
+// one ends the read. The symbols are made of it when somebody asks; who says beforehand that he
+// won't, and only visits them, spares the memory for the table's bytes, too.
 #pragma once
 
 #include "arlib/interface/archive.h"
 #include "arlib/src/table_cursor.h"
 
+#include <algorithm>
 #include <cstdint>
+#include <functional>
+#include <optional>
 #include <span>
 #include <string_view>
 #include <vector>
@@ -27,18 +30,25 @@ public:
   // Their symbols are left out from now on.
   void forgetSymbolsOf(std::span<ArchiveMember* const> members);
 
-  // Hands each entry that is left, in table order, to `add`(name, member). Only of a table that was
-  // found to be sound, and whose bytes are in memory.
+  // Hands each entry that is left, in table order, to `add`(name, member). Names are good until the
+  // next one comes, or for as long as the table's bytes if these are in memory. Only of a table
+  // that was found to be sound. False, with the host's error, if bytes can't be had any more.
   template <class Add>
-  void forEachSymbol(Add add) {
-    const std::vector<ArchiveMember*> forgotten = takeForgotten();
+  [[nodiscard]] bool forEachSymbol(Add add, support::HostError& error) {
+    std::sort(m_Forgotten.begin(), m_Forgotten.end(), std::less<>());
     TableCursor offsets(m_Source, CountSize);
     TableCursor names(m_Source, namesStart());
     for (uint32_t i = 0; i < m_Count; ++i) {
-      const std::string_view name = names.takeName().value();
-      ArchiveMember* member = memberAt(offsets.takeWord().value());
-      if (isLeft(member, forgotten)) add(name, member);
+      const std::optional<std::string_view> name = names.takeName();
+      const std::optional<uint32_t> offset = offsets.takeWord();
+      if (!name || !offset) {
+        error = names.hasFailed() ? names.getError() : offsets.getError();
+        return false;
+      }
+      ArchiveMember* member = memberAt(*offset);
+      if (isLeft(member)) add(*name, member);
     }
+    return true;
   }
 
 private:
@@ -52,9 +62,7 @@ private:
   [[nodiscard]] uint64_t namesStart() const { return CountSize + 4 * uint64_t{m_Count}; }
   // The member whose header stands there, or null.
   [[nodiscard]] ArchiveMember* memberAt(uint32_t offset);
-  [[nodiscard]] std::vector<ArchiveMember*> takeForgotten();
-  [[nodiscard]] static bool isLeft(const ArchiveMember* member,
-                                   std::span<ArchiveMember* const> forgotten);
+  [[nodiscard]] bool isLeft(const ArchiveMember* member) const;
 
   TableSource m_Source;
   uint32_t m_Count = 0;

@@ -56,9 +56,21 @@ inline std::string contentsOf(ArchiveMember* member) {
 }
 
 // What one attempt to read "lib.a" came to.
+// All that there is to know of each.
+inline std::vector<std::string> visitedSymbolsOf(const Archive& archive) {
+  std::vector<std::string> symbols;
+  EXPECT_TRUE(archive.visitSymbols([&](const Symbol& symbol) {
+    symbols.push_back(std::string(symbol.getName()) + (symbol.hasBuildAttributes() ? "|" : "") +
+                      std::string(symbol.getAttributeText()) + " in " +
+                      std::string(symbol.getDefiningMember()->getName()));
+  }));
+  return symbols;
+}
+
 // Nothing else comes of it where the symbols are not wanted, and their table only passes by.
 inline void expectSameWithoutSymbols(std::string_view bytes, Answer answer, bool isRead,
-                                     const std::vector<std::string>& reports) {
+                                     const std::vector<std::string>& reports,
+                                     const std::vector<std::string>& symbols) {
   MemoryHost host;
   host.addFile("lib.a", bytes);
   RecordingHandler handler(answer);
@@ -67,6 +79,7 @@ inline void expectSameWithoutSymbols(std::string_view bytes, Answer answer, bool
   archive.setSymbolsWanted(false);
   EXPECT_EQ(readFile("lib.a", archive), isRead);
   EXPECT_EQ(handler.reports, reports);
+  EXPECT_EQ(visitedSymbolsOf(archive), symbols);
 }
 
 struct Reading {
@@ -75,7 +88,7 @@ struct Reading {
     host.addFile("lib.a", bytes);
     archive.setErrorHandler(&handler);
     isRead = readFile("lib.a", archive);
-    expectSameWithoutSymbols(bytes, answer, isRead, handler.reports);
+    expectSameWithoutSymbols(bytes, answer, isRead, handler.reports, visitedSymbolsOf(archive));
   }
   explicit Reading(const ArchiveBuilder& builder, Answer answer = Answer::GoOnIfTolerable)
       : Reading(std::string_view(builder.bytes()), answer) {}

@@ -123,6 +123,45 @@ TEST_F(TableCursorTest, AnUnreadableTableEndsTheReadWhereverItFails) {
   }
 }
 
+TEST_F(TableCursorTest, SymbolsAreVisitedInTheFileAsTheyAreInMemory) {
+  m_Host.addFile("lib.a", archive()
+                              .symbolTable({{"b$$BuildAttributes$FP2", "b.o"}, {"a", "a.o"}})
+                              .member("a.o", "12")
+                              .member("b.o", "34")
+                              .bytes());
+  for (const bool isWanted : {true, false}) {
+    Archive library(m_Host);
+    library.setSymbolsWanted(isWanted);
+    ASSERT_TRUE(readFile("lib.a", library));
+    const auto expected = ElementsAre("b|FP2 in b.o", "a in a.o");
+    EXPECT_THAT(visitedSymbolsOf(library), expected);
+    if (isWanted) static_cast<void>(library.getSymbols());
+    EXPECT_THAT(visitedSymbolsOf(library), expected) << "again, and where they have been made";
+    library.removeMember(library.getMembers()[2]);
+    EXPECT_THAT(visitedSymbolsOf(library), ElementsAre("a in a.o"));
+  }
+}
+
+TEST_F(TableCursorTest, AVisitFailsWhereTheFileCannotBeRead) {
+  m_Host.addFile("lib.a", archive().symbolTable({{"s", "a.o"}}).member("a.o", "12").bytes());
+  const auto visit = [](const Archive& library) {
+    return library.visitSymbols([](const Symbol&) {});
+  };
+  Archive library(m_Faulty);
+  RecordingHandler handler(Answer::GiveUp);
+  library.setErrorHandler(&handler);
+  library.setSymbolsWanted(false);
+  ASSERT_TRUE(readFile("lib.a", library));
+  m_Faulty.failCall(1, EIO);
+  EXPECT_FALSE(visit(library));
+  EXPECT_THAT(handler.take(), ElementsAre("0 I/O error reading file 'lib.a': Input/output error"));
+  m_Faulty.failCall(0, 0);
+  EXPECT_TRUE(visit(library));
+  ASSERT_TRUE(writeFile("lib.a", library));
+  EXPECT_TRUE(visit(library));
+  EXPECT_THAT(visitedSymbolsOf(library), IsEmpty()) << "the table that was read is gone";
+}
+
 TEST_F(TableCursorTest, AnArchiveIsRewrittenAlsoIfItsTableWasNotKept) {
   const ArchiveBuilder builder =
       archive().symbolTable({{"s", "a.o"}}).member("a.o", "12").member("b.o", "34");
