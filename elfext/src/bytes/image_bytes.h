@@ -29,7 +29,7 @@ enum class ImageFailure : uint8_t {
 // What serves the images of one object after the other, where each is gone when the next comes.
 struct ImageMemory {
   // Larger images get memory of their own, so that only what is looked at of them costs anything.
-  static constexpr uint64_t LargestImage = 0x400000;
+  static constexpr uint64_t LargestImage = 0x800000;
 
   support::ReadWindow window;
   // Of that size once there is any: what is never looked at costs nothing.
