@@ -119,18 +119,19 @@ void putWord(Word word, bool isLittle, uint8_t* bytes) {
   std::memcpy(bytes, &word, sizeof word);
 }
 
-// Calls the function with a format that the compiler knows, as a constant of a type of its own:
-// loops over rows then have no more to decide for each of them.
+// A format that the compiler knows, as a constant of a type of its own.
+template <bool IsWide, bool IsLittle>
+using FixedFormat = std::integral_constant<RecordFormat, RecordFormat{IsWide, IsLittle}>;
+
+// Calls the function with the fixed format: loops over rows then have no more to decide for each of
+// them.
 template <class Function>
 auto withFixedFormat(RecordFormat format, Function function) {
-  constexpr RecordFormat wideLittle = {true, true};
-  constexpr RecordFormat wideBig = {true, false};
-  constexpr RecordFormat narrowLittle = {false, true};
-  constexpr RecordFormat narrowBig = {false, false};
-  if (format == wideLittle) return function(std::integral_constant<RecordFormat, wideLittle>());
-  if (format == wideBig) return function(std::integral_constant<RecordFormat, wideBig>());
-  if (format == narrowLittle) return function(std::integral_constant<RecordFormat, narrowLittle>());
-  return function(std::integral_constant<RecordFormat, narrowBig>());
+  if (format.isWide)
+    return format.isLittle ? function(FixedFormat<true, true>())
+                           : function(FixedFormat<true, false>());
+  return format.isLittle ? function(FixedFormat<false, true>())
+                         : function(FixedFormat<false, false>());
 }
 
 // ---- How a record is taken apart and put together: told once for both directions, by a function

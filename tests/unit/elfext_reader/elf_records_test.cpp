@@ -55,6 +55,16 @@ TEST(ElfRecordsTest, HaveTheSizesOfTheirClass) {
   EXPECT_EQ(relocationRowSize(true, true), 24U);
 }
 
+TEST(ElfRecordsTest, AFixedFormatIsTheOneAskedForAndAConstant) {
+  for (const RecordFormat format : Formats) {
+    const RecordFormat fixed = withFixedFormat(format, [](auto fixedFormat) {
+      constexpr RecordFormat known = fixedFormat;
+      return known;
+    });
+    EXPECT_EQ(fixed, format);
+  }
+}
+
 TEST(ElfRecordsTest, WordsAreReadAndWrittenInTheFilesOrder) {
   const uint8_t bytes[] = {1, 2, 3, 4, 5, 6, 7, 8};
   EXPECT_EQ(getWord<uint16_t>(bytes, true), 0x0201);
