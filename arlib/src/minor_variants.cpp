@@ -8,7 +8,6 @@
 #include <algorithm>
 #include <cstring>
 #include <map>
-#include <unordered_map>
 
 namespace arlib {
 
@@ -45,10 +44,6 @@ uint64_t quickHash(std::string_view name) {
   return hash;
 }
 
-struct NamesKeyHash {
-  size_t operator()(const NamesKey& key) const { return key.hash ^ key.count; }
-};
-
 // Names of a good object are about as long as the object, at most. Those that share their bytes a
 // thousand times over are a trap for whoever compares them.
 bool isComparable(const HostingMember& hosting) {
@@ -71,7 +66,7 @@ SortedNames sortedNames(const SymbolNameList& names) {
 
 // Adds the groups among members of one key.
 void splitByNames(std::span<const HostingMember> hostingMembers,
-                  const std::vector<uint32_t>& candidates, std::vector<VariantGroup>& groups) {
+                  std::span<const uint32_t> candidates, std::vector<VariantGroup>& groups) {
   std::map<SortedNames, VariantGroup> byNames;
   for (const uint32_t candidate : candidates)
     byNames[sortedNames(*hostingMembers[candidate].names)].push_back(candidate);
@@ -88,14 +83,21 @@ NamesKey::NamesKey(const SymbolNameList& names)
     hash += quickHash(names[i]);
 }
 
+// Sorted by their keys, since names can be chosen so that a table of hashes has them all in one
+// place.
 std::vector<VariantGroup> findMinorVariants(std::span<const HostingMember> hostingMembers) {
-  std::unordered_map<NamesKey, std::vector<uint32_t>, NamesKeyHash> byKey;
+  const auto keyOf = [&](uint32_t index) -> const NamesKey& { return hostingMembers[index].key; };
+  std::vector<uint32_t> sorted;
   for (uint32_t i = 0; i < hostingMembers.size(); ++i) {
-    if (isComparable(hostingMembers[i])) byKey[hostingMembers[i].key].push_back(i);
+    if (isComparable(hostingMembers[i])) sorted.push_back(i);
   }
+  std::stable_sort(sorted.begin(), sorted.end(),
+                   [&](uint32_t left, uint32_t right) { return keyOf(left) < keyOf(right); });
   std::vector<VariantGroup> groups;
-  for (const auto& [key, candidates] : byKey) {
-    if (candidates.size() > 1) splitByNames(hostingMembers, candidates, groups);
+  for (auto first = sorted.begin(), last = first; first != sorted.end(); first = last) {
+    last = std::find_if(first, sorted.end(),
+                        [&](uint32_t index) { return keyOf(index) != keyOf(*first); });
+    if (last - first > 1) splitByNames(hostingMembers, {first, last}, groups);
   }
   std::sort(groups.begin(), groups.end(), [](const VariantGroup& left, const VariantGroup& right) {
     return left.front() < right.front();

@@ -10,6 +10,7 @@
 #include "elfext/interface/fast_array.h"
 #include "elfext/interface/full_attr.h"
 
+#include <compare>
 #include <cstdint>
 #include <span>
 #include <string>
@@ -22,7 +23,7 @@ namespace arlib {
 struct NamesKey {
   // Best taken while the names are still at hand.
   explicit NamesKey(const SymbolNameList& names);
-  bool operator==(const NamesKey&) const = default;
+  auto operator<=>(const NamesKey&) const = default;
 
   uint64_t hash = 0; // whatever their order
   uint32_t count;

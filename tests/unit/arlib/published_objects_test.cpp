@@ -10,8 +10,11 @@
 #include "elfext/interface/object_module.h"
 
 #include <algorithm>
+#include <cstring>
+#include <ctime>
 #include <deque>
 #include <random>
+#include <unordered_set>
 
 namespace arlib {
 
@@ -61,6 +64,35 @@ std::vector<VariantGroup> groupsByComparison(std::vector<Names> members) {
     if (group.size() > 1) groups.push_back(group);
   }
   return groups;
+}
+
+// A name of eight bytes by which members that define nothing else would all come to the same place
+// of a table that has as many places as `places` divides by.
+Names nameThatHashesTo(uint64_t multiple, uint64_t places) {
+  constexpr uint64_t Factor = 0x9E3779B97F4A7C15;
+  uint64_t inverse = Factor; // by Newton's steps, each of which doubles the bits that are right
+  for (int step = 0; step < 6; ++step)
+    inverse *= 2 - Factor * inverse;
+  uint64_t word = multiple * places ^ 1;
+  word ^= word >> 32;
+  word = word * inverse ^ sizeof word;
+  std::string name(sizeof word, '\0');
+  std::memcpy(name.data(), &word, sizeof word);
+  return {name};
+}
+
+// As many places as the last two tables have together that so many elements take.
+uint64_t placesOfTables(uint32_t elementCount) {
+  std::unordered_set<uint32_t> table;
+  uint64_t before = 1;
+  uint64_t last = 1;
+  for (uint32_t i = 0; i < elementCount; ++i) {
+    table.insert(i);
+    if (table.bucket_count() == last) continue;
+    before = last;
+    last = table.bucket_count();
+  }
+  return before * last;
 }
 
 using MinorVariantsTest = ArchiveTest;
@@ -171,6 +203,20 @@ TEST_F(MinorVariantsTest, AreFoundAmongManyMembersOfOneName) {
   for (int i = 0; i < 20000; ++i)
     members.push_back({"name" + std::to_string(i % 10000)});
   EXPECT_EQ(groupsOf(members).size(), 10000u);
+}
+
+// Of the processor's time, so that neighbours on it count for little.
+TEST_F(MinorVariantsTest, AreFoundInLittleTimeWhateverTheirNames) {
+  constexpr uint32_t Count = 60000;
+  const uint64_t places = placesOfTables(Count);
+  std::vector<Names> members;
+  for (uint32_t i = 0; i < Count; ++i)
+    members.push_back(nameThatHashesTo(i + 1, places));
+  members.push_back(members.front());
+  const GroupsOf hostile(members);
+  const std::clock_t start = std::clock();
+  EXPECT_THAT(hostile.find(), ElementsAre(VariantGroup{0, Count}));
+  EXPECT_LT(std::clock() - start, CLOCKS_PER_SEC);
 }
 
 TEST_F(MinorVariantsTest, AreNotPublishedWithoutAHandlerWhereTheyCollide) {
