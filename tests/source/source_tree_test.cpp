@@ -187,6 +187,34 @@ TEST(SourceTree, ElfextsRoomsIncludeOnlyFromLowerOnes) {
   }
 }
 
+// Whether there is such a file or folder: by its whole name, or without the part that a library's
+// pair of folders adds, or without its ending.
+bool exists(const fs::path& folder, const fs::path& name) {
+  const fs::path first = *name.begin();
+  const fs::path rest = name.lexically_relative(first);
+  for (const fs::path& path : {name, first / "interface" / rest, first / "src" / rest}) {
+    for (const char* ending : {"", ".h", ".cpp"}) {
+      if (fs::exists(folder / (path.string() + ending))) return true;
+    }
+  }
+  return false;
+}
+
+// Names on the map count from the root, or from where the map says that they do.
+TEST(SourceTree, TheMapLeadsToWhatThereIs) {
+  const std::string map = contentsOf(Root / "docs/architecture.md");
+  const std::regex name("`([a-z][a-z_]*/[a-z_/.]*)`");
+  size_t count = 0;
+  for (std::sregex_iterator match(map.begin(), map.end(), name), end; match != end; ++match) {
+    const std::string path = (*match)[1];
+    EXPECT_TRUE(exists(Root, path) || exists(Root / "elfext", path) ||
+                exists(Root / "elfext/src", path))
+        << path;
+    ++count;
+  }
+  EXPECT_GT(count, 50u);
+}
+
 TEST(SourceTree, EveryFileNamesItsLicence) {
   for (const auto& [room, allowed] : Arrows) {
     for (const fs::path& file : sourcesOf(room)) {
