@@ -10,7 +10,7 @@
 #include "support/interface/read_window.h"
 
 #include <cstdint>
-#include <span>
+#include <memory>
 #include <string_view>
 #include <vector>
 

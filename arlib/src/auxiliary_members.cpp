@@ -3,7 +3,6 @@
 
 #include "arlib/interface/archive_format.h"
 
-#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <string>

@@ -46,7 +46,8 @@ public:
   [[nodiscard]] bool findData();
 
   [[nodiscard]] uint64_t getPosition() const { return m_Position; }
-  // Why bytes could not be had. 0 for a file that is shorter now than the table.
+  // Whether there were bytes that could not be had, and the host's error number; 0 for a file that
+  // is shorter now than the table.
   [[nodiscard]] bool hasFailed() const { return m_HasFailed; }
   [[nodiscard]] support::HostError getError() const { return m_Error; }
 

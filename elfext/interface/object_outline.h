@@ -45,8 +45,9 @@ public:
 
   // Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
   // to the handler, which may be null; the outline is then empty, as it is when the handler lets a
-  // foreign machine pass. The object's name, which may be null too, goes with reports. Attributes
-  // must be wanted beforehand.
+  // foreign machine pass. The handler must live as long as somebody asks for sizes. The object's
+  // name, which may be null too, goes with reports and is copied. Attributes must be wanted
+  // beforehand.
   [[nodiscard]] bool read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
                           ErrorHandler* errorHandler, const char* objectName,
                           bool wantsAttributes = false);

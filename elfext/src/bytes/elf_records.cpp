@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The fields of each record in file order, told once for both directions: a codec either loads the
-// field or stores it.
+// The fields of each record in file order, as codeSymbol has those of symbols.
 #include "elfext/src/bytes/elf_records.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -9,8 +8,6 @@
 namespace elfext {
 
 namespace {
-
-// In the functions below a record is const when it is put.
 
 template <class Codec, class Record>
 void codeFileHeader(Codec codec, Record& record) {

@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The bytes of one object file: in memory that somebody lends, or in a range of a file, of which
-// only those blocks are read that somebody looks at. A small image is read whole, in one host call.
+// only those blocks are read that somebody looks at. A small image is read whole, in one host call,
+// which may bring its neighbours along.
 //
-// The bytes of a file keep one address, in one array as large as the image whose untouched pages
-// cost nothing. So a thousand overlapping views need no more memory than one.
+// The bytes of a file keep one address, in one array that has room for the whole image and whose
+// untouched pages cost nothing. So a thousand overlapping views need no more memory than one.
 #pragma once
 
 #include "elfext/interface/image_source.h"

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/interface/object_outline.h"
 
-#include "alloclib/interface/region_objects.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/symbol_names.h"

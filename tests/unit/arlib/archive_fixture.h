@@ -55,7 +55,6 @@ inline std::string contentsOf(ArchiveMember* member) {
   return member->loadContents() ? asString(member->getContents()) : "(unreadable)";
 }
 
-// What one attempt to read "lib.a" came to.
 // All that there is to know of each.
 inline std::vector<std::string> visitedSymbolsOf(const Archive& archive) {
   std::vector<std::string> symbols;
@@ -82,6 +81,7 @@ inline void expectSameWithoutSymbols(std::string_view bytes, Answer answer, bool
   EXPECT_EQ(visitedSymbolsOf(archive), symbols);
 }
 
+// What one attempt to read "lib.a" came to.
 struct Reading {
   explicit Reading(std::string_view bytes, Answer answer = Answer::GoOnIfTolerable)
       : handler(answer) {
