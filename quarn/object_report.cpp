@@ -79,11 +79,7 @@ void ObjectReport::print() {
 
 void ObjectReport::addMember(ArchiveMember& member) {
   if (member.getType() != arlib::ElfImageArchiveMemberType::getInstance()) return;
-  if (!member.flushContents()) return;
-  const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();
-  if (!m_Outline.read(location.file->shared_from_this(), location.offset, member.getSize(), nullptr,
-                      nullptr))
-    return;
+  if (!arlib::ElfImageArchiveMemberType::readOutline(member, nullptr, false, m_Outline)) return;
   const std::optional<elfext::SizesStatistics> totals = m_Outline.computeSizes();
   if (!totals) return;
   if (shows(Report_Entries)) addEntries(member);

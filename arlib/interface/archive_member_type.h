@@ -108,10 +108,10 @@ public:
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
 
-private:
-  // Reads the member's tables, under that handler. False after a report, if any.
-  static bool read(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
-                   bool wantsAttributes, elfext::ObjectOutline& outline);
+  // Reads what the member's object says of itself, under that handler, which may be null. False
+  // after a report, if any.
+  static bool readOutline(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
+                          bool wantsAttributes, elfext::ObjectOutline& outline);
 };
 
 } // namespace arlib

@@ -148,9 +148,9 @@ void findNames(OutlinedSymbols symbols, const ArchiveMember& archiveMember, Symb
 
 ObjectReading::ObjectReading() : records(elfext::parseAttributeString) {}
 
-bool ElfImageArchiveMemberType::read(ArchiveMember& archiveMember,
-                                     elfext::ErrorHandler* errorHandler, bool wantsAttributes,
-                                     elfext::ObjectOutline& outline) {
+bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
+                                            elfext::ErrorHandler* errorHandler,
+                                            bool wantsAttributes, elfext::ObjectOutline& outline) {
   if (!archiveMember.flushContents()) return false;
   const ArchiveMember::ContentsLocation& location = *archiveMember.getContentsLocation();
   const std::string name(archiveMember.getName());
@@ -178,7 +178,7 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, Objec
   elfext::ObjectOutline& outline = reading.outline;
   reason.clear();
   attributes.reset();
-  if (!read(*archiveMember, &capture, useObjectAttributes, outline)) {
+  if (!readOutline(*archiveMember, &capture, useObjectAttributes, outline)) {
     reason = capture.getText();
     return false;
   }
@@ -197,7 +197,7 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
   QUARN_ASSERT(1, archiveMember != NULL);
   ObjectReading reading;
   elfext::ObjectOutline& outline = reading.outline;
-  if (!read(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
+  if (!readOutline(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
   return findAttributes(outline, outline.getSymbols(), archiveMember->getSize(),
                         useObjectAttributes, reading.records, attributes);
 }

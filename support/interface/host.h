@@ -42,6 +42,11 @@ struct FileStatus {
     return kind != FileKind::Nothing && kind == other.kind && device == other.device &&
            inode == other.inode;
   }
+  // Whether the file has that range of bytes, whatever the two numbers are.
+  [[nodiscard]] bool holds(uint64_t offset, uint64_t count) const {
+    const auto available = static_cast<uint64_t>(size);
+    return offset <= available && count <= available - offset;
+  }
 };
 
 // An open file. A plain number, so that it can be copied; whoever opened it closes it.

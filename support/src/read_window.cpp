@@ -26,7 +26,7 @@ HostError ReadWindow::read(uint64_t offset, size_t size) {
   m_Start = offset;
   const HostError error = m_File->readAt(std::span(m_Bytes).first(wanted), offset, m_Used);
   if (error != 0) m_Used = 0;
-  m_EndsFile = error == 0 && m_Used < wanted;
+  m_EndsFile = error == 0 && (m_Used < wanted || offset + m_Used >= fileSize);
   return error;
 }
 

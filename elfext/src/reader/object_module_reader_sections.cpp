@@ -59,15 +59,13 @@ void giveContents(ReadContext& context, Section& section, const SectionHeader& h
     ModuleBuilder::getBuffer(section).defer(context.image, header.offset, header.size);
 }
 
-// The section of a string table gets what the table of the read has.
-void mendStringTable(Section& section) {
+// The section of a string table gets what differs in the table of the read: its ends.
+void takeMendedStrings(Section& section, std::span<const uint8_t> mended) {
   ModuleBuilder::setAuxiliary(section, false);
-  if (section.getSize() == 0) {
-    section.appendByte(0);
-  } else {
-    section.setByte(0, 0);
-    section.setByte(section.getSize() - 1, 0);
-  }
+  while (section.getSize() < mended.size())
+    section.appendByte(mended[section.getSize()]);
+  section.setByte(0, mended.front());
+  section.setByte(section.getSize() - 1, mended.back());
   ModuleBuilder::setAuxiliary(section, true);
 }
 
@@ -94,7 +92,7 @@ void createSections(ReadContext& context) {
     if (hasFileBytes(header)) giveContents(context, *module.getSection(i), header);
   }
   for (const auto& [section, bytes] : context.mendedStrings)
-    mendStringTable(*module.getSection(section));
+    takeMendedStrings(*module.getSection(section), bytes);
 }
 
 void nameSections(ReadContext& context) {

@@ -11,8 +11,8 @@ Symbol* createSymbol(ReadContext& context, const SymbolTable& table, const char*
                      const SymbolRow& row, const SymbolHome& home) {
   ObjectModule& module = context.module;
   const char* name = row.name == 0 ? nullptr : strings + row.name;
-  const uint32_t type = row.info & 0xFU;
-  const uint32_t binding = row.info >> 4;
+  const uint32_t type = row.type();
+  const uint32_t binding = row.binding();
   const uint32_t visibility = row.other & 0x3U;
   const bool isDynamic = table.isDynamic;
   switch (home.category) {
@@ -31,8 +31,7 @@ Symbol* createSymbol(ReadContext& context, const SymbolTable& table, const char*
     break;
   }
   Section* section = module.getSection(home.section);
-  const uint64_t offset =
-      context.hasLaidOutAddresses() ? row.value - section->getAddress() : row.value;
+  const uint64_t offset = context.placeInHome(row, home);
   return isDynamic
              ? module.createHostedDynamicSymbol(name, offset, type, binding, visibility, section)
              : module.createHostedSymbol(name, offset, type, binding, visibility, section);

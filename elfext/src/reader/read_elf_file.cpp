@@ -50,15 +50,10 @@ bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, Deferral
   return false;
 }
 
-// Whether the file has the range at all: a look at its end may come late, or never.
-bool hasRange(const support::FileStatus& status, uint64_t offset, uint64_t size) {
-  const auto available = static_cast<uint64_t>(status.size);
-  return offset <= available && size <= available - offset;
-}
-
+// A range that the file has: a look at its end may come late, or never.
 bool readShared(const std::shared_ptr<support::SourceFile>& file, uint64_t offset, uint64_t size,
                 ObjectModule& module) {
-  if (!hasRange(file->getStatus(), offset, size)) return reportReadError(module, 0);
+  if (!file->getStatus().holds(offset, size)) return reportReadError(module, 0);
   return readImage(module, std::make_unique<ImageBytes>(file, offset, size), nullptr);
 }
 
@@ -66,7 +61,7 @@ bool readShared(const std::shared_ptr<support::SourceFile>& file, uint64_t offse
 // is not needed any more.
 bool readOwnFile(support::SourceFiles& files, const std::shared_ptr<support::SourceFile>& file,
                  uint64_t offset, uint64_t size, ObjectModule& module) {
-  if (size > ImageBytes::WholeReadLimit || !hasRange(file->getStatus(), offset, size))
+  if (size > ImageBytes::WholeReadLimit || !file->getStatus().holds(offset, size))
     return readShared(file, offset, size, module);
   auto image = std::make_unique<ImageBytes>(file, offset, size);
   if (image->prepare()) {
@@ -81,7 +76,7 @@ bool readOwnFile(support::SourceFiles& files, const std::shared_ptr<support::Sou
 // A range of a file that the caller may close when the read is over.
 bool readLentFile(support::Host& host, support::FileHandle file, const support::FileStatus& status,
                   uint64_t offset, uint64_t size, ObjectModule& module) {
-  if (!hasRange(status, offset, size)) return reportReadError(module, 0);
+  if (!status.holds(offset, size)) return reportReadError(module, 0);
   auto image = std::make_unique<ImageBytes>(host, file, offset, size, false);
   if (image->prepare() && !image->loadAll()) return reportReadError(module, image->getHostError());
   image->forgetFile();

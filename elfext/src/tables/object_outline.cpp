@@ -72,8 +72,7 @@ void addMappingSymbols(const ObjectTables& tables, SizesSource& source) {
     if (home.category != Symbol::Category_Hosted) return;
     const SectionHeader& header = tables.sectionHeaders[home.section];
     if (!isCode(header)) return;
-    const uint64_t base = tables.hasLaidOutAddresses() ? header.addr : 0;
-    source.mappingSymbols.push_back({home.section, row.value - base, name});
+    source.mappingSymbols.push_back({home.section, tables.placeInHome(row, home), name});
   });
 }
 
@@ -118,13 +117,12 @@ bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t off
                          ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
   if (m_File != file) m_Memory->window.setFile(file.get());
   m_File = file;
-  const auto available = static_cast<uint64_t>(file->getStatus().size);
+  const bool isInFile = file->getStatus().holds(offset, size);
   auto content = std::make_unique<Content>(std::move(file), offset, size, errorHandler, objectName);
   ObjectTables& tables = content->tables;
   if (m_Content != nullptr) tables.takeMemory(m_Content->tables);
   m_Content.reset();
-  if (offset > available || size > available - offset)
-    return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
+  if (!isInFile) return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
   bool isForeign = false;
   if (!content->image.prepare(*m_Memory)) return tables.failRead();
   if (!checkHeaders(tables, isForeign)) return false;
@@ -157,7 +155,7 @@ std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
     const SymbolHome home = tables.homeOf(table, index, row);
     const bool isHosted = home.category == Symbol::Category_Hosted;
-    m_Symbols.push_back({table.nameOf(row), home.category, static_cast<uint32_t>(row.info >> 4),
+    m_Symbols.push_back({table.nameOf(row), home.category, row.binding(),
                          isHosted ? tables.nameOf(home.section) : nullptr});
   });
   return m_Symbols;

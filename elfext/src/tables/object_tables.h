@@ -241,6 +241,11 @@ struct ObjectTables {
     }
   }
 
+  // Where a hosted symbol starts, counted from the start of its section.
+  [[nodiscard]] uint64_t placeInHome(const SymbolRow& row, const SymbolHome& home) const {
+    return hasLaidOutAddresses() ? row.value - sectionHeaders[home.section].addr : row.value;
+  }
+
   // The bytes, or null after a report that they can't be had.
   [[nodiscard]] const uint8_t* view(uint64_t offset, uint64_t size);
   // The contents of a section, of a mended table as it should have been. Null, after a report, if

@@ -13,10 +13,6 @@ namespace elfext {
 
 namespace {
 
-uint32_t typeOf(const SymbolRow& row) {
-  return row.info & 0xFU;
-}
-
 bool isSpecialIndex(uint16_t index) {
   return index == SHN_UNDEF || index == SHN_ABS || index == SHN_COMMON || index == SHN_XINDEX;
 }
@@ -31,7 +27,7 @@ RowFault findFault(const ObjectTables& tables, const SymbolTable& table, uint32_
   if (row.shndx == SHN_XINDEX && table.indexes == nullptr) return RowFault::NoIndexes;
   const SymbolHome home = tables.homeOf(table, index, row);
   if (home.category != Symbol::Category_Hosted)
-    return typeOf(row) == STT_SECTION ? RowFault::NotHosted : RowFault::None;
+    return row.type() == STT_SECTION ? RowFault::NotHosted : RowFault::None;
   return home.section >= tables.sectionCount() ? RowFault::Section : RowFault::None;
 }
 
@@ -106,7 +102,7 @@ private:
     const SymbolRow row = getRow(bytes);
     const bool isHosted = row.shndx == SHN_XINDEX || !isSpecialIndex(row.shndx);
     if (!isSpecialIndex(row.shndx) && row.shndx >= m_Tables.sectionCount()) return AlwaysSuspicious;
-    return typeOf(row) == STT_SECTION && !isHosted ? AlwaysSuspicious : row.name;
+    return row.type() == STT_SECTION && !isHosted ? AlwaysSuspicious : row.name;
   }
 
   const ObjectTables& m_Tables;
