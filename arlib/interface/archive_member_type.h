@@ -26,12 +26,11 @@ class ArchiveMember;
 // What decoration texts say: members of a library have thousands of them, of which few differ.
 using AttributeRecords = elfext::AttributeTextCache<elfext::FullAttr>;
 
-// What serves all objects that are read one after the other, for one is like the next.
+// What serves all objects that are read one after the other, for one is like the next. It ends with
+// the last of them; the records may go on.
 struct ObjectReading {
-  ObjectReading();
-
-  AttributeRecords records;
-  elfext::ObjectOutline outline;
+  AttributeRecords& records;
+  elfext::ObjectOutline outline = {};
 };
 
 class ArchiveMemberType {

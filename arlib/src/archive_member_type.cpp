@@ -146,8 +146,6 @@ void findNames(OutlinedSymbols symbols, const ArchiveMember& archiveMember, Symb
 
 } // namespace
 
-ObjectReading::ObjectReading() : records(elfext::parseAttributeString) {}
-
 bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
                                             elfext::ErrorHandler* errorHandler,
                                             bool wantsAttributes, elfext::ObjectOutline& outline) {
@@ -164,7 +162,8 @@ bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
 bool ElfImageArchiveMemberType::getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                                                std::string& reason) const {
   std::optional<elfext::FullAttr> attributes;
-  ObjectReading reading;
+  AttributeRecords records(elfext::parseAttributeString);
+  ObjectReading reading{records};
   return getPublished(archiveMember, reading, names, attributes, reason);
 }
 
@@ -195,7 +194,8 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
                                                    elfext::FullAttr& attributes,
                                                    bool useObjectAttributes) const {
   QUARN_ASSERT(1, archiveMember != NULL);
-  ObjectReading reading;
+  AttributeRecords records(elfext::parseAttributeString);
+  ObjectReading reading{records};
   elfext::ObjectOutline& outline = reading.outline;
   if (!readOutline(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
   return findAttributes(outline, outline.getSymbols(), archiveMember->getSize(),

@@ -2,6 +2,7 @@
 #include "arlib/src/auxiliary_members.h"
 
 #include "arlib/interface/archive_format.h"
+#include "elfext/interface/attribute_string.h"
 
 #include <cerrno>
 #include <cstring>
@@ -27,7 +28,8 @@ AuxiliaryMembers::AuxiliaryMembers(Archive& archive)
     : m_Archive(archive),
       m_Region(alloclib::RegionGeneral::Create(ScratchRegionSize,
                                                "arlib::Archive::updateAuxiliaryMembers() region")),
-      m_SymbolHostingMembers(m_Region.get()), m_Output(m_Region.get()) {}
+      m_Records(elfext::parseAttributeString), m_SymbolHostingMembers(m_Region.get()),
+      m_Output(m_Region.get()) {}
 
 bool AuxiliaryMembers::update() {
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
@@ -177,7 +179,8 @@ bool AuxiliaryMembers::updateSymbolTable() {
 // A member that can't be read is told of and has no entries. A handler that says to stop there
 // leaves the table with the members collected so far.
 void AuxiliaryMembers::collectSymbolHostingMembers() {
-  const elfext::FullAttr nothingStated = m_Reading.records.get("");
+  const elfext::FullAttr nothingStated = m_Records.get("");
+  ObjectReading reading{m_Records};
   QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
   for (ArchiveMember* member : m_Archive.m_ArchiveMembers) {
     if (!member->m_Type->isObjectModule()) continue;
@@ -185,7 +188,7 @@ void AuxiliaryMembers::collectSymbolHostingMembers() {
     auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
     std::optional<elfext::FullAttr> attributes;
     std::string reason;
-    if (!type->getPublished(member, m_Reading, *names, attributes, reason) &&
+    if (!type->getPublished(member, reading, *names, attributes, reason) &&
         !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
       return;
     }
@@ -199,7 +202,7 @@ void AuxiliaryMembers::collectSymbolHostingMembers() {
 // other names may not.
 bool AuxiliaryMembers::addVariantSymbols() {
   m_IsMinorVariant.resize(m_SymbolHostingMembers.getSize());
-  MinorVariants variants(m_Archive, *m_Region, m_Reading.records);
+  MinorVariants variants(m_Archive, *m_Region, m_Records);
   std::vector<HostingMember> members;
   for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.span())) {
     members.clear();

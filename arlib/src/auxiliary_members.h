@@ -47,7 +47,7 @@ private:
 
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;
-  ObjectReading m_Reading;
+  AttributeRecords m_Records;
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
   // By hosting member: whether it is in a group of minor variants.
   std::vector<bool> m_IsMinorVariant;
