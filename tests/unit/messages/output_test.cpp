@@ -63,6 +63,8 @@ private:
 template <class Action>
 std::string inChild(Action action) {
   Pipe pipe;
+  // What the test program has gathered for its own stdout is not the child's to write.
+  std::fflush(stdout);
   const pid_t child = fork();
   if (child == 0) {
     closeStreams();
