@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The actions: one function for each row of the action table. Each goes on with the next word after
-// a complaint; an error that was counted keeps the archive from being written.
+// a complaint; an error that was counted keeps the archive from being written. All but an insertion
+// find an archive that is there.
 #pragma once
 
 #include "quarn/run.h"
 
 namespace quarn {
+
+// Does the action of the run. An archive that isn't there is an error, unless files go into it.
+void doAction(Run& run);
 
 // -r, -q, --create. On a new archive without files it cancels the writing.
 void insertFiles(Run& run);

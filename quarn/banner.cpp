@@ -17,9 +17,6 @@ constexpr char AnyCharacter = '?';
 } // namespace
 
 void showBanner(BannerMode mode, const char* toolName) {
-  static bool isShown = false;
-  if (isShown) return;
-  isShown = true;
   messages::writeText(messages::Stream_Output, support::bannerText(support::buildData()) + "\n");
   if (mode == BannerMode::Alone) return;
   messages::listingMessage(messages::HelpCommandFormat, toolName);

@@ -5,7 +5,7 @@ namespace quarn {
 
 enum class BannerMode { WithHelp, Alone };
 
-// Prints which build this is, and the help, on stdout; at most once a run. `toolName` is the name
+// Prints which build this is, and the help, on stdout. `toolName` is the name
 // that the user called the tool by.
 void showBanner(BannerMode mode, const char* toolName);
 

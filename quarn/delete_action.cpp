@@ -14,7 +14,6 @@ namespace quarn {
 using arlib::ArchiveMember;
 
 void deleteMembers(Run& run) {
-  if (isMissing(run)) return;
   const MemberSelection selection(run.archive);
   std::vector<ArchiveMember*> doomed;
   std::unordered_set<const ArchiveMember*> isDoomed;

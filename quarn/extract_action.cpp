@@ -130,13 +130,11 @@ private:
 } // namespace
 
 void extractMembers(Run& run) {
-  if (isMissing(run)) return;
   Extraction extraction(run);
   forEachSelectedMember(run.archive, run.settings.fileList, extraction);
 }
 
 void printMembers(Run& run) {
-  if (isMissing(run)) return;
   Printing printing(run);
   forEachSelectedMember(run.archive, run.settings.fileList, printing);
   printing.finish();

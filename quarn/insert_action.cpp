@@ -166,8 +166,7 @@ void insertFiles(Run& run) {
     if (run.settings.createArchive) {
       reportMessage(messages::ErrorWord, messages::NoMembersForCreate);
     }
-    run.settings.accessMode = Access_None;
-    run.openStatus.missing = false;
+    run.isCancelled = true;
     return;
   }
   Insertion insertion(run);

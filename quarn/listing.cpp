@@ -56,13 +56,11 @@ std::string reprinted(std::string_view attributeText) {
 } // namespace
 
 void listMembers(Run& run) {
-  if (isMissing(run)) return;
   Listing listing(run.settings.verbose);
   forEachSelectedMember(run.archive, run.settings.fileList, listing);
 }
 
 void listSymbolTable(Run& run) {
-  if (isMissing(run)) return;
   run.archive.updateAuxiliaryMembers();
   if (run.archive.getSymbolTable() == nullptr) {
     reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.archiveName());

@@ -78,7 +78,6 @@ void Movement::reorder() {
 } // namespace
 
 void moveMembers(Run& run) {
-  if (isMissing(run)) return;
   Movement movement(run);
   for (const std::string& word : run.settings.fileList) {
     const ArchiveMember* member = movement.move(word);

@@ -127,7 +127,6 @@ void ObjectReport::printEntries() const {
 } // namespace
 
 void reportObjects(Run& run, uint32_t flags) {
-  if (isMissing(run)) return;
   ObjectReport(run.archive, flags).print();
   // A member that somebody has cut short meanwhile looks like one that is no object. Too late to
   // take anything back, but not to tell.

@@ -80,7 +80,7 @@ void OptionReporter::reportOptionMessage(ReportLevel level, OptionMessage messag
     std::visit([&pieces](auto piece) { pieces.emplace_back(piece); }, argument);
   }
   messages::reportArguments(severityWordOf(level), nullptr, keyOf(message), pieces);
-  if (level == ReportLevel::Fatal) endAfterFatalMessage();
+  if (level == ReportLevel::Fatal) messages::endProcess(1);
 }
 
 } // namespace quarn

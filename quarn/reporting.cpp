@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "quarn/reporting.h"
 
-#include "quarn/start_up.h"
-
 #include <cstring>
 
 namespace quarn {
 
-void endAfterFatalMessage() {
-  shutDown(1);
+bool hasErrors() {
+  return messages::errorCount() != 0;
 }
 
 // The process never leaves the C locale, so the text is the same for every user. Where the host has

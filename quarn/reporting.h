@@ -4,20 +4,21 @@
 #pragma once
 
 #include "messages/interface/messages.h"
+#include "messages/interface/process_end.h"
 
 #include <string>
 
 namespace quarn {
 
-// Ends the process with status 1; does not return.
-[[noreturn]] void endAfterFatalMessage();
+// Whether an error has been counted in this run.
+[[nodiscard]] bool hasErrors();
 
 // Prints a catalogue message. A severity word of fatal or above ends the process. Returns whether
 // something was printed.
 template <class... Arguments>
 bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&... arguments) {
   const bool isPrinted = messages::report(severityWord, nullptr, key, arguments...);
-  if (severityWord >= messages::FatalWord) endAfterFatalMessage();
+  if (severityWord >= messages::FatalWord) messages::endProcess(1);
   return isPrinted;
 }
 

@@ -22,15 +22,13 @@ constexpr int32_t PositionAtEnd = -1;
 
 struct Run {
   arlib::Archive& archive;
-  Settings& settings;
+  const Settings& settings;
   ArchiveOpenStatus& openStatus;
   int32_t position = PositionAtEnd;
+  bool isCancelled = false; // there is nothing to do: nothing is written
 
   [[nodiscard]] const char* archiveName() const { return archive.getFileName(); }
 };
-
-// For every action but insert: reports an archive that isn't there.
-bool isMissing(const Run& run);
 
 // Prints a line like "a - %s" on stdout, where -v asks for it.
 template <class... Arguments>

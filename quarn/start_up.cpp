@@ -34,7 +34,7 @@ void startUp(int argc, const char* const* argv, support::Host& host) {
   support::toolNameFrom(argc > 0 ? argv[0] : nullptr, toolName);
   quarnMain(argc, argv, toolName.data(), host, *driverRegion);
   flushOutput();
-  shutDown(messages::errorCount() != 0 ? 1 : 0);
+  shutDown(hasErrors() ? 1 : 0);
 }
 
 // Objects of the work may still be alive where a message ends the run, so what the regions hold is

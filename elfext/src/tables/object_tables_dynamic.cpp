@@ -24,8 +24,8 @@ std::vector<DynamicTag> getTags(const ObjectTables& tables, const uint8_t* bytes
   return tags;
 }
 
-// The strings that a section with dynamic data names; none is fine.
-bool hasStrings(ObjectTables& tables, uint32_t section) {
+// The strings that a section with dynamic data names; none is fine. False after a report.
+bool checkStrings(ObjectTables& tables, uint32_t section) {
   const std::optional<uint32_t> table = tables.stringTableOf(section);
   return !table || tables.viewSection(*table) != nullptr;
 }
@@ -61,18 +61,19 @@ std::optional<VersionTables> findVersions(const ObjectTables& tables, const Vers
   return versions;
 }
 
-bool hasRecords(ObjectTables& tables, std::optional<uint32_t> section) {
+// The same for the records of a version section and their strings.
+bool checkRecords(ObjectTables& tables, std::optional<uint32_t> section) {
   if (!section || tables.sectionHeaders[*section].size == 0) return true;
-  return tables.viewSection(*section) != nullptr && hasStrings(tables, *section);
+  return tables.viewSection(*section) != nullptr && checkStrings(tables, *section);
 }
 
 bool checkVersions(ObjectTables& tables, const VersionCounts& counts) {
   tables.versions = findVersions(tables, counts);
   if (!tables.versions) return true;
   const VersionTables& versions = *tables.versions;
-  if (!hasRecords(tables, versions.definitions)) return false;
+  if (!checkRecords(tables, versions.definitions)) return false;
   if (!versions.symbolVersions) return true;
-  if (!hasRecords(tables, versions.requirements)) return false;
+  if (!checkRecords(tables, versions.requirements)) return false;
   return !versions.dynamicSymbols || tables.rowCount(*versions.dynamicSymbols) == 0 ||
          tables.viewSection(*versions.symbolVersions) != nullptr;
 }
@@ -121,7 +122,7 @@ private:
     const SectionHeader& header = m_Tables.sectionHeaders[section];
     if (!hasFileBytes(header)) return true;
     if (m_Tables.viewSection(section) == nullptr) return false;
-    if (!hasStrings(m_Tables, value.dynamicSection)) return false;
+    if (!checkStrings(m_Tables, value.dynamicSection)) return false;
     m_Tables.preemptionMaps.push_back(
         {section, value.value - startOf(header), value.dynamicSection});
     return true;
@@ -139,7 +140,7 @@ public:
     const SectionHeader& header = m_Tables.sectionHeaders[index];
     if (header.size == 0) return true;
     const uint8_t* bytes = m_Tables.viewSection(index);
-    if (bytes == nullptr || !hasStrings(m_Tables, index)) return false;
+    if (bytes == nullptr || !checkStrings(m_Tables, index)) return false;
     DynamicTable table = {index, getTags(m_Tables, bytes, header.size)};
     VersionCounts counts;
     for (const DynamicTag& tag : table.tags)
