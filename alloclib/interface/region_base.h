@@ -39,7 +39,7 @@ protected:
   ~Region() = default;
 };
 
-constexpr size_t roundUp(size_t size, size_t multiple) {
+[[nodiscard]] constexpr size_t roundUp(size_t size, size_t multiple) {
   return (size + multiple - 1) & ~(multiple - 1);
 }
 

@@ -72,7 +72,7 @@ private:
     LargeBlock* next;
     LargeBlock* previous;
   };
-  // At the start of a returned piece of bucketBound bytes or more.
+  // At the start of a returned piece of BucketBound bytes or more.
   struct FreeChunk {
     size_t size;
     FreeChunk* next;
@@ -82,10 +82,10 @@ private:
     FreePiece* next;
   };
 
-  static constexpr size_t pageSize = 4096;
-  static constexpr size_t largeSize = 10240;
-  static constexpr size_t bucketBound = 128;
-  static constexpr size_t bucketCount = bucketBound / 8;
+  static constexpr size_t PageSize = 4096;
+  static constexpr size_t LargeSize = 10240;
+  static constexpr size_t BucketBound = 128;
+  static constexpr size_t BucketCount = BucketBound / 8;
 
   RegionGeneral(RegionStats* stats, Region* parent, uint32_t flagsState)
       : m_Stats(stats), m_Parent(parent), m_FlagsState(flagsState) {}

@@ -29,15 +29,15 @@ private:
   friend struct RegionFastOld;
   friend class RegionLargeBlockPeer;
 
-  static constexpr size_t pageSize = 4096;
-  static constexpr size_t chunkSize = size_t{1} << 20;
-  static constexpr size_t forwardSize = 0x20000;
-  static constexpr uint32_t mapWords = 320;
-  static constexpr uint32_t wordsPerChunk = chunkSize / pageSize / 32;
-  static constexpr uint32_t chunkCount = mapWords / wordsPerChunk;
+  static constexpr size_t PageSize = 4096;
+  static constexpr size_t ChunkSize = size_t{1} << 20;
+  static constexpr size_t ForwardSize = 0x20000;
+  static constexpr uint32_t MapWords = 320;
+  static constexpr uint32_t WordsPerChunk = ChunkSize / PageSize / 32;
+  static constexpr uint32_t ChunkCount = MapWords / WordsPerChunk;
   // A hint behind the map: this instance is not searched.
-  static constexpr uint32_t exhaustedHint = mapWords + 1;
-  static constexpr uint32_t noRun = mapWords * 32;
+  static constexpr uint32_t ExhaustedHint = MapWords + 1;
+  static constexpr uint32_t NoRun = MapWords * 32;
 
   RegionLargeBlock(RegionStats* stats, Region* parent, bool transparent, bool ownedParent);
   static RegionLargeBlock* createOn(Region* parent, const char* name, bool transparent,
@@ -45,7 +45,7 @@ private:
 
   void* allocatePages(uint32_t pages);
   void* allocateFromOverflow(uint32_t pages);
-  // The first bit of a run of free pages from the hint on; noRun if there is none.
+  // The first bit of a run of free pages from the hint on; NoRun if there is none.
   [[nodiscard]] uint32_t findRun(uint32_t pages) const;
   [[nodiscard]] RegionLargeBlock* findOwner(const void* pointer, uint32_t& bit);
   void SetBits(uint32_t firstBit, uint32_t count, bool free);
@@ -54,8 +54,8 @@ private:
 
   RegionStats* m_Stats;
   Region* m_Parent;
-  uint32_t m_Bitmap[mapWords];
-  char* m_Chunks[chunkCount] = {};
+  uint32_t m_Bitmap[MapWords];
+  char* m_Chunks[ChunkCount] = {};
   uint32_t m_Hint = 0;
   RegionLargeBlock* m_Overflow = nullptr;
   bool m_Transparent;

@@ -25,10 +25,10 @@ namespace alloclib {
 namespace {
 
 // A working block holds this much beyond the request that made it, and is then cut to pages.
-constexpr size_t blockReserve = 3000;
+constexpr size_t BlockReserve = 3000;
 
 // Far below where adding headers and pages could wrap.
-constexpr size_t largestRequest = PTRDIFF_MAX - (size_t{1} << 16);
+constexpr size_t LargestRequest = PTRDIFF_MAX - (size_t{1} << 16);
 
 size_t gapBefore(const char* address, size_t alignment) {
   return -reinterpret_cast<uintptr_t>(address) & (alignment - 1);
@@ -55,9 +55,9 @@ RegionGeneral* RegionGeneral::Create(size_t initialSize, const char* name) {
   switch (getDebugMode()) {
   case Debug_Off:
   case Debug_Plain:
-    return createPlain(getProcessLargeBlock(), pageSize, pageSize, name, Flags_Fast);
+    return createPlain(getProcessLargeBlock(), PageSize, PageSize, name, Flags_Fast);
   case Debug_Tracing:
-    return createPlain(getProcessLargeBlock(), pageSize, pageSize, name, Flags_FastTracing);
+    return createPlain(getProcessLargeBlock(), PageSize, PageSize, name, Flags_FastTracing);
   case Debug_Transparent:
     return createTransparent(getProcessLargeBlock(), initialSize, name);
   default:
@@ -70,7 +70,7 @@ RegionGeneral* RegionGeneral::createPlain(Region* parent, size_t firstBlockSize,
   static_assert(sizeof(Block) == 16 && sizeof(LargeBlock) == 24);
   const bool tracing = (flagsState & Flags_Tracing) != 0;
   RegionStats* stats = RegionStats::start(name, initialSize, tracing);
-  void* memory = parent->AllocFull(firstBlockSize, pageSize, nullptr);
+  void* memory = parent->AllocFull(firstBlockSize, PageSize, nullptr);
   Block* block = ::new (memory) Block{firstBlockSize, nullptr};
 
   auto* region = ::new (static_cast<void*>(block + 1)) RegionGeneral(stats, parent, flagsState);
@@ -87,8 +87,8 @@ RegionGeneral* RegionGeneral::createPlain(Region* parent, size_t firstBlockSize,
 // left behind; the shell lies in that region, too.
 RegionGeneral* RegionGeneral::createTransparent(Region* parent, size_t initialSize,
                                                 const char* name) {
-  if (initialSize > largestRequest) outOfMemory(initialSize);
-  const size_t firstBlockSize = std::max(pageSize, roundUp(initialSize, pageSize));
+  if (initialSize > LargestRequest) outOfMemory(initialSize);
+  const size_t firstBlockSize = std::max(PageSize, roundUp(initialSize, PageSize));
   RegionGeneral* inner = createPlain(parent, firstBlockSize, initialSize, name, Flags_Fast);
   void* memory = inner->allocate(sizeof(RegionGeneral));
   auto* shell = ::new (memory) RegionGeneral(inner->m_Stats, inner, SLOW_TRANSPARENT);
@@ -142,23 +142,23 @@ void RegionGeneral::releaseBlocks() {
   for (LargeBlock *large = m_LargeBlocks, *next = nullptr; large != nullptr; large = next) {
     next = large->next;
     unpoison(large, large->size);
-    parent->DiscardFull(large, large->size, pageSize);
+    parent->DiscardFull(large, large->size, PageSize);
   }
   for (Block *block = m_Blocks, *next = nullptr; block != nullptr; block = next) {
     next = block->next;
     unpoison(block, block->size);
-    parent->DiscardFull(block, block->size, pageSize);
+    parent->DiscardFull(block, block->size, PageSize);
   }
 }
 
 void* RegionGeneral::allocateSlow(size_t size, size_t alignment) {
-  QUARN_ASSERT(1, std::has_single_bit(alignment) && alignment <= pageSize);
-  if (size > largestRequest) outOfMemory(size);
+  QUARN_ASSERT(1, std::has_single_bit(alignment) && alignment <= PageSize);
+  if (size > LargestRequest) outOfMemory(size);
   const size_t bytes = roundUp(size, 8);
 
   void* block = nullptr;
   if ((m_FlagsState & Flags_Buckets) != 0) block = allocateFromBucket(bytes, alignment);
-  if (block == nullptr && size >= largeSize) block = allocateLarge(bytes, alignment);
+  if (block == nullptr && size >= LargeSize) block = allocateLarge(bytes, alignment);
   if (block == nullptr) block = allocateFromWorkingBlock(bytes, alignment);
 
   if (isTracing()) m_Stats->allocated(block, bytes, bytes - size);
@@ -169,8 +169,8 @@ void* RegionGeneral::allocateSlow(size_t size, size_t alignment) {
 
 void* RegionGeneral::allocateLarge(size_t bytes, size_t alignment) {
   const size_t header = getLargeHeaderSize(sizeof(LargeBlock), alignment);
-  const size_t total = (bytes + header - 1 + pageSize) / pageSize * pageSize;
-  void* memory = m_Parent->AllocFull(total, pageSize, nullptr);
+  const size_t total = (bytes + header - 1 + PageSize) / PageSize * PageSize;
+  void* memory = m_Parent->AllocFull(total, PageSize, nullptr);
   auto* large = ::new (memory) LargeBlock{total, m_LargeBlocks, nullptr};
   if (m_LargeBlocks != nullptr) m_LargeBlocks->previous = large;
   m_LargeBlocks = large;
@@ -183,7 +183,7 @@ void* RegionGeneral::allocateLarge(size_t bytes, size_t alignment) {
 void* RegionGeneral::allocateFromBucket(size_t bytes, size_t alignment) {
   // A piece of this size has room for the alignment wherever it starts.
   const size_t pieceBytes = alignment > 8 ? bytes - 8 + alignment : bytes;
-  if (pieceBytes >= bucketBound || m_Buckets == nullptr) return nullptr;
+  if (pieceBytes >= BucketBound || m_Buckets == nullptr) return nullptr;
   FreePiece*& head = m_Buckets[pieceBytes / 8];
   if (head == nullptr) return nullptr;
 
@@ -214,8 +214,8 @@ void RegionGeneral::makeWorkingBlock(size_t bytes, size_t alignment) {
 
   const size_t worstGap = alignment > 8 ? alignment - 8 : 0;
   const size_t total =
-      (bytes + worstGap + blockReserve + sizeof(Block) - 1 + pageSize) / pageSize * pageSize;
-  void* memory = m_Parent->AllocFull(total, pageSize, nullptr);
+      (bytes + worstGap + BlockReserve + sizeof(Block) - 1 + PageSize) / PageSize * PageSize;
+  void* memory = m_Parent->AllocFull(total, PageSize, nullptr);
   m_Blocks = ::new (memory) Block{total, m_Blocks};
   m_Cursor = reinterpret_cast<char*>(m_Blocks + 1);
   m_WorkingEnd = static_cast<char*>(memory) + total;
@@ -246,7 +246,7 @@ bool RegionGeneral::reuseFreeChunk(size_t bytes, size_t alignment) {
 void RegionGeneral::discardSlow(void* pointer, size_t size, size_t alignment) {
   const size_t bytes = roundUp(size, 8);
   if (isTracing()) m_Stats->discarded(pointer, size, bytes - size);
-  if (size >= largeSize) return discardLarge(pointer, size, alignment);
+  if (size >= LargeSize) return discardLarge(pointer, size, alignment);
   putAside(static_cast<char*>(pointer), bytes);
   // The buckets may have become worth a look, or have cost a new working block themselves.
   SetBlockWorkingState();
@@ -265,14 +265,14 @@ void RegionGeneral::discardLarge(void* pointer, size_t size, size_t alignment) {
   else
     m_Stats->discarded(large, total, 0);
   unpoison(large, total);
-  m_Parent->DiscardFull(large, total, pageSize);
+  m_Parent->DiscardFull(large, total, PageSize);
 }
 
 // Keeps a piece for reuse. `bytes` is a multiple of 8.
 void RegionGeneral::putAside(char* piece, size_t bytes) {
   if (bytes == 0) return;
   noteFragmentation(bytes);
-  if (bytes < bucketBound)
+  if (bytes < BucketBound)
     pushBucket(piece, bytes);
   else
     pushFreeChunk(piece, bytes);
@@ -280,11 +280,11 @@ void RegionGeneral::putAside(char* piece, size_t bytes) {
 
 void RegionGeneral::pushBucket(char* piece, size_t bytes) {
   if (m_Buckets == nullptr) {
-    constexpr size_t bucketArrayBytes = bucketCount * sizeof(FreePiece*);
-    void* memory = allocateFromWorkingBlock(bucketArrayBytes, 8);
-    unpoison(memory, bucketArrayBytes);
-    m_Buckets = static_cast<FreePiece**>(std::memset(memory, 0, bucketArrayBytes));
-    if (isTracing()) m_Stats->overheadIncreased(bucketArrayBytes);
+    constexpr size_t BucketArrayBytes = BucketCount * sizeof(FreePiece*);
+    void* memory = allocateFromWorkingBlock(BucketArrayBytes, 8);
+    unpoison(memory, BucketArrayBytes);
+    m_Buckets = static_cast<FreePiece**>(std::memset(memory, 0, BucketArrayBytes));
+    if (isTracing()) m_Stats->overheadIncreased(BucketArrayBytes);
   }
   poison(piece, bytes);
   unpoison(piece, sizeof(FreePiece));
@@ -305,7 +305,7 @@ void RegionGeneral::SetBlockWorkingState() {
   switch (m_FlagsState & ~uint32_t{Flags_Tracing}) {
   case Flags_Fast:
   case Flags_Buckets:
-    m_FlagsState = tracing | (m_BucketBytes > largeSize ? Flags_Buckets : Flags_Fast);
+    m_FlagsState = tracing | (m_BucketBytes > LargeSize ? Flags_Buckets : Flags_Fast);
     break;
   case SLOW_TRANSPARENT:
     internalError("SLOW_TRANSPARENT occurred in SetBlockWorkingState");
@@ -319,7 +319,7 @@ void RegionGeneral::SetBlockWorkingState() {
 void RegionGeneral::setFastLimit() {
   switch (m_FlagsState) {
   case Flags_Fast:
-    m_FastLimit = m_Cursor + std::min(static_cast<size_t>(m_WorkingEnd - m_Cursor), largeSize);
+    m_FastLimit = m_Cursor + std::min(static_cast<size_t>(m_WorkingEnd - m_Cursor), LargeSize);
     return;
   case Flags_Buckets:
   case Flags_FastTracing:

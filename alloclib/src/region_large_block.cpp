@@ -43,7 +43,7 @@ RegionLargeBlock* RegionFastOld::Create(const char* name) {
 
 RegionLargeBlock* RegionLargeBlock::createOn(Region* parent, const char* name, bool transparent,
                                              bool ownedParent) {
-  RegionStats* stats = RegionStats::start(name, transparent ? 0 : chunkSize, true);
+  RegionStats* stats = RegionStats::start(name, transparent ? 0 : ChunkSize, true);
   void* memory = parent->AllocFull(sizeof(RegionLargeBlock), alignof(RegionLargeBlock), nullptr);
   return ::new (memory) RegionLargeBlock(stats, parent, transparent, ownedParent);
 }
@@ -57,26 +57,26 @@ RegionLargeBlock::RegionLargeBlock(RegionStats* stats, Region* parent, bool tran
 }
 
 void* RegionLargeBlock::AllocFull(size_t size, size_t alignment, const char* fileLine) {
-  if (size == 0 || size % pageSize != 0) internalError("Invalid allocation using RegionLargeBlock");
+  if (size == 0 || size % PageSize != 0) internalError("Invalid allocation using RegionLargeBlock");
   if (m_Transparent) return m_Parent->AllocFull(size, alignment, fileLine);
-  void* block = size >= forwardSize ? m_Parent->AllocFull(size, alignment, fileLine)
-                                    : allocatePages(static_cast<uint32_t>(size / pageSize));
+  void* block = size >= ForwardSize ? m_Parent->AllocFull(size, alignment, fileLine)
+                                    : allocatePages(static_cast<uint32_t>(size / PageSize));
   unpoison(block, size);
   m_Stats->allocated(block, size, 0);
   return block;
 }
 
 void RegionLargeBlock::DiscardFull(void* pointer, size_t size, size_t alignment) {
-  if (size == 0 || size % pageSize != 0) internalError("Invalid discard using RegionLargeBlock");
+  if (size == 0 || size % PageSize != 0) internalError("Invalid discard using RegionLargeBlock");
   if (m_Transparent) return m_Parent->DiscardFull(pointer, size, alignment);
   m_Stats->discarded(pointer, size, 0);
   if (m_FillDiscarded) std::memset(pointer, m_FillByte++, size);
-  if (size >= forwardSize) return m_Parent->DiscardFull(pointer, size, alignment);
+  if (size >= ForwardSize) return m_Parent->DiscardFull(pointer, size, alignment);
 
   uint32_t bit = 0;
   RegionLargeBlock* owner = findOwner(pointer, bit);
   if (owner == nullptr) invalidPointer(pointer);
-  owner->SetBits(bit, static_cast<uint32_t>(size / pageSize), true);
+  owner->SetBits(bit, static_cast<uint32_t>(size / PageSize), true);
   owner->m_Hint = std::min(owner->m_Hint, bit / 32);
   poison(pointer, size);
 }
@@ -95,8 +95,8 @@ void RegionLargeBlock::Destroy(bool freeMemory) {
 void RegionLargeBlock::releaseChunks() {
   for (char* chunk : m_Chunks) {
     if (chunk == nullptr) continue;
-    unpoison(chunk, chunkSize);
-    m_Parent->DiscardFull(chunk, chunkSize, pageSize);
+    unpoison(chunk, ChunkSize);
+    m_Parent->DiscardFull(chunk, ChunkSize, PageSize);
   }
   if (m_Overflow == nullptr) return;
   m_Overflow->releaseChunks();
@@ -105,16 +105,16 @@ void RegionLargeBlock::releaseChunks() {
 
 void* RegionLargeBlock::allocatePages(uint32_t pages) {
   const uint32_t firstBit = findRun(pages);
-  if (firstBit == noRun) return allocateFromOverflow(pages);
+  if (firstBit == NoRun) return allocateFromOverflow(pages);
   if (pages == 1) m_Hint = firstBit / 32;
-  const uint32_t chunk = firstBit / 32 / wordsPerChunk;
+  const uint32_t chunk = firstBit / 32 / WordsPerChunk;
   if (m_Chunks[chunk] == nullptr) makeChunk(chunk);
   SetBits(firstBit, pages, false);
-  return m_Chunks[chunk] + size_t{firstBit % (wordsPerChunk * 32)} * pageSize;
+  return m_Chunks[chunk] + size_t{firstBit % (WordsPerChunk * 32)} * PageSize;
 }
 
 void* RegionLargeBlock::allocateFromOverflow(uint32_t pages) {
-  m_Hint = exhaustedHint;
+  m_Hint = ExhaustedHint;
   if (m_Overflow == nullptr) {
     void* memory =
         m_Parent->AllocFull(sizeof(RegionLargeBlock), alignof(RegionLargeBlock), nullptr);
@@ -125,10 +125,10 @@ void* RegionLargeBlock::allocateFromOverflow(uint32_t pages) {
 
 uint32_t RegionLargeBlock::findRun(uint32_t pages) const {
   uint32_t length = 0;
-  for (uint32_t word = m_Hint; word < mapWords; ++word) {
+  for (uint32_t word = m_Hint; word < MapWords; ++word) {
     const uint32_t bits = m_Bitmap[word];
     // Pages of two chunks are no neighbours.
-    if (bits == 0 || word % wordsPerChunk == 0) length = 0;
+    if (bits == 0 || word % WordsPerChunk == 0) length = 0;
     if (bits == 0) continue;
     const uint32_t start = length == 0 && (bits & 0xFFFF) == 0 ? 16 : 0;
     for (uint32_t bit = start; bit < 32; ++bit) {
@@ -136,16 +136,16 @@ uint32_t RegionLargeBlock::findRun(uint32_t pages) const {
       if (length == pages) return word * 32 + bit + 1 - pages;
     }
   }
-  return noRun;
+  return NoRun;
 }
 
 RegionLargeBlock* RegionLargeBlock::findOwner(const void* pointer, uint32_t& bit) {
   const auto address = reinterpret_cast<uintptr_t>(pointer);
   for (RegionLargeBlock* owner = this; owner != nullptr; owner = owner->m_Overflow) {
-    for (uint32_t chunk = 0; chunk < chunkCount; ++chunk) {
+    for (uint32_t chunk = 0; chunk < ChunkCount; ++chunk) {
       const uintptr_t offset = address - reinterpret_cast<uintptr_t>(owner->m_Chunks[chunk]);
-      if (owner->m_Chunks[chunk] == nullptr || offset >= chunkSize) continue;
-      bit = chunk * wordsPerChunk * 32 + static_cast<uint32_t>(offset / pageSize);
+      if (owner->m_Chunks[chunk] == nullptr || offset >= ChunkSize) continue;
+      bit = chunk * WordsPerChunk * 32 + static_cast<uint32_t>(offset / PageSize);
       return owner;
     }
   }
@@ -153,8 +153,8 @@ RegionLargeBlock* RegionLargeBlock::findOwner(const void* pointer, uint32_t& bit
 }
 
 void RegionLargeBlock::SetBits(uint32_t firstBit, uint32_t count, bool free) {
-  constexpr uint32_t mapBits = mapWords * 32;
-  if (firstBit > mapBits || count > mapBits - firstBit) internalError("SetBits outside of bitmap");
+  constexpr uint32_t MapBits = MapWords * 32;
+  if (firstBit > MapBits || count > MapBits - firstBit) internalError("SetBits outside of bitmap");
   for (uint32_t bit = firstBit; bit < firstBit + count; ++bit) {
     const uint32_t mask = uint32_t{1} << bit % 32;
     m_Bitmap[bit / 32] = free ? m_Bitmap[bit / 32] | mask : m_Bitmap[bit / 32] & ~mask;
@@ -162,8 +162,8 @@ void RegionLargeBlock::SetBits(uint32_t firstBit, uint32_t count, bool free) {
 }
 
 void RegionLargeBlock::makeChunk(uint32_t chunk) {
-  m_Chunks[chunk] = static_cast<char*>(m_Parent->AllocFull(chunkSize, pageSize, nullptr));
-  poison(m_Chunks[chunk], chunkSize);
+  m_Chunks[chunk] = static_cast<char*>(m_Parent->AllocFull(ChunkSize, PageSize, nullptr));
+  poison(m_Chunks[chunk], ChunkSize);
   m_Stats->extended();
 }
 

@@ -17,7 +17,7 @@
 namespace alloclib {
 namespace {
 
-constexpr uint32_t rootSequenceNumber = 1;
+constexpr uint32_t RootSequenceNumber = 1;
 
 // One line of the report: fields at fixed columns, in a buffer of blanks. A field that is too
 // long is cut where the next one starts.
@@ -26,8 +26,8 @@ public:
   ReportLine() { std::memset(m_Buffer, ' ', sizeof m_Buffer); }
 
   void put(size_t column, const char* text) {
-    std::memset(m_Buffer + column, ' ', lineEnd - column);
-    std::memcpy(m_Buffer + column, text, std::min(std::strlen(text), lineEnd - column));
+    std::memset(m_Buffer + column, ' ', LineEnd - column);
+    std::memcpy(m_Buffer + column, text, std::min(std::strlen(text), LineEnd - column));
   }
 
   void putNumber(size_t column, uint64_t number) {
@@ -37,12 +37,12 @@ public:
   }
 
   void write(std::FILE* stream) {
-    m_Buffer[lineEnd] = '\n';
-    std::fwrite(m_Buffer, 1, lineEnd + 1, stream);
+    m_Buffer[LineEnd] = '\n';
+    std::fwrite(m_Buffer, 1, LineEnd + 1, stream);
   }
 
 private:
-  static constexpr size_t lineEnd = 78;
+  static constexpr size_t LineEnd = 78;
 
   char m_Buffer[1024];
 };
@@ -57,7 +57,7 @@ static_assert(sizeof(RegionStats) == 120);
 
 RegionStats::List RegionStats::s_Live;
 RegionStats::List RegionStats::s_Finished;
-uint32_t RegionStats::s_NextSequenceNumber = rootSequenceNumber;
+uint32_t RegionStats::s_NextSequenceNumber = RootSequenceNumber;
 uint32_t RegionStats::s_FinishedLimit = 0;
 
 void RegionStats::List::append(RegionStats* record) {
@@ -211,7 +211,7 @@ void RegionStats::report(std::FILE* stream, bool includeFinished, bool flagLive)
 
 void RegionStats::reportList(std::FILE* stream, const List& list, bool flagLive) {
   for (const RegionStats* record = list.first; record != nullptr; record = record->m_Next) {
-    if (flagLive && record->m_SequenceNumber > rootSequenceNumber)
+    if (flagLive && record->m_SequenceNumber > RootSequenceNumber)
       std::fputs("ERROR: Following region was not destroyed before program termination!\n", stream);
     record->writeLine(stream);
   }
@@ -235,14 +235,14 @@ void RegionStats::writeLine(std::FILE* stream) const {
 
 void RegionStats::freeAll() {
   for (const RegionStats* record = s_Live.first; record != nullptr; record = record->m_Next)
-    if (record->m_SequenceNumber > rootSequenceNumber)
+    if (record->m_SequenceNumber > RootSequenceNumber)
       internalError("FreeAllStats called with live region");
   while (s_Finished.first != nullptr) {
     RegionStats* record = s_Finished.first;
     s_Finished.unlink(record);
     record->release();
   }
-  if (s_Live.first == nullptr) s_NextSequenceNumber = rootSequenceNumber;
+  if (s_Live.first == nullptr) s_NextSequenceNumber = RootSequenceNumber;
 }
 
 } // namespace alloclib
