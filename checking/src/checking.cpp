@@ -49,7 +49,7 @@ bool takePrefix(std::string_view& text, std::string_view prefix) {
 // of levels if there is none.
 uint32_t takeLevelName(std::string_view& text) {
   uint32_t level = 0;
-  for (std::string_view name : levelNames) {
+  for (std::string_view name : LevelNames) {
     if (takePrefix(text, name)) return level;
     ++level;
   }
@@ -106,7 +106,7 @@ bool set_checking_level(const char* text) {
   }
   const bool show = takePrefix(rest, "show,");
   uint32_t level = takeLevelName(rest);
-  if (level == std::size(levelNames)) {
+  if (level == std::size(LevelNames)) {
     if (!show) return false;
     level = Level_None;
   }

@@ -8,7 +8,7 @@
 
 namespace checking {
 
-constexpr std::string_view levelNames[] = {"none", "low", "medium", "high", "extravagant"};
-constexpr std::string_view temperatureNames[] = {"cold", "hot"};
+constexpr std::string_view LevelNames[] = {"none", "low", "medium", "high", "extravagant"};
+constexpr std::string_view TemperatureNames[] = {"cold", "hot"};
 
 } // namespace checking

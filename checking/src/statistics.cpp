@@ -39,13 +39,13 @@ bool counting = false;
 void showSite(const SiteCount& siteCount) {
   const auto& [site, count] = siteCount;
   std::ostringstream text;
-  text << site.path << ' ' << site.line << " (" << temperatureNames[site.temperature] << ' '
-       << levelNames[site.level] << "): " << count << '\n';
+  text << site.path << ' ' << site.line << " (" << TemperatureNames[site.temperature] << ' '
+       << LevelNames[site.level] << "): " << count << '\n';
   showText(text.str());
 }
 
 void showTotals() {
-  std::array<std::array<uint64_t, std::size(levelNames)>, std::size(temperatureNames)> totals = {};
+  std::array<std::array<uint64_t, std::size(LevelNames)>, std::size(TemperatureNames)> totals = {};
   for (const auto& [site, count] : siteCounts)
     totals[site.temperature][site.level] += count;
 
@@ -53,7 +53,7 @@ void showTotals() {
   text << "\nTotals:\n";
   for (size_t temperature = 0; temperature < totals.size(); ++temperature)
     for (size_t level = 0; level < totals[temperature].size(); ++level)
-      text << temperatureNames[temperature] << ' ' << levelNames[level] << ": "
+      text << TemperatureNames[temperature] << ' ' << LevelNames[level] << ": "
            << totals[temperature][level] << '\n';
   showText(text.str());
 }
