@@ -4,5 +4,5 @@
 
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
-  quarn::startUp(argc, argv, support::posixHost());
+  quarn::startUp(argc, argv, support::getPosixHost());
 }

@@ -67,7 +67,7 @@ void showCommandLine(const Parser& parser, const char* toolName) {
 }
 
 [[noreturn]] void showVersionNumber() {
-  messages::writeRaw(support::versionNumberText(support::buildData()) + "\n");
+  messages::writeRaw(support::versionNumberText(support::getBuildData()) + "\n");
   std::exit(flushOutput() ? 0 : 1);
 }
 

@@ -5,7 +5,7 @@
 //
 //   int main() {
 //     alloclib::Session session;
-//     arlib::Archive archive(support::posixHost());
+//     arlib::Archive archive(support::getPosixHost());
 //     ...
 //   }
 #pragma once

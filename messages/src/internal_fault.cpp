@@ -45,9 +45,9 @@ uint32_t extendHash(uint32_t hash, std::string_view text) {
   countMessage(Severity_InternalFault);
   std::string& line = freshLine();
   appendLead(line, nullptr, Severity_InternalFault);
-  appendArguments(
-      line, "[0x%06x:%s] ",
-      ArgumentArray<uint32_t, std::string>{hash, support::versionNumberText(support::buildData())});
+  appendArguments(line, "[0x%06x:%s] ",
+                  ArgumentArray<uint32_t, std::string>{
+                      hash, support::versionNumberText(support::getBuildData())});
   line.append(message).append("\n");
   writeText(messageState.diagnosticStream, line);
   endProcess(1);

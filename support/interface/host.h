@@ -124,10 +124,10 @@ public:
 };
 
 // The host that the process runs on.
-Host& posixHost();
+[[nodiscard]] Host& getPosixHost();
 
-// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of posixHost() before they
-// end the process, and a file size limit shows as a failed write instead of a signal.
+// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of getPosixHost() before
+// they end the process, and a file size limit shows as a failed write instead of a signal.
 void installSignalCleanUp();
 
 } // namespace support

@@ -13,22 +13,22 @@
 namespace support {
 
 // What a name stands for. A name that the host can't tell about counts as nothing.
-FileKind fileKind(Host& host, const char* name);
+[[nodiscard]] FileKind fileKind(Host& host, const char* name);
 
 // Modification time in seconds since 1970, or -1 if the host doesn't tell.
-int64_t fileTime(Host& host, const char* name);
+[[nodiscard]] int64_t fileTime(Host& host, const char* name);
 
 // Whether a name or pattern holds one of the two wildcard characters.
-bool hasWildcard(std::string_view text);
+[[nodiscard]] bool hasWildcard(std::string_view text);
 
 // The part of a file word that names the directory, up to and including the last "/"; may be empty.
-std::string_view directoryPart(std::string_view word);
+[[nodiscard]] std::string_view directoryPart(std::string_view word);
 
 // The names in a directory that match a leaf with "?" and "*", letter case counting, in byte order,
 // so that the same files give the same list whatever the host's order. `directory` is as
 // directoryPart gives it; empty is the current one. No match, or a directory that can't be listed,
 // gives an empty list.
-std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
-                                        std::string_view leaf);
+[[nodiscard]] std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
+                                                      std::string_view leaf);
 
 } // namespace support

@@ -9,21 +9,21 @@
 
 namespace support {
 
-constexpr char lowered(char character) {
+[[nodiscard]] constexpr char lowered(char character) {
   return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
                                               : character;
 }
 
-constexpr bool isLetter(char character) {
+[[nodiscard]] constexpr bool isLetter(char character) {
   return lowered(character) >= 'a' && lowered(character) <= 'z';
 }
 
 // Blank, tab, line feed, vertical tab, form feed, carriage return.
-constexpr bool isWhiteSpace(char character) {
+[[nodiscard]] constexpr bool isWhiteSpace(char character) {
   return character == ' ' || (character >= '\t' && character <= '\r');
 }
 
-constexpr bool equalIgnoringCase(std::string_view left, std::string_view right) {
+[[nodiscard]] constexpr bool equalIgnoringCase(std::string_view left, std::string_view right) {
   if (left.size() != right.size()) return false;
   for (size_t at = 0; at < left.size(); ++at) {
     if (lowered(left[at]) != lowered(right[at])) return false;

@@ -27,15 +27,18 @@ public:
   // and "\" both separate, and both become "\".
   explicit path(std::string_view name, PathStyle style = PathStyle_Detect);
 
-  PathStyle style() const { return m_Style; }
-  const std::string& drive() const { return m_Drive; }         // "c:" or "\\server\share"
-  const std::string& directory() const { return m_Directory; } // with its last separator
-  const std::string& base() const { return m_Base; }
-  const std::string& extension() const { return m_Extension; } // with its "."; may be empty
-  std::string leaf() const { return m_Base + m_Extension; }
+  [[nodiscard]] PathStyle getStyle() const { return m_Style; }
+  // "c:" or "\\server\share"
+  [[nodiscard]] const std::string& getDrive() const { return m_Drive; }
+  // With its last separator.
+  [[nodiscard]] const std::string& getDirectory() const { return m_Directory; }
+  [[nodiscard]] const std::string& getBase() const { return m_Base; }
+  // With its "."; may be empty.
+  [[nodiscard]] const std::string& getExtension() const { return m_Extension; }
+  [[nodiscard]] std::string getLeaf() const { return m_Base + m_Extension; }
 
   void replaceLeaf(std::string_view leaf);
-  std::string toString() const;
+  [[nodiscard]] std::string toString() const;
 
 private:
   std::string m_Drive;
@@ -46,9 +49,9 @@ private:
 };
 
 // PathStyle_Windows, PathStyle_Posix or PathStyle_Undetermined.
-PathStyle detectPathStyle(std::string_view name);
+[[nodiscard]] PathStyle detectPathStyle(std::string_view name);
 
 // What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
-std::string_view lastPathComponent(std::string_view name);
+[[nodiscard]] std::string_view lastPathComponent(std::string_view name);
 
 } // namespace support

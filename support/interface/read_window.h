@@ -25,10 +25,10 @@ public:
 
   // Makes up to `size` bytes at `offset` available; fewer only where the file ends, or on an error.
   // The view holds until the next call.
-  std::span<const uint8_t> fetch(uint64_t offset, size_t size, HostError& error);
+  [[nodiscard]] std::span<const uint8_t> fetch(uint64_t offset, size_t size, HostError& error);
 
 private:
-  HostError read(uint64_t offset, size_t size);
+  [[nodiscard]] HostError read(uint64_t offset, size_t size);
 
   // A step over at most so many bytes is part of a walk, and worth reading ahead for. A longer one
   // is a leap: reading what it leaps over would cost more than the host call that it saves.

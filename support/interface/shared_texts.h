@@ -16,7 +16,8 @@ namespace support {
 // Views of the copies, in the order of the texts. `copy` makes the copy of one text, which lives as
 // long as the views are used.
 template <class Copy>
-std::vector<std::string_view> copyShared(std::span<const char* const> texts, Copy copy) {
+[[nodiscard]] std::vector<std::string_view> copyShared(std::span<const char* const> texts,
+                                                       Copy copy) {
   std::vector<const char*> sorted(texts.begin(), texts.end());
   std::sort(sorted.begin(), sorted.end(), std::less<>());
   // By place. A text that starts within the one before it, or at its end, is an end of that.

@@ -21,12 +21,12 @@ struct BuildData {
 };
 
 // The data of this build.
-const BuildData& buildData();
+[[nodiscard]] const BuildData& getBuildData();
 
 // The lines that --vsn and the help begin with, without a final newline.
-std::string bannerText(const BuildData& data);
+[[nodiscard]] std::string bannerText(const BuildData& data);
 
 // One number for the whole version: "1000001" is 1.0.0, delivery 1.
-std::string versionNumberText(const BuildData& data);
+[[nodiscard]] std::string versionNumberText(const BuildData& data);
 
 } // namespace support

@@ -300,7 +300,7 @@ public:
 
 } // namespace
 
-Host& posixHost() {
+Host& getPosixHost() {
   static PosixHost host;
   return host;
 }

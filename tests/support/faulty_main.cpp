@@ -14,7 +14,7 @@
 namespace {
 
 testsupport::FaultyHost& faultyHost() {
-  static testsupport::FaultyHost host(support::posixHost());
+  static testsupport::FaultyHost host(support::getPosixHost());
   return host;
 }
 

@@ -73,7 +73,7 @@ protected:
   }
 
   fs::path m_Folder;
-  Host& m_Host = posixHost();
+  Host& m_Host = getPosixHost();
 };
 
 std::span<const uint8_t> bytesOf(std::string_view text) {

@@ -26,39 +26,39 @@ TEST(PathStyle, IsWindowsForABackslashInsideElseUndetermined) {
 }
 
 TEST(PathStyle, HasTheStyleNumbersOfItsFormat) {
-  EXPECT_EQ(path("c:\\x").style(), 2u);
-  EXPECT_EQ(path("/x").style(), 3u);
-  EXPECT_EQ(path("x").style(), 5u);
+  EXPECT_EQ(path("c:\\x").getStyle(), 2u);
+  EXPECT_EQ(path("/x").getStyle(), 3u);
+  EXPECT_EQ(path("x").getStyle(), 5u);
 }
 
 TEST(Path, SplitsAWindowsNameIntoFourStrings) {
   const path name("c:/lib/sub\\mem.v1.o");
-  EXPECT_EQ(name.drive(), "c:");
-  EXPECT_EQ(name.directory(), "\\lib\\sub\\");
-  EXPECT_EQ(name.base(), "mem.v1");
-  EXPECT_EQ(name.extension(), ".o");
+  EXPECT_EQ(name.getDrive(), "c:");
+  EXPECT_EQ(name.getDirectory(), "\\lib\\sub\\");
+  EXPECT_EQ(name.getBase(), "mem.v1");
+  EXPECT_EQ(name.getExtension(), ".o");
   EXPECT_EQ(name.toString(), "c:\\lib\\sub\\mem.v1.o");
 }
 
 TEST(Path, SplitsAShareFromItsDirectory) {
   const path name("//server/share/dir/x.o");
-  EXPECT_EQ(name.drive(), "\\\\server\\share");
-  EXPECT_EQ(name.directory(), "\\dir\\");
-  EXPECT_EQ(name.leaf(), "x.o");
-  EXPECT_EQ(path("\\\\server").drive(), "\\\\server");
+  EXPECT_EQ(name.getDrive(), "\\\\server\\share");
+  EXPECT_EQ(name.getDirectory(), "\\dir\\");
+  EXPECT_EQ(name.getLeaf(), "x.o");
+  EXPECT_EQ(path("\\\\server").getDrive(), "\\\\server");
   EXPECT_EQ(path("\\\\").toString(), "\\\\");
 }
 
 TEST(Path, TreatsAnUndeterminedNameAsAWindowsName) {
   const path name("dir/x.o");
-  EXPECT_EQ(name.style(), PathStyle_Undetermined);
-  EXPECT_EQ(name.directory(), "dir\\");
+  EXPECT_EQ(name.getStyle(), PathStyle_Undetermined);
+  EXPECT_EQ(name.getDirectory(), "dir\\");
 }
 
 TEST(Path, KeepsAPosixDirectoryByteForByte) {
   path name("a:b//./c\\d*/x?.o", PathStyle_Posix);
-  EXPECT_EQ(name.drive(), "");
-  EXPECT_EQ(name.directory(), "a:b//./c\\d*/");
+  EXPECT_EQ(name.getDrive(), "");
+  EXPECT_EQ(name.getDirectory(), "a:b//./c\\d*/");
   name.replaceLeaf("x1.o");
   EXPECT_EQ(name.toString(), "a:b//./c\\d*/x1.o");
 }
@@ -66,8 +66,8 @@ TEST(Path, KeepsAPosixDirectoryByteForByte) {
 TEST(Path, ReplacesOnlyTheLeaf) {
   path name("c:dir\\*.o");
   name.replaceLeaf("new");
-  EXPECT_EQ(name.base(), "new");
-  EXPECT_EQ(name.extension(), "");
+  EXPECT_EQ(name.getBase(), "new");
+  EXPECT_EQ(name.getExtension(), "");
   EXPECT_EQ(name.toString(), "c:dir\\new");
 }
 
@@ -80,7 +80,7 @@ TEST(Path, GivesBackEveryPosixNameUnchanged) {
 
 TEST(Path, CutsALeafBeyondTheLongestComponent) {
   const path name(std::string("d/") + std::string(5000, 'x'), PathStyle_Posix);
-  EXPECT_EQ(name.leaf(), std::string(LongestPathComponent, 'x'));
+  EXPECT_EQ(name.getLeaf(), std::string(LongestPathComponent, 'x'));
 }
 
 TEST(LastPathComponent, StandsBehindTheLastSeparatorOfEitherKind) {

@@ -32,7 +32,7 @@ std::string componentLine(const BuildData& data) {
 } // namespace
 
 TEST(Banner, OfThisBuildNamesProductComponentAndTool) {
-  BuildData data = buildData();
+  BuildData data = getBuildData();
   data.buildStamp = 0x01000001;
   EXPECT_EQ(bannerText(data), "Product: Quarn Object Tools 1.0\n"
                               "Component: Quarn Object Tools 1.0\n"
@@ -81,7 +81,7 @@ TEST(Banner, LosesOneTrailingBlank) {
 }
 
 TEST(VersionNumber, OfThisBuildIsOneNumber) {
-  EXPECT_EQ(versionNumberText(buildData()), "1000001");
+  EXPECT_EQ(versionNumberText(getBuildData()), "1000001");
 }
 
 TEST(VersionNumber, GivesTwoDigitsToAllButTheMajorPart) {
