@@ -52,7 +52,7 @@ constexpr ActionOption LateActions[] = {
 std::string commandLineText(const Parser& parser) {
   std::string text(CommandLineSize, '\0');
   for (;;) {
-    TextSink sink(text, TextSink::Quote_Blanks, ' ');
+    TextSink sink(text, TextSink::QuoteMode::Blanks, ' ');
     const size_t needed = printCommandLine(parser, sink);
     const bool fits = needed <= text.size();
     text.resize(fits ? needed - 1 : needed);
@@ -72,7 +72,7 @@ void showCommandLine(const Parser& parser, const char* toolName) {
 }
 
 void applyAction(const Parser& parser, const ActionOption& row, Settings& settings) {
-  if (!parser.booleanValue(row.option)) return;
+  if (!parser.getBoolean(row.option)) return;
   settings.setAction(row.action);
   // A long listing looks at more than the names.
   const bool isLongListing = row.action == Action_List && settings.verbose;
@@ -80,7 +80,7 @@ void applyAction(const Parser& parser, const ActionOption& row, Settings& settin
 }
 
 void applyCreate(const Parser& parser, Settings& settings) {
-  if (!parser.booleanValue(Option_Create)) return;
+  if (!parser.getBoolean(Option_Create)) return;
   settings.setAction(Action_Insert);
   settings.createArchive = true;
   settings.raiseAccessMode(Access_Write);
@@ -90,26 +90,26 @@ void applyCreate(const Parser& parser, Settings& settings) {
 void applyPosition(const Parser& parser, Settings& settings) {
   if (parser.isSet(Option_Before)) {
     settings.positionKind = Position_Before;
-    settings.positionName = parser.textValue(Option_Before);
+    settings.positionName = parser.getText(Option_Before);
   } else if (parser.isSet(Option_After)) {
     settings.positionKind = Position_After;
-    settings.positionName = parser.textValue(Option_After);
+    settings.positionName = parser.getText(Option_After);
   }
 }
 
 void applySymbolTableOptions(const Parser& parser, Settings& settings) {
-  settings.includeDebugSymbols = parser.booleanValue(Option_DebugSymbols);
-  settings.uniqueSymbolsOnly = parser.booleanValue(Option_UniqueSymbols);
-  settings.useObjectBuildAttributes = parser.booleanValue(Option_QobixBuildAttributes);
+  settings.includeDebugSymbols = parser.getBoolean(Option_DebugSymbols);
+  settings.uniqueSymbolsOnly = parser.getBoolean(Option_UniqueSymbols);
+  settings.useObjectBuildAttributes = parser.getBoolean(Option_QobixBuildAttributes);
 }
 
 void applyUpdateMode(const Parser& parser, Settings& settings) {
-  if (parser.booleanValue(Option_Update)) settings.updateMode = Update_IfNotNewer;
-  if (parser.booleanValue(Option_NewFilesOnly)) settings.updateMode = Update_IfOlder;
+  if (parser.getBoolean(Option_Update)) settings.updateMode = Update_IfNotNewer;
+  if (parser.getBoolean(Option_NewFilesOnly)) settings.updateMode = Update_IfOlder;
 }
 
 void applyNormalise(const Parser& parser, Settings& settings) {
-  const int32_t time = parser.integerValue(Option_Normalise);
+  const int32_t time = parser.getInteger(Option_Normalise);
   if (time == 0) return;
   settings.normaliseHeaders = true;
   settings.normaliseTime = time;
@@ -118,35 +118,35 @@ void applyNormalise(const Parser& parser, Settings& settings) {
 } // namespace
 
 void processOptions(const Parser& parser, const char* toolName, Settings& settings) {
-  if (parser.booleanValue(Option_ShowCommandLine)) showCommandLine(parser, toolName);
-  settings.helpRequested = parser.booleanValue(Option_Help);
-  settings.versionRequested = parser.booleanValue(Option_Version);
-  if (parser.booleanValue(Option_VersionNumber)) showVersionNumber();
-  settings.verbose = parser.booleanValue(Option_Verbose);
-  if (parser.booleanValue(Option_QuietCreate)) settings.warnOnCreate = false;
+  if (parser.getBoolean(Option_ShowCommandLine)) showCommandLine(parser, toolName);
+  settings.helpRequested = parser.getBoolean(Option_Help);
+  settings.versionRequested = parser.getBoolean(Option_Version);
+  if (parser.getBoolean(Option_VersionNumber)) showVersionNumber();
+  settings.verbose = parser.getBoolean(Option_Verbose);
+  if (parser.getBoolean(Option_QuietCreate)) settings.warnOnCreate = false;
   applyCreate(parser, settings);
   for (const ActionOption& row : EarlyActions)
     applyAction(parser, row, settings);
-  if (parser.booleanValue(Option_KeepExisting)) settings.overwriteOnExtract = false;
-  if (parser.booleanValue(Option_RebuildSymbolTable)) {
+  if (parser.getBoolean(Option_KeepExisting)) settings.overwriteOnExtract = false;
+  if (parser.getBoolean(Option_RebuildSymbolTable)) {
     settings.rebuildSymbolTable = true;
     settings.raiseAccessMode(Access_Write);
   }
   for (const ActionOption& row : LateActions)
     applyAction(parser, row, settings);
   applyPosition(parser, settings);
-  if (parser.booleanValue(Option_NoSymbolTable)) {
+  if (parser.getBoolean(Option_NoSymbolTable)) {
     settings.suppressSymbolTable = true;
     settings.raiseAccessMode(Access_Write);
   }
-  settings.truncateNames = parser.booleanValue(Option_TruncateNames);
+  settings.truncateNames = parser.getBoolean(Option_TruncateNames);
   applyUpdateMode(parser, settings);
   applySymbolTableOptions(parser, settings);
-  settings.libraryAttributeMap = parser.textValue(Option_LibraryAttributeMap);
+  settings.libraryAttributeMap = parser.getText(Option_LibraryAttributeMap);
   applyNormalise(parser, settings);
   // A level that isn't one is dropped without a word.
   if (parser.isSet(Option_CheckingLevel)) {
-    checking::set_checking_level(parser.textValue(Option_CheckingLevel));
+    checking::set_checking_level(parser.getText(Option_CheckingLevel));
   }
 }
 

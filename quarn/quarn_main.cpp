@@ -70,11 +70,11 @@ void tell(Obstacle obstacle, const Settings& settings, const char* toolName) {
 // where a position is given.
 std::vector<std::string> findFiles(const Parser& parser, support::Host& host,
                                    const Settings& settings) {
-  const bool expand = settings.createArchive || parser.booleanValue(Option_Insert) ||
+  const bool expand = settings.createArchive || parser.getBoolean(Option_Insert) ||
                       parser.isSet(Option_Before) || parser.isSet(Option_After);
   std::vector<std::string> files;
   bool isArchiveName = true;
-  for (const char* word : *parser.textsValue(Option_Words)) {
+  for (const char* word : *parser.getTexts(Option_Words)) {
     if (!isArchiveName) addFileArgument(host, word, expand, files);
     isArchiveName = false;
   }
@@ -94,7 +94,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
   Settings settings;
   readWords(parser, argc, argv);
   processOptions(parser, toolName, settings);
-  const char* archiveName = archiveNameOf(parser.textsValue(Option_Words));
+  const char* archiveName = archiveNameOf(parser.getTexts(Option_Words));
   const Obstacle obstacle = findObstacle(argc, archiveName, settings);
   if (obstacle != Obstacle::None) {
     tell(obstacle, settings, toolName);

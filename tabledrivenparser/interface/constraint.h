@@ -47,7 +47,7 @@ union Constraint {
 
 // Whether every mask of a zero-terminated list has a bit in common with the table's mask. A null
 // list restricts nothing.
-constexpr bool restrictionsMet(const uint32_t* masks, uint32_t tableMask) {
+[[nodiscard]] constexpr bool restrictionsMet(const uint32_t* masks, uint32_t tableMask) {
   if (masks == nullptr) return true;
   for (; *masks != 0; ++masks) {
     if ((*masks & tableMask) == 0) return false;

@@ -22,10 +22,10 @@ struct LinkedListNode {
 namespace detail {
 // Texts are equal by their characters, everything else as itself.
 template <class T>
-bool sameElement(T left, T right) {
+[[nodiscard]] bool sameElement(T left, T right) {
   return left == right;
 }
-inline bool sameElement(const char* left, const char* right) {
+[[nodiscard]] inline bool sameElement(const char* left, const char* right) {
   return std::string_view(left) == std::string_view(right);
 }
 } // namespace detail
@@ -36,7 +36,7 @@ inline bool sameElement(const char* left, const char* right) {
 template <class T>
 class LinkedList {
 public:
-  static constexpr uint32_t absent = 0xFFFFFFFF;
+  static constexpr uint32_t Absent = 0xFFFFFFFF;
 
   class Iterator {
   public:
@@ -56,16 +56,16 @@ public:
   LinkedList(const LinkedList&) = delete;
   LinkedList& operator=(const LinkedList&) = delete;
 
-  bool isEmpty() const { return m_Tail == nullptr; }
+  [[nodiscard]] bool isEmpty() const { return m_Tail == nullptr; }
   // Counts the elements by walking them.
-  uint32_t size() const {
+  [[nodiscard]] uint32_t size() const {
     uint32_t count = 0;
     for (auto element = begin(); element != end(); ++element)
       ++count;
     return count;
   }
-  Iterator begin() const { return Iterator(isEmpty() ? nullptr : &m_First); }
-  Iterator end() const { return Iterator(nullptr); }
+  [[nodiscard]] Iterator begin() const { return Iterator(isEmpty() ? nullptr : &m_First); }
+  [[nodiscard]] Iterator end() const { return Iterator(nullptr); }
 
   void append(T value) {
     LinkedListNode<T>* node = &m_First;
@@ -78,14 +78,14 @@ public:
     m_Tail = node;
   }
 
-  // The position of the first element equal to value, absent if there is none.
-  uint32_t indexOf(T value) const {
+  // The position of the first element equal to value, Absent if there is none.
+  [[nodiscard]] uint32_t indexOf(T value) const {
     uint32_t index = 0;
     for (T element : *this) {
       if (detail::sameElement(element, value)) return index;
       ++index;
     }
-    return absent;
+    return Absent;
   }
 
   void removeAll(T value) {

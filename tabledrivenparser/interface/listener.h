@@ -17,7 +17,7 @@ public:
   // texts. Words that a call-back handler takes and names of via files are not offered. Returns
   // true if the listener has taken the value: the parser then stores nothing, but the option still
   // counts as set.
-  virtual bool onOption(Parser& parser, uint32_t id, const Value& value) = 0;
+  [[nodiscard]] virtual bool onOption(Parser& parser, uint32_t id, const Value& value) = 0;
 };
 
 } // namespace tabledrivenparser

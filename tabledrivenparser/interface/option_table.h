@@ -49,15 +49,15 @@ struct MatchString {
   // Bits of RowFlag.
   uint8_t flags = 0;
 
-  constexpr bool has(RowFlag flag) const { return (flags & flag) != 0; }
-  constexpr bool hasLongName() const { return name.size() > 1; }
+  [[nodiscard]] constexpr bool has(RowFlag flag) const { return (flags & flag) != 0; }
+  [[nodiscard]] constexpr bool hasLongName() const { return name.size() > 1; }
 };
 
 // Any other number accepts silently.
 enum SyntaxPolicy : uint32_t { Policy_Accept = 0, Policy_Warn = 1, Policy_Reject = 2 };
 
-constexpr uint32_t noRow = 0xFFFFFFFF;
-// For each letter the first row that starts with it in either case, or noRow.
+constexpr uint32_t NoRow = 0xFFFFFFFF;
+// For each letter the first row that starts with it in either case, or NoRow.
 using FirstLetterIndex = std::array<uint32_t, 26>;
 
 struct OptionTable {
@@ -103,9 +103,9 @@ struct ValueRecord {
   DefaultCallBack defaultCallBack = nullptr;
 };
 
-constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows) {
+[[nodiscard]] constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows) {
   FirstLetterIndex index{};
-  index.fill(noRow);
+  index.fill(NoRow);
   for (size_t row = rows.size(); row-- > 0;) {
     if (rows[row].name.empty() || !support::isLetter(rows[row].name.front())) continue;
     index[static_cast<size_t>(support::lowered(rows[row].name.front()) - 'a')] =
@@ -115,7 +115,7 @@ constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows)
 }
 
 // Without regard to case, and an upper-case letter before its lower-case twin.
-constexpr bool comesBefore(std::string_view left, std::string_view right) {
+[[nodiscard]] constexpr bool comesBefore(std::string_view left, std::string_view right) {
   for (size_t at = 0; at < left.size() && at < right.size(); ++at) {
     const auto a = static_cast<unsigned char>(support::lowered(left[at]));
     const auto b = static_cast<unsigned char>(support::lowered(right[at]));
@@ -125,7 +125,7 @@ constexpr bool comesBefore(std::string_view left, std::string_view right) {
   return left < right;
 }
 
-constexpr bool areSorted(std::span<const MatchString> rows) {
+[[nodiscard]] constexpr bool areSorted(std::span<const MatchString> rows) {
   for (size_t row = 1; row < rows.size(); ++row) {
     if (!comesBefore(rows[row - 1].name, rows[row].name)) return false;
   }
@@ -134,7 +134,7 @@ constexpr bool areSorted(std::span<const MatchString> rows) {
 
 // Whether the look-up can find the row: it folds the word, but only the first character of a name.
 // Names that start with no letter must sort before those that do.
-constexpr bool isFindable(std::string_view name) {
+[[nodiscard]] constexpr bool isFindable(std::string_view name) {
   if (name.empty()) return true;
   if (static_cast<unsigned char>(support::lowered(name.front())) > 'z') return false;
   for (char character : name.substr(1)) {
@@ -144,7 +144,7 @@ constexpr bool isFindable(std::string_view name) {
 }
 
 // Whether the rows are sorted, can all be found, and their ids lie below idCount.
-constexpr bool areWellFormed(std::span<const MatchString> rows, size_t idCount) {
+[[nodiscard]] constexpr bool areWellFormed(std::span<const MatchString> rows, size_t idCount) {
   for (const MatchString& row : rows) {
     if (row.id >= idCount || !isFindable(row.name)) return false;
   }
@@ -152,7 +152,8 @@ constexpr bool areWellFormed(std::span<const MatchString> rows, size_t idCount) 
 }
 
 // The row of that name, null if there is none.
-constexpr const MatchString* rowNamed(std::span<const MatchString> rows, std::string_view name) {
+[[nodiscard]] constexpr const MatchString* rowNamed(std::span<const MatchString> rows,
+                                                    std::string_view name) {
   for (const MatchString& row : rows) {
     if (row.name == name) return &row;
   }
@@ -162,15 +163,15 @@ constexpr const MatchString* rowNamed(std::span<const MatchString> rows, std::st
 // The list of rows that a definition wants, from their names:
 //   constexpr auto versionRows = rowsNamed(rows, "vsn", "version", "V");
 template <class... Names>
-constexpr std::array<const MatchString*, sizeof...(Names) + 1>
+[[nodiscard]] constexpr std::array<const MatchString*, sizeof...(Names) + 1>
 rowsNamed(std::span<const MatchString> rows, Names... names) {
   return {rowNamed(rows, names)..., nullptr};
 }
 
 // Whether each definition lists rows of its own id only, and all lists together hold every row. No
 // definition may be without a list.
-constexpr bool listEveryRow(std::span<const ValueDefinition> definitions,
-                            std::span<const MatchString> rows) {
+[[nodiscard]] constexpr bool listEveryRow(std::span<const ValueDefinition> definitions,
+                                          std::span<const MatchString> rows) {
   size_t listed = 0;
   for (size_t id = 0; id < definitions.size(); ++id) {
     const MatchString* const* row = definitions[id].rows;

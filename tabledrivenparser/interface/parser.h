@@ -36,7 +36,7 @@ struct ParserTables {
 
 class Parser {
 public:
-  static constexpr uint32_t viaFileDepthLimit = 10;
+  static constexpr uint32_t ViaFileDepthLimit = 10;
 
   // Sets every value to its default. listener may be null. Everything that the parser copies or
   // allocates comes from region and goes with it.
@@ -60,38 +60,41 @@ public:
   void releaseValues();
 
   // True after a fatal report that returned: later words do nothing and count as one used word.
-  bool hasFailed() const { return m_Failed; }
-  bool isEndOfOptions() const { return m_EndOfOptions; }
+  [[nodiscard]] bool hasFailed() const { return m_Failed; }
+  [[nodiscard]] bool isEndOfOptions() const { return m_EndOfOptions; }
   // Whether the names of some enumeration were listed for the user.
-  bool hasShownChoices() const { return m_ChoicesShown; }
-  uint32_t viaFileDepth() const { return m_ViaFileDepth; }
-  uint32_t setCounter() const { return m_SetCounter; }
+  [[nodiscard]] bool hasShownChoices() const { return m_ChoicesShown; }
+  [[nodiscard]] uint32_t getViaFileDepth() const { return m_ViaFileDepth; }
+  [[nodiscard]] uint32_t getSetCounter() const { return m_SetCounter; }
 
-  const OptionTable& options() const { return m_Tables.options; }
-  uint32_t valueCount() const { return static_cast<uint32_t>(m_Tables.definitions.size()); }
-  const ValueDefinition& definition(uint32_t id) const;
-  const ValueRecord& record(uint32_t id) const;
-  bool isSet(uint32_t id) const { return record(id).lastSet != 0; }
+  [[nodiscard]] const OptionTable& getOptions() const { return m_Tables.options; }
+  [[nodiscard]] uint32_t getValueCount() const {
+    return static_cast<uint32_t>(m_Tables.definitions.size());
+  }
+  [[nodiscard]] const ValueDefinition& getDefinition(uint32_t id) const;
+  [[nodiscard]] const ValueRecord& getRecord(uint32_t id) const;
+  [[nodiscard]] bool isSet(uint32_t id) const { return getRecord(id).lastSet != 0; }
   // The default by the definition's rule; null or zero if it has none.
-  Value defaultValue(uint32_t id) const;
-  bool isDefault(uint32_t id) const;
+  [[nodiscard]] Value getDefaultValue(uint32_t id) const;
+  [[nodiscard]] bool isDefault(uint32_t id) const;
 
   // The value of an option of that type; asking for another type is a programming fault.
-  bool booleanValue(uint32_t id) const;
-  uint32_t enumeratorValue(uint32_t id) const;
-  int32_t integerValue(uint32_t id) const;
-  uint64_t addressValue(uint32_t id) const;     // both widths
-  const char* textValue(uint32_t id) const;     // may be null
-  const StrList* textsValue(uint32_t id) const; // STRING_VECTOR, VIA_FILE; null for an empty one
-  const IntegerList* integersValue(uint32_t id) const; // null for an empty one
+  [[nodiscard]] bool getBoolean(uint32_t id) const;
+  [[nodiscard]] uint32_t getEnumerator(uint32_t id) const;
+  [[nodiscard]] int32_t getInteger(uint32_t id) const;
+  [[nodiscard]] uint64_t getAddress(uint32_t id) const; // both widths
+  [[nodiscard]] const char* getText(uint32_t id) const; // may be null
+  // Both null for an empty list; the texts are of STRING_VECTOR and VIA_FILE.
+  [[nodiscard]] const StrList* getTexts(uint32_t id) const;
+  [[nodiscard]] const IntegerList* getIntegers(uint32_t id) const;
 
   // The rest serves handlers, listeners and the parser's own rooms.
 
   void report(ReportLevel level, OptionMessage message,
               std::initializer_list<OptionMessageArgument> arguments);
   // A NUL-terminated copy in the parser's region.
-  const char* copyText(std::string_view text);
-  alloclib::RegionGeneral& region() { return m_Region; }
+  [[nodiscard]] const char* copyText(std::string_view text);
+  [[nodiscard]] alloclib::RegionGeneral& getRegion() { return m_Region; }
 
 private:
   friend class ValueStore;
@@ -100,7 +103,7 @@ private:
   bool takeArgument(WordInHand& hand);
   bool checkConcatenation(const WordInHand& hand);
   uint32_t refuse(const WordInHand& hand);
-  const ValueRecord& recordOfType(uint32_t id, ValueType type) const;
+  [[nodiscard]] const ValueRecord& getRecordOfType(uint32_t id, ValueType type) const;
   void countSet(uint32_t id);
 
   ParserTables m_Tables;

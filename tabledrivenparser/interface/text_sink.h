@@ -11,10 +11,10 @@ namespace tabledrivenparser {
 
 class TextSink {
 public:
-  enum QuoteMode : bool { Quote_Never, Quote_Blanks };
+  enum class QuoteMode : bool { Never, Blanks };
 
-  // The buffer is the caller's. With Quote_Blanks, putValue puts double quotes round a value that
-  // holds a blank or a tab.
+  // The buffer is the caller's. With QuoteMode::Blanks, putValue puts double quotes round a value
+  // that holds a blank or a tab.
   TextSink(std::span<char> buffer, QuoteMode quoteMode, char separator)
       : m_Buffer(buffer), m_QuoteMode(quoteMode), m_Separator(separator) {}
 
@@ -30,7 +30,7 @@ public:
   void setQuoteEmpty(bool quoteEmpty) { m_QuoteEmpty = quoteEmpty; }
 
   // The characters put so far, also those beyond the buffer.
-  size_t used() const { return m_Used; }
+  [[nodiscard]] size_t getUsed() const { return m_Used; }
 
 private:
   std::span<char> m_Buffer;

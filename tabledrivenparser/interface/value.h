@@ -40,7 +40,7 @@ union Value {
   const DefaultNode* defaults; // only in a definition whose default is a list of nodes
 };
 
-constexpr bool isVector(ValueType type) {
+[[nodiscard]] constexpr bool isVector(ValueType type) {
   return type == Type_IntVector || type == Type_Int64Vector || type == Type_StringVector ||
          type == Type_ViaFile;
 }

@@ -26,7 +26,7 @@ public:
   // What a word and the word before it may take together, each with one terminator, as they stand
   // in the file without its comments. Also the number of characters read at a time: a NUL byte is
   // found when its piece is read, before any word of that piece is handed out.
-  static constexpr size_t bufferSize = 1024;
+  static constexpr size_t BufferSize = 1024;
 
   // Opens the file and reads the first piece. Complaints go through the parser's report; name and
   // both objects must outlive this one.
@@ -35,7 +35,7 @@ public:
   ViaFile& operator=(const ViaFile&) = delete;
   virtual ~ViaFile();
 
-  bool isOpen() const { return m_File != nullptr; }
+  [[nodiscard]] bool isOpen() const { return m_File != nullptr; }
   // The next word, or null at the end of the file and after a fatal report. The text is the file's
   // own and stays valid until the second call after this one.
   const char* nextToken();
@@ -68,7 +68,7 @@ private:
   bool m_InComment = false;
   size_t m_Position = 0; // in m_Text
   std::string_view m_Text;
-  std::array<char, bufferSize> m_Buffer;
+  std::array<char, BufferSize> m_Buffer;
   // The last two words in turn, as one of them is still in use while the other is looked ahead to.
   std::array<std::string, 2> m_Words;
   size_t m_Current = 0;

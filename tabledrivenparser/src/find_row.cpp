@@ -103,7 +103,7 @@ std::span<const MatchString> candidateRows(const OptionTable& table, std::string
   const char first = word.empty() ? '\0' : support::lowered(word.front());
   uint32_t start = 0;
   if (support::isLetter(first)) start = table.firstRows[static_cast<size_t>(first - 'a')];
-  if (start == noRow) return {};
+  if (start == NoRow) return {};
   uint32_t end = start;
   for (; end < table.rows.size(); ++end) {
     const std::string_view name = table.rows[end].name;
@@ -115,7 +115,7 @@ std::span<const MatchString> candidateRows(const OptionTable& table, std::string
 }
 
 void warnOfOldSyntax(Parser& parser, const Match& match, uint32_t dashes) {
-  if (parser.options().oldSyntaxPolicy != Policy_Warn || dashes >= 2) return;
+  if (parser.getOptions().oldSyntaxPolicy != Policy_Warn || dashes >= 2) return;
   if (!match.longName && match.firstCharExact) return;
   parser.report(ReportLevel::Warning, OptionMessage::OldSyntax,
                 {match.longName ? "--" : "-", match.row->name, "", ""});
@@ -145,7 +145,7 @@ RowSearch searchRows(const OptionTable& table, std::string_view word, uint32_t d
 }
 
 Match findRow(Parser& parser, std::string_view word, uint32_t dashes) {
-  const RowSearch search = searchRows(parser.options(), word, dashes);
+  const RowSearch search = searchRows(parser.getOptions(), word, dashes);
   const Match& best = search.best;
   if (dashes == 0 || best.row == nullptr || best.restricted) return best;
   if (search.ambiguity != nullptr) {
@@ -153,7 +153,7 @@ Match findRow(Parser& parser, std::string_view word, uint32_t dashes) {
                   {word, best.row->name, search.ambiguity->name});
     return Match{};
   }
-  if (best.row->has(Flag_Deprecated) && parser.options().deprecatedPolicy == Policy_Warn) {
+  if (best.row->has(Flag_Deprecated) && parser.getOptions().deprecatedPolicy == Policy_Warn) {
     parser.report(ReportLevel::Warning, OptionMessage::DeprecatedOption, {best.row->name});
     return best;
   }

@@ -48,7 +48,7 @@ NumberText readNumber(const char* text, ValueType type) {
   const unsigned long long magnitude = std::strtoull(text, &end, base);
   const bool isTooLarge = errno == ERANGE || magnitude > largestMagnitude(type, isNegative);
   number.end = end;
-  number.result = isTooLarge ? Number_Overflow : Number_Good;
+  number.result = isTooLarge ? NumberResult::Overflow : NumberResult::Good;
   number.value = static_cast<int64_t>(isNegative ? 0 - magnitude : magnitude);
   if (type == Type_Address) number.value = static_cast<uint32_t>(number.value);
   return number;

@@ -8,10 +8,10 @@
 
 namespace tabledrivenparser {
 
-enum NumberResult { Number_Good, Number_Bad, Number_Overflow };
+enum class NumberResult { Good, Bad, Overflow };
 
 struct NumberText {
-  NumberResult result = Number_Bad;
+  NumberResult result = NumberResult::Bad;
   int64_t value = 0;         // as in Value::integer
   const char* end = nullptr; // behind the last digit
 };

@@ -43,7 +43,7 @@ uint32_t merit(const ValueDefinition& definition, const MatchString& row, const 
 
 bool canShow(const Parser& parser, const ValueDefinition& definition, const MatchString& row,
              const Value& value) {
-  if (!restrictionsMet(row.restrictions, parser.options().restrictionMask)) return false;
+  if (!restrictionsMet(row.restrictions, parser.getOptions().restrictionMask)) return false;
   return row.kind != Kind_Implied || impliesValue(definition, row, value);
 }
 
@@ -86,14 +86,14 @@ void printEntry(const Parser& parser, TextSink& sink, const ValueDefinition& def
     sink.put(row->name);
     return;
   }
-  const OptionTable& table = parser.options();
+  const OptionTable& table = parser.getOptions();
   const std::string text = argumentText(definition, value, table.restrictionMask);
   sink.putValue(optionPrefix(table, *row, text), text);
 }
 
 void printOption(const Parser& parser, TextSink& sink, uint32_t id) {
-  const ValueDefinition& definition = parser.definition(id);
-  const Value& value = parser.record(id).value;
+  const ValueDefinition& definition = parser.getDefinition(id);
+  const Value& value = parser.getRecord(id).value;
   if (!parser.isSet(id)) return;
   if (definition.type == Type_CallBack) {
     if (value.handler != nullptr) value.handler->printCommandLine(parser, sink);
@@ -106,12 +106,12 @@ void printOption(const Parser& parser, TextSink& sink, uint32_t id) {
 }
 
 void printPositional(const Parser& parser, TextSink& sink, uint32_t id) {
-  const ValueDefinition& definition = parser.definition(id);
-  const Value& value = parser.record(id).value;
+  const ValueDefinition& definition = parser.getDefinition(id);
+  const Value& value = parser.getRecord(id).value;
   if (!parser.isSet(id)) return;
   const auto print = [&](const Value& element) {
     sink.startEntry();
-    sink.putValue("", argumentText(definition, element, parser.options().restrictionMask));
+    sink.putValue("", argumentText(definition, element, parser.getOptions().restrictionMask));
   };
   sink.setQuoteEmpty(true);
   if (isVector(definition.type)) {
@@ -125,9 +125,9 @@ void printPositional(const Parser& parser, TextSink& sink, uint32_t id) {
 } // namespace
 
 size_t printCommandLine(const Parser& parser, TextSink& sink) {
-  const OptionTable& table = parser.options();
+  const OptionTable& table = parser.getOptions();
   const bool hasPositional = !table.rows.empty() && table.rows.front().name.empty();
-  for (uint32_t id = 0; id < parser.valueCount(); ++id) {
+  for (uint32_t id = 0; id < parser.getValueCount(); ++id) {
     if (!hasPositional || id != table.rows.front().id) printOption(parser, sink, id);
   }
   if (table.fallback != nullptr) table.fallback->printCommandLine(parser, sink);
@@ -137,7 +137,7 @@ size_t printCommandLine(const Parser& parser, TextSink& sink) {
   }
   if (hasPositional) printPositional(parser, sink, table.rows.front().id);
   sink.put('\0');
-  return sink.used();
+  return sink.getUsed();
 }
 
 } // namespace tabledrivenparser

@@ -29,7 +29,7 @@ bool isUnknown(const Match& match) {
 }
 
 bool isPassedOver(const Parser& parser, const MatchString& row, std::span<const uint32_t> filter) {
-  if (filter.empty() || parser.definition(row.id).type == Type_ViaFile) return false;
+  if (filter.empty() || parser.getDefinition(row.id).type == Type_ViaFile) return false;
   return std::ranges::find(filter, row.id) == filter.end();
 }
 
@@ -46,11 +46,11 @@ Parser::Parser(const ParserTables& tables, Listener* listener, Reporter& reporte
     : m_Tables(tables), m_Listener(listener), m_Reporter(reporter), m_Files(files),
       m_Region(region), m_OwnedMemory(region) {
   QUARN_ASSERT(1, tables.definitions.size() == tables.values.size());
-  for (uint32_t id = 0; id < valueCount(); ++id) {
+  for (uint32_t id = 0; id < getValueCount(); ++id) {
     ValueRecord& target = m_Tables.values[id];
     target.firstSet = 0;
     target.lastSet = 0;
-    target.value = defaultValue(id);
+    target.value = getDefaultValue(id);
   }
 }
 
@@ -79,15 +79,15 @@ uint32_t Parser::parseArgument(const char* word, const char* next, uint32_t dash
 std::optional<uint32_t> Parser::parseOneOf(WordInHand& hand) {
   hand.match = findRow(*this, hand.word, hand.dashes);
   if (isUnknown(hand.match)) return hand.filter.empty() ? refuse(hand) : 0;
-  if (isPassedOver(*this, hand.row(), hand.filter)) return 1;
+  if (isPassedOver(*this, hand.getRow(), hand.filter)) return 1;
   if (!takeArgument(hand) || !checkConcatenation(hand)) return 1;
 
-  ValueStore store(*this, hand.row(), hand.argument, hand.filter, hand.wordsUsed);
+  ValueStore store(*this, hand.getRow(), hand.argument, hand.filter, hand.wordsUsed);
   const bool isStored = store.store();
   if (m_Failed) return 1;
   if (!isStored && hand.wordsUsed != 0) {
     report(ReportLevel::Fatal, OptionMessage::ArgumentNotPermitted,
-           {hand.argument != nullptr ? hand.argument : "", hand.row().name});
+           {hand.argument != nullptr ? hand.argument : "", hand.getRow().name});
     return 1;
   }
   if (hand.goesOn()) return std::nullopt;
@@ -121,25 +121,25 @@ bool Parser::checkConcatenation(const WordInHand& hand) {
   if (!hand.isConcatenated()) return true;
   const std::string_view rest = hand.match.rest;
   if (hand.argument != nullptr) {
-    report(ReportLevel::Fatal, OptionMessage::ConcatenatedArgument, {hand.row().name, rest});
+    report(ReportLevel::Fatal, OptionMessage::ConcatenatedArgument, {hand.getRow().name, rest});
     return false;
   }
   if (hand.isRepeated()) {
     report(ReportLevel::Warning, OptionMessage::RepeatedConcatenatedOption,
-           {hand.row().name, hand.letters, hand.row().name, rest});
+           {hand.getRow().name, hand.letters, hand.getRow().name, rest});
   }
   return true;
 }
 
 // The word is no option: the fallback handler may know it, or it is an error.
 uint32_t Parser::refuse(const WordInHand& hand) {
-  if (FallbackHandler* fallback = options().fallback) {
+  if (FallbackHandler* fallback = getOptions().fallback) {
     const uint32_t used = fallback->takeWord(*this, hand.word.data(), hand.next, hand.dashes);
     if (used != 0) return used;
   }
   if (hasUnexpectedArgument(hand.match)) {
     report(ReportLevel::Fatal, OptionMessage::UnexpectedArgument,
-           {dashText(hand.dashes), hand.row().name});
+           {dashText(hand.dashes), hand.getRow().name});
   } else {
     report(ReportLevel::Fatal, OptionMessage::UnrecognizedOption,
            {dashText(hand.dashes), hand.word});
@@ -148,36 +148,37 @@ uint32_t Parser::refuse(const WordInHand& hand) {
 }
 
 void Parser::releaseValues() {
-  for (uint32_t id = 0; id < valueCount(); ++id) {
+  for (uint32_t id = 0; id < getValueCount(); ++id) {
     Value& value = m_Tables.values[id].value;
-    const ValueType type = definition(id).type;
+    const ValueType type = getDefinition(id).type;
     if (isVector(type)) value = emptyValue(type);
     if (type == Type_CallBack && value.handler != nullptr) value.handler->releaseValues();
   }
   m_OwnedMemory.clear();
 }
 
-const ValueDefinition& Parser::definition(uint32_t id) const {
-  QUARN_ASSERT(1, id < valueCount());
+const ValueDefinition& Parser::getDefinition(uint32_t id) const {
+  QUARN_ASSERT(1, id < getValueCount());
   return m_Tables.definitions[id];
 }
 
-const ValueRecord& Parser::record(uint32_t id) const {
-  QUARN_ASSERT(1, id < valueCount());
+const ValueRecord& Parser::getRecord(uint32_t id) const {
+  QUARN_ASSERT(1, id < getValueCount());
   return m_Tables.values[id];
 }
 
-Value Parser::defaultValue(uint32_t id) const {
-  const ValueDefinition& wanted = definition(id);
+Value Parser::getDefaultValue(uint32_t id) const {
+  const ValueDefinition& wanted = getDefinition(id);
   switch (wanted.defaultKind) {
   case Default_Fixed:
     return wanted.defaultValue;
   case Default_List: {
-    const DefaultNode* node = firstUsable(wanted.defaultValue.defaults, options().restrictionMask);
+    const DefaultNode* node =
+        firstUsable(wanted.defaultValue.defaults, getOptions().restrictionMask);
     return node != nullptr ? node->value : emptyValue(wanted.type);
   }
   case Default_Computed: {
-    const DefaultCallBack compute = record(id).defaultCallBack;
+    const DefaultCallBack compute = getRecord(id).defaultCallBack;
     return compute != nullptr ? compute(*this, id) : emptyValue(wanted.type);
   }
   case Default_None:
@@ -187,42 +188,44 @@ Value Parser::defaultValue(uint32_t id) const {
 }
 
 bool Parser::isDefault(uint32_t id) const {
-  return areEqual(definition(id).type, record(id).value, defaultValue(id));
+  return areEqual(getDefinition(id).type, getRecord(id).value, getDefaultValue(id));
 }
 
-const ValueRecord& Parser::recordOfType(uint32_t id, ValueType type) const {
-  QUARN_ASSERT(1, definition(id).type == type);
-  return record(id);
+const ValueRecord& Parser::getRecordOfType(uint32_t id, ValueType type) const {
+  QUARN_ASSERT(1, getDefinition(id).type == type);
+  return getRecord(id);
 }
 
-bool Parser::booleanValue(uint32_t id) const {
-  return recordOfType(id, Type_Boolean).value.integer != 0;
+bool Parser::getBoolean(uint32_t id) const {
+  return getRecordOfType(id, Type_Boolean).value.integer != 0;
 }
 
-uint32_t Parser::enumeratorValue(uint32_t id) const {
-  return static_cast<uint32_t>(recordOfType(id, Type_Enum).value.integer);
+uint32_t Parser::getEnumerator(uint32_t id) const {
+  return static_cast<uint32_t>(getRecordOfType(id, Type_Enum).value.integer);
 }
 
-int32_t Parser::integerValue(uint32_t id) const {
-  return static_cast<int32_t>(recordOfType(id, Type_Int).value.integer);
+int32_t Parser::getInteger(uint32_t id) const {
+  return static_cast<int32_t>(getRecordOfType(id, Type_Int).value.integer);
 }
 
-uint64_t Parser::addressValue(uint32_t id) const {
-  QUARN_ASSERT(1, definition(id).type == Type_Address || definition(id).type == Type_Address64);
-  return static_cast<uint64_t>(record(id).value.integer);
+uint64_t Parser::getAddress(uint32_t id) const {
+  QUARN_ASSERT(1,
+               getDefinition(id).type == Type_Address || getDefinition(id).type == Type_Address64);
+  return static_cast<uint64_t>(getRecord(id).value.integer);
 }
 
-const char* Parser::textValue(uint32_t id) const {
-  return recordOfType(id, Type_String).value.text;
+const char* Parser::getText(uint32_t id) const {
+  return getRecordOfType(id, Type_String).value.text;
 }
 
-const StrList* Parser::textsValue(uint32_t id) const {
-  QUARN_ASSERT(1, definition(id).type == Type_StringVector || definition(id).type == Type_ViaFile);
-  return record(id).value.strings;
+const StrList* Parser::getTexts(uint32_t id) const {
+  QUARN_ASSERT(1, getDefinition(id).type == Type_StringVector ||
+                      getDefinition(id).type == Type_ViaFile);
+  return getRecord(id).value.strings;
 }
 
-const IntegerList* Parser::integersValue(uint32_t id) const {
-  return recordOfType(id, Type_IntVector).value.integers;
+const IntegerList* Parser::getIntegers(uint32_t id) const {
+  return getRecordOfType(id, Type_IntVector).value.integers;
 }
 
 void Parser::report(ReportLevel level, OptionMessage message,

@@ -13,7 +13,7 @@ void* StdioViaFileReader::open(const char* name) {
 ptrdiff_t StdioViaFileReader::read(void* file, char* buffer, size_t size) {
   auto* stream = static_cast<std::FILE*>(file);
   const size_t count = std::ferror(stream) != 0 ? 0 : std::fread(buffer, 1, size, stream);
-  if (count == 0 && std::ferror(stream) != 0) return readError;
+  if (count == 0 && std::ferror(stream) != 0) return ReadError;
   return static_cast<ptrdiff_t>(count);
 }
 

@@ -40,8 +40,8 @@ void dumpElement(TextSink& sink, const ValueDefinition& definition, const Value&
   const bool isText = definition.type == Type_String || isVector(definition.type);
   const bool isNumber = definition.type == Type_IntVector || definition.type == Type_Int64Vector;
   if (isText && !isNumber && value.text == nullptr) return sink.put("<null>");
-  constexpr uint32_t everyEntryIsUsable = 0xFFFFFFFF;
-  sink.put(argumentText(definition, value, everyEntryIsUsable));
+  constexpr uint32_t EveryEntryIsUsable = 0xFFFFFFFF;
+  sink.put(argumentText(definition, value, EveryEntryIsUsable));
 }
 
 void dumpValue(TextSink& sink, const ValueDefinition& definition, const Value& value) {
@@ -74,7 +74,7 @@ void dumpOrigin(TextSink& sink, const ValueDefinition& definition) {
 }
 
 void dumpId(const Parser& parser, TextSink& sink, uint32_t id) {
-  const ValueDefinition& definition = parser.definition(id);
+  const ValueDefinition& definition = parser.getDefinition(id);
   char number[16];
   std::snprintf(number, sizeof number, "%3u: ", id);
   sink.put(number);
@@ -86,7 +86,7 @@ void dumpId(const Parser& parser, TextSink& sink, uint32_t id) {
   } else {
     sink.put(" unset:");
   }
-  dumpValue(sink, definition, parser.record(id).value);
+  dumpValue(sink, definition, parser.getRecord(id).value);
   sink.put('\n');
 }
 
@@ -146,15 +146,15 @@ void dumpRow(TextSink& sink, const ValueDefinition& definition, const MatchStrin
 } // namespace
 
 size_t dumpTables(const Parser& parser, TextSink& sink) {
-  for (uint32_t id = 0; id < parser.valueCount(); ++id) {
-    const ValueDefinition& definition = parser.definition(id);
+  for (uint32_t id = 0; id < parser.getValueCount(); ++id) {
+    const ValueDefinition& definition = parser.getDefinition(id);
     dumpId(parser, sink, id);
     for (auto row = definition.rows; row != nullptr && *row != nullptr; ++row) {
       dumpRow(sink, definition, **row);
     }
   }
   sink.put('\0');
-  return sink.used();
+  return sink.getUsed();
 }
 
 } // namespace tabledrivenparser

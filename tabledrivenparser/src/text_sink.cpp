@@ -16,7 +16,8 @@ void TextSink::put(std::string_view text) {
 void TextSink::putValue(std::string_view prefix, std::string_view value) {
   put(prefix);
   const bool hasBlank = value.find_first_of(" \t") != std::string_view::npos;
-  const bool isQuoted = m_QuoteMode == Quote_Blanks && (value.empty() ? m_QuoteEmpty : hasBlank);
+  const bool isQuoted =
+      m_QuoteMode == QuoteMode::Blanks && (value.empty() ? m_QuoteEmpty : hasBlank);
   if (isQuoted) put('"');
   put(value);
   if (isQuoted) put('"');

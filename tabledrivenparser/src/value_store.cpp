@@ -35,8 +35,8 @@ std::string namesOf(const Enumeration& enumeration, uint32_t tableMask) {
 
 ValueStore::ValueStore(Parser& parser, const MatchString& row, const char* argument,
                        std::span<const uint32_t> filter, uint32_t& wordsUsed)
-    : m_Parser(parser), m_Row(row), m_Definition(parser.definition(row.id)), m_Argument(argument),
-      m_Filter(filter), m_WordsUsed(wordsUsed) {}
+    : m_Parser(parser), m_Row(row), m_Definition(parser.getDefinition(row.id)),
+      m_Argument(argument), m_Filter(filter), m_WordsUsed(wordsUsed) {}
 
 bool ValueStore::store() {
   switch (m_Definition.type) {
@@ -66,15 +66,15 @@ bool ValueStore::store() {
 
 ValueStore::Offer ValueStore::offer(const Value& value) {
   const uint32_t id = m_Row.id;
-  if (!meetsConstraint(m_Definition, value, m_Parser.options().restrictionMask)) {
-    return Offer_Refused;
+  if (!meetsConstraint(m_Definition, value, m_Parser.getOptions().restrictionMask)) {
+    return Offer::Refused;
   }
-  const Validator validator = m_Parser.record(id).validator;
-  if (validator != nullptr && !validator(m_Parser, id, value)) return Offer_Refused;
+  const Validator validator = m_Parser.getRecord(id).validator;
+  if (validator != nullptr && !validator(m_Parser, id, value)) return Offer::Refused;
   Listener* listener = m_Parser.m_Listener;
-  if (listener == nullptr || !listener->onOption(m_Parser, id, value)) return Offer_Open;
+  if (listener == nullptr || !listener->onOption(m_Parser, id, value)) return Offer::Open;
   m_Parser.countSet(id);
-  return Offer_Taken;
+  return Offer::Taken;
 }
 
 void ValueStore::keep(const Value& value) {
@@ -88,8 +88,8 @@ void ValueStore::keep(const Value& value) {
 
 void ValueStore::append(const Value& value) {
   Value& list = m_Parser.m_Tables.values[m_Row.id].value;
-  const Value base = m_Parser.defaultValue(m_Row.id);
-  alloclib::RegionGeneral& region = m_Parser.region();
+  const Value base = m_Parser.getDefaultValue(m_Row.id);
+  alloclib::RegionGeneral& region = m_Parser.getRegion();
   if (m_Definition.type == Type_IntVector) {
     appendTo(list.integers, base.integers, static_cast<int>(value.integer), region);
   } else if (m_Definition.type == Type_Int64Vector) {
@@ -101,14 +101,14 @@ void ValueStore::append(const Value& value) {
 
 bool ValueStore::offerAndKeep(const Value& value) {
   const Offer answer = offer(value);
-  if (answer == Offer_Open) keep(value);
-  return answer != Offer_Refused;
+  if (answer == Offer::Open) keep(value);
+  return answer != Offer::Refused;
 }
 
 // An overflow is reported at once, whatever stands behind the number.
 NumberText ValueStore::readNumberAt(const char* text) {
   const NumberText number = readNumber(text, m_Definition.type);
-  if (number.result == Number_Overflow) {
+  if (number.result == NumberResult::Overflow) {
     m_Parser.report(ReportLevel::Fatal, OptionMessage::IntegerOverflow, {m_Argument});
   }
   return number;
@@ -116,14 +116,14 @@ NumberText ValueStore::readNumberAt(const char* text) {
 
 bool ValueStore::storeNumber() {
   const NumberText number = readNumberAt(m_Argument);
-  if (number.result != Number_Good || *number.end != '\0') return false;
+  if (number.result != NumberResult::Good || *number.end != '\0') return false;
   return offerAndKeep(Value{.integer = number.value});
 }
 
 bool ValueStore::storeNumbers() {
   for (const char* text = m_Argument;; ++text) {
     const NumberText number = readNumberAt(text);
-    if (number.result != Number_Good) return false;
+    if (number.result != NumberResult::Good) return false;
     text = number.end;
     if (*text != '\0' && *text != m_Row.separator) return false;
     if (!offerAndKeep(Value{.integer = number.value})) return false;
@@ -135,7 +135,7 @@ bool ValueStore::storeEnumerator() {
   QUARN_ASSERT(1, m_Definition.constraint.enumeration != nullptr);
   if (hasArgument()) return storeNamedEnumerator();
   const Enumeration& enumeration = *m_Definition.constraint.enumeration;
-  const uint32_t tableMask = m_Parser.options().restrictionMask;
+  const uint32_t tableMask = m_Parser.getOptions().restrictionMask;
   if (findEnumerator(enumeration, m_Row.value.integer, tableMask) == nullptr) return false;
   return offerAndKeep(m_Row.value);
 }
@@ -143,11 +143,11 @@ bool ValueStore::storeEnumerator() {
 bool ValueStore::storeNamedEnumerator() {
   const MatchString* entry =
       findEnumerator(*m_Definition.constraint.enumeration, std::string_view(m_Argument),
-                     m_Parser.options().restrictionMask);
+                     m_Parser.getOptions().restrictionMask);
   if (entry == nullptr) return false;
   const Value value{.integer = entry->id};
   const Offer answer = offer(value);
-  if (answer != Offer_Open) return answer == Offer_Taken;
+  if (answer != Offer::Open) return answer == Offer::Taken;
   if (entry->separator != 0) {
     m_Parser.report(ReportLevel::Warning, OptionMessage::DeprecatedArgument,
                     {m_Argument, m_Row.name});
@@ -159,7 +159,7 @@ bool ValueStore::storeNamedEnumerator() {
 
 void ValueStore::showChoices() {
   const std::string names =
-      namesOf(*m_Definition.constraint.enumeration, m_Parser.options().restrictionMask);
+      namesOf(*m_Definition.constraint.enumeration, m_Parser.getOptions().restrictionMask);
   m_Parser.report(ReportLevel::Remark, OptionMessage::SelectableArguments, {m_Row.name, names});
   m_Parser.m_ChoicesShown = true;
 }
@@ -197,7 +197,7 @@ bool ValueStore::storeTexts() {
 }
 
 bool ValueStore::storeThroughHandler() {
-  CallBackHandler* handler = m_Parser.record(m_Row.id).value.handler;
+  CallBackHandler* handler = m_Parser.getRecord(m_Row.id).value.handler;
   if (handler == nullptr) return false;
   if (!handler->takeArgument(m_Parser, m_Row, m_Argument, m_WordsUsed)) return false;
   m_Parser.countSet(m_Row.id);
@@ -212,9 +212,9 @@ bool ValueStore::readViaFiles() {
 
 bool ValueStore::readViaFile(const char* fileName, bool copy) {
   if (copy) fileName = m_Parser.copyText(fileName);
-  if (m_Parser.m_ViaFileDepth + 1 >= Parser::viaFileDepthLimit) {
+  if (m_Parser.m_ViaFileDepth + 1 >= Parser::ViaFileDepthLimit) {
     m_Parser.report(ReportLevel::Fatal, OptionMessage::RecursiveViaFile,
-                    {static_cast<int>(Parser::viaFileDepthLimit), fileName});
+                    {static_cast<int>(Parser::ViaFileDepthLimit), fileName});
     return false;
   }
   ++m_Parser.m_ViaFileDepth;

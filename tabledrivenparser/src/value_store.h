@@ -25,7 +25,7 @@ public:
   bool store();
 
 private:
-  enum Offer { Offer_Refused, Offer_Taken, Offer_Open };
+  enum class Offer { Refused, Taken, Open };
 
   Offer offer(const Value& value);
   void keep(const Value& value);
@@ -45,9 +45,9 @@ private:
   template <class TakePiece>
   bool splitArgument(TakePiece takePiece);
 
-  bool hasArgument() const { return m_Argument != nullptr; }
-  bool isArgumentAList() const;
-  bool isInViaFile() const { return m_Parser.viaFileDepth() > 0; }
+  [[nodiscard]] bool hasArgument() const { return m_Argument != nullptr; }
+  [[nodiscard]] bool isArgumentAList() const;
+  [[nodiscard]] bool isInViaFile() const { return m_Parser.getViaFileDepth() > 0; }
   const char* lastingArgument();
   NumberText readNumberAt(const char* text);
   void showChoices();

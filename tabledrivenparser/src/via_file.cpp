@@ -15,8 +15,8 @@ struct ViaFile::ScanState {
   bool inParentheses = false;
   bool isEscapePending = false;
 
-  bool isQuoted() const { return inDoubleQuotes || inSingleQuotes; }
-  bool isEnclosed() const { return isQuoted() || inParentheses; }
+  [[nodiscard]] bool isQuoted() const { return inDoubleQuotes || inSingleQuotes; }
+  [[nodiscard]] bool isEnclosed() const { return isQuoted() || inParentheses; }
 };
 
 namespace {
@@ -87,7 +87,7 @@ void ViaFile::startWord() {
 // False if the word and its neighbour have grown too long.
 bool ViaFile::countCharacter() {
   ++m_Length;
-  return m_Reader == nullptr || m_Length + m_PreviousLength <= bufferSize;
+  return m_Reader == nullptr || m_Length + m_PreviousLength <= BufferSize;
 }
 
 void ViaFile::scanCharacter(char character, ScanState& state) {
@@ -127,10 +127,10 @@ bool ViaFile::refill() {
   if (!isOpen() || m_LastChar == '\0') return false;
   m_Position = 0;
   m_Text = {};
-  while (m_Text.size() < bufferSize) {
+  while (m_Text.size() < BufferSize) {
     char* free = m_Buffer.data() + m_Text.size();
-    const ptrdiff_t count = m_Reader->read(m_File, free, bufferSize - m_Text.size());
-    if (count == ViaFileReader::readError) fail(OptionMessage::ViaFileReadError);
+    const ptrdiff_t count = m_Reader->read(m_File, free, BufferSize - m_Text.size());
+    if (count == ViaFileReader::ReadError) fail(OptionMessage::ViaFileReadError);
     if (count <= 0) break;
     const size_t size = static_cast<size_t>(count);
     if (std::find(free, free + size, '\0') != free + size) {

@@ -24,22 +24,24 @@ struct WordInHand {
   const char* argument = nullptr; // null if there is none
   uint32_t wordsUsed = 1;
 
-  const MatchString& row() const { return *match.row; }
-  bool isConcatenated() const { return !earlierRows.isEmpty(); }
+  [[nodiscard]] const MatchString& getRow() const { return *match.row; }
+  [[nodiscard]] bool isConcatenated() const { return !earlierRows.isEmpty(); }
 
-  bool isRepeated() const {
+  [[nodiscard]] bool isRepeated() const {
     for (const MatchString* earlier : earlierRows) {
-      if (earlier->id == row().id) return true;
+      if (earlier->id == getRow().id) return true;
     }
     return false;
   }
 
   // Whether other letters follow this one.
-  bool goesOn() const { return row().kind == Kind_Implied && dashes == 1 && !match.rest.empty(); }
+  [[nodiscard]] bool goesOn() const {
+    return getRow().kind == Kind_Implied && dashes == 1 && !match.rest.empty();
+  }
 
   void moveOn() {
     if (!isRepeated()) earlierRows.append(match.row);
-    letters += row().name;
+    letters += getRow().name;
     word = match.rest;
     argument = nullptr;
   }

@@ -27,11 +27,11 @@ public:
 };
 
 void writeAgain(const Parser& parser) {
-  TextSink measuring({}, TextSink::Quote_Blanks, ' ');
+  TextSink measuring({}, TextSink::QuoteMode::Blanks, ' ');
   std::vector<char> buffer(printCommandLine(parser, measuring));
-  TextSink exact(buffer, TextSink::Quote_Blanks, ' ');
+  TextSink exact(buffer, TextSink::QuoteMode::Blanks, ' ');
   if (printCommandLine(parser, exact) != buffer.size() || buffer.back() != '\0') std::abort();
-  TextSink dump({}, TextSink::Quote_Never, ',');
+  TextSink dump({}, TextSink::QuoteMode::Never, ',');
   dumpTables(parser, dump);
 }
 

@@ -121,7 +121,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   static const bool isInitialised = (alloclib::initialise(), true);
   if (!isInitialised || size == 0) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
-  const Reading reading = readFile(text, ViaFile::bufferSize);
+  const Reading reading = readFile(text, ViaFile::BufferSize);
   expect(readFile(text, size_t{data[0]} + 1) == reading);
 
   const bool hasNul = text.find('\0') != std::string_view::npos;

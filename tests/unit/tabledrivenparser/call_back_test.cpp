@@ -41,8 +41,8 @@ protected:
 TEST_F(CallBackOption, handsTheWordOver) {
   m_Session.parse({"--call=a", "--call", "b", "-k"});
   EXPECT_THAT(m_Handler.m_Lines, ElementsAre("call/a/1", "call/b/2", "k/<null>/1"));
-  EXPECT_EQ(m_Session.parser().record(Id_CallBack).firstSet, 1u);
-  EXPECT_EQ(m_Session.parser().record(Id_CallBack).lastSet, 3u);
+  EXPECT_EQ(m_Session.parser().getRecord(Id_CallBack).firstSet, 1u);
+  EXPECT_EQ(m_Session.parser().getRecord(Id_CallBack).lastSet, 3u);
   EXPECT_THAT(m_Session.m_Listener.m_Lines, IsEmpty());
 }
 
@@ -70,7 +70,7 @@ TEST_F(CallBackOption, mayMakeTheWordUnknown) {
 TEST_F(CallBackOption, mayStandInAConcatenation) {
   m_Session.parse({"-kx"});
   EXPECT_THAT(m_Handler.m_Lines, ElementsAre("k/<null>/1"));
-  EXPECT_TRUE(m_Session.parser().booleanValue(Id_Boolean));
+  EXPECT_TRUE(m_Session.parser().getBoolean(Id_Boolean));
 }
 
 TEST_F(CallBackOption, isRefusedWithoutAHandler) {

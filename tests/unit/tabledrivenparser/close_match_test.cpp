@@ -43,7 +43,7 @@ TEST(RivalRows, stayAmbiguousWhenABetterKindTakesTheFirstPlace) {
 TEST(LetterBeforeADot, isNoAbbreviation) {
   Session session;
   session.parse({"-a.o"});
-  EXPECT_STREQ(session.parser().textValue(Id_After), ".o");
+  EXPECT_STREQ(session.parser().getText(Id_After), ".o");
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 

@@ -198,13 +198,13 @@ TEST(CommandLineReport, tellsTheSizeNeeded) {
   session.parse({"-t", "lib.a"});
   std::array<char, 9> enough{};
   enough.fill('?');
-  TextSink sink(enough, TextSink::Quote_Blanks, ' ');
+  TextSink sink(enough, TextSink::QuoteMode::Blanks, ' ');
   EXPECT_EQ(printCommandLine(session.parser(), sink), 9u);
   EXPECT_STREQ(enough.data(), "-t lib.a");
 
   std::array<char, 8> tooSmall{};
   tooSmall.fill('?');
-  TextSink smallSink(tooSmall, TextSink::Quote_Blanks, ' ');
+  TextSink smallSink(tooSmall, TextSink::QuoteMode::Blanks, ' ');
   EXPECT_EQ(printCommandLine(session.parser(), smallSink), 9u);
   EXPECT_EQ(std::string(tooSmall.data(), tooSmall.size()), "-t lib.a");
 }
@@ -299,8 +299,8 @@ private:
 Lines valuesOf(tool::Session& session) {
   Lines lines;
   for (uint32_t id = 0; id < tool::Id_Count; ++id) {
-    const ValueDefinition& definition = session.parser().definition(id);
-    const Value& value = session.parser().record(id).value;
+    const ValueDefinition& definition = session.parser().getDefinition(id);
+    const Value& value = session.parser().getRecord(id).value;
     std::string line = std::to_string(id) + ":";
     if (definition.type == Type_StringVector) {
       for (const std::string& text : session.texts(id))

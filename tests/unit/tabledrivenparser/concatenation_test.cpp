@@ -10,9 +10,9 @@ using testing::IsEmpty;
 TEST(Concatenation, setsEachLetter) {
   Session session;
   session.parse({"-tvC", "word"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_List));
-  EXPECT_TRUE(session.parser().booleanValue(Id_Verbose));
-  EXPECT_TRUE(session.parser().booleanValue(Id_KeepOld));
+  EXPECT_TRUE(session.parser().getBoolean(Id_List));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Verbose));
+  EXPECT_TRUE(session.parser().getBoolean(Id_KeepOld));
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("word"));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
@@ -61,9 +61,9 @@ TEST(Concatenation, refusesTheRestWithAnUnknownLetter) {
 TEST(Concatenation, mayEndInAnOldLongName) {
   Session session;
   session.parse({"-tvsn"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_List));
-  EXPECT_TRUE(session.parser().booleanValue(Id_Version));
-  EXPECT_FALSE(session.parser().booleanValue(Id_Verbose));
+  EXPECT_TRUE(session.parser().getBoolean(Id_List));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Version));
+  EXPECT_FALSE(session.parser().getBoolean(Id_Verbose));
   EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '--vsn'."));
 }
 
@@ -72,7 +72,7 @@ TEST(Concatenation, hasNoLimit) {
   Session session;
   session.parse(Lines{"-" + std::string(letterCount, 'v')});
   EXPECT_EQ(session.reports().size(), letterCount - 1);
-  EXPECT_EQ(session.parser().setCounter(), letterCount);
+  EXPECT_EQ(session.parser().getSetCounter(), letterCount);
 }
 
 // A million letters would be 10^12 steps to anything quadratic.

@@ -129,7 +129,7 @@ TEST(StringConstraint, chainsItsNodes) {
   session.m_Table.restrictionMask = 2;
   session.m_Definitions[Id_String].constraint.strings = &node;
   session.parse({"--text=b", "--text=a"});
-  EXPECT_STREQ(session.parser().textValue(Id_String), "b");
+  EXPECT_STREQ(session.parser().getText(Id_String), "b");
   EXPECT_THAT(session.reports(),
               ElementsAre("fatal: Argument 'a' not permitted for option 'text'."));
 }
@@ -146,7 +146,7 @@ TEST(ValueOrder, isConstraintThenValidatorThenListener) {
   };
   session.m_Listener.m_Answer = [](Parser& parser, uint32_t, const Value& value) {
     calls.push_back("listener " + std::to_string(value.integer));
-    EXPECT_EQ(parser.integersValue(Id_IntVector), nullptr);
+    EXPECT_EQ(parser.getIntegers(Id_IntVector), nullptr);
     return false;
   };
   session.parse({"--many=1,2"});

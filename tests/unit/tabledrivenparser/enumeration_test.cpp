@@ -10,7 +10,7 @@ using testing::IsEmpty;
 TEST(EnumerationOption, takesANameInAnyCase) {
   Session session;
   session.parse({"--enum=rED"});
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 2u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 2u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -20,7 +20,7 @@ TEST(EnumerationOption, wantsTheWholeName) {
     session.parse({"--enum", text});
     EXPECT_THAT(session.reports(), ElementsAre(std::string("fatal: Argument '") + text +
                                                "' not permitted for option 'enum'."));
-    EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 1u);
+    EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 1u);
   }
 }
 
@@ -35,7 +35,7 @@ TEST(EnumerationOption, passesOverRestrictedNames) {
 TEST(EnumerationOption, warnsOfADeprecatedName) {
   Session session;
   session.parse({"--enum=CRIMSON"});
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 2u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 2u);
   EXPECT_THAT(session.reports(),
               ElementsAre("warning: Argument 'CRIMSON' to option 'enum' is deprecated"));
 }
@@ -44,7 +44,7 @@ TEST(EnumerationOption, listsTheNamesForEnumeratorZeroAndStoresIt) {
   Session session;
   EXPECT_FALSE(session.parser().hasShownChoices());
   session.parse({"--enum=choose"});
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 0u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 0u);
   EXPECT_TRUE(session.parser().hasShownChoices());
   EXPECT_THAT(session.reports(),
               ElementsAre("remark: The following arguments to option 'enum' can be selected:\n "
@@ -64,7 +64,7 @@ TEST(EnumerationOption, listsNothingInAFilteredParse) {
   Session session;
   const uint32_t filter[] = {Id_Enum};
   session.parser().parseWord("--enum=choose", nullptr, filter);
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 0u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 0u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -89,7 +89,7 @@ TEST(EnumerationOption, listsEveryNameHoweverMany) {
 TEST(EnumerationOption, takesAnImpliedEnumerator) {
   Session session;
   session.parse({"--red"});
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 2u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 2u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -105,8 +105,8 @@ TEST(ListenerOfAnEnumeration, mayTakeTheValueBeforeAnyRemark) {
   session.m_Listener.m_Answer = [](Parser&, uint32_t, const Value&) { return true; };
   session.parse({"--enum=choose", "--enum=crimson"});
   EXPECT_THAT(session.m_Listener.m_Lines, ElementsAre("2=0", "2=2"));
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 1u);
-  EXPECT_EQ(session.parser().record(Id_Enum).lastSet, 2u);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 1u);
+  EXPECT_EQ(session.parser().getRecord(Id_Enum).lastSet, 2u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 

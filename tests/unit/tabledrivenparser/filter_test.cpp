@@ -17,8 +17,8 @@ TEST(FilteredParse, storesTheListedOptions) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "--diag_style", "gnu"), 2u);
   EXPECT_EQ(parseFiltered(session, "-v"), 1u);
-  EXPECT_EQ(session.parser().enumeratorValue(Id_DiagStyle), 4u);
-  EXPECT_TRUE(session.parser().booleanValue(Id_Verbose));
+  EXPECT_EQ(session.parser().getEnumerator(Id_DiagStyle), 4u);
+  EXPECT_TRUE(session.parser().getBoolean(Id_Verbose));
 }
 
 TEST(FilteredParse, passesOverTheOthersWithoutTheirArguments) {
@@ -27,7 +27,7 @@ TEST(FilteredParse, passesOverTheOthersWithoutTheirArguments) {
   EXPECT_EQ(parseFiltered(session, "-a"), 1u);
   EXPECT_EQ(parseFiltered(session, "--normalise=abc"), 1u);
   EXPECT_EQ(parseFiltered(session, "word"), 1u);
-  EXPECT_EQ(session.parser().setCounter(), 0u);
+  EXPECT_EQ(session.parser().getSetCounter(), 0u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -51,9 +51,9 @@ TEST(FilteredParse, readsViaFilesThroughTheFilter) {
   session.m_Files.m_Contents["f"] = "-t --diag_style=ide word --via g";
   session.m_Files.m_Contents["g"] = "-v";
   EXPECT_EQ(parseFiltered(session, "--via", "f"), 2u);
-  EXPECT_EQ(session.parser().enumeratorValue(Id_DiagStyle), 2u);
-  EXPECT_TRUE(session.parser().booleanValue(Id_Verbose));
-  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_EQ(session.parser().getEnumerator(Id_DiagStyle), 2u);
+  EXPECT_TRUE(session.parser().getBoolean(Id_Verbose));
+  EXPECT_FALSE(session.parser().getBoolean(Id_List));
   EXPECT_THAT(session.texts(Id_Words), IsEmpty());
   EXPECT_THAT(session.texts(Id_Via), ElementsAre("f", "g"));
 }

@@ -17,7 +17,7 @@ class GoodInt : public testing::TestWithParam<GoodNumber> {};
 TEST_P(GoodInt, isStored) {
   Session session;
   session.parse({"--int", GetParam().text});
-  EXPECT_EQ(session.parser().integerValue(Id_Int), GetParam().value);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), GetParam().value);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -37,7 +37,7 @@ TEST_P(BadInt, isNotPermitted) {
   session.parse({"--int", GetParam()});
   EXPECT_THAT(session.reports(), ElementsAre(std::string("fatal: Argument '") + GetParam() +
                                              "' not permitted for option 'int'."));
-  EXPECT_EQ(session.parser().integerValue(Id_Int), -1);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), -1);
 }
 
 INSTANTIATE_TEST_SUITE_P(Number, BadInt,
@@ -60,9 +60,9 @@ INSTANTIATE_TEST_SUITE_P(Number, TooLargeInt,
 TEST(Address, isUnsignedAnd32BitsWide) {
   Session session;
   session.parse({"--addr", "4294967295"});
-  EXPECT_EQ(session.parser().addressValue(Id_Address), 0xFFFFFFFFu);
+  EXPECT_EQ(session.parser().getAddress(Id_Address), 0xFFFFFFFFu);
   session.parse({"--addr=-1"});
-  EXPECT_EQ(session.parser().addressValue(Id_Address), 0xFFFFFFFFu);
+  EXPECT_EQ(session.parser().getAddress(Id_Address), 0xFFFFFFFFu);
   session.parse({"--addr=-0x1"});
   EXPECT_THAT(session.reports(),
               ElementsAre("fatal: Argument '-0x1' not permitted for option 'addr'."));
@@ -78,15 +78,15 @@ TEST(Address, overflowsBeyond32Bits) {
 TEST(Address, takesItsImpliedValue) {
   Session session;
   session.parse({"--address"});
-  EXPECT_EQ(session.parser().addressValue(Id_Address), 0xABCDEFu);
+  EXPECT_EQ(session.parser().getAddress(Id_Address), 0xABCDEFu);
   session.parse({"--address=0x1F"});
-  EXPECT_EQ(session.parser().addressValue(Id_Address), 0x1Fu);
+  EXPECT_EQ(session.parser().getAddress(Id_Address), 0x1Fu);
 }
 
 TEST(Address64, is64BitsWide) {
   Session session;
   session.parse({"--add64=0xFFFFFFFFFFFFFFFF"});
-  EXPECT_EQ(session.parser().addressValue(Id_Address64), 0xFFFFFFFFFFFFFFFFu);
+  EXPECT_EQ(session.parser().getAddress(Id_Address64), 0xFFFFFFFFFFFFFFFFu);
   session.parse({"--add64=18446744073709551616"});
   EXPECT_THAT(session.reports(),
               ElementsAre("fatal: Overflow: '18446744073709551616' will not fit in an integer."));
@@ -95,7 +95,7 @@ TEST(Address64, is64BitsWide) {
 TEST(ImpliedInt, isStoredAsItStands) {
   Session session;
   session.parse({"--int1"});
-  EXPECT_EQ(session.parser().integerValue(Id_Int), 1);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), 1);
 }
 
 } // namespace tabledrivenparser::types

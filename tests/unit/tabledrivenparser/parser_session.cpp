@@ -85,7 +85,7 @@ ptrdiff_t MemoryFiles::read(void* file, char* buffer, size_t size) {
   auto& open = *static_cast<OpenFile*>(file);
   const std::string& contents = m_Contents[open.name];
   const size_t count = std::min({size, contents.size() - open.position, m_PieceSize});
-  if (count == 0 && open.name == m_FailingRead) return readError;
+  if (count == 0 && open.name == m_FailingRead) return ReadError;
   std::memcpy(buffer, contents.data() + open.position, count);
   open.position += count;
   return static_cast<ptrdiff_t>(count);
@@ -98,7 +98,7 @@ bool MemoryFiles::close(void* file) {
 }
 
 bool RecordingListener::onOption(Parser& parser, uint32_t id, const Value& value) {
-  m_Lines.push_back(std::to_string(id) + "=" + textOf(parser.definition(id), value));
+  m_Lines.push_back(std::to_string(id) + "=" + textOf(parser.getDefinition(id), value));
   return m_Answer && m_Answer(parser, id, value);
 }
 
@@ -132,7 +132,7 @@ void ParserSession::parse(const Lines& words) {
 
 Lines ParserSession::texts(uint32_t id) {
   Lines lines;
-  const StrList* list = parser().textsValue(id);
+  const StrList* list = parser().getTexts(id);
   if (list == nullptr) return lines;
   for (const char* text : *list)
     lines.push_back(text);
@@ -141,12 +141,12 @@ Lines ParserSession::texts(uint32_t id) {
 
 std::vector<long long> ParserSession::numbers(uint32_t id) {
   std::vector<long long> result;
-  const Value& value = parser().record(id).value;
-  if (parser().definition(id).type == Type_IntVector && value.integers != nullptr) {
+  const Value& value = parser().getRecord(id).value;
+  if (parser().getDefinition(id).type == Type_IntVector && value.integers != nullptr) {
     for (int number : *value.integers)
       result.push_back(number);
   }
-  if (parser().definition(id).type == Type_Int64Vector && value.longIntegers != nullptr) {
+  if (parser().getDefinition(id).type == Type_Int64Vector && value.longIntegers != nullptr) {
     for (long long number : *value.longIntegers)
       result.push_back(number);
   }
@@ -155,7 +155,7 @@ std::vector<long long> ParserSession::numbers(uint32_t id) {
 
 std::string ParserSession::commandLine() {
   std::vector<char> buffer(1024 * 1024);
-  TextSink sink(buffer, TextSink::Quote_Blanks, ' ');
+  TextSink sink(buffer, TextSink::QuoteMode::Blanks, ' ');
   const size_t needed = printCommandLine(parser(), sink);
   EXPECT_EQ(buffer[needed - 1], '\0');
   return std::string(buffer.data(), needed - 1);
@@ -163,7 +163,7 @@ std::string ParserSession::commandLine() {
 
 std::string ParserSession::dump() {
   std::vector<char> buffer(64 * 1024);
-  TextSink sink(buffer, TextSink::Quote_Never, ',');
+  TextSink sink(buffer, TextSink::QuoteMode::Never, ',');
   const size_t needed = dumpTables(parser(), sink);
   EXPECT_EQ(buffer[needed - 1], '\0');
   return std::string(buffer.data(), needed - 1);

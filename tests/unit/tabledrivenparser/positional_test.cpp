@@ -30,7 +30,7 @@ TEST(PositionalWord, mayBeASingleDash) {
   Session session;
   session.parse({"-", "-t"});
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("-"));
-  EXPECT_TRUE(session.parser().booleanValue(Id_List));
+  EXPECT_TRUE(session.parser().getBoolean(Id_List));
 }
 
 TEST(EndOfOptions, makesEveryWordPositional) {

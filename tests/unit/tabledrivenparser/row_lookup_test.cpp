@@ -12,22 +12,22 @@ using testing::IsEmpty;
 TEST(RowLookup, takesALongNameInAnyCase) {
   Session session;
   session.parse({"--CREATE", "--Help"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
-  EXPECT_TRUE(session.parser().booleanValue(Id_Help));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Create));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Help));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
 TEST(RowLookup, takesAHyphenForAnUnderscore) {
   Session session;
   session.parse({"--new-files_only"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_NewFilesOnly));
+  EXPECT_TRUE(session.parser().getBoolean(Id_NewFilesOnly));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
 TEST(RowLookup, completesANameThatEndsInADot) {
   Session session;
   session.parse({"--cre."});
-  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Create));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -47,7 +47,7 @@ TEST(RowLookup, refusesADotWithOneDash) {
 TEST(RowLookup, takesAnArgumentBehindAnAbbreviation) {
   Session session;
   session.parse({"--db.=low"});
-  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "low");
+  EXPECT_STREQ(session.parser().getText(Id_CheckLevel), "low");
 }
 
 TEST(RowLookup, refusesAnArgumentThatTouchesALongName) {
@@ -83,22 +83,22 @@ INSTANTIATE_TEST_SUITE_P(RowLookup, AmbiguousWord,
 TEST(RowLookup, prefersARowWithoutArgumentWhereNoneIsGiven) {
   Session session;
   session.parse({"--d."});
-  EXPECT_TRUE(session.parser().booleanValue(Id_DebugSymbols));
+  EXPECT_TRUE(session.parser().getBoolean(Id_DebugSymbols));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
 TEST(RowLookup, prefersARowWithArgumentWhereOneIsGiven) {
   Session session;
   session.parse({"--no_.=5", "--de.", "--no_d."});
-  EXPECT_EQ(session.parser().integerValue(Id_Normalise), 5);
+  EXPECT_EQ(session.parser().getInteger(Id_Normalise), 5);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
 TEST(RowLookup, prefersTheLongerName) {
   Session session;
   session.parse({"--version."});
-  EXPECT_TRUE(session.parser().booleanValue(Id_VersionNumber));
-  EXPECT_FALSE(session.parser().booleanValue(Id_Version));
+  EXPECT_TRUE(session.parser().getBoolean(Id_VersionNumber));
+  EXPECT_FALSE(session.parser().getBoolean(Id_Version));
 }
 
 TEST(RowLookup, refusesALetterWithTwoDashes) {
@@ -108,20 +108,20 @@ TEST(RowLookup, refusesALetterWithTwoDashes) {
 TEST(RowLookup, tellsTwinLettersApart) {
   Session session;
   session.parse({"-V", "-T", "-C"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_Version));
-  EXPECT_FALSE(session.parser().booleanValue(Id_Verbose));
-  EXPECT_TRUE(session.parser().booleanValue(Id_Truncate));
-  EXPECT_FALSE(session.parser().booleanValue(Id_List));
-  EXPECT_TRUE(session.parser().booleanValue(Id_KeepOld));
-  EXPECT_FALSE(session.parser().booleanValue(Id_NoBanner));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Version));
+  EXPECT_FALSE(session.parser().getBoolean(Id_Verbose));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Truncate));
+  EXPECT_FALSE(session.parser().getBoolean(Id_List));
+  EXPECT_TRUE(session.parser().getBoolean(Id_KeepOld));
+  EXPECT_FALSE(session.parser().getBoolean(Id_NoBanner));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
 TEST(RowLookup, warnsOfAnOldLetterInTheOtherCase) {
   Session session;
   session.parse({"-D", "-X"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_Delete));
-  EXPECT_TRUE(session.parser().booleanValue(Id_Extract));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Delete));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Extract));
   EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '-d'.",
                                              "warning: Old syntax, please use '-x'."));
 }
@@ -129,7 +129,7 @@ TEST(RowLookup, warnsOfAnOldLetterInTheOtherCase) {
 TEST(RowLookup, warnsOfAnOldLongNameWithOneDash) {
   Session session;
   session.parse({"-create"});
-  EXPECT_TRUE(session.parser().booleanValue(Id_Create));
+  EXPECT_TRUE(session.parser().getBoolean(Id_Create));
   EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '--create'."));
 }
 
@@ -144,8 +144,8 @@ TEST(RowLookup, takesOldSyntaxInSilenceWhereThePolicySaysSo) {
     silent.oldSyntaxPolicy = static_cast<SyntaxPolicy>(policy);
     ParserSession session(silent, definitions);
     session.parse({"-create", "-D"});
-    EXPECT_TRUE(session.parser().booleanValue(Id_Create));
-    EXPECT_TRUE(session.parser().booleanValue(Id_Delete));
+    EXPECT_TRUE(session.parser().getBoolean(Id_Create));
+    EXPECT_TRUE(session.parser().getBoolean(Id_Delete));
     EXPECT_THAT(session.reports(), IsEmpty());
   }
 }
@@ -201,7 +201,7 @@ TEST(RowArgument, standsBehindALetterOrIsTheNextWord) {
   for (const auto& words : {Lines{"-apos"}, Lines{"-a", "pos"}, Lines{"-a=pos"}}) {
     Session session;
     session.parse(words);
-    EXPECT_STREQ(session.parser().textValue(Id_After), "pos");
+    EXPECT_STREQ(session.parser().getText(Id_After), "pos");
     EXPECT_THAT(session.texts(Id_Words), IsEmpty());
     EXPECT_THAT(session.reports(), IsEmpty());
   }
@@ -218,17 +218,17 @@ TEST(RowArgument, countsTheWordsUsed) {
 TEST(RowArgument, mayLookLikeAnOption) {
   Session session;
   session.parse({"-a", "-t", "--db_check", "--"});
-  EXPECT_STREQ(session.parser().textValue(Id_After), "-t");
-  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "--");
-  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_STREQ(session.parser().getText(Id_After), "-t");
+  EXPECT_STREQ(session.parser().getText(Id_CheckLevel), "--");
+  EXPECT_FALSE(session.parser().getBoolean(Id_List));
   EXPECT_FALSE(session.parser().isEndOfOptions());
 }
 
 TEST(RowArgument, mayBeEmptyBehindTheSign) {
   Session session;
   session.parse({"--db_check=", "-a=", "word"});
-  EXPECT_STREQ(session.parser().textValue(Id_CheckLevel), "");
-  EXPECT_STREQ(session.parser().textValue(Id_After), "");
+  EXPECT_STREQ(session.parser().getText(Id_CheckLevel), "");
+  EXPECT_STREQ(session.parser().getText(Id_After), "");
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("word"));
 }
 
@@ -267,7 +267,7 @@ TEST(RowArgument, behindTheSeparatorIsOldSyntax) {
 TEST(RowArgument, isTheLastOneGiven) {
   Session session;
   session.parse({"-b", "one", "-i", "two"});
-  EXPECT_STREQ(session.parser().textValue(Id_Before), "two");
+  EXPECT_STREQ(session.parser().getText(Id_Before), "two");
 }
 
 // A small table with what the big one lacks.
@@ -306,7 +306,7 @@ TEST(SpecialRow, mayStartWithADigit) {
   const OptionTable special = specialTable();
   ParserSession session(special, specialDefinitions);
   session.parse({"--1ST"});
-  EXPECT_TRUE(session.parser().booleanValue(1));
+  EXPECT_TRUE(session.parser().getBoolean(1));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -344,16 +344,16 @@ TEST(SpecialRow, withAnOptionalArgumentLeavesTheNextWord) {
   const OptionTable special = specialTable();
   ParserSession session(special, specialDefinitions);
   session.parse({"-O", "word"});
-  EXPECT_STREQ(session.parser().textValue(4), "implied");
+  EXPECT_STREQ(session.parser().getText(4), "implied");
   EXPECT_THAT(session.texts(0), ElementsAre("word"));
   session.parse({"-Onear"});
-  EXPECT_STREQ(session.parser().textValue(4), "near");
+  EXPECT_STREQ(session.parser().getText(4), "near");
   session.parse({"--other"});
-  EXPECT_STREQ(session.parser().textValue(4), "implied");
+  EXPECT_STREQ(session.parser().getText(4), "implied");
   session.parse({"--other=far"});
-  EXPECT_STREQ(session.parser().textValue(4), "far");
+  EXPECT_STREQ(session.parser().getText(4), "far");
   session.parse({"--other="});
-  EXPECT_STREQ(session.parser().textValue(4), "");
+  EXPECT_STREQ(session.parser().getText(4), "");
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 
@@ -386,7 +386,7 @@ TEST(FallbackHandling, isOfferedWhatNoRowAccepts) {
   ParserSession session(open, definitions);
   session.parse({"--odd", "word", "-t", "-k", "-tk", "last"});
   EXPECT_THAT(fallback.m_Lines, ElementsAre("2odd/word", "1k/-tk"));
-  EXPECT_TRUE(session.parser().booleanValue(Id_List));
+  EXPECT_TRUE(session.parser().getBoolean(Id_List));
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("last"));
   EXPECT_THAT(session.reports(), IsEmpty());
 }
@@ -405,7 +405,7 @@ TEST(Failure, endsAllParsing) {
   Session session;
   session.parse({"--nonsense", "-t", "--", "-a"});
   EXPECT_TRUE(session.parser().hasFailed());
-  EXPECT_FALSE(session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(session.parser().getBoolean(Id_List));
   EXPECT_FALSE(session.parser().isEndOfOptions());
   EXPECT_EQ(session.parser().parseWord("-t", "x"), 1u);
   EXPECT_EQ(session.reports().size(), 1u);

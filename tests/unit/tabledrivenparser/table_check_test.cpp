@@ -27,9 +27,9 @@ static_assert(!isFindable("a-b"));
 static_assert(!isFindable("~a"));
 static_assert(!isFindable("\xe9"));
 
-static_assert(indexByFirstLetter(sorted)['a' - 'a'] == noRow);
+static_assert(indexByFirstLetter(sorted)['a' - 'a'] == NoRow);
 static_assert(indexByFirstLetter(sorted)['c' - 'a'] == 2);
-static_assert(indexByFirstLetter(sorted)['z' - 'a'] == noRow);
+static_assert(indexByFirstLetter(sorted)['z' - 'a'] == NoRow);
 
 static_assert(rowNamed(sorted, "c") == &sorted[3]);
 static_assert(rowNamed(sorted, "no") == nullptr);

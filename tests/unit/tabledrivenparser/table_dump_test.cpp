@@ -98,7 +98,7 @@ TEST(TableDump, joinsSeveralMasksAndFlags) {
 TEST(TableDump, tellsTheSizeNeeded) {
   Session session;
   const size_t size = session.dump().size() + 1;
-  TextSink sink({}, TextSink::Quote_Never, ',');
+  TextSink sink({}, TextSink::QuoteMode::Never, ',');
   EXPECT_EQ(dumpTables(session.parser(), sink), size);
 }
 

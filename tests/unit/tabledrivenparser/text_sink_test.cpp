@@ -10,22 +10,22 @@ namespace tabledrivenparser {
 
 TEST(TextSink, goesOnCountingWhenItIsFull) {
   std::array<char, 4> buffer{};
-  TextSink sink(buffer, TextSink::Quote_Never, ' ');
+  TextSink sink(buffer, TextSink::QuoteMode::Never, ' ');
   sink.put("abcdef");
   sink.put('g');
-  EXPECT_EQ(sink.used(), 7u);
+  EXPECT_EQ(sink.getUsed(), 7u);
   EXPECT_EQ(std::string(buffer.data(), buffer.size()), "abcd");
 }
 
 TEST(TextSink, countsWithoutAnyBuffer) {
-  TextSink sink({}, TextSink::Quote_Never, ' ');
+  TextSink sink({}, TextSink::QuoteMode::Never, ' ');
   sink.put("abc");
-  EXPECT_EQ(sink.used(), 3u);
+  EXPECT_EQ(sink.getUsed(), 3u);
 }
 
 TEST(TextSink, separatesEntriesAfterTheFirst) {
   std::array<char, 16> buffer{};
-  TextSink sink(buffer, TextSink::Quote_Never, ',');
+  TextSink sink(buffer, TextSink::QuoteMode::Never, ',');
   for (const char* text : {"a", "b", "c"}) {
     sink.startEntry();
     sink.put(text);
@@ -41,20 +41,20 @@ std::string valueText(TextSink::QuoteMode mode, bool quoteEmpty, std::string_vie
   TextSink sink(buffer, mode, ' ');
   sink.setQuoteEmpty(quoteEmpty);
   sink.putValue("p=", value);
-  return std::string(buffer.data(), sink.used());
+  return std::string(buffer.data(), sink.getUsed());
 }
 
 TEST(TextSink, quotesAValueWithABlankOrATab) {
-  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "a b"), "p=\"a b\"");
-  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "\t"), "p=\"\t\"");
-  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, "ab"), "p=ab");
-  EXPECT_EQ(valueText(TextSink::Quote_Never, true, "a b"), "p=a b");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "a b"), "p=\"a b\"");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "\t"), "p=\"\t\"");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "ab"), "p=ab");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Never, true, "a b"), "p=a b");
 }
 
 TEST(TextSink, quotesAnEmptyValueOnDemand) {
-  EXPECT_EQ(valueText(TextSink::Quote_Blanks, false, ""), "p=");
-  EXPECT_EQ(valueText(TextSink::Quote_Blanks, true, ""), "p=\"\"");
-  EXPECT_EQ(valueText(TextSink::Quote_Never, true, ""), "p=");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, ""), "p=");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, true, ""), "p=\"\"");
+  EXPECT_EQ(valueText(TextSink::QuoteMode::Never, true, ""), "p=");
 }
 
 } // namespace tabledrivenparser

@@ -11,9 +11,9 @@ TEST(ValueRecordTest, startsAsItsDefaultAndUnset) {
   Session session;
   session.m_Records[Id_Int].value.integer = 99;
   session.m_Records[Id_Int].lastSet = 99;
-  EXPECT_EQ(session.parser().integerValue(Id_Int), -1);
-  EXPECT_EQ(session.parser().enumeratorValue(Id_Enum), 1u);
-  EXPECT_EQ(session.parser().textsValue(Id_StringVector), nullptr);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), -1);
+  EXPECT_EQ(session.parser().getEnumerator(Id_Enum), 1u);
+  EXPECT_EQ(session.parser().getTexts(Id_StringVector), nullptr);
   EXPECT_FALSE(session.parser().isSet(Id_Int));
   EXPECT_TRUE(session.parser().isDefault(Id_Int));
 }
@@ -21,27 +21,27 @@ TEST(ValueRecordTest, startsAsItsDefaultAndUnset) {
 TEST(ValueRecordTest, countsTheFirstAndTheLastTimeItWasSet) {
   Session session;
   session.parse({"--int=1", "-x", "--int=2"});
-  EXPECT_EQ(session.parser().record(Id_Int).firstSet, 1u);
-  EXPECT_EQ(session.parser().record(Id_Int).lastSet, 3u);
-  EXPECT_EQ(session.parser().record(Id_Boolean).firstSet, 2u);
-  EXPECT_EQ(session.parser().record(Id_Boolean).lastSet, 2u);
-  EXPECT_EQ(session.parser().setCounter(), 3u);
+  EXPECT_EQ(session.parser().getRecord(Id_Int).firstSet, 1u);
+  EXPECT_EQ(session.parser().getRecord(Id_Int).lastSet, 3u);
+  EXPECT_EQ(session.parser().getRecord(Id_Boolean).firstSet, 2u);
+  EXPECT_EQ(session.parser().getRecord(Id_Boolean).lastSet, 2u);
+  EXPECT_EQ(session.parser().getSetCounter(), 3u);
 }
 
 TEST(ValueRecordTest, staysUnsetWhenTheStoreFails) {
   Session session;
   session.parse({"--int=x"});
   EXPECT_FALSE(session.parser().isSet(Id_Int));
-  EXPECT_EQ(session.parser().setCounter(), 0u);
+  EXPECT_EQ(session.parser().getSetCounter(), 0u);
 }
 
 TEST(ValueRecordTest, countsAsSetWhenTheListenerTookTheValue) {
   Session session;
   session.m_Listener.m_Answer = [](Parser&, uint32_t id, const Value&) { return id == Id_Int; };
   session.parse({"--int=5", "--text=t"});
-  EXPECT_EQ(session.parser().integerValue(Id_Int), -1);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), -1);
   EXPECT_TRUE(session.parser().isSet(Id_Int));
-  EXPECT_STREQ(session.parser().textValue(Id_String), "t");
+  EXPECT_STREQ(session.parser().getText(Id_String), "t");
   EXPECT_THAT(session.m_Listener.m_Lines, ElementsAre("5=5", "8=t"));
 }
 
@@ -59,21 +59,21 @@ TEST(ValueRecordTest, isRefusedByItsValidator) {
 TEST(BooleanOption, takesTheRowsValueWhateverTheText) {
   Session session;
   session.parse({"--bool", "false"});
-  EXPECT_EQ(session.parser().record(Id_Boolean).value.integer, 1);
-  EXPECT_TRUE(session.parser().booleanValue(Id_Boolean));
+  EXPECT_EQ(session.parser().getRecord(Id_Boolean).value.integer, 1);
+  EXPECT_TRUE(session.parser().getBoolean(Id_Boolean));
 }
 
 TEST(StringOption, takesItsImpliedValue) {
   Session session;
   session.parse({"--text_x"});
-  EXPECT_STREQ(session.parser().textValue(Id_String), "x");
+  EXPECT_STREQ(session.parser().getText(Id_String), "x");
 }
 
 TEST(StringOption, pointsIntoTheCommandLine) {
   Session session;
   const char word[] = "--text=abc";
   session.parser().parseWord(word, nullptr);
-  EXPECT_EQ(session.parser().textValue(Id_String), word + 7);
+  EXPECT_EQ(session.parser().getText(Id_String), word + 7);
 }
 
 TEST(BadType, isNeverStored) {
@@ -85,7 +85,7 @@ TEST(BadType, isNeverStored) {
 
 TEST(DefaultOfAValue, mayBeNone) {
   Session session;
-  EXPECT_EQ(session.parser().addressValue(Id_Address64), 0u);
+  EXPECT_EQ(session.parser().getAddress(Id_Address64), 0u);
 }
 
 TEST(DefaultOfAValue, isTheFirstUsableNode) {
@@ -98,7 +98,7 @@ TEST(DefaultOfAValue, isTheFirstUsableNode) {
     session.m_Table.restrictionMask = tableMask;
     session.m_Definitions[Id_Int].defaultKind = Default_List;
     session.m_Definitions[Id_Int].defaultValue.defaults = &head;
-    return session.parser().integerValue(Id_Int);
+    return session.parser().getInteger(Id_Int);
   };
   EXPECT_EQ(defaultUnder(3), 10);
   EXPECT_EQ(defaultUnder(2), 20);
@@ -111,7 +111,7 @@ TEST(DefaultOfAValue, isNoneWithoutAUsableNode) {
   session.m_Table.restrictionMask = 1;
   session.m_Definitions[Id_String].defaultKind = Default_List;
   session.m_Definitions[Id_String].defaultValue.defaults = &node;
-  EXPECT_EQ(session.parser().textValue(Id_String), nullptr);
+  EXPECT_EQ(session.parser().getText(Id_String), nullptr);
 }
 
 TEST(DefaultOfAValue, mayBeComputed) {
@@ -121,8 +121,8 @@ TEST(DefaultOfAValue, mayBeComputed) {
   session.m_Records[Id_Int].defaultCallBack = [](const Parser&, uint32_t id) {
     return Value{.integer = 100 + id};
   };
-  EXPECT_EQ(session.parser().integerValue(Id_Int), 100 + static_cast<int>(Id_Int));
-  EXPECT_EQ(session.parser().textValue(Id_String), nullptr);
+  EXPECT_EQ(session.parser().getInteger(Id_Int), 100 + static_cast<int>(Id_Int));
+  EXPECT_EQ(session.parser().getText(Id_String), nullptr);
   session.parse({"--int=105"});
   EXPECT_TRUE(session.parser().isDefault(Id_Int));
 }
@@ -136,8 +136,8 @@ TEST(Release, emptiesVectorsAndLeavesOtherValues) {
   EXPECT_THAT(session.texts(Id_Via), IsEmpty());
   EXPECT_THAT(session.numbers(Id_IntVector), IsEmpty());
   EXPECT_THAT(session.numbers(Id_Int64Vector), IsEmpty());
-  EXPECT_EQ(session.parser().integerValue(Id_Int), 3);
-  EXPECT_STREQ(session.parser().textValue(Id_String), "c");
+  EXPECT_EQ(session.parser().getInteger(Id_Int), 3);
+  EXPECT_STREQ(session.parser().getText(Id_String), "c");
 }
 
 } // namespace tabledrivenparser::types

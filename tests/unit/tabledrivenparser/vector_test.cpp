@@ -97,7 +97,7 @@ TEST(ListenerOfAVector, takesSingleElements) {
   };
   session.parse({"--texts=a,b,c"});
   EXPECT_THAT(session.texts(Id_StringVector), ElementsAre("a", "c"));
-  EXPECT_EQ(session.parser().setCounter(), 3u);
+  EXPECT_EQ(session.parser().getSetCounter(), 3u);
   EXPECT_THAT(session.reports(), IsEmpty());
 }
 

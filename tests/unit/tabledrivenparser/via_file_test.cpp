@@ -25,7 +25,7 @@ protected:
 TEST_F(ViaOption, readsWordsAtItsPlace) {
   files()["f"] = "-t b\n--diag_style=gnu c";
   m_Session.parse({"a", "--via", "f", "d"});
-  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_TRUE(m_Session.parser().getBoolean(Id_List));
   EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("a", "b", "c", "d"));
   EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("f"));
   EXPECT_THAT(m_Session.reports(), IsEmpty());
@@ -66,8 +66,8 @@ TEST_F(ViaOption, stopsAtTheFirstBadFileOfAList) {
 TEST_F(ViaOption, takesArgumentsOfOptionsFromTheFile) {
   files()["f"] = "-a\n pos --db_check \"\" x";
   m_Session.parse({"--via", "f"});
-  EXPECT_STREQ(m_Session.parser().textValue(Id_After), "pos");
-  EXPECT_STREQ(m_Session.parser().textValue(Id_CheckLevel), "");
+  EXPECT_STREQ(m_Session.parser().getText(Id_After), "pos");
+  EXPECT_STREQ(m_Session.parser().getText(Id_CheckLevel), "");
   EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("x"));
 }
 
@@ -97,14 +97,14 @@ TEST_F(ViaOption, copiesTextsThatOutliveTheBuffer) {
   files()["f"] = contents;
   files()["inner"] = "--libattrmap map";
   m_Session.parse({"--via", "f"});
-  EXPECT_STREQ(m_Session.parser().textValue(Id_After), "pos");
-  EXPECT_STREQ(m_Session.parser().textValue(Id_Before), "q");
-  EXPECT_STREQ(m_Session.parser().textValue(Id_Map), "map");
+  EXPECT_STREQ(m_Session.parser().getText(Id_After), "pos");
+  EXPECT_STREQ(m_Session.parser().getText(Id_Before), "q");
+  EXPECT_STREQ(m_Session.parser().getText(Id_Map), "map");
   EXPECT_THAT(m_Session.texts(Id_DiagError), ElementsAre("L1", "L2", "L3"));
   EXPECT_THAT(m_Session.texts(Id_Via), ElementsAre("f", "inner"));
   EXPECT_EQ(m_Session.texts(Id_Words).front(), "word0");
   EXPECT_EQ(m_Session.texts(Id_Words).back(), "word999");
-  EXPECT_EQ(m_Session.parser().viaFileDepth(), 0u);
+  EXPECT_EQ(m_Session.parser().getViaFileDepth(), 0u);
 }
 
 TEST_F(ViaOption, nestsNineLevels) {
@@ -131,13 +131,13 @@ TEST_F(ViaOption, stopsAFileThatNamesItselfAtTheTenthLevel) {
 TEST_F(ViaOption, countsTheSetBehindTheWordsOfTheFile) {
   files()["f"] = "-t -v";
   m_Session.parse({"--via", "f"});
-  EXPECT_EQ(m_Session.parser().record(Id_Via).firstSet, 3u);
+  EXPECT_EQ(m_Session.parser().getRecord(Id_Via).firstSet, 3u);
 }
 
 TEST_F(ViaOption, reportsAFileThatCannotBeOpened) {
   m_Session.parse({"--via", "no%s", "-t"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Could not open via file 'no%s'."));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_List));
 }
 
 TEST_F(ViaOption, reportsAnEmptyName) {
@@ -150,7 +150,7 @@ TEST_F(ViaOption, reportsAReadError) {
   m_Session.m_Files.m_FailingRead = "f";
   m_Session.parse({"--via", "f"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Error when reading from via file 'f'."));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_List));
 }
 
 TEST_F(ViaOption, actsOnEarlierPiecesBeforeAReadError) {
@@ -158,8 +158,8 @@ TEST_F(ViaOption, actsOnEarlierPiecesBeforeAReadError) {
   m_Session.m_Files.m_FailingRead = "f";
   m_Session.parse({"--via", "f"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Error when reading from via file 'f'."));
-  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_Verbose));
+  EXPECT_TRUE(m_Session.parser().getBoolean(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_Verbose));
 }
 
 TEST_F(ViaOption, warnsOfAFailingCloseAndGoesOn) {
@@ -167,7 +167,7 @@ TEST_F(ViaOption, warnsOfAFailingCloseAndGoesOn) {
   m_Session.m_Files.m_FailingClose = "f";
   m_Session.parse({"--via", "f", "-v"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("warning: Could not close via file 'f'."));
-  EXPECT_TRUE(m_Session.parser().booleanValue(Id_Verbose));
+  EXPECT_TRUE(m_Session.parser().getBoolean(Id_Verbose));
 }
 
 TEST_F(ViaOption, saysNothingOfTheCloseOnceAllHasFailed) {
@@ -182,21 +182,21 @@ TEST_F(ViaOption, looksOneWordAheadBeforeItActs) {
   files()["f"] = "-t \"open\n -v";
   m_Session.parse({"--via", "f"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Malformed via file 'f'."));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_List));
 }
 
 TEST_F(ViaOption, hasActedOnAllButTheWordBeforeAMalformedOne) {
   files()["f"] = "-t -v (open";
   m_Session.parse({"--via", "f"});
-  EXPECT_TRUE(m_Session.parser().booleanValue(Id_List));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_Verbose));
+  EXPECT_TRUE(m_Session.parser().getBoolean(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_Verbose));
 }
 
 TEST_F(ViaOption, reportsABadOptionOfTheFile) {
   files()["f"] = "--nonsense -t";
   m_Session.parse({"--via", "f"});
   EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Unrecognized option '--nonsense'."));
-  EXPECT_FALSE(m_Session.parser().booleanValue(Id_List));
+  EXPECT_FALSE(m_Session.parser().getBoolean(Id_List));
 }
 
 TEST_F(ViaOption, takesNoPartInConcatenation) {
@@ -265,7 +265,7 @@ protected:
     const auto region = makeRegion();
     Parser parser({table, definitions, records}, nullptr, session.m_Reporter, m_Reader, *region);
     parser.parseWord("--via", path.c_str());
-    for (const StrList* words = parser.textsValue(Id_Words); words != nullptr; words = nullptr) {
+    for (const StrList* words = parser.getTexts(Id_Words); words != nullptr; words = nullptr) {
       for (const char* word : *words)
         session.m_Reporter.m_Lines.push_back(word);
     }
@@ -300,8 +300,8 @@ TEST_F(StdioReader, staysInErrorOnceAReadFailed) {
   void* file = m_Reader.open(m_Folder.c_str());
   ASSERT_NE(file, nullptr);
   char buffer[8];
-  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::readError);
-  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::readError);
+  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::ReadError);
+  EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::ReadError);
   EXPECT_TRUE(m_Reader.close(file));
 }
 

@@ -209,7 +209,7 @@ TEST(ViaBuffer, cutsNoWordAtAnyPosition) {
                           "\"\\", "(g h)", "",       "\\", "last"};
   std::string otherWords = "\r\n";
   Lines otherAndExpected = expected;
-  for (size_t shift = 0; shift <= ViaFile::bufferSize; ++shift) {
+  for (size_t shift = 0; shift <= ViaFile::BufferSize; ++shift) {
     const std::string blanks(shift, ' ');
     ASSERT_THAT(wordsOf(blanks + text), ElementsAreArray(expected)) << shift;
     ASSERT_THAT(wordsOf(blanks + text + "\n"), ElementsAreArray(expected)) << shift;
