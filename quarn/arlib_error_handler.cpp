@@ -106,7 +106,7 @@ bool ArlibErrorHandler::reportMemberAttributesClash(const Archive&, const Archiv
 
 void ArlibErrorHandler::showClashes(const elfext::FullAttr& attributes) const {
   if (!m_ShowDetails) return;
-  const std::string_view format = messages::messageText(messages::AttributeClash);
+  const std::string_view format = messages::getMessageText(messages::AttributeClash);
   elfext::FullAttr remaining = attributes;
   elfext::Clash clash;
   while (elfext::takeClash(remaining, clash))
@@ -116,7 +116,7 @@ void ArlibErrorHandler::showClashes(const elfext::FullAttr& attributes) const {
 // The lines have a severity of their own, so that they also come when the warning is silenced.
 void ArlibErrorHandler::showGroup(MinorVariantGroup group) const {
   if (!m_ShowDetails) return;
-  const std::string_view format = messages::messageText(messages::VariantGroupMember);
+  const std::string_view format = messages::getMessageText(messages::VariantGroupMember);
   for (size_t i = 0; i < group.size(); ++i) {
     messages::reportFormat(RemarkWord, nullptr, format, group.front()->getName(), i,
                            group[i]->getName());

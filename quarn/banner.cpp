@@ -17,7 +17,8 @@ constexpr char AnyCharacter = '?';
 } // namespace
 
 void showBanner(BannerMode mode, const char* toolName) {
-  messages::writeText(messages::Stream_Output, support::bannerText(support::getBuildData()) + "\n");
+  messages::writeText(messages::Stream::Output,
+                      support::bannerText(support::getBuildData()) + "\n");
   if (mode == BannerMode::Alone) return;
   messages::listingMessage(messages::HelpCommandFormat, toolName);
   messages::listingMessage(messages::HelpWildcards, AnyCharacter);

@@ -62,7 +62,7 @@ std::string commandLineText(const Parser& parser) {
 
 void showCommandLine(const Parser& parser, const char* toolName) {
   messages::reportFormat(messages::RemarkWord, nullptr,
-                         messages::messageText(messages::CommandLineEcho), toolName,
+                         messages::getMessageText(messages::CommandLineEcho), toolName,
                          commandLineText(parser));
 }
 

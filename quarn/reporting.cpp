@@ -6,7 +6,7 @@
 namespace quarn {
 
 bool hasErrors() {
-  return messages::errorCount() != 0;
+  return messages::getErrorCount() != 0;
 }
 
 // The process never leaves the C locale, so the text is the same for every user. Where the host has
@@ -18,7 +18,7 @@ std::string hostErrorText(int errorNumber) {
 bool flushOutput() {
   if (messages::flushAll()) return true;
   reportMessage(messages::ErrorWord, messages::WritingExtractedFile, "stdout",
-                hostErrorText(messages::stdoutError()));
+                hostErrorText(messages::getStdoutError()));
   return false;
 }
 

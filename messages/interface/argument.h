@@ -17,29 +17,31 @@ concept IntegerArgument = std::integral<Type> && !std::same_as<Type, bool> &&
 
 class Argument {
 public:
-  enum Kind : uint8_t { Kind_String, Kind_Character, Kind_Integer };
+  enum class Kind : uint8_t { String, Character, Integer };
 
   // A text is only viewed: it must outlive the call that the argument is made for. All of these
   // are implicit, since the reporting templates exist to take plain values.
-  Argument(std::string_view text) : m_Text(text), m_Kind(Kind_String) {}
+  Argument(std::string_view text) : m_Text(text), m_Kind(Kind::String) {}
   Argument(const std::string& text) : Argument(std::string_view(text)) {}
   Argument(const char* text) : Argument(std::string_view(text ? text : "(null)")) {}
   Argument(char character)
-      : m_Value(static_cast<unsigned char>(character)), m_Kind(Kind_Character) {}
+      : m_Value(static_cast<unsigned char>(character)), m_Kind(Kind::Character) {}
   template <IntegerArgument Type>
   Argument(Type value)
-      : m_Value(static_cast<uint64_t>(value)), m_Kind(Kind_Integer), m_IsWide(sizeof(Type) > 4) {}
+      : m_Value(static_cast<uint64_t>(value)), m_Kind(Kind::Integer), m_IsWide(sizeof(Type) > 4) {}
 
-  Kind kind() const { return m_Kind; }
-  std::string_view text() const { return m_Text; }
-  char character() const { return static_cast<char>(m_Value); }
+  [[nodiscard]] Kind getKind() const { return m_Kind; }
+  [[nodiscard]] std::string_view getText() const { return m_Text; }
+  [[nodiscard]] char getCharacter() const { return static_cast<char>(m_Value); }
 
   // As in C, the conversion decides whether the bits are read as signed: an unsigned 32-bit
   // argument of 0xFFFFFFFF shows as -1 under %d.
-  int64_t signedValue() const {
+  [[nodiscard]] int64_t getSigned() const {
     return m_IsWide ? static_cast<int64_t>(m_Value) : static_cast<int32_t>(m_Value);
   }
-  uint64_t unsignedValue() const { return m_IsWide ? m_Value : static_cast<uint32_t>(m_Value); }
+  [[nodiscard]] uint64_t getUnsigned() const {
+    return m_IsWide ? m_Value : static_cast<uint32_t>(m_Value);
+  }
 
 private:
   std::string_view m_Text;

@@ -21,12 +21,12 @@ inline constexpr uint32_t JapaneseCatalogue = 1;
 inline constexpr uint32_t CatalogueCount = 2;
 
 // The rows of a built-in catalogue, ascending by key; index is below CatalogueCount.
-std::span<const CatalogueRow> catalogueRows(uint32_t index);
+[[nodiscard]] std::span<const CatalogueRow> getCatalogueRows(uint32_t index);
 
 // The text of a key: from the external catalogue if there is one that has it, else from the chosen
 // built-in one. An unknown key gives "<NotFound Code=... key=...>", good until the next such call;
 // every other text lives as long as its catalogue.
-std::string_view messageText(Key key);
+[[nodiscard]] std::string_view getMessageText(Key key);
 
 // A catalogue that is looked at before the built-in one; its rows must ascend by key and belong to
 // the caller. An empty span takes it away.
@@ -34,15 +34,15 @@ void setExternalCatalogue(std::span<const CatalogueRow> rows);
 
 // Chooses the built-in catalogue and the output code page by a name such as "ja_JP", "ja_JP.UTF-8"
 // or "UTF-8". False if the name is not valid; then nothing has changed.
-bool setLocale(std::string_view name);
+[[nodiscard]] bool setLocale(std::string_view name);
 
 // For initialise: English, and the host's own encoding.
 void resetLocale();
 
-uint32_t currentCatalogue();
+[[nodiscard]] uint32_t getCurrentCatalogue();
 
 // The code page by its number: 65001 is UTF-8, the default. Texts leave in UTF-8 whatever it is,
 // as a host without code pages has nothing to convert to.
-uint32_t outputCodePage();
+[[nodiscard]] uint32_t getOutputCodePage();
 
 } // namespace messages

@@ -12,10 +12,10 @@
 
 namespace messages {
 
-enum FormatStatus : uint8_t {
-  FormatStatus_Done,
-  FormatStatus_BadFormat,        // unknown conversion, or one that does not fit its argument
-  FormatStatus_TooManyArguments, // the format reaches beyond MostFormatArguments
+enum class FormatStatus : uint8_t {
+  Done,
+  BadFormat,        // unknown conversion, or one that does not fit its argument
+  TooManyArguments, // the format reaches beyond MostFormatArguments
 };
 
 inline constexpr uint32_t MostFormatArguments = 20;

@@ -16,7 +16,7 @@ enum class Key : uint32_t {};
 inline constexpr std::string_view SeverityLetters = "?IWE?U??";
 inline constexpr uint32_t LargestNumber = 16383;
 
-constexpr Key makeKey(char letter, uint32_t number, char severityLetter) {
+[[nodiscard]] constexpr Key makeKey(char letter, uint32_t number, char severityLetter) {
   const size_t severityPlace = SeverityLetters.find(severityLetter);
   const uint32_t place =
       severityPlace == std::string_view::npos ? 0 : static_cast<uint32_t>(severityPlace);
@@ -24,18 +24,18 @@ constexpr Key makeKey(char letter, uint32_t number, char severityLetter) {
              place << 1};
 }
 
-constexpr uint32_t valueOf(Key key) {
+[[nodiscard]] constexpr uint32_t valueOf(Key key) {
   return static_cast<uint32_t>(key);
 }
-constexpr uint32_t numberOf(Key key) {
+[[nodiscard]] constexpr uint32_t numberOf(Key key) {
   return valueOf(key) >> 4 & LargestNumber;
 }
-constexpr char severityLetterOf(Key key) {
+[[nodiscard]] constexpr char severityLetterOf(Key key) {
   return SeverityLetters[valueOf(key) >> 1 & 7];
 }
 
 // "?" where the key holds no letter.
-constexpr char letterOf(Key key) {
+[[nodiscard]] constexpr char letterOf(Key key) {
   const char letter = static_cast<char>(valueOf(key) >> 18 & 0x7F);
   const bool isLetter = (letter >= 'A' && letter <= 'Z') || (letter >= 'a' && letter <= 'z');
   return isLetter ? letter : '?';
@@ -46,8 +46,8 @@ class KeyText {
 public:
   explicit KeyText(Key key);
   // Both views live as long as this object.
-  std::string_view text() const { return {m_Characters, m_Length}; }
-  std::string_view textBehindLetter() const { return text().substr(1); }
+  [[nodiscard]] std::string_view getText() const { return {m_Characters, m_Length}; }
+  [[nodiscard]] std::string_view getTextBehindLetter() const { return getText().substr(1); }
 
 private:
   char m_Characters[8]; // a letter, four or five digits, a letter

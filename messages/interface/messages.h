@@ -84,7 +84,7 @@ template <class... Arguments>
 // The 24-bit number of a fault, from its text before the arguments are put in. The path of an
 // assertion counts from its last component named "work", whichever separator it is written with,
 // so that the place of the source tree doesn't matter.
-uint32_t faultHash(std::string_view text);
+[[nodiscard]] uint32_t computeFaultHash(std::string_view text);
 
 // How many messages came out at each severity.
 struct Counters {
@@ -95,8 +95,8 @@ struct Counters {
   uint32_t fatalErrors = 0;
   uint32_t internalFaults = 0;
 };
-Counters counters();
-uint32_t errorCount();
+[[nodiscard]] Counters getCounters();
+[[nodiscard]] uint32_t getErrorCount();
 
 // The run ends at the report that makes errors, fatal errors and internal faults together exceed
 // the limit. The default handler ends the process with status 1; after one that returns, the
@@ -105,17 +105,17 @@ using LimitHandler = void (*)();
 void setLimit(uint32_t limit, LimitHandler handler);
 
 // The look of diagnostics: 0 the tool's own, 1 for development environments, 2 for editors.
-uint32_t style();
+[[nodiscard]] uint32_t getStyle();
 void setStyle(uint32_t style);
 
 // The stream of diagnostics, stderr unless changed.
-Stream diagnosticStream();
+[[nodiscard]] Stream getDiagnosticStream();
 void setDiagnosticStream(Stream stream);
 
 // The number of characters behind the last newline of what was printed as plain message.
-uint32_t column();
+[[nodiscard]] uint32_t getColumn();
 
 // The severity that a message comes out with, by the user's overrides and the word's permissions.
-uint32_t effectiveSeverity(uint32_t severityWord, Key key);
+[[nodiscard]] uint32_t computeEffectiveSeverity(uint32_t severityWord, Key key);
 
 } // namespace messages

@@ -12,7 +12,7 @@
 
 namespace messages {
 
-enum Stream : uint8_t { Stream_Output, Stream_Error };
+enum class Stream : uint8_t { Output, Error };
 
 // Duplicates stdout and stderr, unless this was done before. What is written to a stream that is
 // closed at this moment is dropped silently.
@@ -55,8 +55,8 @@ public:
 bool flushAll();
 
 // Whether a write to stdout failed; from then on everything for stdout is dropped.
-bool stdoutFailed();
+[[nodiscard]] bool hasStdoutFailed();
 // The host's error number of that failure, or 0.
-int stdoutError();
+[[nodiscard]] int getStdoutError();
 
 } // namespace messages

@@ -10,7 +10,7 @@ class OutputSink {
 public:
   virtual ~OutputSink() = default;
   // Takes all the bytes. 0, or the host's error number, after which an unknown part is written.
-  virtual int write(std::string_view bytes) = 0;
+  [[nodiscard]] virtual int write(std::string_view bytes) = 0;
 };
 
 } // namespace messages

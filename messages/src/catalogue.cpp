@@ -17,8 +17,8 @@ struct NamedCatalogue {
 };
 
 constexpr NamedCatalogue Catalogues[CatalogueCount] = {
-    {"en_US", englishCatalogue},
-    {"ja_JP", japaneseCatalogue},
+    {"en_US", getEnglishCatalogue},
+    {"ja_JP", getJapaneseCatalogue},
 };
 
 struct CodePage {
@@ -58,8 +58,8 @@ std::string_view notFoundText(Key key) {
   static char text[64];
   const KeyText keyText(key);
   const int length = std::snprintf(text, sizeof text, "<NotFound Code=%.*s key=0x%.8x>",
-                                   static_cast<int>(keyText.text().size()), keyText.text().data(),
-                                   static_cast<unsigned>(valueOf(key)));
+                                   static_cast<int>(keyText.getText().size()),
+                                   keyText.getText().data(), static_cast<unsigned>(valueOf(key)));
   return {text, static_cast<size_t>(length)};
 }
 
@@ -72,12 +72,12 @@ const Row* findByName(std::span<const Row> rows, std::string_view name) {
 
 } // namespace
 
-std::span<const CatalogueRow> catalogueRows(uint32_t index) {
+std::span<const CatalogueRow> getCatalogueRows(uint32_t index) {
   return Catalogues[index].catalogue().rows;
 }
 
 // A listing says the same thing thousands of times.
-MessageFormat messageFormat(Key key) {
+MessageFormat getMessageFormat(Key key) {
   if (const CatalogueRow* row = findRow(externalCatalogue, key)) return {row->text, {}};
   const BuiltInCatalogue& catalogue = Catalogues[catalogueIndex].catalogue();
   if (catalogue.rows[lastIndex].key != key) {
@@ -88,8 +88,8 @@ MessageFormat messageFormat(Key key) {
   return formatAt(catalogue, lastIndex);
 }
 
-std::string_view messageText(Key key) {
-  return messageFormat(key).text;
+std::string_view getMessageText(Key key) {
+  return getMessageFormat(key).text;
 }
 
 void setExternalCatalogue(std::span<const CatalogueRow> rows) {
@@ -115,11 +115,11 @@ void resetLocale() {
   codePageNumber = Utf8CodePage;
 }
 
-uint32_t currentCatalogue() {
+uint32_t getCurrentCatalogue() {
   return catalogueIndex;
 }
 
-uint32_t outputCodePage() {
+uint32_t getOutputCodePage() {
   return codePageNumber;
 }
 

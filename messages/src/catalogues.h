@@ -17,8 +17,8 @@ struct BuiltInCatalogue {
   std::span<const uint16_t> ends;      // by row: the number of pieces up to its last one
 };
 
-const BuiltInCatalogue& englishCatalogue();
-const BuiltInCatalogue& japaneseCatalogue();
+const BuiltInCatalogue& getEnglishCatalogue();
+const BuiltInCatalogue& getJapaneseCatalogue();
 
 // A text, and what it says if it is a built-in one; of any other there are no pieces.
 struct MessageFormat {
@@ -26,7 +26,7 @@ struct MessageFormat {
   std::span<const FormatPiece> pieces;
 };
 
-// Good for as long as messageText's answer.
-MessageFormat messageFormat(Key key);
+// Good for as long as getMessageText's answer.
+MessageFormat getMessageFormat(Key key);
 
 } // namespace messages

@@ -34,9 +34,9 @@ struct CompiledRows {
   std::array<FormatPiece, PieceCount> pieces;
   std::array<uint16_t, RowCount> ends;
 
-  consteval bool hasFault() const {
+  [[nodiscard]] consteval bool hasFault() const {
     return std::any_of(pieces.begin(), pieces.end(),
-                       [](const FormatPiece& piece) { return piece.fault != FormatStatus_Done; });
+                       [](const FormatPiece& piece) { return piece.fault != FormatStatus::Done; });
   }
 };
 

@@ -69,7 +69,7 @@ void applyDiagnosticStyle(uint32_t enumerator) {
   }
 }
 
-uint32_t effectiveSeverity(uint32_t severityWord, Key key) {
+uint32_t computeEffectiveSeverity(uint32_t severityWord, Key key) {
   const MessageState& state = messageState;
   const uint32_t asked = severityOf(severityWord);
   if (asked >= SeverityCount) internalFault("Messages: Bad severity number %d\n", asked);

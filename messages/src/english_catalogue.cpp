@@ -133,7 +133,7 @@ constexpr BuiltInCatalogue Catalogue = {Rows, Compiled.pieces, Compiled.ends};
 
 } // namespace
 
-const BuiltInCatalogue& englishCatalogue() {
+const BuiltInCatalogue& getEnglishCatalogue() {
   return Catalogue;
 }
 

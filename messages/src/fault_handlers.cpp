@@ -23,9 +23,9 @@ void onRegionOutOfMemory(size_t, size_t) {
 }
 
 void onRegionError(const char* text) {
-  std::string& line = freshLine();
+  std::string& line = startLine();
   appendArguments(line, "Internal alloclib error: %s\n", ArgumentArray<const char*>{text});
-  writeText(Stream_Error, line);
+  writeText(Stream::Error, line);
   endProcess(1);
 }
 

@@ -15,25 +15,25 @@ using Arguments = std::span<const Argument>;
 
 // False if the conversion is none of ours, or not one for this kind of argument.
 bool appendArgument(std::string& text, const Conversion& conversion, const Argument& argument) {
-  switch (argument.kind()) {
-  case Argument::Kind_String:
+  switch (argument.getKind()) {
+  case Argument::Kind::String:
     if (conversion.letter != 's') return false;
-    appendString(text, conversion, argument.text());
+    appendString(text, conversion, argument.getText());
     return true;
-  case Argument::Kind_Character:
+  case Argument::Kind::Character:
     if (conversion.letter != 'c') return false;
-    appendCharacter(text, conversion, argument.character());
+    appendCharacter(text, conversion, argument.getCharacter());
     return true;
-  case Argument::Kind_Integer:
+  case Argument::Kind::Integer:
     break;
   }
   if (conversion.letter == 'd' || conversion.letter == 'i') {
-    appendSigned(text, conversion, argument.signedValue());
+    appendSigned(text, conversion, argument.getSigned());
     return true;
   }
   constexpr std::string_view UnsignedLetters = "uxXo";
   if (UnsignedLetters.find(conversion.letter) == std::string_view::npos) return false;
-  appendUnsigned(text, conversion, argument.unsignedValue());
+  appendUnsigned(text, conversion, argument.getUnsigned());
   return true;
 }
 
@@ -41,9 +41,9 @@ bool appendArgument(std::string& text, const Conversion& conversion, const Argum
 bool readStar(Arguments arguments, uint8_t index, int32_t& value) {
   if (index >= arguments.size()) return false;
   const Argument& argument = arguments[index];
-  if (argument.kind() != Argument::Kind_Integer) return false;
-  value = static_cast<int32_t>(argument.signedValue());
-  return value == argument.signedValue();
+  if (argument.getKind() != Argument::Kind::Integer) return false;
+  value = static_cast<int32_t>(argument.getSigned());
+  return value == argument.getSigned();
 }
 
 bool setWidth(Conversion& conversion, Arguments arguments, uint8_t index) {
@@ -66,19 +66,19 @@ FormatStatus appendConversion(std::string& text, const FormatPiece& piece, Argum
   Conversion conversion = piece.conversion;
   const bool hasStarWidth = piece.widthArgument != FormatPiece::NoArgument;
   if (hasStarWidth && !setWidth(conversion, arguments, piece.widthArgument))
-    return FormatStatus_BadFormat;
+    return FormatStatus::BadFormat;
   const bool hasStarPrecision = piece.precisionArgument != FormatPiece::NoArgument;
   if (hasStarPrecision && !setPrecision(conversion, arguments, piece.precisionArgument))
-    return FormatStatus_BadFormat;
-  if (piece.fault != FormatStatus_Done) return piece.fault;
-  if (piece.argument >= arguments.size()) return FormatStatus_BadFormat;
-  return appendArgument(text, conversion, arguments[piece.argument]) ? FormatStatus_Done
-                                                                     : FormatStatus_BadFormat;
+    return FormatStatus::BadFormat;
+  if (piece.fault != FormatStatus::Done) return piece.fault;
+  if (piece.argument >= arguments.size()) return FormatStatus::BadFormat;
+  return appendArgument(text, conversion, arguments[piece.argument]) ? FormatStatus::Done
+                                                                     : FormatStatus::BadFormat;
 }
 
 FormatStatus appendPiece(std::string& text, const FormatPiece& piece, Arguments arguments) {
   text.append(piece.literal);
-  return piece.hasConversion ? appendConversion(text, piece, arguments) : FormatStatus_Done;
+  return piece.hasConversion ? appendConversion(text, piece, arguments) : FormatStatus::Done;
 }
 
 } // namespace
@@ -87,9 +87,9 @@ FormatStatus appendPieces(std::string& text, std::span<const FormatPiece> pieces
                           std::span<const Argument> arguments) {
   for (const FormatPiece& piece : pieces) {
     const FormatStatus status = appendPiece(text, piece, arguments);
-    if (status != FormatStatus_Done) return status;
+    if (status != FormatStatus::Done) return status;
   }
-  return FormatStatus_Done;
+  return FormatStatus::Done;
 }
 
 // Piece by piece and without an allocation for them: "Out of memory" may come this way.
@@ -99,9 +99,9 @@ FormatStatus appendFormatted(std::string& text, std::string_view format,
   FormatPiece piece;
   while (reader.read(piece)) {
     const FormatStatus status = appendPiece(text, piece, arguments);
-    if (status != FormatStatus_Done) return status;
+    if (status != FormatStatus::Done) return status;
   }
-  return FormatStatus_Done;
+  return FormatStatus::Done;
 }
 
 } // namespace messages

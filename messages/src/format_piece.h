@@ -25,7 +25,7 @@ struct FormatPiece {
   uint8_t precisionArgument = NoArgument; // likewise
   // Where it is not Done, no argument fits, and nothing behind the piece counts. The arguments of
   // its stars were named in front of the fault, and may be at fault first.
-  FormatStatus fault = FormatStatus_Done;
+  FormatStatus fault = FormatStatus::Done;
 };
 
 // As appendFormatted, for a format that was read.

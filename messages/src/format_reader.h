@@ -26,13 +26,13 @@ public:
     if (!skip('%') || isPercent) return true;
     piece.hasConversion = true;
     piece.fault = readConversion(piece);
-    if (piece.fault != FormatStatus_Done) m_Rest = {};
+    if (piece.fault != FormatStatus::Done) m_Rest = {};
     return true;
   }
 
 private:
   // How the format names its arguments; the two ways don't mix.
-  enum Order : uint8_t { Order_Unknown, Order_Sequential, Order_Positional };
+  enum class Order : uint8_t { Unknown, Sequential, Positional };
 
   static constexpr uint32_t LargestNumber = std::numeric_limits<int32_t>::max();
 
@@ -89,21 +89,21 @@ private:
 
   // Positions count from 1; without one it is the next argument in turn.
   constexpr FormatStatus nameArgument(std::optional<uint32_t> position, uint8_t& argument) {
-    const Order order = position ? Order_Positional : Order_Sequential;
-    if (m_Order != Order_Unknown && m_Order != order) return FormatStatus_BadFormat;
+    const Order order = position ? Order::Positional : Order::Sequential;
+    if (m_Order != Order::Unknown && m_Order != order) return FormatStatus::BadFormat;
     m_Order = order;
-    if (position == 0u) return FormatStatus_BadFormat;
+    if (position == 0u) return FormatStatus::BadFormat;
     const uint32_t index = position ? *position - 1 : m_NamedCount++;
-    if (index >= MostFormatArguments) return FormatStatus_TooManyArguments;
+    if (index >= MostFormatArguments) return FormatStatus::TooManyArguments;
     argument = static_cast<uint8_t>(index);
-    return FormatStatus_Done;
+    return FormatStatus::Done;
   }
 
   // A width or a precision: a number, or a "*" and the argument that holds it.
   constexpr FormatStatus readExtent(uint32_t& extent, uint8_t& argument) {
     if (skip('*')) return nameArgument(readPosition(), argument);
     extent = readNumber();
-    return extent <= LargestNumber ? FormatStatus_Done : FormatStatus_BadFormat;
+    return extent <= LargestNumber ? FormatStatus::Done : FormatStatus::BadFormat;
   }
 
   // From behind its "%".
@@ -112,14 +112,14 @@ private:
     const std::optional<uint32_t> position = readPosition();
     readFlags(conversion);
     FormatStatus status = readExtent(conversion.width, piece.widthArgument);
-    if (status != FormatStatus_Done) return status;
+    if (status != FormatStatus::Done) return status;
     conversion.hasPrecision = skip('.');
     if (conversion.hasPrecision) {
       status = readExtent(conversion.precision, piece.precisionArgument);
-      if (status != FormatStatus_Done) return status;
+      if (status != FormatStatus::Done) return status;
     }
     m_Rest.remove_prefix(std::min(m_Rest.find_first_not_of("hljztL"), m_Rest.size()));
-    if (m_Rest.empty()) return FormatStatus_BadFormat;
+    if (m_Rest.empty()) return FormatStatus::BadFormat;
     conversion.letter = m_Rest.front();
     m_Rest.remove_prefix(1);
     return nameArgument(position, piece.argument);
@@ -127,7 +127,7 @@ private:
 
   std::string_view m_Rest;
   uint32_t m_NamedCount = 0; // in sequential order
-  Order m_Order = Order_Unknown;
+  Order m_Order = Order::Unknown;
 };
 
 } // namespace messages

@@ -43,7 +43,7 @@ uint32_t extendHash(uint32_t hash, std::string_view text) {
 
 [[noreturn]] void endWithFault(uint32_t hash, std::string_view message) {
   countMessage(Severity_InternalFault);
-  std::string& line = freshLine();
+  std::string& line = startLine();
   appendLead(line, nullptr, Severity_InternalFault);
   appendArguments(line, "[0x%06x:%s] ",
                   ArgumentArray<uint32_t, std::string>{
@@ -55,7 +55,7 @@ uint32_t extendHash(uint32_t hash, std::string_view text) {
 
 } // namespace
 
-uint32_t faultHash(std::string_view text) {
+uint32_t computeFaultHash(std::string_view text) {
   text = text.substr(0, text.find('\n'));
   if (!text.starts_with(AssertionLead)) return extendHash(0, text);
   const size_t pathStart = findWorkComponent(text, AssertionLead.size());
@@ -65,18 +65,18 @@ uint32_t faultHash(std::string_view text) {
 void internalFaultArguments(std::string_view format, std::span<const Argument> arguments) {
   std::string message;
   // The report of a bad format must not itself fail on one: then the format is shown as it is.
-  if (appendFormatted(message, format, arguments) != FormatStatus_Done) message = format;
-  endWithFault(faultHash(format), message);
+  if (appendFormatted(message, format, arguments) != FormatStatus::Done) message = format;
+  endWithFault(computeFaultHash(format), message);
 }
 
 void plainFault(const char* text) {
-  endWithFault(faultHash(text), text);
+  endWithFault(computeFaultHash(text), text);
 }
 
 void assertionFault(const char* path, unsigned line, const char* expression) {
   std::string message(AssertionLead);
   message.append(path).append(" line ").append(std::to_string(line)).append(" (");
-  const uint32_t hash = faultHash(message + "%s)");
+  const uint32_t hash = computeFaultHash(message + "%s)");
   endWithFault(hash, message.append(expression).append(")"));
 }
 

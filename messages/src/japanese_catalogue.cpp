@@ -132,7 +132,7 @@ constexpr BuiltInCatalogue Catalogue = {Rows, Compiled.pieces, Compiled.ends};
 
 } // namespace
 
-const BuiltInCatalogue& japaneseCatalogue() {
+const BuiltInCatalogue& getJapaneseCatalogue() {
   return Catalogue;
 }
 

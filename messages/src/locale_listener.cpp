@@ -16,10 +16,10 @@ bool LocaleListener::onOption(tabledrivenparser::Parser&, uint32_t,
   if (m_Reporter) {
     m_Reporter(LocaleNotInitialised, locale);
   } else {
-    std::string& line = freshLine();
+    std::string& line = startLine();
     appendArguments(line, "*** Could not initialise message locale '%s'\n",
                     ArgumentArray<std::string_view>{locale});
-    writeText(Stream_Error, line);
+    writeText(Stream::Error, line);
   }
   endProcess(1);
 }

@@ -25,7 +25,7 @@ struct MessageState {
   uint32_t limit = 50;
   LimitHandler limitHandler = nullptr; // null: end the process
   uint32_t column = 0;
-  Stream diagnosticStream = Stream_Error;
+  Stream diagnosticStream = Stream::Error;
 };
 
 extern MessageState messageState;
@@ -40,7 +40,7 @@ void installFaultHandlers();
 bool countMessage(uint32_t severity);
 
 // An empty line to compose in. It keeps its memory, so that also "Out of memory" can be composed.
-std::string& freshLine();
+std::string& startLine();
 
 // The location in the current style, then the prefix of the severity.
 void appendLead(std::string& line, const Location* location, uint32_t severity);

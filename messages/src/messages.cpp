@@ -41,7 +41,7 @@ constexpr StyleRow Styles[] = {
 // clang-format on
 
 // The report of a bad style needs a style itself.
-const StyleRow& currentStyle() {
+const StyleRow& getCurrentStyle() {
   return Styles[messageState.style < std::size(Styles) ? messageState.style : 0];
 }
 
@@ -53,8 +53,8 @@ size_t knownFieldCount(const Location& location) {
 
 void appendCode(std::string& line, Key key) {
   const KeyText keyText(key);
-  appendArguments(line, currentStyle().codeFormat,
-                  ArgumentArray<char, std::string_view>{CodeLetter, keyText.textBehindLetter()});
+  appendArguments(line, getCurrentStyle().codeFormat,
+                  ArgumentArray<char, std::string_view>{CodeLetter, keyText.getTextBehindLetter()});
 }
 
 void checkStyle() {
@@ -64,7 +64,7 @@ void checkStyle() {
 }
 
 [[noreturn]] void endWithTooManyArguments() {
-  writeText(Stream_Error, "** NLS Fatal Error: Too many arguments in format string\n");
+  writeText(Stream::Error, "** NLS Fatal Error: Too many arguments in format string\n");
   endProcess(1);
 }
 
@@ -74,11 +74,11 @@ void appendMessage(std::string& line, const MessageFormat& format,
   const FormatStatus status = format.pieces.empty() ? appendFormatted(line, format.text, arguments)
                                                     : appendPieces(line, format.pieces, arguments);
   switch (status) {
-  case FormatStatus_Done:
+  case FormatStatus::Done:
     return;
-  case FormatStatus_BadFormat:
+  case FormatStatus::BadFormat:
     internalFault("Messages: Bad message format %s\n", format.text);
-  case FormatStatus_TooManyArguments:
+  case FormatStatus::TooManyArguments:
     endWithTooManyArguments();
   }
 }
@@ -97,7 +97,7 @@ uint32_t columnAfter(uint32_t column, std::string_view text) {
 
 } // namespace
 
-std::string& freshLine() {
+std::string& startLine() {
   static std::string line;
   line.clear();
   line.reserve(LineCapacity);
@@ -114,9 +114,9 @@ void appendLead(std::string& line, const Location* location, uint32_t severity) 
   const size_t known = knownFieldCount(place);
   const std::string_view file = known == 0 ? ToolName : place.file;
   appendArguments(
-      line, currentStyle().locationFormats[known],
+      line, getCurrentStyle().locationFormats[known],
       ArgumentArray<std::string_view, uint32_t, uint32_t>{file, place.line, place.column});
-  line += currentStyle().prefixes[severity];
+  line += getCurrentStyle().prefixes[severity];
 }
 
 bool countMessage(uint32_t severity) {
@@ -141,33 +141,33 @@ void initialise() {
   state.style = 0;
   setLimit(50, nullptr);
   state.column = 0;
-  state.diagnosticStream = Stream_Error;
+  state.diagnosticStream = Stream::Error;
   resetLocale();
   setExternalCatalogue({});
-  freshLine();
+  startLine();
   openStreams();
   installFaultHandlers();
 }
 
 bool reportArguments(uint32_t severityWord, const Location* location, Key key,
                      std::span<const Argument> arguments) {
-  const uint32_t severity = effectiveSeverity(severityWord, key);
+  const uint32_t severity = computeEffectiveSeverity(severityWord, key);
   if (!countMessage(severity)) return false;
   checkStyle();
-  std::string& line = freshLine();
+  std::string& line = startLine();
   appendLead(line, location, severity);
   if (severity != Severity_Remark) appendCode(line, key);
-  appendBody(line, messageFormat(key), arguments);
+  appendBody(line, getMessageFormat(key), arguments);
   writeText(messageState.diagnosticStream, line);
   return true;
 }
 
 bool reportFormatArguments(uint32_t severityWord, const Location* location, std::string_view format,
                            std::span<const Argument> arguments) {
-  const uint32_t severity = effectiveSeverity(severityWord, Key{});
+  const uint32_t severity = computeEffectiveSeverity(severityWord, Key{});
   if (!countMessage(severity)) return false;
   checkStyle();
-  std::string& line = freshLine();
+  std::string& line = startLine();
   appendLead(line, location, severity);
   appendBody(line, {format, {}}, arguments);
   writeText(messageState.diagnosticStream, line);
@@ -175,26 +175,26 @@ bool reportFormatArguments(uint32_t severityWord, const Location* location, std:
 }
 
 void plainMessageArguments(Key key, std::span<const Argument> arguments) {
-  std::string& line = freshLine();
-  appendMessage(line, messageFormat(key), arguments);
+  std::string& line = startLine();
+  appendMessage(line, getMessageFormat(key), arguments);
   messageState.column = columnAfter(messageState.column, line);
   writeText(messageState.diagnosticStream, line);
 }
 
 void listingMessageArguments(Key key, std::span<const Argument> arguments) {
-  std::string& line = freshLine();
-  appendMessage(line, messageFormat(key), arguments);
+  std::string& line = startLine();
+  appendMessage(line, getMessageFormat(key), arguments);
   if (line.ends_with('\n')) messageState.column = 0;
-  writeText(Stream_Output, line);
+  writeText(Stream::Output, line);
 }
 
-Counters counters() {
+Counters getCounters() {
   const auto& counts = messageState.counts;
   return {counts[Severity_Suppressed], counts[Severity_Remark], counts[Severity_Warning],
           counts[Severity_Error],      counts[Severity_Fatal],  counts[Severity_InternalFault]};
 }
 
-uint32_t errorCount() {
+uint32_t getErrorCount() {
   return messageState.counts[Severity_Error];
 }
 
@@ -203,7 +203,7 @@ void setLimit(uint32_t limit, LimitHandler handler) {
   messageState.limitHandler = handler;
 }
 
-uint32_t style() {
+uint32_t getStyle() {
   return messageState.style;
 }
 
@@ -211,7 +211,7 @@ void setStyle(uint32_t style) {
   messageState.style = style;
 }
 
-Stream diagnosticStream() {
+Stream getDiagnosticStream() {
   return messageState.diagnosticStream;
 }
 
@@ -219,7 +219,7 @@ void setDiagnosticStream(Stream stream) {
   messageState.diagnosticStream = stream;
 }
 
-uint32_t column() {
+uint32_t getColumn() {
   return messageState.column;
 }
 

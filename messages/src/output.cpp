@@ -70,7 +70,7 @@ std::string escaped(std::string_view text) {
 }
 
 void passOn(Stream stream, std::string_view bytes) {
-  if (stream == Stream_Output) {
+  if (stream == Stream::Output) {
     outputBuffer.append(bytes);
     return;
   }
@@ -142,21 +142,21 @@ void writeText(Stream stream, std::string_view text) {
 }
 
 void writeRaw(std::string_view bytes) {
-  writeBytes(Stream_Output, bytes);
+  writeBytes(Stream::Output, bytes);
 }
 
 bool flushAll() {
   releaseHeld();
   outputBuffer.flush();
-  return !stdoutFailed();
+  return !hasStdoutFailed();
 }
 
-bool stdoutFailed() {
-  return outputBuffer.error() != 0;
+bool hasStdoutFailed() {
+  return outputBuffer.getError() != 0;
 }
 
-int stdoutError() {
-  return outputBuffer.error();
+int getStdoutError() {
+  return outputBuffer.getError();
 }
 
 } // namespace messages

@@ -20,7 +20,7 @@ public:
   void setSink(OutputSink* sink);
 
   // The host's error number of the first failure, or 0.
-  int error() const { return m_Error; }
+  [[nodiscard]] int getError() const { return m_Error; }
   void noteError(int errorNumber) {
     if (m_Error == 0) m_Error = errorNumber;
   }

@@ -280,8 +280,8 @@ const Names UnmentionedOptions = {
 };
 
 TEST(SourceTree, TheHelpMentionsEachOptionOrLeavesItOutDeliberately) {
-  const std::string help = std::string(messages::messageText(messages::HelpEditOptions)) +
-                           std::string(messages::messageText(messages::HelpOtherOptions));
+  const std::string help = std::string(messages::getMessageText(messages::HelpEditOptions)) +
+                           std::string(messages::getMessageText(messages::HelpOtherOptions));
   for (const tabledrivenparser::MatchString& row : quarn::optionTable().rows) {
     const std::string name(row.name);
     const std::string shown = "\n" + std::string(row.hasLongName() ? "--" : " -") + name + " ";

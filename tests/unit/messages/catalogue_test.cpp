@@ -23,7 +23,7 @@ using testing::Pair;
 struct CatalogueTest : MessagesTest {};
 
 std::string textOf(Key key) {
-  return std::string(KeyText(key).text());
+  return std::string(KeyText(key).getText());
 }
 
 // What a format does with each of its arguments, counted from 1.
@@ -119,9 +119,9 @@ TEST(MessageKey, PrintsAQuestionMarkForWhatIsNoLetter) {
 }
 
 TEST(Catalogue, AscendsByKeyInEveryLanguageWithTheSameKeys) {
-  const auto english = catalogueRows(EnglishCatalogue);
+  const auto english = getCatalogueRows(EnglishCatalogue);
   for (uint32_t index = 0; index < CatalogueCount; ++index) {
-    const auto rows = catalogueRows(index);
+    const auto rows = getCatalogueRows(index);
     ASSERT_EQ(rows.size(), english.size());
     for (size_t i = 0; i < rows.size(); ++i)
       EXPECT_EQ(rows[i].key, english[i].key);
@@ -133,8 +133,8 @@ TEST(Catalogue, AscendsByKeyInEveryLanguageWithTheSameKeys) {
 TEST(Catalogue, HasTheSameArgumentsInEveryLanguage) {
   EXPECT_THAT(argumentsOf("%s: %2d of %%"), ElementsAre(Pair(1, "s"), Pair(2, "2d")));
   EXPECT_THAT(argumentsOf("%2$-5u %1$s"), ElementsAre(Pair(1, "s"), Pair(2, "-5u")));
-  const auto english = catalogueRows(EnglishCatalogue);
-  const auto japanese = catalogueRows(JapaneseCatalogue);
+  const auto english = getCatalogueRows(EnglishCatalogue);
+  const auto japanese = getCatalogueRows(JapaneseCatalogue);
   ASSERT_EQ(japanese.size(), english.size());
   for (size_t i = 0; i < english.size(); ++i)
     EXPECT_EQ(argumentsOf(japanese[i].text), argumentsOf(english[i].text))
@@ -143,14 +143,14 @@ TEST(Catalogue, HasTheSameArgumentsInEveryLanguage) {
 
 // A text that names some arguments by position and others in turn would be a fault when printed.
 TEST(Catalogue, HasOnlyGoodFormats) {
-  const auto english = catalogueRows(EnglishCatalogue);
+  const auto english = getCatalogueRows(EnglishCatalogue);
   for (uint32_t index = 0; index < CatalogueCount; ++index) {
-    const auto rows = catalogueRows(index);
+    const auto rows = getCatalogueRows(index);
     ASSERT_EQ(rows.size(), english.size());
     for (size_t i = 0; i < rows.size(); ++i) {
       const std::vector<Argument> arguments = exampleArguments(english[i].text);
       std::string text;
-      EXPECT_EQ(appendFormatted(text, rows[i].text, arguments), FormatStatus_Done)
+      EXPECT_EQ(appendFormatted(text, rows[i].text, arguments), FormatStatus::Done)
           << textOf(rows[i].key);
       EXPECT_FALSE(text.empty());
     }
@@ -161,13 +161,13 @@ TEST(Catalogue, HasOnlyGoodFormats) {
 TEST_F(CatalogueTest, FillsThePiecesOfEachTextInEveryLanguage) {
   for (const char* locale : {"en_US", "ja_JP"}) {
     ASSERT_TRUE(setLocale(locale));
-    for (const CatalogueRow& row : catalogueRows(EnglishCatalogue)) {
-      const MessageFormat format = messageFormat(row.key);
+    for (const CatalogueRow& row : getCatalogueRows(EnglishCatalogue)) {
+      const MessageFormat format = getMessageFormat(row.key);
       const std::vector<Argument> arguments = exampleArguments(row.text);
       std::string filled;
       std::string expected;
-      EXPECT_EQ(appendPieces(filled, format.pieces, arguments), FormatStatus_Done);
-      EXPECT_EQ(appendFormatted(expected, format.text, arguments), FormatStatus_Done);
+      EXPECT_EQ(appendPieces(filled, format.pieces, arguments), FormatStatus::Done);
+      EXPECT_EQ(appendFormatted(expected, format.text, arguments), FormatStatus::Done);
       EXPECT_EQ(filled, expected) << textOf(row.key);
     }
   }
@@ -178,14 +178,14 @@ TEST(Catalogue, IsUtf8InEveryLanguage) {
   EXPECT_FALSE(isUtf8("\x82\xa0"));
   EXPECT_FALSE(isUtf8("\xe3\x81"));
   for (uint32_t index = 0; index < CatalogueCount; ++index) {
-    for (const CatalogueRow& row : catalogueRows(index))
+    for (const CatalogueRow& row : getCatalogueRows(index))
       EXPECT_TRUE(isUtf8(row.text)) << textOf(row.key);
   }
 }
 
 TEST(Catalogue, IsJapaneseWhereverThereAreWords) {
   std::vector<Key> withoutWords;
-  for (const CatalogueRow& row : catalogueRows(JapaneseCatalogue)) {
+  for (const CatalogueRow& row : getCatalogueRows(JapaneseCatalogue)) {
     if (std::none_of(row.text.begin(), row.text.end(), isAbove127)) withoutWords.push_back(row.key);
   }
   EXPECT_THAT(withoutWords, ElementsAre(ListedMember, AddedMember, ReplacedMember, DeletedMember,
@@ -194,14 +194,14 @@ TEST(Catalogue, IsJapaneseWhereverThereAreWords) {
 }
 
 TEST(Catalogue, IsEnglishInPlainAscii) {
-  for (const CatalogueRow& row : catalogueRows(EnglishCatalogue))
+  for (const CatalogueRow& row : getCatalogueRows(EnglishCatalogue))
     EXPECT_TRUE(std::none_of(row.text.begin(), row.text.end(), isAbove127)) << textOf(row.key);
 }
 
 // What a program that reads the output looks for stays, and so do the ends of lines.
 TEST(Catalogue, HasTheSameLinesAndOptionsInEveryLanguage) {
-  const auto english = catalogueRows(EnglishCatalogue);
-  const auto japanese = catalogueRows(JapaneseCatalogue);
+  const auto english = getCatalogueRows(EnglishCatalogue);
+  const auto japanese = getCatalogueRows(JapaneseCatalogue);
   for (size_t i = 0; i < english.size(); ++i) {
     const std::vector<std::string_view> lines = linesOf(english[i].text);
     const std::vector<std::string_view> translated = linesOf(japanese[i].text);
@@ -275,7 +275,7 @@ TEST(Catalogue, HasTheTextsOfTheDiagnostics) {
   for (const auto& [code, text] : expected) {
     const Key key = makeKey(code[0], static_cast<uint32_t>(std::stoul(code + 1)), code[5]);
     EXPECT_EQ(textOf(key), code);
-    EXPECT_EQ(messageText(key), text) << code;
+    EXPECT_EQ(getMessageText(key), text) << code;
   }
 }
 
@@ -362,21 +362,21 @@ Examples:-
 
 TEST_F(CatalogueTest, AMissingRowShowsItsKeyAndTheRunGoesOn) {
   const Key missing = makeKey('L', 1, 'E');
-  EXPECT_EQ(messageText(missing), "<NotFound Code=L0001E key=0x01300016>");
+  EXPECT_EQ(getMessageText(missing), "<NotFound Code=L0001E key=0x01300016>");
   EXPECT_TRUE(report(ErrorWord, nullptr, missing, "unused"));
   EXPECT_EQ(errorText(), "Error: L0001E: <NotFound Code=L0001E key=0x01300016>\n");
-  EXPECT_EQ(errorCount(), 1u);
+  EXPECT_EQ(getErrorCount(), 1u);
 }
 
 TEST_F(CatalogueTest, AnExternalCatalogueComesFirst) {
   static constexpr CatalogueRow rows[] = {{OutOfMemory, "No memory"},
                                           {makeKey('L', 6801, 'E'), "New text"}};
   setExternalCatalogue(rows);
-  EXPECT_EQ(messageText(OutOfMemory), "No memory");
-  EXPECT_EQ(messageText(makeKey('L', 6801, 'E')), "New text");
-  EXPECT_EQ(messageText(NoArchiveSpecified), "No archive specified");
+  EXPECT_EQ(getMessageText(OutOfMemory), "No memory");
+  EXPECT_EQ(getMessageText(makeKey('L', 6801, 'E')), "New text");
+  EXPECT_EQ(getMessageText(NoArchiveSpecified), "No archive specified");
   setExternalCatalogue({});
-  EXPECT_EQ(messageText(OutOfMemory), "Out of memory");
+  EXPECT_EQ(getMessageText(OutOfMemory), "Out of memory");
 }
 
 TEST_F(CatalogueTest, AnExternalTextIsFilledLikeABuiltInOne) {
@@ -399,33 +399,33 @@ TEST_F(CatalogueTest, AChangeOfLanguageHoldsForTheNextLine) {
     listingMessage(NoEntryPoints);
   }
   ASSERT_TRUE(setLocale("ja_JP"));
-  const std::string japanese(messageText(NoEntryPoints));
+  const std::string japanese(getMessageText(NoEntryPoints));
   ASSERT_TRUE(setLocale("en_US"));
-  const std::string text(messageText(NoEntryPoints));
+  const std::string text(getMessageText(NoEntryPoints));
   EXPECT_NE(japanese, text);
   EXPECT_EQ(outputText(), text + japanese + text);
 }
 
 TEST_F(CatalogueTest, ALocaleNameChoosesTableAndCodePage) {
   EXPECT_TRUE(setLocale("ja_JP.UTF-8"));
-  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+  EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
   EXPECT_TRUE(setLocale("en_US"));
-  EXPECT_EQ(currentCatalogue(), EnglishCatalogue);
+  EXPECT_EQ(getCurrentCatalogue(), EnglishCatalogue);
   EXPECT_TRUE(setLocale("ja_JP"));
-  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+  EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
 }
 
 TEST_F(CatalogueTest, ACodePageAloneLeavesTheTable) {
   ASSERT_TRUE(setLocale("ja_JP"));
   for (const char* name : {"UTF-8", "utf-8", "UTF8", "utf8", "65001"}) {
     EXPECT_TRUE(setLocale(name)) << name;
-    EXPECT_EQ(outputCodePage(), 65001u);
+    EXPECT_EQ(getOutputCodePage(), 65001u);
   }
   for (const char* name : {"gb2312", "20936"}) {
     EXPECT_TRUE(setLocale(name)) << name;
-    EXPECT_EQ(outputCodePage(), 20936u);
+    EXPECT_EQ(getOutputCodePage(), 20936u);
   }
-  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+  EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
 }
 
 TEST_F(CatalogueTest, ABadLocaleNameChangesNothing) {
@@ -433,8 +433,8 @@ TEST_F(CatalogueTest, ABadLocaleNameChangesNothing) {
                            "ja_JP.1252", "1252", "Utf-8", "en_US.UTF-8.x", "EN_US"}) {
     EXPECT_FALSE(setLocale(name)) << name;
   }
-  EXPECT_EQ(currentCatalogue(), EnglishCatalogue);
-  EXPECT_EQ(outputCodePage(), 65001u);
+  EXPECT_EQ(getCurrentCatalogue(), EnglishCatalogue);
+  EXPECT_EQ(getOutputCodePage(), 65001u);
 }
 
 } // namespace messages

@@ -13,7 +13,7 @@ struct DiagnosticControlTest : MessagesTest {
 };
 
 uint32_t severityOfNonElf(uint32_t word) {
-  return effectiveSeverity(word, AddingNonElfObject);
+  return computeEffectiveSeverity(word, AddingNonElfObject);
 }
 
 } // namespace
@@ -22,15 +22,15 @@ TEST_F(DiagnosticControlTest, ANumberSuppressesItsWarning) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticSuppress, "L6875"));
   reportNonElf();
   EXPECT_EQ(errorText(), "");
-  EXPECT_EQ(counters().suppressed, 1u);
-  EXPECT_EQ(counters().warnings, 0u);
+  EXPECT_EQ(getCounters().suppressed, 1u);
+  EXPECT_EQ(getCounters().warnings, 0u);
 }
 
 TEST_F(DiagnosticControlTest, AWarningRaisedToAnErrorCountsAndKeepsItsLetter) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "6875"));
   reportNonElf();
   EXPECT_EQ(errorText(), "Error: L6875W: Adding non-ELF object 'a' to archive 'b'\n");
-  EXPECT_EQ(errorCount(), 1u);
+  EXPECT_EQ(getErrorCount(), 1u);
 }
 
 TEST_F(DiagnosticControlTest, AWarningLoweredToARemarkHasNeitherPrefixNorCode) {
@@ -61,9 +61,9 @@ TEST_F(DiagnosticControlTest, NeitherErrorsNorRemarksMove) {
   applyDiagnosticOption(DiagnosticSuppress, "6838");
   applyDiagnosticOption(DiagnosticSuppress, "6873");
   applyDiagnosticOption(DiagnosticError, "6872");
-  EXPECT_EQ(effectiveSeverity(ErrorWord, NoArchiveSpecified), Severity_Error);
-  EXPECT_EQ(effectiveSeverity(RemarkWord, CreatingArchive), Severity_Remark);
-  EXPECT_EQ(effectiveSeverity(RemarkWord, NoSymbolTable), Severity_Remark);
+  EXPECT_EQ(computeEffectiveSeverity(ErrorWord, NoArchiveSpecified), Severity_Error);
+  EXPECT_EQ(computeEffectiveSeverity(RemarkWord, CreatingArchive), Severity_Remark);
+  EXPECT_EQ(computeEffectiveSeverity(RemarkWord, NoSymbolTable), Severity_Remark);
 }
 
 TEST_F(DiagnosticControlTest, EachWayNeedsThePermissionOfTheWord) {
@@ -88,7 +88,7 @@ TEST_F(DiagnosticControlTest, TheOrderOfMapAndNumberDoesNotMatter) {
   applyDiagnosticOption(DiagnosticError, "WARNING");
   applyDiagnosticOption(DiagnosticError, "L6874");
   EXPECT_EQ(severityOfNonElf(WarningWord), Severity_Error);
-  EXPECT_EQ(effectiveSeverity(WarningWord, NoBaseVariant), Severity_Error);
+  EXPECT_EQ(computeEffectiveSeverity(WarningWord, NoBaseVariant), Severity_Error);
 }
 
 TEST_F(DiagnosticControlTest, RemarkIsABadTargetForAWholeSeverity) {
@@ -123,7 +123,7 @@ TEST_F(DiagnosticControlTest, NumbersOutsideTheRangeAreBad) {
     EXPECT_TRUE(applyDiagnosticOption(DiagnosticWarning, text)) << text;
   }
   EXPECT_EQ(severityOfNonElf(WarningWord), Severity_Warning);
-  EXPECT_EQ(counters().warnings, 12u);
+  EXPECT_EQ(getCounters().warnings, 12u);
   EXPECT_TRUE(errorText().starts_with("Warning: L9962I: Unknown diagnostic number 0\n"
                                       "Warning: L9962I: Unknown diagnostic number 10000\n"
                                       "Warning: L9962I: Unknown diagnostic number 4294974171\n"));
@@ -132,10 +132,10 @@ TEST_F(DiagnosticControlTest, NumbersOutsideTheRangeAreBad) {
 TEST_F(DiagnosticControlTest, FirstAndLastNumberOfTheRangeAreGood) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "1"));
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "09999"));
-  EXPECT_EQ(effectiveSeverity(WarningWord, makeKey('L', 1, 'W')), Severity_Error);
-  EXPECT_EQ(effectiveSeverity(WarningWord, makeKey('L', 9999, 'W')), Severity_Error);
-  EXPECT_EQ(effectiveSeverity(WarningWord, makeKey('L', 10000, 'W')), Severity_Warning);
-  EXPECT_EQ(effectiveSeverity(WarningWord, makeKey('L', 16383, 'W')), Severity_Warning);
+  EXPECT_EQ(computeEffectiveSeverity(WarningWord, makeKey('L', 1, 'W')), Severity_Error);
+  EXPECT_EQ(computeEffectiveSeverity(WarningWord, makeKey('L', 9999, 'W')), Severity_Error);
+  EXPECT_EQ(computeEffectiveSeverity(WarningWord, makeKey('L', 10000, 'W')), Severity_Warning);
+  EXPECT_EQ(computeEffectiveSeverity(WarningWord, makeKey('L', 16383, 'W')), Severity_Warning);
 }
 
 TEST_F(DiagnosticControlTest, TheReportOfABadElementCannotBeMoved) {
@@ -148,8 +148,8 @@ TEST_F(DiagnosticControlTest, TheReportOfABadElementCannotBeMoved) {
 TEST_F(DiagnosticControlTest, AnOverrideDoesNotChangeWhatWasCounted) {
   reportNonElf();
   applyDiagnosticOption(DiagnosticError, "6875");
-  EXPECT_EQ(counters().warnings, 1u);
-  EXPECT_EQ(errorCount(), 0u);
+  EXPECT_EQ(getCounters().warnings, 1u);
+  EXPECT_EQ(getErrorCount(), 0u);
 }
 
 TEST_F(DiagnosticControlTest, LiteralFormatsAreOutOfReachOfNumbers) {
@@ -169,7 +169,7 @@ TEST_F(DiagnosticControlTest, TheStyleOptionMapsToTheThreeStyles) {
   const std::pair<uint32_t, uint32_t> expected[] = {{0, 1}, {1, 0}, {2, 1}, {3, 1}, {4, 2}};
   for (const auto& [enumerator, number] : expected) {
     applyDiagnosticStyle(enumerator);
-    EXPECT_EQ(style(), number) << enumerator;
+    EXPECT_EQ(getStyle(), number) << enumerator;
   }
 }
 

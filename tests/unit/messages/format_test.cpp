@@ -43,13 +43,13 @@ Result format(std::string_view text, const Arguments&... arguments) {
 template <class... Arguments>
 std::string good(std::string_view text, const Arguments&... arguments) {
   const Result result = format(text, arguments...);
-  EXPECT_EQ(result.status, FormatStatus_Done) << text;
+  EXPECT_EQ(result.status, FormatStatus::Done) << text;
   return result.text;
 }
 
 template <class... Arguments>
 bool isBad(std::string_view text, const Arguments&... arguments) {
-  return format(text, arguments...).status == FormatStatus_BadFormat;
+  return format(text, arguments...).status == FormatStatus::BadFormat;
 }
 
 // The formats come from the test's tables, which the compiler can't check.
@@ -175,14 +175,14 @@ TEST(Format, HandlesTwentyArguments) {
   for (int i = 0; i < 20; ++i)
     twenty += "%d";
   std::string text;
-  EXPECT_EQ(appendFormatted(text, twenty, arguments), FormatStatus_Done);
+  EXPECT_EQ(appendFormatted(text, twenty, arguments), FormatStatus::Done);
   EXPECT_EQ(text, std::string(20, '7'));
-  EXPECT_EQ(appendFormatted(text, twenty + "%d", arguments), FormatStatus_TooManyArguments);
-  EXPECT_EQ(appendFormatted(text, "%20$d", arguments), FormatStatus_Done);
-  EXPECT_EQ(appendFormatted(text, "%21$d", arguments), FormatStatus_TooManyArguments);
+  EXPECT_EQ(appendFormatted(text, twenty + "%d", arguments), FormatStatus::TooManyArguments);
+  EXPECT_EQ(appendFormatted(text, "%20$d", arguments), FormatStatus::Done);
+  EXPECT_EQ(appendFormatted(text, "%21$d", arguments), FormatStatus::TooManyArguments);
   EXPECT_EQ(appendFormatted(text, "%99999999999999999999$d", arguments),
-            FormatStatus_TooManyArguments);
-  EXPECT_EQ(appendFormatted(text, "%1$*21$d", arguments), FormatStatus_TooManyArguments);
+            FormatStatus::TooManyArguments);
+  EXPECT_EQ(appendFormatted(text, "%1$*21$d", arguments), FormatStatus::TooManyArguments);
 }
 
 TEST(Format, RefusesAConversionThatDoesNotFitItsArgument) {
@@ -228,11 +228,11 @@ TEST(Format, KeepsWhatCameOutBeforeTheFault) {
 
 // What is wrong with the format itself comes behind what is wrong with an argument in front of it.
 TEST(Format, TellsTheFirstFaultOfAConversion) {
-  EXPECT_EQ(format("%1$*2$.*21$d", 1, "a").status, FormatStatus_BadFormat);
-  EXPECT_EQ(format("%1$*3$.*21$d", 1, 2).status, FormatStatus_BadFormat);
-  EXPECT_EQ(format("%1$*2$.*21$d", 1, 2).status, FormatStatus_TooManyArguments);
-  EXPECT_EQ(format("%21$*2$.*2$d", 1, 2).status, FormatStatus_TooManyArguments);
-  EXPECT_EQ(format("%21$*2$.*2$", 1, 2).status, FormatStatus_BadFormat);
+  EXPECT_EQ(format("%1$*2$.*21$d", 1, "a").status, FormatStatus::BadFormat);
+  EXPECT_EQ(format("%1$*3$.*21$d", 1, 2).status, FormatStatus::BadFormat);
+  EXPECT_EQ(format("%1$*2$.*21$d", 1, 2).status, FormatStatus::TooManyArguments);
+  EXPECT_EQ(format("%21$*2$.*2$d", 1, 2).status, FormatStatus::TooManyArguments);
+  EXPECT_EQ(format("%21$*2$.*2$", 1, 2).status, FormatStatus::BadFormat);
 }
 
 TEST(Format, IsReadOnceAndFilledManyTimes) {
@@ -243,13 +243,13 @@ TEST(Format, IsReadOnceAndFilledManyTimes) {
     const std::vector<Argument> arguments = {"member.o", name, round % 20 - 10, round};
     std::string filled = "before ";
     std::string expected = "before ";
-    ASSERT_EQ(appendPieces(filled, pieces, arguments), FormatStatus_Done);
-    ASSERT_EQ(appendFormatted(expected, Text, arguments), FormatStatus_Done);
+    ASSERT_EQ(appendPieces(filled, pieces, arguments), FormatStatus::Done);
+    ASSERT_EQ(appendFormatted(expected, Text, arguments), FormatStatus::Done);
     ASSERT_EQ(filled, expected);
   }
   // A width that came from an argument is not kept.
   std::string text;
-  ASSERT_EQ(appendPieces(text, pieces, std::vector<Argument>{"m", "n", 3, 1}), FormatStatus_Done);
+  ASSERT_EQ(appendPieces(text, pieces, std::vector<Argument>{"m", "n", 3, 1}), FormatStatus::Done);
   EXPECT_EQ(text, "n   from m at     1, 100%\n");
 }
 

@@ -17,7 +17,7 @@ struct InternalFaultTest : MessagesTest {};
 TEST_F(InternalFaultTest, PrintsNumberVersionAndMessageAndEndsTheRun) {
   EXPECT_EQ(statusOf([] { internalFault("Broken %s", "thing"); }), 1);
   EXPECT_EQ(errorText(), "Internal fault: [0x1698f9:1000001] Broken thing\n");
-  EXPECT_EQ(counters().internalFaults, 1u);
+  EXPECT_EQ(getCounters().internalFaults, 1u);
 }
 
 TEST_F(InternalFaultTest, StartsWithTheToolNameInStyleOne) {
@@ -38,29 +38,31 @@ TEST_F(InternalFaultTest, EndsSilentlyAtTheLimit) {
 }
 
 TEST(FaultHash, EndsAtTheFirstNewline) {
-  EXPECT_EQ(faultHash("Broken %s\nmore"), 0x1698f9u);
-  EXPECT_EQ(faultHash(""), 0u);
+  EXPECT_EQ(computeFaultHash("Broken %s\nmore"), 0x1698f9u);
+  EXPECT_EQ(computeFaultHash(""), 0u);
 }
 
 TEST(FaultHash, CountsABackslashAsASlash) {
-  EXPECT_EQ(faultHash("a\\b"), faultHash("a/b"));
+  EXPECT_EQ(computeFaultHash("a\\b"), computeFaultHash("a/b"));
 }
 
 TEST(FaultHash, CutsThePathOfAnAssertionToItsLastWorkComponent) {
-  const uint32_t hash = faultHash("Assertion failed: work/arlib/src/a.cpp line 12 (%s)");
+  const uint32_t hash = computeFaultHash("Assertion failed: work/arlib/src/a.cpp line 12 (%s)");
   EXPECT_EQ(hash, 0x017813u);
   for (const char* text : {"Assertion failed: /home/me/work/arlib/src/a.cpp line 12 (%s)",
                            "Assertion failed: C:\\work\\x\\work\\arlib\\src\\a.cpp line 12 (%s)",
                            "Assertion failed: /work/work/arlib/src/a.cpp line 12 (%s)"}) {
-    EXPECT_EQ(faultHash(text), hash) << text;
+    EXPECT_EQ(computeFaultHash(text), hash) << text;
   }
 }
 
 TEST(FaultHash, TakesOnlyAWholeComponentForTheTree) {
   const char* const whole = "Assertion failed: /homework/workshop/a.cpp line 12 (%s)";
-  EXPECT_NE(faultHash(whole), faultHash("Assertion failed: work/workshop/a.cpp line 12 (%s)"));
-  EXPECT_NE(faultHash(whole), faultHash("Assertion failed: workshop/a.cpp line 12 (%s)"));
-  EXPECT_NE(faultHash("Broken /work/a.cpp"), faultHash("Broken work/a.cpp"));
+  EXPECT_NE(computeFaultHash(whole),
+            computeFaultHash("Assertion failed: work/workshop/a.cpp line 12 (%s)"));
+  EXPECT_NE(computeFaultHash(whole),
+            computeFaultHash("Assertion failed: workshop/a.cpp line 12 (%s)"));
+  EXPECT_NE(computeFaultHash("Broken /work/a.cpp"), computeFaultHash("Broken work/a.cpp"));
 }
 
 TEST_F(InternalFaultTest, AFailedAssertionShowsPathLineAndExpression) {

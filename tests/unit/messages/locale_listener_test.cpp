@@ -59,7 +59,7 @@ struct LocaleListenerTest : MessagesTest {
 
 TEST_F(LocaleListenerTest, ActsDuringTheParseAndLetsTheValueBeStored) {
   EXPECT_TRUE(parse("--message_locale=ja_JP.utf8", reportFatal));
-  EXPECT_EQ(currentCatalogue(), JapaneseCatalogue);
+  EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
   EXPECT_EQ(errorText(), "");
 }
 

@@ -84,7 +84,7 @@ void onAlarm(int) {}
 } // namespace
 
 TEST_F(OutputTest, StdoutIsGatheredAndFlushedAtTheEnd) {
-  writeText(Stream_Output, "a\n");
+  writeText(Stream::Output, "a\n");
   writeRaw("b");
   EXPECT_EQ(m_Output.writeCount(), 0u);
   EXPECT_TRUE(flushAll());
@@ -100,8 +100,8 @@ TEST_F(OutputTest, WhatComesFirstComesFirst) {
   listingMessage(ListedMember, "a.o");
   writeRaw("contents");
   report(ErrorWord, nullptr, NoArchiveSpecified);
-  writeText(Stream_Output, "banner\n");
-  writeText(Stream_Error, "plain\n");
+  writeText(Stream::Output, "banner\n");
+  writeText(Stream::Error, "plain\n");
   listingMessage(ListedMember, "b.o");
   flushAll();
   EXPECT_EQ(all, "a.o\ncontentsError: L6838E: No archive specified\nbanner\nplain\nb.o\n");
@@ -116,8 +116,8 @@ TEST_F(OutputTest, RawBytesPassUnchanged) {
 
 TEST_F(OutputTest, TextIsEscapedOnBothStreams) {
   const std::string text("\0\037 ~\177\x80\t\n", 8);
-  writeText(Stream_Output, text);
-  writeText(Stream_Error, text);
+  writeText(Stream::Output, text);
+  writeText(Stream::Error, text);
   EXPECT_EQ(outputText(), "\\000\\037 ~\\177\x80\t\n");
   EXPECT_EQ(errorText(), outputText());
 }
@@ -132,7 +132,7 @@ TEST_F(OutputTest, AByteIsEscapedWhereverItStands) {
     for (size_t at = 0; at < Size; ++at) {
       std::string text(Size, 'x');
       text[at] = static_cast<char>(byte);
-      writeText(Stream_Output, text);
+      writeText(Stream::Output, text);
       expected += isEscaped ? std::string(at, 'x') + octal + std::string(Size - at - 1, 'x') : text;
     }
   }
@@ -182,17 +182,17 @@ TEST_F(OutputTest, AListingEndsWhereStdoutFails) {
   m_Output.failWith(0);
   listingMessage(ListedMember, "late.o");
   EXPECT_FALSE(flushAll());
-  EXPECT_EQ(stdoutError(), ENOSPC);
+  EXPECT_EQ(getStdoutError(), ENOSPC);
   EXPECT_EQ(m_Output.text(), before);
 }
 
 TEST_F(OutputTest, AFailureOfStdoutIsRememberedAndTheRestDropped) {
   m_Output.failWith(ENOSPC);
   writeRaw("a");
-  EXPECT_FALSE(stdoutFailed());
+  EXPECT_FALSE(hasStdoutFailed());
   EXPECT_FALSE(flushAll());
-  EXPECT_TRUE(stdoutFailed());
-  EXPECT_EQ(stdoutError(), ENOSPC);
+  EXPECT_TRUE(hasStdoutFailed());
+  EXPECT_EQ(getStdoutError(), ENOSPC);
   m_Output.failWith(0);
   writeRaw(std::string(MoreThanTheBuffer, 'x'));
   writeRaw("b");
@@ -203,7 +203,7 @@ TEST_F(OutputTest, AFailureOfStdoutIsRememberedAndTheRestDropped) {
 TEST_F(OutputTest, AFailureOfALargePieceIsRememberedToo) {
   m_Output.failWith(EPIPE);
   writeRaw(std::string(MoreThanTheBuffer, 'x'));
-  EXPECT_EQ(stdoutError(), EPIPE);
+  EXPECT_EQ(getStdoutError(), EPIPE);
 }
 
 TEST_F(OutputTest, AFailureOfStderrStopsNothing) {
@@ -212,7 +212,7 @@ TEST_F(OutputTest, AFailureOfStderrStopsNothing) {
   m_Error.failWith(0);
   EXPECT_TRUE(report(WarningWord, nullptr, NoArchiveSpecified));
   EXPECT_EQ(m_Error.writeCount(), 1u);
-  EXPECT_FALSE(stdoutFailed());
+  EXPECT_FALSE(hasStdoutFailed());
 }
 
 TEST(DescriptorSink, ClosedFromTheStartDropsEverything) {
@@ -289,9 +289,9 @@ TEST(Streams, AClosedStdoutIsDroppedAndDoesNotComeOutOfStderr) {
               dup2(descriptor, STDERR_FILENO);
               close(STDOUT_FILENO);
               openStreams();
-              writeText(Stream_Output, "lost\n");
-              writeText(Stream_Error, "kept\n");
-              if (!flushAll() || stdoutFailed()) _exit(1);
+              writeText(Stream::Output, "lost\n");
+              writeText(Stream::Error, "kept\n");
+              if (!flushAll() || hasStdoutFailed()) _exit(1);
             }),
             "kept\n");
 }
@@ -301,8 +301,8 @@ TEST(Streams, AClosedStderrIsDroppedAndDoesNotComeOutOfStdout) {
               dup2(descriptor, STDOUT_FILENO);
               close(STDERR_FILENO);
               openStreams();
-              writeText(Stream_Error, "lost\n");
-              writeText(Stream_Output, "kept\n");
+              writeText(Stream::Error, "lost\n");
+              writeText(Stream::Output, "kept\n");
               flushAll();
             }),
             "kept\n");
@@ -313,7 +313,7 @@ TEST(Streams, AFileThatGetsTheNumberOfAClosedStdoutIsNotWritten) {
               close(STDOUT_FILENO);
               openStreams();
               if (dup(descriptor) != STDOUT_FILENO) _exit(1);
-              writeText(Stream_Output, "lost\n");
+              writeText(Stream::Output, "lost\n");
               flushAll();
             }),
             "");
@@ -323,9 +323,9 @@ TEST(Streams, ClosingFlushesAndDropsTheRest) {
   EXPECT_EQ(inChild([](int descriptor) {
               dup2(descriptor, STDOUT_FILENO);
               openStreams();
-              writeText(Stream_Output, "kept\n");
+              writeText(Stream::Output, "kept\n");
               closeStreams();
-              writeText(Stream_Output, "lost\n");
+              writeText(Stream::Output, "lost\n");
               flushAll();
             }),
             "kept\n");
@@ -337,7 +337,7 @@ TEST(ProcessEnd, FlushesAndExitsByDefault) {
               openStreams();
               const pid_t child = fork();
               if (child == 0) {
-                writeText(Stream_Output, "kept\n");
+                writeText(Stream::Output, "kept\n");
                 endProcess(7);
               }
               int status = 0;
@@ -352,7 +352,7 @@ TEST(ProcessEnd, AShutDownThatFailsDoesNotGoRoundInCircles) {
               dup2(descriptor, STDOUT_FILENO);
               openStreams();
               setExitHandler([](int) {
-                writeText(Stream_Output, "once\n");
+                writeText(Stream::Output, "once\n");
                 endProcess(5);
               });
               const pid_t child = fork();
@@ -373,8 +373,8 @@ struct HeldOutputTest : MessagesTest {
   }
 
   static void writeBoth() {
-    writeText(Stream_Output, "out 1\n");
-    writeText(Stream_Error, "err\n");
+    writeText(Stream::Output, "out 1\n");
+    writeText(Stream::Error, "err\n");
     writeRaw("out 2\n");
   }
 

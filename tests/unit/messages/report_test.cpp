@@ -95,8 +95,8 @@ TEST_F(ReportTest, PrintsALiteralFormatWithoutCode) {
   EXPECT_TRUE(reportFormat(RemarkWord, nullptr, "[%s %s]", "quarn", "-t 100%s.a"));
   EXPECT_TRUE(reportFormat(WarningWord, nullptr, "odd"));
   EXPECT_EQ(errorText(), "[quarn -t 100%s.a]\nWarning: odd\n");
-  EXPECT_EQ(counters().remarks, 1u);
-  EXPECT_EQ(counters().warnings, 1u);
+  EXPECT_EQ(getCounters().remarks, 1u);
+  EXPECT_EQ(getCounters().warnings, 1u);
 }
 
 TEST_F(ReportTest, PrintsNoNewlineBehindAnEmptyText) {
@@ -143,21 +143,21 @@ TEST_F(ReportTest, CountsEachSeverity) {
   for (int i = 0; i < 6; ++i) {
     report(severityWord(Severity_InternalFault), nullptr, NoArchiveSpecified);
   }
-  const Counters counted = counters();
+  const Counters counted = getCounters();
   EXPECT_EQ(counted.suppressed, 1u);
   EXPECT_EQ(counted.remarks, 2u);
   EXPECT_EQ(counted.warnings, 3u);
   EXPECT_EQ(counted.errors, 4u);
   EXPECT_EQ(counted.fatalErrors, 5u);
   EXPECT_EQ(counted.internalFaults, 6u);
-  EXPECT_EQ(errorCount(), 4u);
+  EXPECT_EQ(getErrorCount(), 4u);
 }
 
 TEST_F(ReportTest, ASuppressedMessageIsCountedAndNotPrinted) {
   EXPECT_FALSE(report(severityWord(Severity_Suppressed), nullptr, NoArchiveSpecified));
   EXPECT_FALSE(reportFormat(severityWord(Severity_Suppressed), nullptr, "x"));
   EXPECT_EQ(errorText(), "");
-  EXPECT_EQ(counters().suppressed, 2u);
+  EXPECT_EQ(getCounters().suppressed, 2u);
 }
 
 TEST_F(ReportTest, TheFiftyFirstErrorEndsTheRunUnprinted) {
@@ -200,35 +200,35 @@ TEST_F(ReportTest, CallsAnotherLimitHandlerOnlyOnceAndGoesOnIfItReturns) {
 
 TEST_F(ReportTest, PlainMessagesKeepAccountOfTheColumn) {
   plainMessage(NoArchiveSpecified);
-  EXPECT_EQ(column(), 20u);
+  EXPECT_EQ(getColumn(), 20u);
   plainMessage(NoArchiveSpecified);
-  EXPECT_EQ(column(), 40u);
+  EXPECT_EQ(getColumn(), 40u);
   plainMessage(SelectableArguments, "x", "ab");
-  EXPECT_EQ(column(), 3u);
+  EXPECT_EQ(getColumn(), 3u);
   plainMessage(ListedMember, "a.o");
-  EXPECT_EQ(column(), 0u);
+  EXPECT_EQ(getColumn(), 0u);
   EXPECT_EQ(errorText(), "No archive specifiedNo archive specified"
                          "The following arguments to option 'x' can be selected:\n aba.o\n");
-  EXPECT_EQ(counters().remarks, 0u);
+  EXPECT_EQ(getCounters().remarks, 0u);
 }
 
 TEST_F(ReportTest, DiagnosticsAndListingLinesResetTheColumn) {
   plainMessage(NoArchiveSpecified);
   listingMessage(ListedMember, "a.o");
-  EXPECT_EQ(column(), 0u);
+  EXPECT_EQ(getColumn(), 0u);
   plainMessage(NoArchiveSpecified);
   listingMessage(NoArchiveSpecified);
-  EXPECT_EQ(column(), 20u);
+  EXPECT_EQ(getColumn(), 20u);
   report(RemarkWord, nullptr, NoArchiveSpecified);
-  EXPECT_EQ(column(), 0u);
+  EXPECT_EQ(getColumn(), 0u);
 }
 
 TEST_F(ReportTest, ListingsGoToStdoutWhateverTheStreamOfDiagnostics) {
   listingMessage(ListedMember, "a\001.o");
   EXPECT_EQ(outputText(), "a\\001.o\n");
   EXPECT_EQ(errorText(), "");
-  EXPECT_EQ(counters().remarks, 0u);
-  setDiagnosticStream(Stream_Output);
+  EXPECT_EQ(getCounters().remarks, 0u);
+  setDiagnosticStream(Stream::Output);
   report(ErrorWord, nullptr, NoArchiveSpecified);
   plainMessage(ListedMember, "b.o");
   EXPECT_EQ(outputText(), "a\\001.o\nError: L6838E: No archive specified\nb.o\n");
@@ -242,15 +242,15 @@ TEST_F(ReportTest, AFormatThatReachesBeyondTwentyArgumentsEndsTheRun) {
 
 TEST_F(ReportTest, InitialiseBringsBackTheStateOfAFreshProcess) {
   setStyle(1);
-  setDiagnosticStream(Stream_Output);
+  setDiagnosticStream(Stream::Output);
   reportErrors(3);
   plainMessage(NoArchiveSpecified);
   setLimit(1, [] {});
   initialise();
-  EXPECT_EQ(style(), 0u);
-  EXPECT_EQ(diagnosticStream(), Stream_Error);
-  EXPECT_EQ(errorCount(), 0u);
-  EXPECT_EQ(column(), 0u);
+  EXPECT_EQ(getStyle(), 0u);
+  EXPECT_EQ(getDiagnosticStream(), Stream::Error);
+  EXPECT_EQ(getErrorCount(), 0u);
+  EXPECT_EQ(getColumn(), 0u);
   reportErrors(50);
   EXPECT_EQ(statusOf([&] { reportErrors(1); }), 1);
 }
