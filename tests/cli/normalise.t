@@ -32,3 +32,10 @@ The same files give the same bytes, whatever their times, owners, modes, and the
   $ quarn --create --normalise=1 --diag_suppress=L6875 one.a 'one/*.o'
   $ (umask 077; TZ=Asia/Tokyo LC_ALL=tr_TR.UTF-8 quarn --create --normalise=1 --diag_suppress=L6875 two.a 'two/*.o')
   $ cmp one.a two.a
+
+The document of the formats shows, byte for byte, what becomes of two files.
+
+  $ dump() { sed -n "/^\`\`\`$1\$/,/^\`\`\`\$/p" "$QUARN_DOCS/formats.md" | grep '^ ' | cut -c 7-54; }
+  $ file note.txt one; file a_rather_long_name.txt four
+  $ quarn --create --normalise=86400 --diag_suppress=L6875 lib.a note.txt a_rather_long_name.txt
+  $ patch shown.a 0 "$(dump archive-normalised | tr -d '\n')"; cmp lib.a shown.a
