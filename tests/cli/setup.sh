@@ -78,24 +78,28 @@ table() {
 
 # patch FILE OFFSET HEXBYTES: these bytes in the place of those that stand there.
 patch() {
-  printf '%b' "$(sed 's/../\\x&/g' <<< "${3// /}")" | dd of="$1" bs=64K oflag=seek_bytes seek=$(( $2 )) \
-    conv=notrunc status=none
+  local hex=${3//[ $'\n']/} bytes='' at
+  for (( at = 0; at < ${#hex}; at += 2 )); do bytes+="\\x${hex:at:2}"; done
+  printf '%b' "$bytes" | dd of="$1" bs=64K oflag=seek_bytes seek=$(( $2 )) conv=notrunc status=none
 }
 
 # little SIZE NUMBER...: the numbers as hex bytes, the low byte first.
 little() {
-  local size=$1 number left
+  local size=$1 number left digits text=''
   shift
   for number in "$@"; do
     for (( left = size; left > 0; --left )); do
-      printf '%02x' $(( number & 255 ))
+      printf -v digits '%02x' $(( number & 255 ))
+      text+=$digits
       number=$(( number >> 8 ))
     done
   done
+  printf '%s' "$text"
 }
 
 # The places of fields, as offset and size, in the header and in the rows of a little-endian object of
-# class 1. The helpers below are for such objects only.
+# class 1. The helpers below are for such objects only. Transcripts call them by the hundred, and what
+# takes time is starting a program: od and dd are started once for what is read or written at once.
 declare -A elfFields=([class]='4 1' [data]='5 1' [type]='16 2' [machine]='18 2' [version]='20 4'
   [entry]='24 4' [phoff]='28 4' [shoff]='32 4' [ehsize]='40 2' [phentsize]='42 2' [phnum]='44 2'
   [shentsize]='46 2' [shnum]='48 2' [shstrndx]='50 2')
@@ -103,11 +107,17 @@ declare -A sectionFields=([name]='0 4' [type]='4 4' [flags]='8 4' [addr]='12 4' 
   [link]='24 4' [info]='28 4' [addralign]='32 4' [entsize]='36 4')
 declare -A symbolFields=([name]='0 4' [value]='4 4' [size]='8 4' [info]='12 1' [other]='13 1' [shndx]='14 2')
 
+# numberAt FILE OFFSET SIZE: the number that stands there, in $number.
+numberAt() {
+  read -r number < <(od -A n -v -t "u$3" --endian=little -j "$2" -N "$3" "$1")
+}
+
 # field FILE BASE PLACE [NUMBER]: says a number, or sets it.
 field() {
-  local place=($3)
+  local place=($3) number
   if [ $# = 4 ]; then patch "$1" $(( $2 + place )) "$(little "${place[1]}" "$4")"; return; fi
-  od -A n -v -t "u${place[1]}" --endian=little -j $(( $2 + place )) -N "${place[1]}" "$1" | tr -d ' '
+  numberAt "$1" $(( $2 + place )) "${place[1]}"
+  echo "$number"
 }
 
 # elf FILE FIELD [NUMBER]: a field of the header.
@@ -117,25 +127,35 @@ elf() {
 
 # section FILE INDEX FIELD [NUMBER]: a field of a section's row.
 section() {
-  field "$1" $(( $(elf "$1" shoff) + 40 * $2 )) "${sectionFields[$3]}" ${4:+"$4"}
+  local number
+  numberAt "$1" ${elfFields[shoff]}
+  field "$1" $(( number + 40 * $2 )) "${sectionFields[$3]}" ${4:+"$4"}
 }
 
 # symbol FILE INDEX FIELD [NUMBER]: a field of a row of the first symbol table.
 symbol() {
-  local table=0
-  while [ "$(section "$1" $table type)" != 2 ]; do
-    table=$(( table + 1 ))
-    if (( table == $(elf "$1" shnum) )); then echo "$1 has no symbol table"; return 1; fi
+  local number rows words at
+  numberAt "$1" ${elfFields[shoff]}
+  rows=$number
+  numberAt "$1" ${elfFields[shnum]}
+  words=($(od -A n -v -t u4 --endian=little -j "$rows" -N $(( 40 * number )) "$1"))
+  for (( at = 0; at < ${#words[@]}; at += 10 )); do
+    (( words[at + 1] == 2 )) || continue
+    field "$1" $(( words[at + 4] + 16 * $2 )) "${symbolFields[$3]}" ${4:+"$4"}
+    return
   done
-  field "$1" $(( $(section "$1" $table offset) + 16 * $2 )) "${symbolFields[$3]}" ${4:+"$4"}
+  echo "$1 has no symbol table"
+  return 1
 }
 
 # addSection FILE TYPE HEXBYTES [FIELD NUMBER]...: one more section, the last. The rows move to the end.
 addSection() {
-  local file=$1 type=$2 bytes=${3// /} count rows end
+  local file=$1 type=$2 bytes=${3// /} number count rows end
   shift 3
-  count=$(elf "$file" shnum)
-  rows=$(od -A n -v -t x1 -j "$(elf "$file" shoff)" -N $(( 40 * count )) "$file" | tr -d ' \n')
+  numberAt "$file" ${elfFields[shnum]}
+  count=$number
+  numberAt "$file" ${elfFields[shoff]}
+  rows=$(od -A n -v -t x1 -j "$number" -N $(( 40 * count )) "$file")
   end=$(stat -c %s "$file")
   patch "$file" "$end" "$bytes$rows$(little 4 0 "$type" 0 0 "$end" $(( ${#bytes} / 2 )) 0 0 0 0)"
   elf "$file" shoff $(( end + ${#bytes} / 2 ))
@@ -148,9 +168,11 @@ addSection() {
 
 # addSegment FILE TYPE OFFSET FILE_SIZE MEMORY_SIZE FLAGS: one more program header. The rows move to the end.
 addSegment() {
-  local file=$1 count rows end
-  count=$(elf "$file" phnum)
-  rows=$(od -A n -v -t x1 -j "$(elf "$file" phoff)" -N $(( 32 * count )) "$file" | tr -d ' \n')
+  local file=$1 number count rows end
+  numberAt "$file" ${elfFields[phnum]}
+  count=$number
+  numberAt "$file" ${elfFields[phoff]}
+  rows=$(od -A n -v -t x1 -j "$number" -N $(( 32 * count )) "$file")
   end=$(stat -c %s "$file")
   patch "$file" "$end" "$rows$(little 4 "$2" "$3" 0 0 "$4" "$5" "$6" 0)"
   elf "$file" phoff "$end"
@@ -168,8 +190,9 @@ variant() {
 
 # published FILE: the names in the symbol table, as they stand in the file. The count and the offsets are in front.
 published() {
-  local size count
-  size=$(head -c 66 "$1" | tail -c 10)
+  local header size count
+  IFS= read -r -N 66 header < "$1"
+  size=${header: -10}
   count=$(od -A n -t u4 --endian=big -j 68 -N 4 "$1")
   tail -c +$(( 73 + 4 * count )) "$1" | head -c $(( size - 4 - 4 * count )) | tr '\0\n' '\n~'
 }
