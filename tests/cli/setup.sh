@@ -188,6 +188,16 @@ variant() {
     "${symbols[@]}" "$QUARN_EXAMPLES/wide_plain.o" "$file"
 }
 
+# variants TEXT...: a library lib.a of a build for each text, made with ${options[@]}, and what its symbol table says.
+options=()
+variants() {
+  local text number=0
+  rm -f ?.o lib.a
+  for text; do number=$(( number + 1 )); variant $number.o ${text:+"$text"}; done
+  quarn --create --normalise=1000000000 "${options[@]}" lib.a ?.o || return
+  listed lib.a
+}
+
 # published FILE: the names in the symbol table, as they stand in the file. The count and the offsets are in front.
 published() {
   local header size count

@@ -3,17 +3,6 @@ member that needs more say what.
 
   $ . "$TESTDIR/setup.sh"
 
-variants TEXT...: a library of a build for each text, and what its symbol table says.
-
-  $ variants() {
-  >   local text number=0
-  >   rm -f ?.o lib.a
-  >   for text; do number=$(( number + 1 )); variant $number.o ${text:+"$text"}; done
-  >   quarn --create --normalise=1000000000 "${options[@]}" lib.a ?.o || return
-  >   listed lib.a
-  > }
-  $ options=()
-
 The first of these is the base: it needs what all of them do.
 
   $ variants '$ZEV_ISAv4$IEEE1' '$ZEV_ISAv5$IEEE1' '$ZEV_ISAv4$IEEE1$IW'
@@ -126,33 +115,9 @@ Symbols count with their multiplicities, in any order.
   wide_gcd 1.o
   wide_gcd 2.o
 
-No base, or more than one. With -v come the members: of the group, or those that are bases.
-
-  $ variants '$J$IEEE1' '$E$IEEE1'
-  Warning: L6874W: Minor variants of archive member '1.o' include no base variant
-  gcd$$BuildAttributes$$J$IEEE1 1.o
-  gcd$$BuildAttributes$$E$IEEE1 2.o
-  $ options=(-v); variants '$J$IEEE1' '$E$IEEE1' | sed '/^a/d'
-  Warning: L6874W: Minor variants of archive member '1.o' include no base variant
-   * 1.o [0] : 1.o
-   * 1.o [1] : 2.o
-  gcd$$BuildAttributes$$J$IEEE1 1.o
-  gcd$$BuildAttributes$$E$IEEE1 2.o
-  $ options=(); variants '$J$IEEE1' '$J$IEEE1'
-  Warning: L6876W: Minor variants of archive member '1.o' include multiple base variants
-  gcd 1.o
-  gcd 2.o
-  $ options=(-v); variants '$IEEE1' '$J$IEEE1' '$IEEE1' | sed '/^a/d'
-  Warning: L6876W: Minor variants of archive member '1.o' include multiple base variants
-   * 1.o [0] : 1.o
-   * 1.o [1] : 3.o
-  gcd 1.o
-  gcd$$BuildAttributes$$J$IEEE1 2.o
-  gcd 3.o
-
 A member that states nothing takes part all the same: it claims the ordinary floating-point model.
 
-  $ options=(); variants '' ''
+  $ variants '' ''
   Warning: L6876W: Minor variants of archive member '1.o' include multiple base variants
   gcd 1.o
   gcd 2.o
@@ -180,69 +145,6 @@ The stack and the level of the ABI make no variant, but are told where there is 
   $ variants '$IEEE1$PRES8' '$J$IEEE1$PRES8$REQ8$EABIv2'
   gcd 1.o
   gcd$$BuildAttributes$$J$IEEE1$REQ8$EABIv2 2.o
-
-What has no token, or reads back as more than it is. The name stands as it is in the table; a listing shows it in its
-own words.
-
-  $ variants '$HFUi3' '$FPiv8'
-  Warning: L6877W: Attribute difference of archive member '2.o' in minor variant group beginning with '1.o' includes attribute(s) with no symbol decoration representation
-  gcd 1.o
-  gcd$$BuildAttributes$$HFUi5$PE$IEEE1 2.o
-  $ options=(-v); variants '$IEEE1' '$R:L22$IEEE1' | sed '/^a/d'; options=()
-  Warning: L6877W: Attribute difference of archive member '2.o' in minor variant group beginning with '1.o' includes attribute(s) with no symbol decoration representation
-   * 1.o [0] : 1.o
-   * 1.o [1] : 2.o
-  gcd 1.o
-  gcd$$BuildAttributes$$A:L22$IEEE1 2.o
-  $ published lib.a
-  gcd
-  gcd$$BuildAttributes$$C:L22$W:L22$IEEE1
-  $ variants '$IEEE1' '$ZEV_ISAv5$IEEE1' '$KRL_ISAv1$IEEE1' > out; sed -n 2,3p out
-  gcd$$BuildAttributes$$ZEV_ISAv5$IEEE1 2.o
-  gcd$$BuildAttributes$$KRL_ISAv1$IEEE1 3.o
-  $ rm -f ?.o; variant 1.o '$IEEE1'; variant 2.o '$ZEV_ISAv5$IEEE1' '$KRL_ISAv1$IEEE1'; rm lib.a; quarn --create lib.a 1.o 2.o
-  Warning: L6877W: Attribute difference of archive member '2.o' in minor variant group beginning with '1.o' includes attribute(s) with no symbol decoration representation
-  $ published lib.a
-  gcd
-  gcd$$BuildAttributes$$KRL_ISAv2$ZEV_ISAv5$IEEE1
-
-The warnings can be silenced, which the lines of -v are not, and raised: then nothing is written.
-
-  $ options=(--diag_suppress=L6876); variants '$J$IEEE1' '$J$IEEE1'
-  gcd 1.o
-  gcd 2.o
-  $ options=(-v --diag_suppress=warning); variants '$J$IEEE1' '$J$IEEE1' | sed '/^a/d'
-   * 1.o [0] : 1.o
-   * 1.o [1] : 2.o
-  gcd 1.o
-  gcd 2.o
-  $ options=(--diag_error=L6876); variants '$J$IEEE1' '$J$IEEE1'; ls lib.a
-  Error: L6876W: Minor variants of archive member '1.o' include multiple base variants
-  ls: cannot access 'lib.a': No such file or directory
-  [2]
-  $ options=(--diag_error=L6874); variants '$J$IEEE1' '$E$IEEE1'; ls lib.a
-  Error: L6874W: Minor variants of archive member '1.o' include no base variant
-  ls: cannot access 'lib.a': No such file or directory
-  [2]
-  $ options=(--diag_remark=L6877 -v); variants '$IEEE1' '$R:L22$IEEE1' | sed '/^a/d'
-  Attribute difference of archive member '2.o' in minor variant group beginning with '1.o' includes attribute(s) with no symbol decoration representation
-   * 1.o [0] : 1.o
-   * 1.o [1] : 2.o
-  gcd 1.o
-  gcd$$BuildAttributes$$A:L22$IEEE1 2.o
-  $ options=(--diag_style=ide); variants '$J$IEEE1' '$J$IEEE1'
-  quarn : warning L6876:  Minor variants of archive member '1.o' include multiple base variants
-  gcd 1.o
-  gcd 2.o
-  $ options=()
-
-An archive that has one keeps it when a warning is an error.
-
-  $ variants '$J$IEEE1' '$E$IEEE1$IW' > out; cp lib.a old.a
-  Warning: L6874W: Minor variants of archive member '1.o' include no base variant
-  $ quarn -r --diag_error=L6874 lib.a 1.o; echo $?; cmp lib.a old.a
-  Error: L6874W: Minor variants of archive member '1.o' include no base variant
-  1
 
 Groups come first, in the order of their first members, then the members that are like no other. A survivor of a group
 is an ordinary member.
