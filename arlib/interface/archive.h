@@ -32,11 +32,29 @@
 namespace arlib {
 
 class ReadSymbolTable;
+struct DerivedTable;
+struct DerivedTables;
+struct MemberLayout;
 
 enum class SymbolTableMode : uint32_t {
   Always = 0,    // keep a symbol table, even an empty one
   Never = 1,     // never keep one
   IfSymbols = 2, // keep one only if some member has symbols to publish
+};
+
+// What is done to an archive, as far as it makes derived data stale. The table that says which is
+// in arlib/src/archive.cpp.
+enum class Edit : uint8_t {
+  Publishing,  // what the symbol table is to hold, and whether there is to be one
+  EmptyMember, // a member without bytes comes to the end
+  FileMember,  // a member that holds a file comes to the end
+  NewName,
+  NewBytes, // a member's, in memory
+  NewFile,  // a member's bytes are those of another file
+  Move,
+  Removal,
+  ReadSymbols, // another symbol table was read
+  TableChange, // a table comes or goes
 };
 
 class Archive {
@@ -209,7 +227,6 @@ private:
   friend class ArchiveMember;
   friend class ArchiveFileReader;
   friend class ArchiveFileWriter;
-  friend class AuxiliaryMembers;
 
   // An entry of the symbol views: sorted by member, so that each member's symbols lie together.
   struct SymbolView {
@@ -229,13 +246,15 @@ private:
   ArchiveMember* appendFileMember(std::string_view regionName,
                                   const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
                                   uint32_t size);
-  // Whether a piece lies inside a file. If not, the handler decides: on true the piece is cut to
-  // what is there.
-  bool isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
-                    uint32_t& offset, uint32_t& size, int64_t fileSize) const;
+  // Cuts a piece that reaches beyond the end of its file to what is there, if the handler says so.
+  // False after a report that ends the operation.
+  bool cutToFile(const char* fileName, std::optional<std::string_view> reportedName,
+                 uint32_t& offset, uint32_t& size, int64_t fileSize) const;
   // Frees what the members hold outside the regions, and their bytes.
   static void letGo(std::span<ArchiveMember* const> archiveMembers);
-  void markEdited();
+  // The two places where data becomes stale, and where the tables and offsets stop being so.
+  void noteEdit(Edit edit);
+  void noteTablesUpToDate();
   [[nodiscard]] Symbol symbolOf(std::string_view name, ArchiveMember* member) const;
   void makeSymbols() const;
   void sortMembers();
@@ -243,9 +262,17 @@ private:
   void groupSymbols();
   void takeOut(std::span<ArchiveMember* const> sortedMembers);
   void forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers);
-  void markMoved();
   // The members by address: only to find them fast, that order shows nowhere.
   std::vector<ArchiveMember*> sortedByAddress(std::span<ArchiveMember* const> archiveMembers) const;
+  // The steps of updateAuxiliaryMembers. All but the last leave the archive as it is.
+  [[nodiscard]] bool rebuildLongNames(DerivedTables& tables);
+  [[nodiscard]] bool rebuildSymbols(DerivedTables& tables);
+  [[nodiscard]] bool isLaidOutAs(const MemberLayout& layout) const;
+  void takeTables(const DerivedTables& tables);
+  void takeTable(ArchiveMember*& table, const ArchiveMemberType* type, const DerivedTable& derived);
+  void takeLayout(const MemberLayout& layout);
+  void putTablesInPlace();
+  void forgetTable(ArchiveMember*& table);
   const char* copyToRegion(std::string_view text);
   std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
                                      const ArchiveMember* archiveMember) const;
@@ -284,7 +311,7 @@ private:
   ArchiveMember* m_FileNameTable = nullptr;
   ArchiveMember* m_SymbolTable = nullptr;
 
-  // What an edit makes stale, and what brings it up to date again.
+  // Cleared by noteEdit, and set by who brings it up to date.
   bool m_SortedArchiveMembersUpToDate = true; // findMembers
   bool m_SortedSymbolsUpToDate = true;        // findSymbols
   bool m_DefinedSymbolsUpToDate = true;       // getDefinedSymbols

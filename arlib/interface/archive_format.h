@@ -34,7 +34,7 @@ constexpr std::string_view AttributeMarker = elfext::DecorationMarker;
 constexpr uint8_t PaddingByte = 0x0A;
 
 constexpr uint32_t MemberHeaderSize = 60;
-constexpr size_t MaximumShortName = 15;          // longer names go in the long-name table
+constexpr size_t MaximumShortName = 15;
 constexpr uint64_t MaximumFileSize = 0x7FFFFFFF; // archives and members stay below 2 GiB
 
 // Where a field stands in the member header, in bytes.
@@ -93,6 +93,11 @@ bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uin
 
 constexpr uint64_t roundUpToEven(uint64_t value) {
   return value + (value & 1);
+}
+
+// Whether a name goes in the long-name table.
+constexpr bool isLongName(std::string_view name) {
+  return name.size() > MaximumShortName;
 }
 
 // Where the next header starts, for a header at `offset` whose contents have `size` bytes.

@@ -126,7 +126,6 @@ private:
   friend class Archive;
   friend class ArchiveFileReader;
   friend class ArchiveFileWriter;
-  friend class AuxiliaryMembers;
   friend class ElfImageArchiveMemberType;
 
   struct Contents {
@@ -138,12 +137,13 @@ private:
   // Uninitialised bytes in the archive's container region; the old ones are freed, except those of
   // a table that came from the file, into which names point: they go when the archive is cleared.
   std::span<uint8_t> replaceContents(uint32_t size);
+  // The same with bytes of that region which are filled already.
+  void takeContents(std::span<uint8_t> bytes);
   void freeContents();
   // The archive holds the file from now on.
   void setLocation(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
                    bool isTemporary);
   void takeFile(const std::shared_ptr<support::SourceFile>& file, uint32_t offset, uint32_t size);
-  void markReplaced();
   bool readContents(std::span<uint8_t> bytes);
   // From the location, which there must be, under the module's own handler.
   bool readInto(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector) const;

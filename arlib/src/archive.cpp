@@ -3,6 +3,7 @@
 
 #include "arlib/interface/archive_format.h"
 #include "arlib/interface/name_order.h"
+#include "arlib/src/derived_tables.h"
 #include "arlib/src/read_symbol_table.h"
 #include "elfext/interface/sort.h"
 #include "support/interface/path.h"
@@ -19,6 +20,46 @@ namespace arlib {
 namespace {
 
 constexpr size_t InitialRegionSize = 1024;
+
+// What an edit makes stale. What is not marked stays as it is: a new name moves no member, so what
+// the symbol table says stays true, unless the long-name table then moves them; a member without
+// bytes has nothing to publish, and its offset is computed with the tables.
+struct StaleRow {
+  Edit edit;
+  bool sortedMembers;  // findMembers
+  bool sortedSymbols;  // findSymbols
+  bool definedSymbols; // getDefinedSymbols
+  bool offsets;        // updateAuxiliaryMembers, as the next two
+  bool fileNameTable;
+  bool symbolTable;
+};
+
+// clang-format off
+constexpr bool Yes = true;
+constexpr bool No = false;
+constexpr StaleRow StaleRows[] = {
+    //                   sorted   sorted   defined           long     symbol
+    //                   members  symbols  symbols  offsets  names    table
+    {Edit::Publishing,   No,      No,      No,      No,      No,      Yes},
+    {Edit::EmptyMember,  Yes,     No,      No,      No,      Yes,     Yes},
+    {Edit::FileMember,   Yes,     No,      No,      Yes,     Yes,     Yes},
+    {Edit::NewName,      Yes,     No,      No,      No,      Yes,     No },
+    {Edit::NewBytes,     No,      No,      No,      Yes,     No,      Yes},
+    {Edit::NewFile,      No,      No,      No,      Yes,     Yes,     Yes},
+    {Edit::Move,         Yes,     No,      No,      No,      Yes,     Yes},
+    {Edit::Removal,      Yes,     Yes,     Yes,     Yes,     Yes,     Yes},
+    {Edit::ReadSymbols,  No,      Yes,     Yes,     No,      No,      No },
+    {Edit::TableChange,  Yes,     No,      No,      No,      No,      No },
+};
+// clang-format on
+
+consteval bool isInOrder(std::span<const StaleRow> rows) {
+  for (size_t i = 0; i < rows.size(); ++i) {
+    if (static_cast<size_t>(rows[i].edit) != i) return false;
+  }
+  return rows.size() == static_cast<size_t>(Edit::TableChange) + 1;
+}
+static_assert(isInOrder(StaleRows), "an edit's row is found by its number");
 
 // Copies the equal range of a sorted view into a list.
 template <class Element, class List, class Compare>
@@ -67,13 +108,13 @@ const char* Archive::copyToRegion(std::string_view text) {
 
 void Archive::setLibraryAttributes(const elfext::FullAttr& attributes) {
   m_LibraryAttributes = attributes;
-  m_SymbolTableUpToDate = false;
+  noteEdit(Edit::Publishing);
 }
 
 void Archive::setSymbolTableMode(SymbolTableMode mode) {
   QUARN_ASSERT(1, !isReadOnly());
   m_SymbolTableMode = mode;
-  m_SymbolTableUpToDate = false;
+  noteEdit(Edit::Publishing);
 }
 
 void Archive::setFileName(const char* name) {
@@ -106,26 +147,30 @@ void Archive::clear() {
   m_SortedSymbols.setSize(0);
   m_FileNameTable = nullptr;
   m_SymbolTable = nullptr;
-  m_SortedArchiveMembersUpToDate = true;
-  m_SortedSymbolsUpToDate = true;
-  m_DefinedSymbolsUpToDate = false;
+  noteEdit(Edit::Removal);
+  noteTablesUpToDate();
+}
+
+void Archive::noteEdit(Edit edit) {
+  const StaleRow& stale = StaleRows[static_cast<size_t>(edit)];
+  m_SortedArchiveMembersUpToDate &= !stale.sortedMembers;
+  m_SortedSymbolsUpToDate &= !stale.sortedSymbols;
+  m_DefinedSymbolsUpToDate &= !stale.definedSymbols;
+  m_ArchiveMemberOffsetsUpToDate &= !stale.offsets;
+  m_FileNameTableUpToDate &= !stale.fileNameTable;
+  m_SymbolTableUpToDate &= !stale.symbolTable;
+}
+
+void Archive::noteTablesUpToDate() {
   m_ArchiveMemberOffsetsUpToDate = true;
   m_FileNameTableUpToDate = true;
   m_SymbolTableUpToDate = true;
-}
-
-void Archive::markEdited() {
-  m_FileNameTableUpToDate = false;
-  m_SymbolTableUpToDate = false;
-  m_SortedArchiveMembersUpToDate = false;
-  m_ArchiveMemberOffsetsUpToDate = false;
 }
 
 ArchiveMember* Archive::appendMember(std::string_view regionName) {
   ArchiveMember* member = alloclib::create<ArchiveMember>(*m_ObjectRegion, this);
   member->m_Name = regionName;
   m_ArchiveMembers.append(member);
-  m_SortedArchiveMembersUpToDate = false;
   return member;
 }
 
@@ -167,12 +212,12 @@ ArchiveMember* Archive::appendFileMember(std::string_view regionName,
                                          uint32_t offset, uint32_t size) {
   ArchiveMember* member = appendMember(regionName);
   member->takeFile(file, offset, size);
-  markEdited();
+  noteEdit(Edit::FileMember);
   return member;
 }
 
-bool Archive::isInsideFile(const char* fileName, std::optional<std::string_view> reportedName,
-                           uint32_t& offset, uint32_t& size, int64_t fileSize) const {
+bool Archive::cutToFile(const char* fileName, std::optional<std::string_view> reportedName,
+                        uint32_t& offset, uint32_t& size, int64_t fileSize) const {
   const auto available = static_cast<uint64_t>(fileSize);
   if (offset <= available && size <= available - offset) return true;
   if (!goOn(&ErrorHandler::reportRegionOutsideFile, fileName, reportedName, offset, size,
@@ -194,8 +239,7 @@ ArchiveMember* Archive::addMember(std::string_view name, int64_t date, uint32_t 
   member->m_Mode = mode;
   member->replaceContents(0);
   member->m_Type = ArchiveMemberType::decide(member);
-  m_FileNameTableUpToDate = false;
-  m_SymbolTableUpToDate = false;
+  noteEdit(Edit::EmptyMember);
   return member;
 }
 
@@ -231,7 +275,7 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   QUARN_ASSERT(1, !m_ReadOnly);
   FileProbe probe;
   if (!openSource(fileName, probe)) return nullptr;
-  if (!isInsideFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
+  if (!cutToFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
   const std::string_view leaf = support::lastPathComponent(memberName);
   ArchiveMember* member =
       appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, offset, size);
@@ -244,7 +288,7 @@ ArchiveMember* Archive::addMemberFromMember(const ArchiveMember& source) {
   const std::string_view leaf = support::lastPathComponent(source.getName());
   ArchiveMember* member = appendMember({copyToRegion(leaf), leaf.size()});
   member->setContentsFromMember(source);
-  markEdited();
+  noteEdit(Edit::FileMember);
   return member;
 }
 
@@ -312,8 +356,6 @@ void Archive::forgetSymbolsOf(std::span<ArchiveMember* const> sortedMembers) {
                               symbol->getDefiningMember(), std::less<>());
   });
   m_Symbols.setSize(static_cast<uint32_t>(end - m_Symbols.begin()));
-  m_SortedSymbolsUpToDate = false;
-  m_DefinedSymbolsUpToDate = false;
 }
 
 void Archive::removeMember(ArchiveMember* archiveMember) {
@@ -326,14 +368,8 @@ void Archive::removeMembers(std::span<ArchiveMember* const> archiveMembers) {
   const std::vector<ArchiveMember*> gone = sortedByAddress(archiveMembers);
   takeOut(gone);
   forgetSymbolsOf(gone);
-  markEdited();
+  noteEdit(Edit::Removal);
   letGo(archiveMembers);
-}
-
-void Archive::markMoved() {
-  m_FileNameTableUpToDate = false;
-  m_SymbolTableUpToDate = false;
-  m_SortedArchiveMembersUpToDate = false;
 }
 
 void Archive::moveMember(ArchiveMember* archiveMember, uint32_t newIndex) {
@@ -345,7 +381,7 @@ void Archive::moveMember(ArchiveMember* archiveMember, uint32_t newIndex) {
   if (oldIndex == newIndex) return;
   m_ArchiveMembers.remove(oldIndex);
   m_ArchiveMembers.insert(std::min(newIndex, m_ArchiveMembers.getSize()), archiveMember);
-  markMoved();
+  noteEdit(Edit::Move);
 }
 
 void Archive::moveMembers(std::span<ArchiveMember* const> archiveMembers, uint32_t newIndex) {
@@ -357,7 +393,7 @@ void Archive::moveMembers(std::span<ArchiveMember* const> archiveMembers, uint32
   const auto place = m_ArchiveMembers.begin() + newIndex;
   std::copy_backward(place, m_ArchiveMembers.end() - archiveMembers.size(), m_ArchiveMembers.end());
   std::copy(archiveMembers.begin(), archiveMembers.end(), place);
-  if (!std::equal(before.begin(), before.end(), m_ArchiveMembers.begin())) markMoved();
+  if (!std::equal(before.begin(), before.end(), m_ArchiveMembers.begin())) noteEdit(Edit::Move);
 }
 
 uint32_t Archive::getMemberIndex(const ArchiveMember* archiveMember) const {
@@ -443,6 +479,97 @@ std::span<Symbol* const> Archive::getDefinedSymbols(const ArchiveMember* archive
 std::span<Symbol* const> Archive::getSortedDefinedSymbols(const ArchiveMember* archiveMember) {
   groupSymbols();
   return symbolsOf(m_DefinedSymbols.byMemberAndName, archiveMember);
+}
+
+// Names and symbols may be views of the bytes of a table that is replaced: they are brought in, to
+// stay. Bytes that nobody wanted at the read are not read to be replaced.
+bool Archive::rebuildLongNames(DerivedTables& tables) {
+  if (!makeLongNameTable(*this, *m_ContainerRegion, tables)) return false;
+  // A table without names goes at once: the reports of the next step count members without it.
+  if (tables.longNames.fate == DerivedTable::Fate::Dropped) forgetTable(m_FileNameTable);
+  const bool isReplaced =
+      m_FileNameTable != nullptr && tables.longNames.fate == DerivedTable::Fate::Made;
+  return !isReplaced || m_FileNameTable->loadContents();
+}
+
+bool Archive::rebuildSymbols(DerivedTables& tables) {
+  if (!makeSymbolTable(*this, *m_ContainerRegion, tables)) return false;
+  const bool isReplaced =
+      m_SymbolTable != nullptr && tables.symbols.fate == DerivedTable::Fate::Made;
+  return !isReplaced || !m_AreSymbolsWanted || m_SymbolTable->loadContents();
+}
+
+// A long-name table that comes, goes or changes its size shifts all members behind it, and with
+// them what the symbol table's offsets lead to. As long as that table counts as up to date, each
+// member's offset is the one that it knows.
+bool Archive::isLaidOutAs(const MemberLayout& layout) const {
+  for (uint32_t i = 0; i < m_ArchiveMembers.getSize(); ++i) {
+    const ArchiveMember* member = m_ArchiveMembers[i];
+    if (!member->isAuxiliary() && member->m_Offset != layout.members[i]) return false;
+  }
+  return true;
+}
+
+bool Archive::updateAuxiliaryMembers() {
+  for (ArchiveMember* member : m_ArchiveMembers) {
+    if (member->m_Type == nullptr) member->determineType();
+  }
+  DerivedTables tables;
+  if (!m_FileNameTableUpToDate && !rebuildLongNames(tables)) return false;
+  tables.layout = layOut(getMembers(), tables.symbols.getSizeAfter(m_SymbolTable),
+                         tables.longNames.getSizeAfter(m_FileNameTable));
+  const bool hasTrueSymbols =
+      m_SymbolTableUpToDate && (m_SymbolTable == nullptr || isLaidOutAs(tables.layout));
+  if (!hasTrueSymbols && !rebuildSymbols(tables)) return false;
+  takeTables(tables);
+  return true;
+}
+
+void Archive::takeTables(const DerivedTables& tables) {
+  auto nameOffset = tables.nameOffsets.begin();
+  for (ArchiveMember* member : m_ArchiveMembers) {
+    if (nameOffset == tables.nameOffsets.end()) break;
+    if (isLongName(member->m_Name)) member->m_FileNameTableOffset = *nameOffset++;
+  }
+  for (uint32_t i = 0; i < m_ArchiveMembers.getSize(); ++i)
+    m_ArchiveMembers[i]->m_Offset = tables.layout.members[i];
+  takeTable(m_FileNameTable, FileNameTableArchiveMemberType::getInstance(), tables.longNames);
+  takeTable(m_SymbolTable, SymbolTableArchiveMemberType::getInstance(), tables.symbols);
+  if (m_SymbolTable != nullptr) m_SymbolTable->m_Offset = tables.layout.symbolTable;
+  if (m_FileNameTable != nullptr) m_FileNameTable->m_Offset = tables.layout.longNameTable;
+  putTablesInPlace();
+  noteTablesUpToDate();
+}
+
+void Archive::takeTable(ArchiveMember*& table, const ArchiveMemberType* type,
+                        const DerivedTable& derived) {
+  if (derived.fate == DerivedTable::Fate::Kept) return;
+  if (derived.fate == DerivedTable::Fate::Dropped) return forgetTable(table);
+  if (table == nullptr) {
+    table = appendMember("");
+    table->m_Type = type;
+    noteEdit(Edit::TableChange);
+  }
+  table->takeContents(derived.bytes);
+}
+
+// The object is only forgotten until the archive is cleared: names and symbols may be views of its
+// bytes.
+void Archive::forgetTable(ArchiveMember*& table) {
+  if (table == nullptr) return;
+  m_ArchiveMembers.remove(getMemberIndex(table));
+  m_ForgottenTables.push_back(table);
+  table = nullptr;
+  noteEdit(Edit::TableChange);
+}
+
+// They may stand anywhere: where a file had them, where members were moved in front of them, or at
+// the end as they were made.
+void Archive::putTablesInPlace() {
+  uint32_t place = 0;
+  for (ArchiveMember* table : {m_SymbolTable, m_FileNameTable}) {
+    if (table != nullptr) moveMember(table, place++);
+  }
 }
 
 uint64_t Archive::computeFileSize() const {

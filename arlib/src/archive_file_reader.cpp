@@ -108,9 +108,7 @@ bool ArchiveFileReader::readMembers() {
     if (pass == Pass::Failure) return false;
     ++m_Counter;
   }
-  m_Archive.m_SymbolTableUpToDate = true;
-  m_Archive.m_FileNameTableUpToDate = true;
-  m_Archive.m_ArchiveMemberOffsetsUpToDate = true;
+  m_Archive.noteTablesUpToDate();
   return true;
 }
 
@@ -249,7 +247,7 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   if (!checkHostFile()) return nullptr;
   auto offset = static_cast<uint32_t>(m_Offset + MemberHeaderSize);
   uint32_t size = m_Numbers.size;
-  if (!m_Archive.isInsideFile(m_File->getName(), name, offset, size, m_Status.size)) return nullptr;
+  if (!m_Archive.cutToFile(m_File->getName(), name, offset, size, m_Status.size)) return nullptr;
   // A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
   std::string_view leaf = support::lastPathComponent(name);
   if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
@@ -312,8 +310,7 @@ bool ArchiveFileReader::skipPadding() {
 bool ArchiveFileReader::readSymbolTable() {
   QUARN_ASSERT(1, m_Archive.m_SymbolTableUpToDate);
   m_Archive.m_Symbols.setSize(0);
-  m_Archive.m_SortedSymbolsUpToDate = false;
-  m_Archive.m_DefinedSymbolsUpToDate = false;
+  m_Archive.noteEdit(Edit::ReadSymbols);
   if (m_Archive.m_SymbolTable == nullptr) return true;
   auto table = std::make_unique<ReadSymbolTable>(symbolTableSource(), m_Archive.getMembers());
   if (!table->check(m_Archive)) return false;

@@ -67,7 +67,7 @@ std::span<const uint8_t> asBytes(std::string_view text) {
 std::string nameField(const ArchiveMember& member) {
   if (member.getType() == FileNameTableArchiveMemberType::getInstance()) return "//";
   if (member.getType() == SymbolTableArchiveMemberType::getInstance()) return "/";
-  if (member.getName().size() > MaximumShortName) {
+  if (isLongName(member.getName())) {
     return "/" + std::to_string(member.getFileNameTableOffset());
   }
   return std::string(member.getName()) + "/";
@@ -82,8 +82,8 @@ public:
         m_Target(m_Host.followLinks(fileName)), m_Contents(archive), m_MustBeNew(mustBeNew) {}
 
   bool write();
-  // Whether there is a file where there must be none; that has not been reported.
-  [[nodiscard]] bool hasAppeared() const { return m_HasAppeared; }
+  // Whether somebody else has made the file that had to be new; that has not been reported.
+  [[nodiscard]] bool wasOvertaken() const { return m_WasOvertaken; }
 
 private:
   bool checkTarget();
@@ -113,7 +113,7 @@ private:
   support::FileHandle m_Temporary;
   ContentsReader m_Contents;
   bool m_MustBeNew;
-  bool m_HasAppeared = false;
+  bool m_WasOvertaken = false;
 };
 
 bool writeFile(const char* fileName, Archive& archive) {
@@ -125,7 +125,7 @@ NewFile writeNewFile(const char* fileName, Archive& archive) {
   QUARN_ASSERT(1, fileName != NULL);
   ArchiveFileWriter writer(fileName, archive, true);
   if (writer.write()) return NewFile::Written;
-  return writer.hasAppeared() ? NewFile::Exists : NewFile::Failed;
+  return writer.wasOvertaken() ? NewFile::Exists : NewFile::Failed;
 }
 
 bool ArchiveFileWriter::checkTarget() {
@@ -134,8 +134,8 @@ bool ArchiveFileWriter::checkTarget() {
   if (statusError != 0 && statusError != ENOENT) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, statusError);
   }
-  m_HasAppeared = m_MustBeNew && statusError == 0;
-  if (m_HasAppeared) return false;
+  m_WasOvertaken = m_MustBeNew && statusError == 0;
+  if (m_WasOvertaken) return false;
   if (statusError == 0 && !m_Host.isWritable(m_Target.c_str())) {
     return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
   }
@@ -238,8 +238,8 @@ bool ArchiveFileWriter::takeName() {
   const char* temporary = m_TemporaryName.c_str();
   const int error = m_MustBeNew ? m_Host.renameNew(temporary, m_Target.c_str())
                                 : m_Host.rename(temporary, m_Target.c_str());
-  m_HasAppeared = m_MustBeNew && error == EEXIST;
-  if (error == 0 || m_HasAppeared) return error == 0;
+  m_WasOvertaken = m_MustBeNew && error == EEXIST;
+  if (error == 0 || m_WasOvertaken) return error == 0;
   return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
 }
 

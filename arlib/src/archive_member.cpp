@@ -57,8 +57,7 @@ void ArchiveMember::setName(std::string_view name) {
   QUARN_ASSERT(1, !isAuxiliary());
   if (name == m_Name) return;
   m_Name = std::string_view(m_Archive->copyToRegion(name), name.size());
-  m_Archive->m_FileNameTableUpToDate = false;
-  m_Archive->m_SortedArchiveMembersUpToDate = false;
+  m_Archive->noteEdit(Edit::NewName);
 }
 
 std::span<const uint8_t> ArchiveMember::getContents() const {
@@ -91,6 +90,13 @@ std::span<uint8_t> ArchiveMember::replaceContents(uint32_t size) {
   m_Contents = Contents{static_cast<uint8_t*>(m_Archive->m_ContainerRegion->allocate(capacity)),
                         size, capacity};
   return {m_Contents->bytes, size};
+}
+
+void ArchiveMember::takeContents(std::span<uint8_t> bytes) {
+  freeContents();
+  m_Size = static_cast<uint32_t>(bytes.size());
+  m_Contents = Contents{bytes.data(), m_Size, m_Size};
+  releaseContentsLocation();
 }
 
 void ArchiveMember::freeContents() {
@@ -176,8 +182,7 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
   m_Size = size;
   m_Type = nullptr;
   determineType();
-  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
-  m_Archive->m_SymbolTableUpToDate = false;
+  m_Archive->noteEdit(Edit::NewBytes);
   m_Modified = true;
   releaseContentsLocation();
 }
@@ -196,12 +201,6 @@ void ArchiveMember::takeFile(const std::shared_ptr<support::SourceFile>& file, u
   m_Modified = true;
 }
 
-void ArchiveMember::markReplaced() {
-  m_Archive->m_FileNameTableUpToDate = false;
-  m_Archive->m_SymbolTableUpToDate = false;
-  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
-}
-
 bool ArchiveMember::setContentsFromFile(const char* fileName) {
   QUARN_ASSERT(1, fileName != NULL);
   return setContentsFromFile(fileName, probeFile(m_Archive->m_SourceFiles, fileName));
@@ -213,7 +212,7 @@ bool ArchiveMember::setContentsFromFile(const char* fileName, const FileProbe& p
     return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
   }
   takeFile(probe.file, 0, static_cast<uint32_t>(probe.status.size));
-  markReplaced();
+  m_Archive->noteEdit(Edit::NewFile);
   m_Type = ArchiveMemberType::decide(probe.firstBytes());
   return true;
 }
@@ -224,11 +223,9 @@ bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t off
   QUARN_ASSERT(1, m_Type != NULL);
   FileProbe probe;
   if (!m_Archive->openSource(fileName, probe)) return false;
-  if (!m_Archive->isInsideFile(fileName, std::nullopt, offset, size, probe.status.size)) {
-    return false;
-  }
+  if (!m_Archive->cutToFile(fileName, std::nullopt, offset, size, probe.status.size)) return false;
   takeFile(probe.file, offset, size);
-  markReplaced();
+  m_Archive->noteEdit(Edit::NewFile);
   m_Type = nullptr;
   determineType();
   return true;
@@ -238,7 +235,7 @@ void ArchiveMember::setContentsFromMember(const ArchiveMember& source) {
   QUARN_ASSERT(1, m_Type != NULL);
   const ContentsLocation& location = *source.getContentsLocation();
   takeFile(location.file->shared_from_this(), location.offset, source.m_Size);
-  markReplaced();
+  m_Archive->noteEdit(Edit::NewFile);
   takeHeaderNumbers(source);
   m_Type = source.m_Type;
 }
@@ -280,8 +277,7 @@ bool ArchiveMember::clearType() {
   // Without its bytes in memory the member must keep its location, or it would have neither.
   if (isLoaded) releaseContentsLocation();
   m_Type = nullptr;
-  m_Archive->m_ArchiveMemberOffsetsUpToDate = false;
-  m_Archive->m_SymbolTableUpToDate = false;
+  m_Archive->noteEdit(Edit::NewBytes);
   m_Modified = true;
   return isLoaded;
 }

@@ -124,7 +124,7 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
       baseVariants.push_back(group[i].member);
     else if (!decorate(*group[i].member, attributes, decoration))
       return false;
-    output.append({group[i].member, decorateNames(*group[i].names, decoration)});
+    output.append({group[i].place, decorateNames(*group[i].names, decoration)});
   }
   return reportBases(baseVariants);
 }

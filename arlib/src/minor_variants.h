@@ -33,6 +33,7 @@ struct NamesKey {
 // A member with names to publish.
 struct HostingMember {
   ArchiveMember* member;
+  uint32_t place; // in the archive's list of members
   const SymbolNameList* names;
   NamesKey key;
   elfext::FullAttr attributes = {};
@@ -40,7 +41,7 @@ struct HostingMember {
 
 // Neighbours in the table to come: names that lead to one member.
 struct SymbolTableEntries {
-  const ArchiveMember* member;
+  uint32_t place; // of the member
   const SymbolNameList* names;
 };
 

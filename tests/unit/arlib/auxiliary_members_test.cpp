@@ -326,6 +326,24 @@ TEST_F(AuxiliaryMembersTest, FailsWhereATableCannotBeLoaded) {
   EXPECT_EQ(m_Archive.getFileNameTable(), member(0));
 }
 
+// Both tables are handed over together, or none.
+TEST_F(AuxiliaryMembersTest, LeaveTheArchiveAsItWasWhereTheSecondOneFails) {
+  read(archive().symbolTable({{"s", "a"}}).longNames({Long1}).member("a", "x").member(Long1, "y"));
+  const std::vector<uint8_t> names(member(1)->getContents().begin(),
+                                   member(1)->getContents().end());
+  const uint32_t offset = member(3)->getOffset();
+  member(0)->discardContents();
+  m_Archive.closeFiles();
+  m_Host.at("lib.a").isUnreadable = true;
+  member(2)->setName(Long2);
+  m_Archive.setSymbolTableMode(SymbolTableMode::Always);
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(member(1)->getContents(), testing::ElementsAreArray(names));
+  EXPECT_EQ(member(1)->getSize(), names.size());
+  EXPECT_EQ(member(3)->getOffset(), offset);
+  EXPECT_EQ(m_Archive.getMembers().size(), 4u);
+}
+
 TEST_F(AuxiliaryMembersTest, FailsWhereTheSymbolTableCannotBeLoaded) {
   read(archive().symbolTable({{"s", "a"}}).member("a", "x"));
   member(0)->discardContents();

@@ -32,7 +32,7 @@ public:
       SymbolNameList& list = m_Lists.emplace_back(m_Region.get());
       for (const std::string& name : names)
         list.add(std::string_view(name));
-      m_Members.push_back({nullptr, &list, NamesKey(list)});
+      m_Members.push_back({nullptr, 0, &list, NamesKey(list)});
     }
   }
 

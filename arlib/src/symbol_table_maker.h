@@ -1,16 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// One rebuild of the two tables of an archive. The order of the steps is forced: the symbol table
-// holds the offsets of members, and these depend on the size of the long-name table.
+// The symbol table from its members' symbols: first the builds of one module, with decorated names,
+// then all other members in file order. Reading every object makes it the most expensive thing that
+// the library does.
 #pragma once
 
 #include "alloclib/interface/region_objects.h"
-#include "arlib/interface/archive.h"
 #include "arlib/interface/symbol_name_list.h"
+#include "arlib/src/derived_tables.h"
 #include "arlib/src/minor_variants.h"
 #include "elfext/interface/fast_array.h"
 
 #include <cstdint>
+#include <span>
 #include <string_view>
 #include <unordered_set>
 #include <vector>
@@ -18,32 +20,28 @@
 namespace arlib {
 
 // All working storage lies in one scratch region that is dropped as a whole.
-class AuxiliaryMembers {
+class SymbolTableMaker {
 public:
-  explicit AuxiliaryMembers(Archive& archive);
+  explicit SymbolTableMaker(Archive& archive);
 
-  // False if one of the tables could not be rebuilt; it then stands as it was.
-  bool update();
+  // Finds what is to be published. False after a report.
+  bool collect();
+
+  // Whether there is anything to publish, or the archive keeps an empty table as well.
+  [[nodiscard]] bool isTableWanted() const;
+
+  // Size of the table, which may be more than an archive can hold.
+  [[nodiscard]] uint64_t computeTableSize() const;
+
+  // Writes the table, which is of that size, for members that stand there.
+  void fillSymbolTable(std::span<uint8_t> bytes, const MemberLayout& layout) const;
 
 private:
-  bool updateFileNameTable();
-  bool updateSymbolTable();
-  void removeSymbolTable();
   void collectSymbolHostingMembers();
   bool addVariantSymbols();
   void addPlainSymbols();
   [[nodiscard]] const SymbolNameList* dropSeenNames(const SymbolNameList& names,
                                                     std::unordered_set<std::string_view>& seen);
-  [[nodiscard]] uint64_t computeTableSize() const;
-  bool makeSymbolTable(uint64_t tableSize);
-  void computeMemberOffsets(uint64_t tableSize);
-  void fillSymbolTable(std::span<uint8_t> bytes) const;
-  ArchiveMember* appendTable(const ArchiveMemberType* type);
-  bool resizeTable(ArchiveMember* table, uint32_t size);
-  void forgetTable(ArchiveMember*& table);
-  [[nodiscard]] bool hasLayoutChanged() const;
-  void putTablesInPlace();
-  void computeOffsets();
 
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;

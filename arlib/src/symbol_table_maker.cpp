@@ -1,0 +1,148 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "arlib/src/symbol_table_maker.h"
+
+#include "arlib/interface/archive_format.h"
+#include "elfext/interface/attribute_string.h"
+
+#include <cerrno>
+#include <cstring>
+#include <optional>
+#include <string>
+
+namespace arlib {
+
+namespace {
+
+constexpr size_t ScratchRegionSize = 0x100000;
+
+} // namespace
+
+SymbolTableMaker::SymbolTableMaker(Archive& archive)
+    : m_Archive(archive),
+      m_Region(alloclib::RegionGeneral::Create(ScratchRegionSize,
+                                               "arlib::Archive::updateAuxiliaryMembers() region")),
+      m_Records(elfext::parseAttributeString), m_SymbolHostingMembers(m_Region.get()),
+      m_Output(m_Region.get()) {}
+
+bool SymbolTableMaker::collect() {
+  collectSymbolHostingMembers();
+  if (!isTableWanted()) return true;
+  if (!addVariantSymbols()) return false;
+  addPlainSymbols();
+  return true;
+}
+
+bool SymbolTableMaker::isTableWanted() const {
+  return m_SymbolHostingMembers.getSize() != 0 ||
+         m_Archive.getSymbolTableMode() == SymbolTableMode::Always;
+}
+
+// A member that can't be read is told of and has no entries. A handler that says to stop there
+// leaves the table with the members collected so far.
+void SymbolTableMaker::collectSymbolHostingMembers() {
+  const elfext::FullAttr nothingStated = m_Records.get("");
+  ObjectReading reading{m_Records};
+  QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
+  const std::span<ArchiveMember* const> members = m_Archive.getMembers();
+  for (uint32_t place = 0; place < members.size(); ++place) {
+    ArchiveMember* member = members[place];
+    if (!member->getType()->isObjectModule()) continue;
+    const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(member->getType());
+    auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+    std::optional<elfext::FullAttr> attributes;
+    std::string reason;
+    if (!type->getPublished(member, reading, *names, attributes, reason) &&
+        !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
+      return;
+    }
+    if (names->getSize() == 0) continue;
+    m_SymbolHostingMembers.append(
+        {member, place, names, NamesKey(*names), attributes.value_or(nothingStated)});
+  }
+}
+
+// They come before all others. A name of theirs may stand in the table more than once, also where
+// other names may not.
+bool SymbolTableMaker::addVariantSymbols() {
+  m_IsMinorVariant.resize(m_SymbolHostingMembers.getSize());
+  MinorVariants variants(m_Archive, *m_Region, m_Records);
+  std::vector<HostingMember> members;
+  for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.span())) {
+    members.clear();
+    for (const uint32_t index : group) {
+      m_IsMinorVariant[index] = true;
+      members.push_back(m_SymbolHostingMembers[index]);
+    }
+    if (!variants.addSymbols(members, m_Output)) return false;
+  }
+  return true;
+}
+
+void SymbolTableMaker::addPlainSymbols() {
+  std::unordered_set<std::string_view> seenNames;
+  for (uint32_t index = 0; index < m_SymbolHostingMembers.getSize(); ++index) {
+    if (m_IsMinorVariant[index]) continue;
+    const HostingMember& hosting = m_SymbolHostingMembers[index];
+    const SymbolNameList* names = hosting.names;
+    if (m_Archive.getUniqueSymbolsOnly()) names = dropSeenNames(*names, seenNames);
+    m_Output.append({hosting.place, names});
+  }
+}
+
+const SymbolNameList* SymbolTableMaker::dropSeenNames(const SymbolNameList& names,
+                                                      std::unordered_set<std::string_view>& seen) {
+  auto* fresh = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+  for (uint32_t i = 0; i < names.getSize(); ++i) {
+    if (seen.insert(names[i]).second) fresh->addCopied(names[i]);
+  }
+  return fresh;
+}
+
+uint64_t SymbolTableMaker::computeTableSize() const {
+  uint64_t size = 4;
+  for (const SymbolTableEntries& entries : m_Output)
+    size += (4 + 1) * uint64_t{entries.names->getSize()} + entries.names->getTextSize();
+  return size;
+}
+
+// The count, the offset of each name's member, and the names.
+void SymbolTableMaker::fillSymbolTable(std::span<uint8_t> bytes, const MemberLayout& layout) const {
+  const size_t symbolTableSize = bytes.size();
+  size_t symbolTablePosition = 4;
+  for (const auto& [place, names] : m_Output) {
+    for (uint32_t i = 0; i < names->getSize(); ++i, symbolTablePosition += 4)
+      putBigEndian32(bytes.data() + symbolTablePosition, layout.members[place]);
+  }
+  putBigEndian32(bytes.data(), static_cast<uint32_t>(symbolTablePosition / 4 - 1));
+  for (const auto& [place, names] : m_Output) {
+    for (uint32_t i = 0; i < names->getSize(); ++i) {
+      const std::string_view name = (*names)[i];
+      std::memcpy(bytes.data() + symbolTablePosition, name.data(), name.size());
+      symbolTablePosition += name.size();
+      bytes[symbolTablePosition++] = 0;
+    }
+  }
+  QUARN_ASSERT(1, symbolTablePosition == symbolTableSize);
+}
+
+bool makeSymbolTable(Archive& archive, alloclib::RegionGeneral& region, DerivedTables& tables) {
+  const std::optional<uint64_t> longNamesSize =
+      tables.longNames.getSizeAfter(archive.getFileNameTable());
+  tables.symbols.fate = DerivedTable::Fate::Dropped;
+  tables.layout = layOut(archive.getMembers(), std::nullopt, longNamesSize);
+  if (archive.getSymbolTableMode() == SymbolTableMode::Never) return true;
+  SymbolTableMaker maker(archive);
+  if (!maker.collect()) return false;
+  if (!maker.isTableWanted()) return true;
+  const uint64_t size = maker.computeTableSize();
+  if (size > MaximumFileSize) {
+    return archive.fail(&ErrorHandler::reportWriteError, archive.getFileName(), EFBIG);
+  }
+  tables.layout = layOut(archive.getMembers(), size, longNamesSize);
+  tables.symbols = {DerivedTable::Fate::Made,
+                    {static_cast<uint8_t*>(region.allocate(size)), static_cast<size_t>(size)}};
+  maker.fillSymbolTable(tables.symbols.bytes, tables.layout);
+  return true;
+}
+
+} // namespace arlib
