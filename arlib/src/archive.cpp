@@ -412,7 +412,7 @@ uint32_t Archive::getSymbolIndex(const Symbol* symbol) const {
 void Archive::sortMembers() {
   if (m_SortedArchiveMembersUpToDate) return;
   m_SortedArchiveMembers.assign(m_ArchiveMembers);
-  elfext::mergeSort(m_SortedArchiveMembers.span(),
+  elfext::mergeSort(m_SortedArchiveMembers.getSpan(),
                     [](const ArchiveMember* left, const ArchiveMember* right) {
                       return compareIgnoringCase(left->m_Name, right->m_Name);
                     });
@@ -428,7 +428,7 @@ void Archive::sortSymbols() {
   if (m_SortedSymbolsUpToDate) return;
   static_cast<void>(getSymbols());
   m_SortedSymbols.assign(m_Symbols);
-  elfext::mergeSort(m_SortedSymbols.span(), [](const Symbol* left, const Symbol* right) {
+  elfext::mergeSort(m_SortedSymbols.getSpan(), [](const Symbol* left, const Symbol* right) {
     return left->getName().compare(right->getName());
   });
   m_SortedSymbolsUpToDate = true;

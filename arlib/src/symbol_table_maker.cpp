@@ -67,7 +67,7 @@ bool SymbolTableMaker::addVariantSymbols() {
   m_IsMinorVariant.resize(m_SymbolHostingMembers.getSize());
   MinorVariants variants(m_Archive, *m_Region, m_Records);
   std::vector<HostingMember> members;
-  for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.span())) {
+  for (const VariantGroup& group : findMinorVariants(m_SymbolHostingMembers.getSpan())) {
     members.clear();
     for (const uint32_t index : group) {
       m_IsMinorVariant[index] = true;

@@ -46,8 +46,8 @@ public:
   [[nodiscard]] T* end() { return m_Elements + m_Used; }
   [[nodiscard]] const T* begin() const { return m_Elements; }
   [[nodiscard]] const T* end() const { return m_Elements + m_Used; }
-  [[nodiscard]] std::span<T> span() { return {m_Elements, m_Used}; }
-  [[nodiscard]] std::span<const T> span() const { return {m_Elements, m_Used}; }
+  [[nodiscard]] std::span<T> getSpan() { return {m_Elements, m_Used}; }
+  [[nodiscard]] std::span<const T> getSpan() const { return {m_Elements, m_Used}; }
 
   // The element may be one of this array.
   void append(const T& element) {
@@ -118,7 +118,7 @@ public:
   // strict order.
   template <class IsLess>
   void sort(IsLess isLess) {
-    smoothSort(span(), isLess);
+    smoothSort(getSpan(), isLess);
   }
 
 protected:
@@ -130,7 +130,7 @@ protected:
   ~ArrayBase() { this->releaseElements(m_Elements, getBytes(m_Allocated)); }
 
 private:
-  static size_t getBytes(uint32_t capacity) { return size_t{capacity} * sizeof(T); }
+  [[nodiscard]] static size_t getBytes(uint32_t capacity) { return size_t{capacity} * sizeof(T); }
 
   T* allocateFor(uint32_t capacity) {
     return static_cast<T*>(this->allocateElements(getBytes(capacity)));

@@ -144,7 +144,7 @@ private:
   static constexpr uint32_t NumberCount = 46;
   static constexpr uint32_t TextCount = 3;
 
-  [[nodiscard]] static BuildAttributes invalid();
+  [[nodiscard]] static BuildAttributes makeInvalid();
   [[nodiscard]] bool hasNumber(uint32_t place) const { return (m_Present >> place & 1) != 0; }
   [[nodiscard]] uint32_t getNumber(uint32_t place) const;
   // Without consequences for other tags or the record.

@@ -14,7 +14,7 @@ constexpr std::string_view ZevVendor = "ZEV";
 
 // What a run of attributes in a section holds for.
 enum AttributeScope : uint32_t { Tag_File = 1, Tag_Section = 2, Tag_Symbol = 3 };
-constexpr bool isAttributeScope(uint32_t kind) {
+[[nodiscard]] constexpr bool isAttributeScope(uint32_t kind) {
   return kind >= Tag_File && kind <= Tag_Symbol;
 }
 
@@ -110,8 +110,8 @@ public:
   }
 
 private:
-  static constexpr bool isRegular(int32_t tag) { return tag < 0 || tag > 32; }
-  static constexpr bool isEven(int32_t tag) { return tag % 2 == 0; }
+  [[nodiscard]] static constexpr bool isRegular(int32_t tag) { return tag < 0 || tag > 32; }
+  [[nodiscard]] static constexpr bool isEven(int32_t tag) { return tag % 2 == 0; }
 };
 
 } // namespace elfext

@@ -19,14 +19,16 @@ namespace elfext {
 constexpr uint32_t RecognizedBytes = 64;
 
 // Tests the bytes of a whole image, or its first RecognizedBytes.
-bool isElfData(std::span<const uint8_t> data);
+[[nodiscard]] bool isElfData(std::span<const uint8_t> data);
 
 // Tests a file. One that can't be opened or read, or of 0xFFFFFFFF bytes or more, is no ELF file.
-bool isElfFile(support::Host& host, const char* fileName);
-bool isElfFile(support::Host& host, support::FileHandle file);
+[[nodiscard]] bool isElfFile(support::Host& host, const char* fileName);
+[[nodiscard]] bool isElfFile(support::Host& host, support::FileHandle file);
 
 // Tests `size` bytes at `offset` of a file.
-bool isElfFile(support::Host& host, const char* fileName, uint64_t offset, uint64_t size);
-bool isElfFile(support::Host& host, support::FileHandle file, uint64_t offset, uint64_t size);
+[[nodiscard]] bool isElfFile(support::Host& host, const char* fileName, uint64_t offset,
+                             uint64_t size);
+[[nodiscard]] bool isElfFile(support::Host& host, support::FileHandle file, uint64_t offset,
+                             uint64_t size);
 
 } // namespace elfext

@@ -31,7 +31,7 @@ struct AccessWords {
   uint16_t data = 0;
   uint16_t stores = 0;
 
-  static constexpr AccessWords all(uint16_t word) { return {word, word, word, word}; }
+  [[nodiscard]] static constexpr AccessWords all(uint16_t word) { return {word, word, word, word}; }
   friend constexpr AccessWords operator|(const AccessWords& a, const AccessWords& b) {
     return {static_cast<uint16_t>(a.code | b.code),
             static_cast<uint16_t>(a.readOnlyData | b.readOnlyData),

@@ -18,11 +18,11 @@ class LazyArray {
 public:
   [[nodiscard]] uint32_t getSize() const { return m_Array == nullptr ? 0 : m_Array->getSize(); }
   [[nodiscard]] bool isEmpty() const { return getSize() == 0; }
-  [[nodiscard]] std::span<T> span() const {
-    return m_Array == nullptr ? std::span<T>() : m_Array->span();
+  [[nodiscard]] std::span<T> getSpan() const {
+    return m_Array == nullptr ? std::span<T>() : m_Array->getSpan();
   }
-  [[nodiscard]] T* begin() const { return span().data(); }
-  [[nodiscard]] T* end() const { return span().data() + getSize(); }
+  [[nodiscard]] T* begin() const { return getSpan().data(); }
+  [[nodiscard]] T* end() const { return getSpan().data() + getSize(); }
 
   [[nodiscard]] T& operator[](uint32_t index) const {
     QUARN_ASSERT(1, m_Array != nullptr);

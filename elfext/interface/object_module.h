@@ -212,7 +212,7 @@ public:
                                                      uint32_t flags);
 
   [[nodiscard]] std::span<const DebugOverlayRecord> getDebugOverlayRecords() const {
-    return m_DebugOverlayRecords.span();
+    return m_DebugOverlayRecords.getSpan();
   }
   void addDebugOverlayRecord(const DebugOverlayRecord& record);
 
@@ -252,7 +252,7 @@ public:
   [[nodiscard]] Section* getSection(uint32_t index) const { return m_Sections[index]; }
   [[nodiscard]] uint32_t getSectionIndex(const Section* section) const;
   void setSectionIndex(Section* section, uint32_t index);
-  [[nodiscard]] std::span<Section* const> getSections() const { return m_Sections.span(); }
+  [[nodiscard]] std::span<Section* const> getSections() const { return m_Sections.getSpan(); }
   // Room for so many more in all lists of that kind.
   void reserveSections(uint32_t count);
 
@@ -283,43 +283,43 @@ public:
 
   // The auxiliary sections of one type each, in the order in which they were made.
   [[nodiscard]] std::span<StringTableSection* const> getStringTableSections() const {
-    return m_StringTableSections.span();
+    return m_StringTableSections.getSpan();
   }
   [[nodiscard]] std::span<SymbolTableSection* const> getSymtabSections() const {
-    return m_SymtabSections.span();
+    return m_SymtabSections.getSpan();
   }
   [[nodiscard]] std::span<SymbolTableSection* const> getDynsymSections() const {
-    return m_DynsymSections.span();
+    return m_DynsymSections.getSpan();
   }
   [[nodiscard]] std::span<GroupSection* const> getGroupSections() const {
-    return m_GroupSections.span();
+    return m_GroupSections.getSpan();
   }
   [[nodiscard]] std::span<HashSection* const> getHashSections() const {
-    return m_HashSections.span();
+    return m_HashSections.getSpan();
   }
   [[nodiscard]] std::span<ShndxSection* const> getShndxSections() const {
-    return m_ShndxSections.span();
+    return m_ShndxSections.getSpan();
   }
   [[nodiscard]] std::span<PreemptionMapSection* const> getPreemptionMapSections() const {
-    return m_PreemptionMapSections.span();
+    return m_PreemptionMapSections.getSpan();
   }
   [[nodiscard]] std::span<VerdefSection* const> getVerdefSections() const {
-    return m_VerdefSections.span();
+    return m_VerdefSections.getSpan();
   }
   [[nodiscard]] std::span<VerneedSection* const> getVerneedSections() const {
-    return m_VerneedSections.span();
+    return m_VerneedSections.getSpan();
   }
   [[nodiscard]] std::span<VersymSection* const> getVersymSections() const {
-    return m_VersymSections.span();
+    return m_VersymSections.getSpan();
   }
   [[nodiscard]] std::span<DynamicSection* const> getDynamicSections() const {
-    return m_DynamicSections.span();
+    return m_DynamicSections.getSpan();
   }
   [[nodiscard]] std::span<DebugOverlaySection* const> getDebugOverlaySections() const {
-    return m_DebugOverlaySections.span();
+    return m_DebugOverlaySections.getSpan();
   }
   [[nodiscard]] std::span<BuildAttributesSection* const> getBuildAttributesSections() const {
-    return m_BuildAttributesSections.span();
+    return m_BuildAttributesSections.getSpan();
   }
 
   // ---- Symbols
@@ -353,14 +353,14 @@ public:
   [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
   void setSymbolIndex(Symbol* symbol, uint32_t index);
   // Without the null symbol.
-  [[nodiscard]] std::span<Symbol* const> getSymbols() const { return m_Symbols.span(); }
+  [[nodiscard]] std::span<Symbol* const> getSymbols() const { return m_Symbols.getSpan(); }
 
   [[nodiscard]] uint32_t getDynamicSymbolCount() const;
   [[nodiscard]] Symbol* getDynamicSymbol(uint32_t index) const;
   [[nodiscard]] uint32_t getDynamicSymbolIndex(const Symbol* symbol) const;
   void setDynamicSymbolIndex(Symbol* symbol, uint32_t index);
   [[nodiscard]] std::span<Symbol* const> getDynamicSymbols() const {
-    return m_DynamicSymbols.span();
+    return m_DynamicSymbols.getSpan();
   }
 
   [[nodiscard]] uint32_t getAbsoluteSymbolCount() const { return m_AbsoluteSymbols.getSize(); }
@@ -418,7 +418,7 @@ public:
   [[nodiscard]] Segment* getSegment(uint32_t index) const { return m_Segments[index]; }
   [[nodiscard]] uint32_t getSegmentIndex(const Segment* segment) const;
   void setSegmentIndex(Segment* segment, uint32_t index);
-  [[nodiscard]] std::span<Segment* const> getSegments() const { return m_Segments.span(); }
+  [[nodiscard]] std::span<Segment* const> getSegments() const { return m_Segments.getSpan(); }
   // For each section, by its index: the first of these segments that wholly contains it at a known
   // distance, or null. For all sections at once, where Section::isInSegment is for one.
   [[nodiscard]] std::vector<Segment*> findHolders(std::span<Segment* const> segments) const;
@@ -450,7 +450,7 @@ public:
   Preemption* createPreemption(const char* symbolName, const char* preemptingDllName);
 
   [[nodiscard]] std::span<RawDataBlock* const> getRawDataBlocks() const {
-    return m_RawDataBlocks.span();
+    return m_RawDataBlocks.getSpan();
   }
   // `size` bytes of the segment; the caller gives them.
   RawDataBlock* createRawDataBlock(Segment* segment, uint64_t size);

@@ -17,14 +17,14 @@ class Symbol;
 // does.
 class PruneCriterion {
 public:
-  virtual bool goes(const Section&) const { return false; }
-  virtual bool goes(const Group&) const { return false; }
-  virtual bool goes(const Segment&) const { return false; }
+  [[nodiscard]] virtual bool goes(const Section&) const { return false; }
+  [[nodiscard]] virtual bool goes(const Group&) const { return false; }
+  [[nodiscard]] virtual bool goes(const Segment&) const { return false; }
   // Static and dynamic symbols.
-  virtual bool goes(const Symbol&) const { return false; }
-  virtual bool goes(const NeededLibrary&) const { return false; }
-  virtual bool goes(const LibrarySearchPath&) const { return false; }
-  virtual bool goes(const Preemption&) const { return false; }
+  [[nodiscard]] virtual bool goes(const Symbol&) const { return false; }
+  [[nodiscard]] virtual bool goes(const NeededLibrary&) const { return false; }
+  [[nodiscard]] virtual bool goes(const LibrarySearchPath&) const { return false; }
+  [[nodiscard]] virtual bool goes(const Preemption&) const { return false; }
 
 protected:
   ~PruneCriterion() = default;

@@ -71,7 +71,7 @@ public:
   [[nodiscard]] Group* getGroup() const { return m_Group; }
   // Sections whose links point here, in the order in which they were linked.
   [[nodiscard]] std::span<Section* const> getLinkingSections() const {
-    return m_LinkingSections.span();
+    return m_LinkingSections.getSpan();
   }
   // The segment that a section/segment note names; null if there is none.
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
@@ -98,27 +98,29 @@ public:
 
   // Contents. Reading needs them to be here; writing also needs an ordinary section whose contents
   // are in memory. Offsets and sizes are in bytes; words have the module's byte order. See Buffer.
-  [[nodiscard]] const uint8_t* getContents() const { return readable().getContents(); }
-  [[nodiscard]] uint64_t getContentsSize() const { return readable().getSize(); }
-  [[nodiscard]] uint8_t getByte(uint64_t offset) const { return readable().getByte(offset); }
-  [[nodiscard]] uint16_t get16(uint64_t offset) const { return readable().get16(offset); }
-  [[nodiscard]] uint32_t get32(uint64_t offset) const { return readable().get32(offset); }
-  [[nodiscard]] uint64_t get64(uint64_t offset) const { return readable().get64(offset); }
+  [[nodiscard]] const uint8_t* getContents() const { return getReadableBuffer().getContents(); }
+  [[nodiscard]] uint64_t getContentsSize() const { return getReadableBuffer().getSize(); }
+  [[nodiscard]] uint8_t getByte(uint64_t offset) const {
+    return getReadableBuffer().getByte(offset);
+  }
+  [[nodiscard]] uint16_t get16(uint64_t offset) const { return getReadableBuffer().get16(offset); }
+  [[nodiscard]] uint32_t get32(uint64_t offset) const { return getReadableBuffer().get32(offset); }
+  [[nodiscard]] uint64_t get64(uint64_t offset) const { return getReadableBuffer().get64(offset); }
   [[nodiscard]] uint16_t getUnaligned16(uint64_t offset) const {
-    return readable().getUnaligned16(offset);
+    return getReadableBuffer().getUnaligned16(offset);
   }
   [[nodiscard]] uint32_t getUnaligned32(uint64_t offset) const {
-    return readable().getUnaligned32(offset);
+    return getReadableBuffer().getUnaligned32(offset);
   }
   [[nodiscard]] uint64_t getUnaligned64(uint64_t offset) const {
-    return readable().getUnaligned64(offset);
+    return getReadableBuffer().getUnaligned64(offset);
   }
   bool read(uint64_t offset, void* destination, uint64_t count) const override;
 
-  void setByte(uint64_t offset, uint8_t value) { writable().setByte(offset, value); }
-  void set16(uint64_t offset, uint16_t value) { writable().set16(offset, value); }
-  void set32(uint64_t offset, uint32_t value) { writable().set32(offset, value); }
-  void set64(uint64_t offset, uint64_t value) { writable().set64(offset, value); }
+  void setByte(uint64_t offset, uint8_t value) { getWritableBuffer().setByte(offset, value); }
+  void set16(uint64_t offset, uint16_t value) { getWritableBuffer().set16(offset, value); }
+  void set32(uint64_t offset, uint32_t value) { getWritableBuffer().set32(offset, value); }
+  void set64(uint64_t offset, uint64_t value) { getWritableBuffer().set64(offset, value); }
   bool write(uint64_t offset, const void* source, uint64_t count) override;
   // Each adds to the size field too, and returns the old size of the contents.
   uint64_t appendByte(uint8_t value);
@@ -162,10 +164,10 @@ public:
   void getRelocationsInRange(uint64_t fromOffset, uint64_t toOffset, RelocationList* relocations);
   // The sections that say so in the file.
   [[nodiscard]] std::span<RelocationSection* const> getStaticRelocationSections() const {
-    return m_StaticRelocationSections.span();
+    return m_StaticRelocationSections.getSpan();
   }
   [[nodiscard]] std::span<RelocationSection* const> getDynamicRelocationSections() const {
-    return m_DynamicRelocationSections.span();
+    return m_DynamicRelocationSections.getSpan();
   }
   // Makes all relocations that are still rows.
   void materializeRelocations();
@@ -232,8 +234,8 @@ private:
 
   void markChanged();
   void markHostedChanged();
-  [[nodiscard]] const Buffer& readable() const;
-  [[nodiscard]] Buffer& writable();
+  [[nodiscard]] const Buffer& getReadableBuffer() const;
+  [[nodiscard]] Buffer& getWritableBuffer();
   bool readDeferredContents();
   void dropDeferredContents();
 

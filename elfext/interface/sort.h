@@ -33,7 +33,7 @@ void sort(void* base, size_t count, CompareProc compareProc, void* context);
 namespace sorting {
 
 // For a temporary array on the heap; never null.
-void* allocateScratch(size_t count, size_t itemSize);
+[[nodiscard]] void* allocateScratch(size_t count, size_t itemSize);
 
 // Merges the sorted halves [0, middle) and [middle, count) by way of the scratch array.
 template <class T, class Compare>
@@ -112,7 +112,7 @@ private:
   }
 
   // Whether the item of another heap's root belongs above the root and both its children.
-  bool isAboveHeap(size_t candidate, size_t root, size_t size, size_t below) const {
+  [[nodiscard]] bool isAboveHeap(size_t candidate, size_t root, size_t size, size_t below) const {
     if (!m_IsLess(m_Items[root], m_Items[candidate])) return false;
     if (size < 3) return true;
     const size_t right = root - 1;

@@ -50,6 +50,6 @@ struct Target {
 [[nodiscard]] bool hasFullFeatures(uint32_t number, uint32_t profile, FeatureSet features);
 
 // The first floating-point unit of the table.
-[[nodiscard]] const TargetEntry& firstFloatingPointUnit();
+[[nodiscard]] const TargetEntry& getFirstFloatingPointUnit();
 
 } // namespace elfext

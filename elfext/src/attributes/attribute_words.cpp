@@ -31,7 +31,7 @@ struct WordKey {
       (at < 8 ? beginning : rest) |= byte << (56 - 8 * (at % 8));
     }
   }
-  [[nodiscard]] constexpr size_t length() const { return rest & 0xFF; }
+  [[nodiscard]] constexpr size_t getLength() const { return rest & 0xFF; }
   constexpr auto operator<=>(const WordKey&) const = default;
 };
 
@@ -70,7 +70,7 @@ static_assert(std::ranges::adjacent_find(Words, std::ranges::greater_equal(), &W
 
 // A longer word would not be in its key whole.
 static_assert(std::ranges::all_of(Words, [](const WordRow& row) {
-  return row.key.length() <= LongestWord;
+  return row.key.getLength() <= LongestWord;
 }));
 
 // ---- Access names

@@ -90,7 +90,7 @@ BuildAttributes::BuildAttributes(std::string_view attributeText)
   deriveStandardTags();
 }
 
-BuildAttributes BuildAttributes::invalid() {
+BuildAttributes BuildAttributes::makeInvalid() {
   BuildAttributes attributes;
   attributes.m_Valid = false;
   return attributes;
@@ -386,7 +386,7 @@ void BuildAttributes::copyMissingOthers(const BuildAttributes& other) {
 
 // Tags of vendor "ZEV" come last, as they have consequences for others.
 BuildAttributes BuildAttributes::getUnion(const BuildAttributes& a, const BuildAttributes& b) {
-  if (!a.m_Valid || !b.m_Valid) return invalid();
+  if (!a.m_Valid || !b.m_Valid) return makeInvalid();
   BuildAttributes result = b;
   for (uint32_t place = 0; place < TextCount; ++place) {
     if (!a.m_Texts[place] || result.m_Texts[place]) continue;
@@ -416,7 +416,7 @@ void BuildAttributes::copyDifferentOthers(const BuildAttributes& from,
 }
 
 BuildAttributes BuildAttributes::getDifference(const BuildAttributes& a, const BuildAttributes& b) {
-  if (!a.m_Valid || !b.m_Valid) return invalid();
+  if (!a.m_Valid || !b.m_Valid) return makeInvalid();
   BuildAttributes result;
   differenceFullAttr(result.m_FullAttr, b.getFullAttr(), a.getFullAttr());
   for (uint32_t place = 0; place < NumberCount; ++place) {
@@ -434,7 +434,7 @@ BuildAttributes BuildAttributes::getDifference(const BuildAttributes& a, const B
 
 BuildAttributes BuildAttributes::getIntersection(const BuildAttributes& a,
                                                  const BuildAttributes& b) {
-  if (!a.m_Valid || !b.m_Valid) return invalid();
+  if (!a.m_Valid || !b.m_Valid) return makeInvalid();
   BuildAttributes result;
   result.m_FullAttr = intersectFullAttr(a.getFullAttr(), b.getFullAttr());
   for (uint32_t place = 0; place < NumberCount; ++place) {
@@ -455,7 +455,7 @@ BuildAttributes BuildAttributes::getCheckedCombination(const BuildAttributes& a,
                                                        const BuildAttributes& b) {
   FullAttr merged;
   if (!a.m_Valid || !b.m_Valid || !mergeFullAttr(merged, a.getFullAttr(), b.getFullAttr()))
-    return invalid();
+    return makeInvalid();
   BuildAttributes result = getUnion(a, b);
   if (result.hasTag(Tag_CPU_arch))
     result.m_CpuArch = std::max(a.getNumericTag(Tag_CPU_arch), b.getNumericTag(Tag_CPU_arch));

@@ -52,7 +52,7 @@ void addLine(LibraryAttributeMap& map, std::string_view line) {
       {std::string(pattern), parseAttributeString(attributes), std::string(takeWord(line))});
 }
 
-LibraryAttributeMap builtInMap() {
+LibraryAttributeMap makeBuiltInMap() {
   LibraryAttributeMap map;
   for (const std::string_view line : BuiltInLines)
     addLine(map, line);
@@ -127,7 +127,7 @@ LibraryAttributeMap readLibraryAttributeMap(support::Host& host, const char* pat
                                             bool& usedDefault) {
   LibraryAttributeMap map;
   usedDefault = path == nullptr || !readFile(host, path, map);
-  return usedDefault ? builtInMap() : map;
+  return usedDefault ? makeBuiltInMap() : map;
 }
 
 void getLibraryAttributes(FullAttr& result, std::string_view name, const LibraryAttributeMap& map) {

@@ -50,7 +50,7 @@ private:
   void putStack8(uint64_t bit, bool isSet) {
     m_Record.m_Stack8 = isSet ? m_Record.m_Stack8 | bit : m_Record.m_Stack8 & ~bit;
   }
-  [[nodiscard]] Target ownTarget() const;
+  [[nodiscard]] Target getOwnTarget() const;
 
   void addTarget();
   void narrowTarget();
@@ -69,7 +69,7 @@ private:
   FullAttr m_Record = DefaultFullAttr;
 };
 
-Target RecordFromTags::ownTarget() const {
+Target RecordFromTags::getOwnTarget() const {
   if (!has(Tag_CPU_arch)) return findTarget("");
   const uint32_t architecture = get(Tag_CPU_arch);
   if (get(Tag_Z64_ISA_use) != 0) return findTarget(architecture == 14 ? "8-A.64" : "");
@@ -77,7 +77,7 @@ Target RecordFromTags::ownTarget() const {
 }
 
 void RecordFromTags::addTarget() {
-  const Target target = ownTarget();
+  const Target target = getOwnTarget();
   m_Record.m_Features = target.features;
   m_Record.m_TargetClass = target.targetClass;
   m_Record.m_Access = has(Tag_CPU_arch) ? defaultAccessWords(get(Tag_CPU_arch), "")
@@ -149,7 +149,7 @@ void RecordFromTags::addDsp() {
   features.put(SOFTFP, get(Tag_ABI_FP_number_model) != 0 && passesInIntegers);
   if (get(Tag_DSP_extension) == 1)
     features |= DSP_MULT | V7EM_EXTENSION;
-  else if (!ownTarget().features.contains(V7EM_EXTENSION))
+  else if (!getOwnTarget().features.contains(V7EM_EXTENSION))
     features.put(V7EM_EXTENSION, false);
 }
 

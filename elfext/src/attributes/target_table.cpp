@@ -113,7 +113,7 @@ const TargetEntry& firstFloatingPointUnitIn(std::span<const TargetEntry> rows) {
   return *found;
 }
 
-const TargetEntry& firstFloatingPointUnit() {
+const TargetEntry& getFirstFloatingPointUnit() {
   return firstFloatingPointUnitIn(Rows);
 }
 

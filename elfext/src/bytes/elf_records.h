@@ -66,8 +66,8 @@ struct SymbolRow {
   uint64_t value = 0;
   uint64_t size = 0;
 
-  [[nodiscard]] uint32_t type() const { return info & 0xFU; }
-  [[nodiscard]] uint32_t binding() const { return info >> 4U; }
+  [[nodiscard]] uint32_t getType() const { return info & 0xFU; }
+  [[nodiscard]] uint32_t getBinding() const { return info >> 4U; }
 };
 
 // r_info, taken apart as the class says. Of a row without addend the addend is 0.

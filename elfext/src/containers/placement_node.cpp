@@ -49,20 +49,20 @@ PlacementNode* PlacementNode::find(uint64_t* offset) {
 }
 
 bool PlacementNode::link(PlacementNode& first, PlacementNode& second, uint64_t delta) {
-  constexpr uint64_t furthest = std::numeric_limits<uint64_t>::max();
+  constexpr uint64_t Furthest = std::numeric_limits<uint64_t>::max();
   uint64_t firstOffset = 0;
   uint64_t secondOffset = 0;
   PlacementNode* firstRoot = first.find(&firstOffset);
   PlacementNode* secondRoot = second.find(&secondOffset);
   if (firstRoot == secondRoot)
     return firstOffset <= secondOffset && secondOffset - firstOffset == delta;
-  if (delta > furthest - firstOffset) return false;
+  if (delta > Furthest - firstOffset) return false;
   // Where `second` is, as the first root and as its own root see it.
   const uint64_t wanted = firstOffset + delta;
   PlacementNode* lower = wanted >= secondOffset ? firstRoot : secondRoot;
   PlacementNode* upper = wanted >= secondOffset ? secondRoot : firstRoot;
   const uint64_t distance = std::max(wanted, secondOffset) - std::min(wanted, secondOffset);
-  if (distance > furthest - upper->m_Reach) return false;
+  if (distance > Furthest - upper->m_Reach) return false;
   lower->m_Reach = std::max(lower->m_Reach, distance + upper->m_Reach);
   upper->hangUnder(lower, distance);
   return true;

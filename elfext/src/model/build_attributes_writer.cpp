@@ -191,9 +191,11 @@ BuildAttributesSection& onlySection(ObjectModule& module) {
   struct Surplus final : PruneCriterion {
     explicit Surplus(const Section& first) : m_First(first) {}
     using PruneCriterion::goes;
-    bool goes(const Section& section) const override {
+    [[nodiscard]] bool goes(const Section& section) const override {
       return section.getType() == SHT_ZEV_ATTRIBUTES && &section != &m_First;
     }
+
+  private:
     const Section& m_First;
   };
   const auto sections = module.getBuildAttributesSections();

@@ -238,13 +238,13 @@ void ObjectModule::prune(const PruneCriterion& criterion) {
 
 void ObjectModule::clear() {
   struct Everything final : PruneCriterion {
-    bool goes(const Section&) const override { return true; }
-    bool goes(const Group&) const override { return true; }
-    bool goes(const Segment&) const override { return true; }
-    bool goes(const Symbol&) const override { return true; }
-    bool goes(const NeededLibrary&) const override { return true; }
-    bool goes(const LibrarySearchPath&) const override { return true; }
-    bool goes(const Preemption&) const override { return true; }
+    [[nodiscard]] bool goes(const Section&) const override { return true; }
+    [[nodiscard]] bool goes(const Group&) const override { return true; }
+    [[nodiscard]] bool goes(const Segment&) const override { return true; }
+    [[nodiscard]] bool goes(const Symbol&) const override { return true; }
+    [[nodiscard]] bool goes(const NeededLibrary&) const override { return true; }
+    [[nodiscard]] bool goes(const LibrarySearchPath&) const override { return true; }
+    [[nodiscard]] bool goes(const Preemption&) const override { return true; }
   };
   prune(Everything());
   m_HasLostContents = false;
@@ -296,7 +296,9 @@ void ObjectModule::deleteOne(const Object* object) {
   struct TheOne final : PruneCriterion {
     explicit TheOne(const Object* doomed) : m_Object(doomed) {}
     using PruneCriterion::goes;
-    bool goes(const Object& other) const override { return &other == m_Object; }
+    [[nodiscard]] bool goes(const Object& other) const override { return &other == m_Object; }
+
+  private:
     const Object* m_Object;
   };
   QUARN_ASSERT(1, object != NULL);

@@ -43,10 +43,10 @@ void ObjectModule::updateSortedViews() {
   m_DynamicSymbolsSortedByAddress.assign(m_DynamicSymbols);
   m_SymbolsSortedByName.assign(m_Symbols);
   m_DynamicSymbolsSortedByName.assign(m_DynamicSymbols);
-  sortByKey(m_SymbolsSortedByAddress.span(), getAddress);
-  sortByKey(m_DynamicSymbolsSortedByAddress.span(), getAddress);
-  sortByName(m_SymbolsSortedByName.span());
-  sortByName(m_DynamicSymbolsSortedByName.span());
+  sortByKey(m_SymbolsSortedByAddress.getSpan(), getAddress);
+  sortByKey(m_DynamicSymbolsSortedByAddress.getSpan(), getAddress);
+  sortByName(m_SymbolsSortedByName.getSpan());
+  sortByName(m_DynamicSymbolsSortedByName.getSpan());
   m_AreSortedViewsUpToDate = true;
 }
 
@@ -68,7 +68,7 @@ bool ObjectModule::getSymbolsByName(const char* name, SymbolList* symbols) {
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
   updateSortedViews();
-  const SymbolView view = m_SymbolsSortedByName.span();
+  const SymbolView view = m_SymbolsSortedByName.getSpan();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 
@@ -76,14 +76,14 @@ bool ObjectModule::getDynamicSymbolsByName(const char* name, SymbolList* symbols
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
   updateSortedViews();
-  const SymbolView view = m_DynamicSymbolsSortedByName.span();
+  const SymbolView view = m_DynamicSymbolsSortedByName.getSpan();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 
 bool ObjectModule::collectByAddress(uint32_t fromIndex, uint32_t toIndex, uint32_t mask,
                                     SymbolList* symbols) const {
   QUARN_ASSERT(1, fromIndex <= toIndex && toIndex < m_SymbolsSortedByAddress.getSize());
-  return collect(m_SymbolsSortedByAddress.span(), {true, fromIndex, toIndex}, mask, symbols);
+  return collect(m_SymbolsSortedByAddress.getSpan(), {true, fromIndex, toIndex}, mask, symbols);
 }
 
 bool ObjectModule::getSymbolsInRange(uint64_t fromAddress, uint64_t toAddress, uint32_t mask,
@@ -92,7 +92,7 @@ bool ObjectModule::getSymbolsInRange(uint64_t fromAddress, uint64_t toAddress, u
   updateSortedViews();
   symbols->setSize(0);
   const SymbolRun run =
-      findRange(m_SymbolsSortedByAddress.span(), getAddress, fromAddress, toAddress);
+      findRange(m_SymbolsSortedByAddress.getSpan(), getAddress, fromAddress, toAddress);
   return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
 }
 
@@ -104,7 +104,8 @@ bool ObjectModule::getPrecedingSymbols(uint64_t address, uint32_t mask, SymbolLi
   QUARN_ASSERT(1, symbols != NULL);
   updateSortedViews();
   symbols->setSize(0);
-  const SymbolRun run = findPreceding(m_SymbolsSortedByAddress.span(), getAddress, address, mask);
+  const SymbolRun run =
+      findPreceding(m_SymbolsSortedByAddress.getSpan(), getAddress, address, mask);
   return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
 }
 
@@ -112,7 +113,8 @@ bool ObjectModule::getFollowingSymbols(uint64_t address, uint32_t mask, SymbolLi
   QUARN_ASSERT(1, symbols != NULL);
   updateSortedViews();
   symbols->setSize(0);
-  const SymbolRun run = findFollowing(m_SymbolsSortedByAddress.span(), getAddress, address, mask);
+  const SymbolRun run =
+      findFollowing(m_SymbolsSortedByAddress.getSpan(), getAddress, address, mask);
   return run.isFound && collectByAddress(run.fromIndex, run.toIndex, mask, symbols);
 }
 

@@ -71,7 +71,7 @@ void Pruner::markDependentSections() {
     if (group->m_Goes && group->m_GroupSection != nullptr) take(group->m_GroupSection);
   for (size_t next = 0; next < going.size(); ++next)
     for (bool isDynamic : {false, true})
-      for (RelocationSection* section : going[next]->getRelocationSections(isDynamic).span())
+      for (RelocationSection* section : going[next]->getRelocationSections(isDynamic).getSpan())
         take(section);
   m_SectionsGo = !going.empty();
 }
@@ -108,7 +108,7 @@ void Pruner::sweepRelocations() {
   for (Section* section : m_ObjectModule.m_Sections) {
     if (section->m_Goes) continue;
     section->materializeRelocations();
-    for (Relocation* relocation : section->m_Relocations.span())
+    for (Relocation* relocation : section->m_Relocations.getSpan())
       if (relocation->m_Origin != nullptr && relocation->m_Origin->m_Goes)
         relocation->m_Origin = nullptr;
     if (!m_SymbolsGo || section->m_Relocations.isEmpty()) continue;
@@ -163,7 +163,7 @@ void Pruner::sweepGroups() {
       group->m_GroupSection = nullptr;
     group->m_Members.removeIf([](const Section* section) { return section->m_Goes; });
     if (!group->m_Goes) continue;
-    for (Section* section : group->m_Members.span())
+    for (Section* section : group->m_Members.getSpan())
       section->m_Group = nullptr;
     if (areAnyNoted) noted.remove(Stringlett(group->m_Signature));
   }

@@ -12,12 +12,12 @@
 
 namespace elfext {
 
-const Buffer& Section::readable() const {
+const Buffer& Section::getReadableBuffer() const {
   QUARN_ASSERT(1, !isContentsDeferred());
   return m_Contents;
 }
 
-Buffer& Section::writable() {
+Buffer& Section::getWritableBuffer() {
   QUARN_ASSERT(1, !m_IsAuxiliary);
   QUARN_ASSERT(1, !isContentsDeferred());
   QUARN_ASSERT(1, !m_HasExternalContents);
@@ -29,33 +29,33 @@ bool Section::isModifiable() const {
 }
 
 bool Section::read(uint64_t offset, void* destination, uint64_t count) const {
-  return readable().read(offset, destination, count);
+  return getReadableBuffer().read(offset, destination, count);
 }
 
 bool Section::write(uint64_t offset, const void* source, uint64_t count) {
-  return writable().write(offset, source, count);
+  return getWritableBuffer().write(offset, source, count);
 }
 
 uint64_t Section::appendByte(uint8_t value) {
-  const uint64_t oldSize = writable().appendByte(value);
+  const uint64_t oldSize = getWritableBuffer().appendByte(value);
   addSize(sizeof value);
   return oldSize;
 }
 
 uint64_t Section::append16(uint16_t value) {
-  const uint64_t oldSize = writable().append16(value);
+  const uint64_t oldSize = getWritableBuffer().append16(value);
   addSize(sizeof value);
   return oldSize;
 }
 
 uint64_t Section::append32(uint32_t value) {
-  const uint64_t oldSize = writable().append32(value);
+  const uint64_t oldSize = getWritableBuffer().append32(value);
   addSize(sizeof value);
   return oldSize;
 }
 
 uint64_t Section::append64(uint64_t value) {
-  const uint64_t oldSize = writable().append64(value);
+  const uint64_t oldSize = getWritableBuffer().append64(value);
   addSize(sizeof value);
   return oldSize;
 }

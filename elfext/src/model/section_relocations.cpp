@@ -49,7 +49,7 @@ void Section::materializeRelocations() {
   m_PendingRelocationCount = 0;
   std::vector<RelocationSection*> sections;
   for (bool isDynamic : {false, true})
-    for (RelocationSection* section : getRelocationSections(isDynamic).span())
+    for (RelocationSection* section : getRelocationSections(isDynamic).getSpan())
       if (section->getPendingRowCount() != 0) sections.push_back(section);
   std::sort(sections.begin(), sections.end(), [](const Section* left, const Section* right) {
     return left->getIndex() < right->getIndex();
@@ -61,7 +61,7 @@ void Section::materializeRelocations() {
   for (RelocationSection* section : sections) {
     const uint32_t first = m_Relocations.getSize();
     section->takeRows()->appendTo(*this);
-    for (Relocation* relocation : m_Relocations.span().subspan(first))
+    for (Relocation* relocation : m_Relocations.getSpan().subspan(first))
       relocation->m_Origin = section;
   }
   m_IsRelocatable = isRelocatable;
@@ -82,7 +82,7 @@ uint32_t Section::getRelocationIndex(const Relocation* relocation) {
   QUARN_ASSERT(1, relocation != NULL);
   QUARN_ASSERT(1, relocation->m_Section == this);
   QUARN_ASSERT(2, m_Relocations.contains(const_cast<Relocation*>(relocation)));
-  const std::span<Relocation*> all = m_Relocations.span();
+  const std::span<Relocation*> all = m_Relocations.getSpan();
   const auto found = std::find(all.begin(), all.end(), relocation);
   return found == all.end() ? NoIndex : static_cast<uint32_t>(found - all.begin());
 }
@@ -113,7 +113,7 @@ void Section::removeRelocation(Relocation* relocation) {
 void Section::removeAllRelocations() {
   QUARN_ASSERT(1, !m_ObjectModule->m_IndexesFrozen);
   for (bool isDynamic : {false, true})
-    for (RelocationSection* section : getRelocationSections(isDynamic).span())
+    for (RelocationSection* section : getRelocationSections(isDynamic).getSpan())
       section->takeRows();
   m_PendingRelocationCount = 0;
   m_Relocations.clear();
@@ -181,9 +181,9 @@ void Section::sortRelocations() {
   materializeRelocations();
   if (m_AreRelocationsSorted) return;
   m_RelocationsSortedByOffset.clear();
-  for (Relocation* relocation : m_Relocations.span())
+  for (Relocation* relocation : m_Relocations.getSpan())
     m_RelocationsSortedByOffset.append(m_ObjectModule->getContainerRegion(), relocation);
-  mergeSort(m_RelocationsSortedByOffset.span(),
+  mergeSort(m_RelocationsSortedByOffset.getSpan(),
             [](const Relocation* left, const Relocation* right) {
               return static_cast<int>(left->getOffset() > right->getOffset()) -
                      static_cast<int>(left->getOffset() < right->getOffset());
@@ -195,7 +195,7 @@ void Section::getRelocationsInRange(uint64_t fromOffset, uint64_t toOffset,
                                     RelocationList* relocations) {
   QUARN_ASSERT(1, relocations != NULL);
   sortRelocations();
-  const std::span<Relocation*> all = m_RelocationsSortedByOffset.span();
+  const std::span<Relocation*> all = m_RelocationsSortedByOffset.getSpan();
   const auto from = std::partition_point(
       all.begin(), all.end(), [=](const Relocation* r) { return r->getOffset() < fromOffset; });
   const auto to = std::partition_point(

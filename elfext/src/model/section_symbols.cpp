@@ -57,7 +57,7 @@ uint32_t Section::getHostedSymbolIndex(const Symbol* symbol) const {
   QUARN_ASSERT(1, !symbol->isDynamic());
   QUARN_ASSERT(1, symbol->getHostedSymbolSection() == this);
   QUARN_ASSERT(2, m_HostedSymbols.contains(const_cast<Symbol*>(symbol)));
-  return findIndex(m_HostedSymbols.span(), symbol);
+  return findIndex(m_HostedSymbols.getSpan(), symbol);
 }
 
 uint32_t Section::getHostedDynamicSymbolIndex(const Symbol* symbol) const {
@@ -65,7 +65,7 @@ uint32_t Section::getHostedDynamicSymbolIndex(const Symbol* symbol) const {
   QUARN_ASSERT(1, symbol->isDynamic());
   QUARN_ASSERT(1, symbol->getHostedSymbolSection() == this);
   QUARN_ASSERT(2, m_HostedDynamicSymbols.contains(const_cast<Symbol*>(symbol)));
-  return findIndex(m_HostedDynamicSymbols.span(), symbol);
+  return findIndex(m_HostedDynamicSymbols.getSpan(), symbol);
 }
 
 void Section::setHostedSymbolIndex(Symbol* symbol, uint32_t index) {
@@ -99,10 +99,10 @@ HostedViews& Section::getHostedViews() {
 const HostedViews& Section::getHostedViewsByOffset() {
   HostedViews& views = getHostedViews();
   if (std::exchange(m_AreHostedByOffsetUpToDate, true)) return views;
-  copy(m_HostedSymbols.span(), views.m_HostedSymbolsSortedByOffset);
-  copy(m_HostedDynamicSymbols.span(), views.m_HostedDynamicSymbolsSortedByOffset);
-  sortByKey(views.m_HostedSymbolsSortedByOffset.span(), getOffset);
-  sortByKey(views.m_HostedDynamicSymbolsSortedByOffset.span(), getOffset);
+  copy(m_HostedSymbols.getSpan(), views.m_HostedSymbolsSortedByOffset);
+  copy(m_HostedDynamicSymbols.getSpan(), views.m_HostedDynamicSymbolsSortedByOffset);
+  sortByKey(views.m_HostedSymbolsSortedByOffset.getSpan(), getOffset);
+  sortByKey(views.m_HostedDynamicSymbolsSortedByOffset.getSpan(), getOffset);
   return views;
 }
 
@@ -110,16 +110,16 @@ const HostedViews& Section::getHostedViewsByOffset() {
 const HostedViews& Section::getHostedViewsByName() {
   HostedViews& views = getHostedViews();
   if (std::exchange(m_AreHostedByNameUpToDate, true)) return views;
-  copy(m_HostedSymbols.span(), views.m_HostedSymbolsSortedByName);
-  copy(m_HostedDynamicSymbols.span(), views.m_HostedDynamicSymbolsSortedByName);
-  sortByName(views.m_HostedSymbolsSortedByName.span());
-  sortByName(views.m_HostedDynamicSymbolsSortedByName.span());
+  copy(m_HostedSymbols.getSpan(), views.m_HostedSymbolsSortedByName);
+  copy(m_HostedDynamicSymbols.getSpan(), views.m_HostedDynamicSymbolsSortedByName);
+  sortByName(views.m_HostedSymbolsSortedByName.getSpan());
+  sortByName(views.m_HostedDynamicSymbolsSortedByName.getSpan());
   return views;
 }
 
 bool Section::getSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.getSpan();
   return collect(view, findRange(view, getOffset, fromOffset, toOffset), Symbol::Class_Mapping,
                  symbols);
 }
@@ -127,20 +127,20 @@ bool Section::getSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolLi
 bool Section::getDynamicSymbolsInRange(uint64_t fromOffset, uint64_t toOffset,
                                        SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByOffset().m_HostedDynamicSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedDynamicSymbolsSortedByOffset.getSpan();
   return collect(view, findRange(view, getOffset, fromOffset, toOffset), Symbol::Class_All,
                  symbols);
 }
 
 bool Section::getPrecedingSymbols(uint64_t offset, uint32_t mask, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.getSpan();
   return collect(view, findPreceding(view, getOffset, offset, mask), mask, symbols);
 }
 
 bool Section::getFollowingMappingSymbols(uint64_t offset, SymbolList* symbols) {
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.span();
+  const SymbolView view = getHostedViewsByOffset().m_HostedSymbolsSortedByOffset.getSpan();
   return collect(view, findFollowing(view, getOffset, offset, Symbol::Class_Mapping),
                  Symbol::Class_Mapping, symbols);
 }
@@ -148,14 +148,14 @@ bool Section::getFollowingMappingSymbols(uint64_t offset, SymbolList* symbols) {
 bool Section::getSymbolsByName(const char* name, SymbolList* symbols) {
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByName().m_HostedSymbolsSortedByName.span();
+  const SymbolView view = getHostedViewsByName().m_HostedSymbolsSortedByName.getSpan();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 
 bool Section::getDynamicSymbolsByName(const char* name, SymbolList* symbols) {
   QUARN_ASSERT(1, name != NULL);
   QUARN_ASSERT(1, symbols != NULL);
-  const SymbolView view = getHostedViewsByName().m_HostedDynamicSymbolsSortedByName.span();
+  const SymbolView view = getHostedViewsByName().m_HostedDynamicSymbolsSortedByName.getSpan();
   return collect(view, findName(view, name), Symbol::Class_All, symbols);
 }
 

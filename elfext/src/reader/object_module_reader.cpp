@@ -36,7 +36,7 @@ void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
   ModuleBuilder::setStoredProgramHeaderCount(module, header.phnum);
   ModuleBuilder::setSectionHeaderEntrySize(module, header.shentsize);
   ModuleBuilder::setProgramHeaderEntrySize(module, header.phentsize);
-  module.reserveSections(context.sectionCount());
+  module.reserveSections(context.getSectionCount());
 }
 
 void makeObjects(ReadContext& context) {

@@ -22,7 +22,7 @@ bool overlaps(const ProgramHeader& segment, uint64_t offset, uint64_t size) {
 }
 
 uint64_t sectionHeaderTableSize(const ReadContext& context) {
-  return uint64_t{context.fileHeader.shentsize} * context.sectionCount();
+  return uint64_t{context.fileHeader.shentsize} * context.getSectionCount();
 }
 
 uint32_t headersInFirstLoad(const ReadContext& context) {
@@ -35,7 +35,7 @@ uint32_t headersInFirstLoad(const ReadContext& context) {
   if (overlaps(*load, 0, header.ehsize)) conditions |= ReadCondition_LoadOverlapsElfHeader;
   if (overlaps(*load, header.shoff, sectionHeaderTableSize(context)))
     conditions |= ReadCondition_LoadOverlapsSectionHeaderTable;
-  if (overlaps(*load, header.phoff, uint64_t{header.phentsize} * context.segmentCount()))
+  if (overlaps(*load, header.phoff, uint64_t{header.phentsize} * context.getSegmentCount()))
     conditions |= ReadCondition_LoadOverlapsProgramHeaderTable;
   return conditions;
 }

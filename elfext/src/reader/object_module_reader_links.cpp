@@ -50,7 +50,7 @@ void linkByType(ReadContext& context, Section& section, Section& link) {
 
 void linkSections(ReadContext& context) {
   for (const bool isByType : {true, false}) {
-    for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+    for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
       if (!context.hasLink(i) || isLinkedByType(context.typeOf(i)) != isByType) continue;
       Section& section = *context.module.getSection(i);
       Section& link = *context.module.getSection(context.sectionHeaders[i].link);

@@ -38,12 +38,12 @@ void placeHeaderTables(ReadContext& context) {
   // An earlier read may have left them elsewhere.
   module.getSectionHeaderTable().clearFileOffset();
   module.getProgramHeaderTable().clearFileOffset();
-  if (context.sectionCount() != 0) {
-    module.getSectionHeaderTable().setEntryCount(context.sectionCount());
+  if (context.getSectionCount() != 0) {
+    module.getSectionHeaderTable().setEntryCount(context.getSectionCount());
     module.getSectionHeaderTable().setFileOffset(context.fileHeader.shoff);
   }
   if (module.getFileType() != ET_REL) {
-    module.getProgramHeaderTable().setEntryCount(context.segmentCount());
+    module.getProgramHeaderTable().setEntryCount(context.getSegmentCount());
     module.getProgramHeaderTable().setFileOffset(context.fileHeader.phoff);
   }
 }
@@ -52,11 +52,11 @@ void placeHeaderTables(ReadContext& context) {
 class RegionList {
 public:
   explicit RegionList(ReadContext& context) {
-    for (uint32_t i = 0; i < context.segmentCount(); ++i) {
+    for (uint32_t i = 0; i < context.getSegmentCount(); ++i) {
       const ProgramHeader& header = context.programHeaders[i];
       add(context.module.getSegment(i), header.offset, header.filesz);
     }
-    for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+    for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
       const SectionHeader& header = context.sectionHeaders[i];
       if (hasFileBytes(header)) add(context.module.getSection(i), header.offset, header.size);
     }
@@ -105,7 +105,7 @@ void tieSectionsWithoutBytes(ReadContext& context) {
   if (context.programHeaders.empty()) return;
   const std::vector<uint32_t> segments =
       findSegments(context.sectionHeaders, context.programHeaders, context.module.getOsAbi());
-  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
     if (segments[i] == NoExtent) continue;
     const uint64_t distance =
         context.sectionHeaders[i].offset - context.programHeaders[segments[i]].offset;

@@ -86,7 +86,7 @@ void createSections(ReadContext& context) {
     ModuleBuilder::adoptHeader(section, header);
   }
   QUARN_ASSERT(1, module.getSectionCount() == context.sectionHeaders.size());
-  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
     const SectionHeader& header = context.sectionHeaders[i];
     if (header.type == SHT_NOBITS) ModuleBuilder::adoptSize(*module.getSection(i), header.size);
     if (hasFileBytes(header)) giveContents(context, *module.getSection(i), header);
@@ -102,7 +102,7 @@ void nameSections(ReadContext& context) {
   ModuleBuilder::markSectionNameTable(
       *static_cast<StringTableSection*>(context.module.getSection(table)));
   const char* names = context.stringsOf(table);
-  for (uint32_t i = 0; i < context.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
     const uint32_t offset = context.sectionHeaders[i].name;
     if (offset != 0) ModuleBuilder::adoptName(*context.module.getSection(i), names + offset);
   }

@@ -11,8 +11,8 @@ Symbol* createSymbol(ReadContext& context, const SymbolTable& table, const char*
                      const SymbolRow& row, const SymbolHome& home) {
   ObjectModule& module = context.module;
   const char* name = row.name == 0 ? nullptr : strings + row.name;
-  const uint32_t type = row.type();
-  const uint32_t binding = row.binding();
+  const uint32_t type = row.getType();
+  const uint32_t binding = row.getBinding();
   const uint32_t visibility = row.other & 0x3U;
   const bool isDynamic = table.isDynamic;
   switch (home.category) {
@@ -58,7 +58,7 @@ void createSymbolsOf(ReadContext& context, const SymbolTable& table) {
 } // namespace
 
 void createSymbols(ReadContext& context) {
-  context.symbols.resize(context.sectionCount());
+  context.symbols.resize(context.getSectionCount());
   for (const SymbolTable& table : context.symbolTables)
     createSymbolsOf(context, table);
 }

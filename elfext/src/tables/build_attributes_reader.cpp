@@ -35,7 +35,7 @@ enum class SectionState : uint8_t { None, Read, Corrupt };
 // False ends the read.
 bool readAttributeSections(ObjectTables& tables, AttributeStore& store, SectionState& state) {
   InjectionBudget budget(tables.image.getSize());
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) != SHT_ZEV_ATTRIBUTES) continue;
     const uint64_t size = tables.sectionHeaders[i].size;
     const uint8_t* contents = size == 0 ? nullptr : tables.viewSection(i);

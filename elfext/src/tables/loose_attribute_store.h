@@ -24,7 +24,7 @@ public:
   [[nodiscard]] const BuildAttributes* getOwnOfFile() const { return getOwn({}); }
 
   [[nodiscard]] bool isKept() const override { return m_Cache.has_value(); }
-  [[nodiscard]] uint32_t getSectionCount() const override { return m_Tables.sectionCount(); }
+  [[nodiscard]] uint32_t getSectionCount() const override { return m_Tables.getSectionCount(); }
   [[nodiscard]] uint32_t getSymbolCount() const override { return m_SymbolCount; }
   [[nodiscard]] AttributeSymbol getSymbol(uint32_t index) const override;
   [[nodiscard]] BuildAttributesCache& getCache() override { return *m_Cache; }

@@ -55,8 +55,8 @@ bool isCode(const SectionHeader& header) {
 }
 
 void addSections(const ObjectTables& tables, SizesSource& source) {
-  source.sections.reserve(tables.sectionCount());
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  source.sections.reserve(tables.getSectionCount());
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const SectionHeader& header = tables.sectionHeaders[i];
     const uint64_t size = sizeOf(tables, i);
     source.sections.push_back(
@@ -97,14 +97,14 @@ bool addSegments(ObjectTables& tables, SizesSource& source) {
     source.segments.push_back(
         {segment.type, segment.flags, {segment.offset, segment.filesz}, segment.memsz});
   }
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const uint64_t size = tables.typeOf(i) == SHT_NOBITS ? 0 : sizeOf(tables, i);
     if (size != 0) source.occupied.push_back({tables.sectionHeaders[i].offset, size});
   }
   const FileHeader& header = tables.fileHeader;
   source.occupied.push_back({0, header.ehsize});
-  source.occupied.push_back({header.phoff, uint64_t{header.phentsize} * tables.segmentCount()});
-  source.occupied.push_back({header.shoff, uint64_t{header.shentsize} * tables.sectionCount()});
+  source.occupied.push_back({header.phoff, uint64_t{header.phentsize} * tables.getSegmentCount()});
+  source.occupied.push_back({header.shoff, uint64_t{header.shentsize} * tables.getSectionCount()});
   return addRawData(tables, source);
 }
 
@@ -139,8 +139,8 @@ std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
   std::vector<OutlinedSection> sections;
   if (m_Content == nullptr) return sections;
   const ObjectTables& tables = m_Content->tables;
-  sections.reserve(tables.sectionCount());
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  sections.reserve(tables.getSectionCount());
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const SectionHeader& header = tables.sectionHeaders[i];
     sections.push_back({tables.nameOf(i), header.type, header.flags});
   }
@@ -155,7 +155,7 @@ std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
     const SymbolHome home = tables.homeOf(table, index, row);
     const bool isHosted = home.category == Symbol::Category_Hosted;
-    m_Symbols.push_back({table.nameOf(row), home.category, row.binding(),
+    m_Symbols.push_back({table.nameOf(row), home.category, row.getBinding(),
                          isHosted ? tables.nameOf(home.section) : nullptr});
   });
   return m_Symbols;

@@ -174,12 +174,12 @@ struct ObjectTables {
   // Only of the large ones: without this, each object's arrays would be new memory to the process.
   void takeMemory(ObjectTables& former);
 
-  [[nodiscard]] uint32_t sectionCount() const {
+  [[nodiscard]] uint32_t getSectionCount() const {
     return static_cast<uint32_t>(sectionHeaders.size());
   }
   // What messages call the last section.
-  [[nodiscard]] uint32_t lastSection() const { return sectionCount() - 1; }
-  [[nodiscard]] uint32_t segmentCount() const {
+  [[nodiscard]] uint32_t getLastSection() const { return getSectionCount() - 1; }
+  [[nodiscard]] uint32_t getSegmentCount() const {
     return static_cast<uint32_t>(programHeaders.size());
   }
   [[nodiscard]] uint32_t typeOf(uint32_t section) const { return sectionHeaders[section].type; }
@@ -210,14 +210,15 @@ struct ObjectTables {
   // Calls the function with index and row of each symbol but the null one, as long as it answers
   // true. Answers whether it always did.
   template <class Function>
+  // Who visits every row has no use for the answer. NOLINTNEXTLINE(modernize-use-nodiscard)
   bool forEachSymbolRow(const SymbolTable& table, Function function) const {
     return withFixedFormat(format, [&](auto fixedFormat) {
-      constexpr RecordFormat rowFormat = fixedFormat;
+      constexpr RecordFormat RowFormat = fixedFormat;
       const uint8_t* bytes = table.rows;
       for (uint32_t index = 1; index < table.rowCount; ++index) {
-        bytes += symbolRowSize(rowFormat.isWide);
+        bytes += symbolRowSize(RowFormat.isWide);
         SymbolRow row;
-        getRecord(rowFormat, bytes, row);
+        getRecord(RowFormat, bytes, row);
         if (!function(index, row)) return false;
       }
       return true;

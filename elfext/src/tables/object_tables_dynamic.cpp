@@ -31,7 +31,7 @@ bool checkStrings(ObjectTables& tables, uint32_t section) {
 }
 
 std::optional<uint32_t> findLast(const ObjectTables& tables, uint32_t type) {
-  for (uint32_t i = tables.sectionCount(); i > 0; --i) {
+  for (uint32_t i = tables.getSectionCount(); i > 0; --i) {
     if (tables.typeOf(i - 1) == type) return i - 1;
   }
   return std::nullopt;
@@ -110,7 +110,7 @@ private:
 
   [[nodiscard]] std::vector<Extent> getExtents() const {
     std::vector<Extent> extents;
-    for (uint32_t i = 0; i < m_Tables.sectionCount(); ++i) {
+    for (uint32_t i = 0; i < m_Tables.getSectionCount(); ++i) {
       const SectionHeader& header = m_Tables.sectionHeaders[i];
       if (header.type == SHT_NULL || (m_AreFileOffsets && header.type == SHT_NOBITS)) continue;
       extents.push_back({startOf(header), endOf(startOf(header), header.size), i});
@@ -170,7 +170,7 @@ private:
 
 bool checkDynamicSections(ObjectTables& tables) {
   DynamicWalk walk(tables);
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) != SHT_DYNAMIC || tables.isBroken(i)) continue;
     if (!walk.takeSection(i)) return false;
   }

@@ -16,9 +16,9 @@ constexpr uint32_t NoGroup = 0xFFFFFFFF;
 // The owners are, by section, the sections of the groups that they are in.
 bool checkMember(ObjectTables& tables, uint32_t group, uint32_t member,
                  std::vector<uint32_t>& owners) {
-  if (member >= tables.sectionCount())
+  if (member >= tables.getSectionCount())
     return goOn(tables.reporter, &ErrorHandler::groupMemberOutOfRange, group, member,
-                tables.lastSection());
+                tables.getLastSection());
   if (member == 0 && tables.typeOf(0) == SHT_NULL) return true;
   if (owners[member] != NoGroup)
     return goOn(tables.reporter, &ErrorHandler::sectionInTwoGroups, member, owners[member], group);
@@ -66,11 +66,11 @@ bool checkOverlappingGroups(ObjectTables& tables, std::span<const uint32_t> grou
 
 bool checkGroups(ObjectTables& tables) {
   std::vector<uint32_t> groups;
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) == SHT_GROUP && !tables.isBroken(i)) groups.push_back(i);
   }
   if (groups.empty()) return true;
-  std::vector<uint32_t> owners(tables.sectionCount(), NoGroup);
+  std::vector<uint32_t> owners(tables.getSectionCount(), NoGroup);
   if (tables.overlap) return checkOverlappingGroups(tables, groups, owners);
   tables.groups.reserve(groups.size());
   for (const uint32_t index : groups) {

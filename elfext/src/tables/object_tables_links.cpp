@@ -36,7 +36,7 @@ constexpr LinkRule ShndxRule         = {&ErrorHandler::shndxLinkOutOfRange,     
 bool checkLink(ObjectTables& tables, uint32_t index, const LinkRule& rule) {
   const uint32_t link = tables.sectionHeaders[index].link;
   if (link == 0 && rule.isZeroAllowed) return true;
-  const bool isInRange = link < tables.sectionCount();
+  const bool isInRange = link < tables.getSectionCount();
   const uint32_t type = isInRange ? tables.typeOf(link) : 0;
   if (isInRange && (type == rule.wantedType || type == rule.otherWantedType)) {
     tables.links[index] = LinkState::Whole;
@@ -44,7 +44,7 @@ bool checkLink(ObjectTables& tables, uint32_t index, const LinkRule& rule) {
   }
   const bool goesOn =
       isInRange ? goOn(tables.reporter, rule.ofWrongType, index, link, type)
-                : goOn(tables.reporter, rule.outOfRange, index, link, tables.lastSection());
+                : goOn(tables.reporter, rule.outOfRange, index, link, tables.getLastSection());
   tables.links[index] = LinkState::Broken;
   return goesOn && rule.isSkippable;
 }
@@ -52,10 +52,10 @@ bool checkLink(ObjectTables& tables, uint32_t index, const LinkRule& rule) {
 bool checkRelocationLinks(ObjectTables& tables, uint32_t index) {
   if (!checkLink(tables, index, RelocationRule)) return false;
   const uint32_t target = tables.sectionHeaders[index].info;
-  if (tables.isBroken(index) || target < tables.sectionCount()) return true;
+  if (tables.isBroken(index) || target < tables.getSectionCount()) return true;
   tables.links[index] = LinkState::WithoutTarget;
   return goOn(tables.reporter, &ErrorHandler::relocationTargetOutOfRange, index, target,
-              tables.lastSection());
+              tables.getLastSection());
 }
 
 bool checkGroupLinks(ObjectTables& tables, uint32_t index) {
@@ -106,21 +106,21 @@ bool checkLinkByType(ObjectTables& tables, uint32_t index) {
 bool checkPlainLink(ObjectTables& tables, uint32_t index) {
   const SectionHeader& header = tables.sectionHeaders[index];
   if (header.link == 0 || isLinkedByType(header.type)) return true;
-  if (header.link < tables.sectionCount()) {
+  if (header.link < tables.getSectionCount()) {
     tables.links[index] = LinkState::Whole;
     return true;
   }
   return stop(tables.reporter, &ErrorHandler::sectionLinkOutOfRange, index, header.link,
-              tables.lastSection());
+              tables.getLastSection());
 }
 
 } // namespace
 
 bool checkLinks(ObjectTables& tables) {
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!checkLinkByType(tables, i)) return false;
   }
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!checkPlainLink(tables, i)) return false;
   }
   return true;

@@ -30,13 +30,13 @@ DebugOverlayRow getOverlayRecord(const ObjectTables& tables, const uint8_t* row,
 
 bool checkOverlayRecord(ObjectTables& tables, uint32_t index, uint64_t number,
                         const DebugOverlayRow& record) {
-  if (record.debugSection >= tables.sectionCount())
+  if (record.debugSection >= tables.getSectionCount())
     return goOn(tables.reporter, &ErrorHandler::overlayOfNoSection, number, index,
                 record.debugSection);
   if (!isDebugSectionName(tables.nameOf(record.debugSection)))
     return goOn(tables.reporter, &ErrorHandler::overlayOfOtherSection, number, index,
                 record.debugSection);
-  if (record.section >= tables.sectionCount())
+  if (record.section >= tables.getSectionCount())
     return goOn(tables.reporter, &ErrorHandler::overlayOfNoSection, number, index, record.section);
   tables.debugOverlayRows.push_back(record);
   return true;
@@ -70,7 +70,7 @@ uint64_t roundUpToWord(uint64_t size) {
 // thousand.
 std::vector<uint32_t> findAllocatedSections(const ObjectTables& tables) {
   std::vector<uint32_t> sections;
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if ((tables.sectionHeaders[i].flags & SHF_ALLOC) != 0) sections.push_back(i);
   }
   return sections;
@@ -81,10 +81,10 @@ std::vector<uint32_t> findAllocatedSections(const ObjectTables& tables) {
 bool checkSegmentMap(ObjectTables& tables, uint32_t noteSection,
                      std::span<const uint32_t> allocated, const uint8_t* words, uint64_t count) {
   const auto sectionCount = static_cast<uint32_t>(allocated.size());
-  tables.notedSegments.resize(tables.sectionCount(), NoSegment);
+  tables.notedSegments.resize(tables.getSectionCount(), NoSegment);
   for (uint32_t i = 0; i < sectionCount; ++i) {
     const uint32_t segment = i < count ? tables.get<uint32_t>(words + uint64_t{i} * 4) : 0;
-    if (segment < tables.segmentCount())
+    if (segment < tables.getSegmentCount())
       tables.notedSegments[allocated[i]] = segment;
     else if (!goOn(tables.reporter, &ErrorHandler::segmentMapOutOfRange, noteSection, allocated[i],
                    segment))
@@ -121,7 +121,7 @@ bool checkNotes(ObjectTables& tables, uint32_t index, std::span<const uint32_t> 
 } // namespace
 
 bool checkDebugOverlays(ObjectTables& tables) {
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) == SHT_ZEV_DEBUGOVERLAY && !checkDebugOverlay(tables, i)) return false;
   }
   return true;
@@ -129,7 +129,7 @@ bool checkDebugOverlays(ObjectTables& tables) {
 
 bool checkSegmentMaps(ObjectTables& tables) {
   std::optional<std::vector<uint32_t>> allocated;
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) != SHT_NOTE || tables.sectionHeaders[i].size < SmallestNote) continue;
     if (!allocated) allocated = findAllocatedSections(tables);
     if (!checkNotes(tables, i, *allocated)) return false;

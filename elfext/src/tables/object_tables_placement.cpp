@@ -25,8 +25,9 @@ std::vector<Extent> getOccupiedExtents(const ObjectTables& tables) {
   }
   const FileHeader& header = tables.fileHeader;
   add(0, header.ehsize);
-  add(header.shoff, uint64_t{header.shentsize} * tables.sectionCount());
-  if (header.type != ET_REL) add(header.phoff, uint64_t{header.phentsize} * tables.segmentCount());
+  add(header.shoff, uint64_t{header.shentsize} * tables.getSectionCount());
+  if (header.type != ET_REL)
+    add(header.phoff, uint64_t{header.phentsize} * tables.getSegmentCount());
   return extents;
 }
 
@@ -34,7 +35,7 @@ std::vector<Extent> getOccupiedExtents(const ObjectTables& tables) {
 class GapFinder {
 public:
   GapFinder(ObjectTables& tables, std::span<const Extent> others) : m_Tables(tables) {
-    for (uint32_t i = 0; i < tables.segmentCount(); ++i) {
+    for (uint32_t i = 0; i < tables.getSegmentCount(); ++i) {
       const ProgramHeader& header = tables.programHeaders[i];
       if (header.filesz != 0) addEvents({header.offset, endOf(header.offset, header.filesz), i});
     }

@@ -108,7 +108,7 @@ bool checkOverlappingTable(ObjectTables& tables, const RelocationTable& table,
 
 bool checkRelocations(ObjectTables& tables) {
   std::optional<OverlappingTables> overlappingTables;
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!isRelocationTable(tables.typeOf(i)) || tables.isBroken(i)) continue;
     if (tables.sectionHeaders[i].size == 0) continue;
     RelocationTable table;

@@ -30,8 +30,8 @@ bool readSectionCount(ObjectTables& tables, uint64_t& count) {
 template <class Record>
 bool readTable(ObjectTables& tables, uint64_t offset, uint64_t count, uint32_t rowSize,
                std::vector<Record>& records) {
-  constexpr uint64_t mostRows = std::numeric_limits<uint32_t>::max();
-  const bool fits = count <= tables.image.getSize() / rowSize && count < mostRows;
+  constexpr uint64_t MostRows = std::numeric_limits<uint32_t>::max();
+  const bool fits = count <= tables.image.getSize() / rowSize && count < MostRows;
   if (!fits) return mapLowLevelResult(tables.reporter, LowLevelResult::OutsideImage);
   const uint8_t* bytes = tables.view(offset, count * rowSize);
   if (bytes == nullptr) return false;
@@ -62,7 +62,7 @@ bool checkTableShape(ObjectTables& tables, uint32_t index) {
 void findOverlap(ObjectTables& tables) {
   std::vector<Extent> extents;
   extents.reserve(tables.sectionHeaders.size());
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const SectionHeader& header = tables.sectionHeaders[i];
     const uint64_t end = endOf(header.offset, header.size);
     if (hasFileBytes(header) && end > header.offset) extents.push_back({header.offset, end, i});
@@ -73,14 +73,14 @@ void findOverlap(ObjectTables& tables) {
 // Leaves the list empty if there are no such segments, as in objects that are still to be linked.
 void findLoadSegments(ObjectTables& tables) {
   std::vector<Extent> loads;
-  for (uint32_t i = 0; i < tables.segmentCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSegmentCount(); ++i) {
     const ProgramHeader& header = tables.programHeaders[i];
     if (header.type == PT_LOAD)
       loads.push_back({header.offset, endOf(header.offset, header.filesz), i});
   }
   if (loads.empty()) return;
   std::vector<Extent> sections;
-  sections.reserve(tables.sectionCount());
+  sections.reserve(tables.getSectionCount());
   for (const SectionHeader& header : tables.sectionHeaders)
     sections.push_back({header.offset, endOf(header.offset, header.size), 0});
   tables.loadSegments = findFirstHolders(loads, sections);
@@ -137,9 +137,9 @@ bool findNameTable(ObjectTables& tables) {
   }
   tables.sectionNameTable = table;
   if (table == 0) return true;
-  if (table >= tables.sectionCount())
+  if (table >= tables.getSectionCount())
     return stop(tables.reporter, &ErrorHandler::sectionNameTableOutOfRange, table,
-                tables.lastSection());
+                tables.getLastSection());
   if (tables.typeOf(table) != SHT_STRTAB)
     return stop(tables.reporter, &ErrorHandler::sectionNameTableOfWrongType, table,
                 tables.typeOf(table));
@@ -149,9 +149,9 @@ bool findNameTable(ObjectTables& tables) {
 // False only if the handler does not want to go on with sections that will stay nameless.
 bool dropNames(ObjectTables& tables) {
   uint32_t index = 0;
-  while (index < tables.sectionCount() && tables.sectionHeaders[index].name == 0)
+  while (index < tables.getSectionCount() && tables.sectionHeaders[index].name == 0)
     ++index;
-  return index == tables.sectionCount() ||
+  return index == tables.getSectionCount() ||
          goOn(tables.reporter, &ErrorHandler::nameWithoutNameTable, index);
 }
 
@@ -181,7 +181,7 @@ bool checkProgramHeaders(ObjectTables& tables) {
 }
 
 bool checkTableShapes(ObjectTables& tables) {
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!checkTableShape(tables, i)) return false;
   }
   findOverlap(tables);
@@ -190,7 +190,7 @@ bool checkTableShapes(ObjectTables& tables) {
 
 bool checkContents(ObjectTables& tables) {
   findLoadSegments(tables);
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const SectionHeader& header = tables.sectionHeaders[i];
     if (hasFileBytes(header) && !checkSectionBytes(tables, i)) return false;
     if (header.type == SHT_STRTAB && !checkStringTable(tables, i)) return false;
@@ -207,7 +207,7 @@ bool checkSectionNames(ObjectTables& tables) {
     if (tables.sectionNames == nullptr) return false;
   }
   const uint64_t size = tables.stringSize(table);
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     SectionHeader& header = tables.sectionHeaders[i];
     if (header.name == 0 || header.name < size) continue;
     if (!goOn(tables.reporter, &ErrorHandler::sectionNameOutOfRange, i, header.name, size))

@@ -27,8 +27,8 @@ RowFault findFault(const ObjectTables& tables, const SymbolTable& table, uint32_
   if (row.shndx == SHN_XINDEX && table.indexes == nullptr) return RowFault::NoIndexes;
   const SymbolHome home = tables.homeOf(table, index, row);
   if (home.category != Symbol::Category_Hosted)
-    return row.type() == STT_SECTION ? RowFault::NotHosted : RowFault::None;
-  return home.section >= tables.sectionCount() ? RowFault::Section : RowFault::None;
+    return row.getType() == STT_SECTION ? RowFault::NotHosted : RowFault::None;
+  return home.section >= tables.getSectionCount() ? RowFault::Section : RowFault::None;
 }
 
 bool reportFault(const ObjectTables& tables, const SymbolTable& table, uint32_t index,
@@ -46,7 +46,7 @@ bool reportFault(const ObjectTables& tables, const SymbolTable& table, uint32_t 
     return stop(tables.reporter, &ErrorHandler::sectionSymbolNotHosted, place);
   case RowFault::Section:
     return stop(tables.reporter, &ErrorHandler::symbolSectionOutOfRange, place,
-                tables.homeOf(table, index, row).section, tables.lastSection());
+                tables.homeOf(table, index, row).section, tables.getLastSection());
   }
   return true;
 }
@@ -72,7 +72,7 @@ public:
         m_UsesIndex(image, symbolRowSize(tables.format.isWide),
                     [this](const uint8_t* bytes) { return getRow(bytes).shndx == SHN_XINDEX; }),
         m_IsBadIndex(image, 4, [this](const uint8_t* bytes) {
-          return m_Tables.get<uint32_t>(bytes) >= m_Tables.sectionCount();
+          return m_Tables.get<uint32_t>(bytes) >= m_Tables.getSectionCount();
         }) {}
   OverlappingTables(const OverlappingTables&) = delete;
   OverlappingTables& operator=(const OverlappingTables&) = delete;
@@ -101,8 +101,9 @@ private:
   [[nodiscard]] uint32_t suspicion(const uint8_t* bytes) const {
     const SymbolRow row = getRow(bytes);
     const bool isHosted = row.shndx == SHN_XINDEX || !isSpecialIndex(row.shndx);
-    if (!isSpecialIndex(row.shndx) && row.shndx >= m_Tables.sectionCount()) return AlwaysSuspicious;
-    return row.type() == STT_SECTION && !isHosted ? AlwaysSuspicious : row.name;
+    if (!isSpecialIndex(row.shndx) && row.shndx >= m_Tables.getSectionCount())
+      return AlwaysSuspicious;
+    return row.getType() == STT_SECTION && !isHosted ? AlwaysSuspicious : row.name;
   }
 
   const ObjectTables& m_Tables;
@@ -155,7 +156,7 @@ bool checkOverlappingTable(ObjectTables& tables, const SymbolTable& table,
 
 bool checkSymbols(ObjectTables& tables) {
   std::optional<OverlappingTables> overlappingTables;
-  for (uint32_t i = 0; i < tables.sectionCount(); ++i) {
+  for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!isSymbolTable(tables.typeOf(i)) || tables.isBroken(i)) continue;
     SymbolTable table;
     if (!openTable(tables, i, table)) return false;

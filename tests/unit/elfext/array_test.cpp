@@ -37,7 +37,7 @@ TYPED_TEST(ArrayTest, StartsEmptyWithRoomForOne) {
   EXPECT_EQ(this->m_Array.getSize(), 0u);
   EXPECT_TRUE(this->m_Array.isEmpty());
   EXPECT_EQ(this->m_Array.getCapacity(), 1u);
-  EXPECT_THAT(this->m_Array.span(), IsEmpty());
+  EXPECT_THAT(this->m_Array.getSpan(), IsEmpty());
 }
 
 TYPED_TEST(ArrayTest, GrowsByHalfAndOneWhenItIsFull) {
@@ -56,14 +56,14 @@ TYPED_TEST(ArrayTest, AppendsAnElementOfItsOwnWhileItGrows) {
   this->m_Array.append(5);
   for (int round = 0; round < 20; ++round)
     this->m_Array.append(this->m_Array[0]);
-  EXPECT_THAT(this->m_Array.span(), testing::Each(5));
+  EXPECT_THAT(this->m_Array.getSpan(), testing::Each(5));
 }
 
 TYPED_TEST(ArrayTest, AppendsManyAsIfOneByOne) {
   const std::vector<int> values{1, 2, 3, 4, 5};
   this->m_Array.append(0);
   this->m_Array.append(values.data(), 5);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(0, 1, 2, 3, 4, 5));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(0, 1, 2, 3, 4, 5));
   EXPECT_EQ(this->m_Array.getCapacity(), 7u);
 }
 
@@ -77,28 +77,28 @@ TYPED_TEST(ArrayTest, InsertsInFrontOfAnElement) {
   this->appendAll({1, 2, 3});
   this->m_Array.insert(0, 10);
   this->m_Array.insert(2, 20);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(10, 1, 20, 2, 3));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(10, 1, 20, 2, 3));
 }
 
 TYPED_TEST(ArrayTest, InsertsBehindTheLastElement) {
   this->m_Array.insert(0, 1);
   this->m_Array.insert(1, 2);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 2));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 2));
 }
 
 TYPED_TEST(ArrayTest, InsertsAnElementOfItsOwn) {
   this->appendAll({1, 2, 3, 4});
   this->m_Array.insert(0, this->m_Array[3]);
   this->m_Array.insert(1, this->m_Array[2]);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(4, 2, 1, 2, 3, 4));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(4, 2, 1, 2, 3, 4));
 }
 
 TYPED_TEST(ArrayTest, RemovesAndKeepsTheOrder) {
   this->appendAll({1, 2, 3, 4});
   this->m_Array.remove(1);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 3, 4));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 3, 4));
   this->m_Array.remove(2);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 3));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 3));
   this->m_Array.remove(0);
   this->m_Array.remove(0);
   EXPECT_TRUE(this->m_Array.isEmpty());
@@ -107,13 +107,13 @@ TYPED_TEST(ArrayTest, RemovesAndKeepsTheOrder) {
 TYPED_TEST(ArrayTest, RemovesTheFirstOfEqualValues) {
   this->appendAll({1, 2, 3, 2});
   this->m_Array.removeValue(2);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 3, 2));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 3, 2));
 }
 
 TYPED_TEST(ArrayTest, RemovesNothingForAnAbsentValue) {
   this->appendAll({1, 2});
   this->m_Array.removeValue(3);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 2));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 2));
 }
 
 TYPED_TEST(ArrayTest, FindsWhatItContains) {
@@ -128,9 +128,9 @@ TYPED_TEST(ArrayTest, FindsWhatItContains) {
 TYPED_TEST(ArrayTest, ExposesTheOldElementsWhenItShrinksAndGrowsInPlace) {
   this->appendAll({1, 2, 3});
   this->m_Array.setSize(1);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1));
   this->m_Array.setSize(3);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 2, 3));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 2, 3));
   EXPECT_EQ(this->m_Array.getCapacity(), 4u);
 }
 
@@ -161,24 +161,24 @@ TYPED_TEST(ArrayTest, BecomesTheCopyOfAnother) {
   TypeParam other = makeContainer<TypeParam>(this->m_Region);
   other.append(9);
   other.assign(this->m_Array);
-  EXPECT_THAT(other.span(), ElementsAre(1, 2, 3));
+  EXPECT_THAT(other.getSpan(), ElementsAre(1, 2, 3));
   other[0] = 7;
   EXPECT_EQ(this->m_Array[0], 1);
   this->m_Array.setSize(1);
   other.assign(this->m_Array);
-  EXPECT_THAT(other.span(), ElementsAre(1));
+  EXPECT_THAT(other.getSpan(), ElementsAre(1));
 }
 
 TYPED_TEST(ArrayTest, IsUnchangedByItself) {
   this->appendAll({1, 2, 3});
   this->m_Array.assign(this->m_Array);
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 2, 3));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 2, 3));
 }
 
 TYPED_TEST(ArrayTest, SortsInPlace) {
   this->appendAll({3, 1, 2, 5, 4});
   this->m_Array.sort([](int left, int right) { return left < right; });
-  EXPECT_THAT(this->m_Array.span(), ElementsAre(1, 2, 3, 4, 5));
+  EXPECT_THAT(this->m_Array.getSpan(), ElementsAre(1, 2, 3, 4, 5));
   EXPECT_EQ(this->m_Array.getCapacity(), 7u);
 }
 
@@ -186,7 +186,7 @@ TYPED_TEST(ArrayTest, IsReadThroughAConstant) {
   this->appendAll({1, 2});
   const TypeParam& array = this->m_Array;
   EXPECT_EQ(array[1], 2);
-  EXPECT_THAT(array.span(), ElementsAre(1, 2));
+  EXPECT_THAT(array.getSpan(), ElementsAre(1, 2));
   EXPECT_EQ(array.end() - array.begin(), 2);
 }
 
@@ -223,7 +223,7 @@ TYPED_TEST(ArrayTest, BehavesAsAPlainListUnderRandomEditing) {
     default:
       EXPECT_EQ(this->m_Array.contains(value), std::ranges::find(model, value) != model.end());
     }
-    ASSERT_THAT(this->m_Array.span(), ElementsAreArray(model));
+    ASSERT_THAT(this->m_Array.getSpan(), ElementsAreArray(model));
   }
 }
 

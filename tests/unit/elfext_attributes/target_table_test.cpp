@@ -164,7 +164,7 @@ TEST(TargetTable, TellsWhetherAnArchitectureHasAllOfASet) {
 }
 
 TEST(TargetTable, HasAFirstFloatingPointUnit) {
-  const TargetEntry& unit = firstFloatingPointUnit();
+  const TargetEntry& unit = getFirstFloatingPointUnit();
   EXPECT_EQ(unit.kind, TargetKind_FloatingPointUnit);
   EXPECT_NE((&unit - 1)->kind, TargetKind_FloatingPointUnit);
 }
