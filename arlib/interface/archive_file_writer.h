@@ -25,6 +25,6 @@ enum class NewFile {
 };
 
 // The same for an archive that must not replace anything.
-NewFile writeNewFile(const char* fileName, Archive& archive);
+[[nodiscard]] NewFile writeNewFile(const char* fileName, Archive& archive);
 
 } // namespace arlib

@@ -91,7 +91,7 @@ void putMemberHeader(std::span<uint8_t, MemberHeaderSize> bytes, std::string_vie
 // `result` is then what had been read so far.
 bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uint32_t& result);
 
-constexpr uint64_t roundUpToEven(uint64_t value) {
+[[nodiscard]] constexpr uint64_t roundUpToEven(uint64_t value) {
   return value + (value & 1);
 }
 
@@ -101,11 +101,11 @@ constexpr bool isLongName(std::string_view name) {
 }
 
 // Where the next header starts, for a header at `offset` whose contents have `size` bytes.
-constexpr uint64_t nextHeaderOffset(uint64_t offset, uint64_t size) {
+[[nodiscard]] constexpr uint64_t nextHeaderOffset(uint64_t offset, uint64_t size) {
   return roundUpToEven(offset + MemberHeaderSize + size);
 }
 
-constexpr uint32_t getBigEndian32(const uint8_t* bytes) {
+[[nodiscard]] constexpr uint32_t getBigEndian32(const uint8_t* bytes) {
   return uint32_t{bytes[0]} << 24 | uint32_t{bytes[1]} << 16 | uint32_t{bytes[2]} << 8 |
          uint32_t{bytes[3]};
 }

@@ -46,28 +46,28 @@ public:
 
   // The one rule that decides a member's type: an ELF image by the test of its bytes, or unknown.
   // The auxiliary types are set by the reader and by the rebuild of the tables alone.
-  static const ArchiveMemberType* decide(const ArchiveMember* archiveMember);
+  [[nodiscard]] static const ArchiveMemberType* decide(const ArchiveMember* archiveMember);
 
   // The same rule for a caller that has the first elfext::RecognizedBytes at hand.
-  static const ArchiveMemberType* decide(std::span<const uint8_t> firstBytes);
+  [[nodiscard]] static const ArchiveMemberType* decide(std::span<const uint8_t> firstBytes);
 };
 
 // Any file that the archive can't look into.
 class UnknownArchiveMemberType final : public ArchiveMemberType {
 public:
-  static const UnknownArchiveMemberType* getInstance();
+  [[nodiscard]] static const UnknownArchiveMemberType* getInstance();
   [[nodiscard]] bool isAuxiliaryType() const override { return false; }
 };
 
 class SymbolTableArchiveMemberType final : public ArchiveMemberType {
 public:
-  static const SymbolTableArchiveMemberType* getInstance();
+  [[nodiscard]] static const SymbolTableArchiveMemberType* getInstance();
   [[nodiscard]] bool isAuxiliaryType() const override { return true; }
 };
 
 class FileNameTableArchiveMemberType final : public ArchiveMemberType {
 public:
-  static const FileNameTableArchiveMemberType* getInstance();
+  [[nodiscard]] static const FileNameTableArchiveMemberType* getInstance();
   [[nodiscard]] bool isAuxiliaryType() const override { return true; }
 };
 
@@ -97,7 +97,7 @@ public:
 
 class ElfImageArchiveMemberType final : public ObjectModuleArchiveMemberType {
 public:
-  static const ElfImageArchiveMemberType* getInstance();
+  [[nodiscard]] static const ElfImageArchiveMemberType* getInstance();
   [[nodiscard]] bool isElfImage(const ArchiveMember* archiveMember) const override;
   bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                       std::string& reason) const override;

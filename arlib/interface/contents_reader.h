@@ -27,11 +27,11 @@ public:
   ContentsReader& operator=(const ContentsReader&) = delete;
 
   // Turns to a member. False after a report.
-  bool begin(const ArchiveMember& member);
+  [[nodiscard]] bool begin(const ArchiveMember& member);
 
   // The next piece; empty at the end of the member. It holds until the next call. False after a
   // report.
-  bool read(std::span<const uint8_t>& piece);
+  [[nodiscard]] bool read(std::span<const uint8_t>& piece);
 
   // Makes sure that the file of the members read so far was not written to meanwhile: what came of
   // them could be old in one place and new in another. `begin` does so where it turns to another

@@ -24,7 +24,7 @@ struct FileProbe {
   // tells why then.
   std::shared_ptr<support::SourceFile> file;
 
-  [[nodiscard]] std::span<const uint8_t> firstBytes() const {
+  [[nodiscard]] std::span<const uint8_t> getFirstBytes() const {
     return std::span(bytes).first(byteCount);
   }
   [[nodiscard]] bool exists() const { return status.kind != support::FileKind::Nothing; }
@@ -34,16 +34,16 @@ struct FileProbe {
 
   // Why the file can't become a member: 0, or the error number to report. It must be a regular
   // file, and the numbers that go in the header must not be negative as signed 32-bit values.
-  [[nodiscard]] support::HostError refusal() const;
+  [[nodiscard]] support::HostError getRefusal() const;
 };
 
 // Opens regular files only: looking at a device or a FIFO could have effects, or wait.
-FileProbe probeFile(support::SourceFiles& files, const char* fileName);
+[[nodiscard]] FileProbe probeFile(support::SourceFiles& files, const char* fileName);
 
 // The same without the first bytes.
-FileProbe openProbe(support::SourceFiles& files, const char* fileName);
+[[nodiscard]] FileProbe openProbe(support::SourceFiles& files, const char* fileName);
 
-// What may be said of a file's status alone, as FileProbe::refusal does.
-support::HostError refusalOf(const support::FileStatus& status);
+// What may be said of a file's status alone, as FileProbe::getRefusal does.
+[[nodiscard]] support::HostError refusalOf(const support::FileStatus& status);
 
 } // namespace arlib

@@ -11,12 +11,12 @@
 
 namespace arlib {
 
-constexpr unsigned char foldCase(char character) {
+[[nodiscard]] constexpr unsigned char foldCase(char character) {
   return static_cast<unsigned char>(support::lowered(character));
 }
 
 // Below, above or equal to 0.
-constexpr int compareIgnoringCase(std::string_view left, std::string_view right) {
+[[nodiscard]] constexpr int compareIgnoringCase(std::string_view left, std::string_view right) {
   const size_t common = std::min(left.size(), right.size());
   for (size_t i = 0; i < common; ++i) {
     const int difference = foldCase(left[i]) - foldCase(right[i]);

@@ -251,20 +251,20 @@ ArchiveMember* Archive::addMemberFromFile(const char* fileName) {
 ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe& probe) {
   QUARN_ASSERT(1, fileName != NULL);
   QUARN_ASSERT(1, !m_ReadOnly);
-  if (const int error = probe.refusal(); error != 0) {
+  if (const int error = probe.getRefusal(); error != 0) {
     fail(&ErrorHandler::reportReadError, fileName, error);
     return nullptr;
   }
   const std::string_view leaf = support::lastPathComponent(fileName);
   ArchiveMember* member = appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, 0,
                                            static_cast<uint32_t>(probe.status.size));
-  member->m_Type = ArchiveMemberType::decide(probe.firstBytes());
+  member->m_Type = ArchiveMemberType::decide(probe.getFirstBytes());
   return member;
 }
 
 bool Archive::openSource(const char* fileName, FileProbe& probe) {
   probe = openProbe(m_SourceFiles, fileName);
-  const int error = probe.refusal();
+  const int error = probe.getRefusal();
   return error == 0 || fail(&ErrorHandler::reportReadError, fileName, error);
 }
 

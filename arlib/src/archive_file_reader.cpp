@@ -312,14 +312,14 @@ bool ArchiveFileReader::readSymbolTable() {
   m_Archive.m_Symbols.setSize(0);
   m_Archive.noteEdit(Edit::ReadSymbols);
   if (m_Archive.m_SymbolTable == nullptr) return true;
-  auto table = std::make_unique<ReadSymbolTable>(symbolTableSource(), m_Archive.getMembers());
+  auto table = std::make_unique<ReadSymbolTable>(getSymbolTableSource(), m_Archive.getMembers());
   if (!table->check(m_Archive)) return false;
   m_Archive.m_ReadSymbolTable = std::move(table);
   // Bytes that have only passed by may be newer than the headers.
   return m_Archive.m_AreSymbolsWanted || checkUnchanged();
 }
 
-TableSource ArchiveFileReader::symbolTableSource() const {
+TableSource ArchiveFileReader::getSymbolTableSource() const {
   const ArchiveMember* table = m_Archive.m_SymbolTable;
   const uint64_t size = table->getSize();
   if (table->hasContents()) return {.text = asText(table->getContents()), .size = size};

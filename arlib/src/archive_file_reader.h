@@ -53,7 +53,7 @@ private:
   bool checkUnchanged();
 
   bool readSymbolTable();
-  [[nodiscard]] TableSource symbolTableSource() const;
+  [[nodiscard]] TableSource getSymbolTableSource() const;
 
   [[nodiscard]] std::string_view field(HeaderField which) const {
     return m_Header.substr(which.position, which.width);

@@ -208,12 +208,12 @@ bool ArchiveMember::setContentsFromFile(const char* fileName) {
 
 bool ArchiveMember::setContentsFromFile(const char* fileName, const FileProbe& probe) {
   QUARN_ASSERT(1, m_Type != NULL);
-  if (const int error = probe.refusal(); error != 0) {
+  if (const int error = probe.getRefusal(); error != 0) {
     return m_Archive->fail(&ErrorHandler::reportReadError, fileName, error);
   }
   takeFile(probe.file, 0, static_cast<uint32_t>(probe.status.size));
   m_Archive->noteEdit(Edit::NewFile);
-  m_Type = ArchiveMemberType::decide(probe.firstBytes());
+  m_Type = ArchiveMemberType::decide(probe.getFirstBytes());
   return true;
 }
 

@@ -22,23 +22,23 @@
 namespace arlib {
 
 const UnknownArchiveMemberType* UnknownArchiveMemberType::getInstance() {
-  static const UnknownArchiveMemberType instance;
-  return &instance;
+  static const UnknownArchiveMemberType Instance;
+  return &Instance;
 }
 
 const SymbolTableArchiveMemberType* SymbolTableArchiveMemberType::getInstance() {
-  static const SymbolTableArchiveMemberType instance;
-  return &instance;
+  static const SymbolTableArchiveMemberType Instance;
+  return &Instance;
 }
 
 const FileNameTableArchiveMemberType* FileNameTableArchiveMemberType::getInstance() {
-  static const FileNameTableArchiveMemberType instance;
-  return &instance;
+  static const FileNameTableArchiveMemberType Instance;
+  return &Instance;
 }
 
 const ElfImageArchiveMemberType* ElfImageArchiveMemberType::getInstance() {
-  static const ElfImageArchiveMemberType instance;
-  return &instance;
+  static const ElfImageArchiveMemberType Instance;
+  return &Instance;
 }
 
 const ArchiveMemberType* ArchiveMemberType::decide(const ArchiveMember* archiveMember) {

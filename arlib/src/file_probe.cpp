@@ -16,7 +16,7 @@ bool FileProbe::hasArchiveMagic() const {
          std::equal(ArchiveMagic.begin(), ArchiveMagic.end(), bytes.begin());
 }
 
-support::HostError FileProbe::refusal() const {
+support::HostError FileProbe::getRefusal() const {
   return statusError != 0 ? statusError : refusalOf(status);
 }
 
@@ -46,7 +46,7 @@ FileProbe openProbe(support::SourceFiles& files, const char* fileName) {
 
 FileProbe probeFile(support::SourceFiles& files, const char* fileName) {
   FileProbe probe = openProbe(files, fileName);
-  if (probe.refusal() != 0) return probe;
+  if (probe.getRefusal() != 0) return probe;
   size_t done = 0;
   if (probe.file->readAt(probe.bytes, 0, done) == 0) probe.byteCount = static_cast<uint32_t>(done);
   return probe;

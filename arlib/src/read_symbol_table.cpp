@@ -27,7 +27,7 @@ ReadSymbolTable::ReadSymbolTable(const TableSource& source, std::span<ArchiveMem
 
 bool ReadSymbolTable::check(const Archive& archive) {
   if (!checkCount(archive)) return false;
-  TableCursor names(m_Source, namesStart());
+  TableCursor names(m_Source, getNamesStart());
   if (!checkEntries(archive, names)) return false;
   // A member's type may change later, and the tables have no symbols.
   for (ArchiveMember*& member : m_Members) {
@@ -45,7 +45,7 @@ bool ReadSymbolTable::checkCount(const Archive& archive) {
   const std::optional<uint32_t> count = cursor.takeWord();
   if (!count) return failToRead(archive, cursor);
   m_Count = *count;
-  const uint64_t required = namesStart();
+  const uint64_t required = getNamesStart();
   if (size >= required) return true;
   return archive.end(&ErrorHandler::reportSymbolTableCountTooLarge, size, m_Count, required);
 }

@@ -37,7 +37,7 @@ public:
   [[nodiscard]] bool forEachSymbol(Add add, support::HostError& error) {
     std::sort(m_Forgotten.begin(), m_Forgotten.end(), std::less<>());
     TableCursor offsets(m_Source, CountSize);
-    TableCursor names(m_Source, namesStart());
+    TableCursor names(m_Source, getNamesStart());
     for (uint32_t i = 0; i < m_Count; ++i) {
       const std::optional<std::string_view> name = names.takeName();
       const std::optional<uint32_t> offset = offsets.takeWord();
@@ -59,7 +59,7 @@ private:
   [[nodiscard]] static bool checkRest(const Archive& archive, TableCursor& names);
 
   static constexpr uint64_t CountSize = 4;
-  [[nodiscard]] uint64_t namesStart() const { return CountSize + 4 * uint64_t{m_Count}; }
+  [[nodiscard]] uint64_t getNamesStart() const { return CountSize + 4 * uint64_t{m_Count}; }
   // The member whose header stands there, or null.
   [[nodiscard]] ArchiveMember* memberAt(uint32_t offset);
   [[nodiscard]] bool isLeft(const ArchiveMember* member) const;

@@ -32,11 +32,11 @@ TEST(FileProbeTest, TakesTheFirstBytesOfRegularFilesOnly) {
   host.addFile("file", std::string(100, 'x'));
   host.addFile("locked", "secret").isUnreadable = true;
   host.addSpecial("fifo").bytes = "never looked at";
-  EXPECT_EQ(probe(host, "file").firstBytes().size(), elfext::RecognizedBytes);
+  EXPECT_EQ(probe(host, "file").getFirstBytes().size(), elfext::RecognizedBytes);
   EXPECT_TRUE(probe(host, "file").exists());
-  EXPECT_EQ(probe(host, "locked").firstBytes().size(), 0u);
-  EXPECT_EQ(probe(host, "locked").refusal(), 0);
-  EXPECT_EQ(probe(host, "fifo").firstBytes().size(), 0u);
+  EXPECT_EQ(probe(host, "locked").getFirstBytes().size(), 0u);
+  EXPECT_EQ(probe(host, "locked").getRefusal(), 0);
+  EXPECT_EQ(probe(host, "fifo").getFirstBytes().size(), 0u);
   EXPECT_FALSE(probe(host, "gone").exists());
   EXPECT_EQ(host.openHandles(), 0u);
 }
@@ -48,12 +48,12 @@ TEST(FileProbeTest, SaysWhyAFileCannotBeTaken) {
   host.addDirectory("dir");
   host.addSpecial("fifo");
   host.addFile("untold", "x").mode = 0;
-  EXPECT_EQ(probe(host, "file").refusal(), 0);
-  EXPECT_EQ(probe(host, "untold").refusal(), EINVAL);
-  EXPECT_EQ(probe(host, "big").refusal(), EOVERFLOW);
-  EXPECT_EQ(probe(host, "dir").refusal(), EISDIR);
-  EXPECT_EQ(probe(host, "fifo").refusal(), EINVAL);
-  EXPECT_EQ(probe(host, "gone").refusal(), ENOENT);
+  EXPECT_EQ(probe(host, "file").getRefusal(), 0);
+  EXPECT_EQ(probe(host, "untold").getRefusal(), EINVAL);
+  EXPECT_EQ(probe(host, "big").getRefusal(), EOVERFLOW);
+  EXPECT_EQ(probe(host, "dir").getRefusal(), EISDIR);
+  EXPECT_EQ(probe(host, "fifo").getRefusal(), EINVAL);
+  EXPECT_EQ(probe(host, "gone").getRefusal(), ENOENT);
 }
 
 // What is read of it later is read of the file that was looked at.
