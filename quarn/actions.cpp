@@ -20,7 +20,7 @@ bool wantsArchive(Action action) {
 void doAction(Run& run) {
   const Action action = run.settings.action;
   if (run.openStatus.missing && wantsArchive(action)) {
-    reportMessage(messages::ErrorWord, messages::ArchiveNotFound, run.archiveName(),
+    reportMessage(messages::ErrorWord, messages::ArchiveNotFound, run.getArchiveName(),
                   hostErrorText(run.openStatus.errorNumber));
     return;
   }

@@ -74,15 +74,15 @@ RunEnd writeArchive(Run& run) {
   const bool isNew = run.openStatus.missing;
   if (run.settings.accessMode != Access_Write && !isNew) return RunEnd::Done;
   if (isNew && run.settings.warnOnCreate) {
-    reportMessage(messages::RemarkWord, messages::CreatingArchive, run.archiveName());
+    reportMessage(messages::RemarkWord, messages::CreatingArchive, run.getArchiveName());
   }
   run.archive.updateAuxiliaryMembers();
   if (hasErrors()) return RunEnd::Done;
   if (!isNew || run.openStatus.errorNumber == 0) {
-    arlib::writeFile(run.archiveName(), run.archive);
+    arlib::writeFile(run.getArchiveName(), run.archive);
     return RunEnd::Done;
   }
-  const arlib::NewFile newFile = arlib::writeNewFile(run.archiveName(), run.archive);
+  const arlib::NewFile newFile = arlib::writeNewFile(run.getArchiveName(), run.archive);
   return newFile == arlib::NewFile::Exists ? RunEnd::Overtaken : RunEnd::Done;
 }
 

@@ -26,7 +26,8 @@ void deleteMembers(Run& run) {
       verboseMessage(run.settings, messages::DeletedMember, (*member)->getName());
     }
     if (doomed.size() == before) {
-      reportMessage(messages::WarningWord, messages::NotPresentInArchive, word, run.archiveName());
+      reportMessage(messages::WarningWord, messages::NotPresentInArchive, word,
+                    run.getArchiveName());
     }
   }
   if (!doomed.empty()) run.archive.removeMembers(doomed);

@@ -148,7 +148,7 @@ void Insertion::normalise(ArchiveMember& member) const {
 void Insertion::warnIfNotElf(const ArchiveMember& member) {
   if (m_NonElfWarned || member.getType() == arlib::ElfImageArchiveMemberType::getInstance()) return;
   reportMessage(messages::WarningWord, messages::AddingNonElfObject, member.getName(),
-                m_Run.archiveName());
+                m_Run.getArchiveName());
   m_NonElfWarned = true;
 }
 

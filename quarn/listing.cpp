@@ -63,7 +63,7 @@ void listMembers(Run& run) {
 void listSymbolTable(Run& run) {
   run.archive.updateAuxiliaryMembers();
   if (run.archive.getSymbolTable() == nullptr) {
-    reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.archiveName());
+    reportMessage(messages::RemarkWord, messages::NoSymbolTable, run.getArchiveName());
     return;
   }
   elfext::AttributeTextCache<std::string> attributes(reprinted);

@@ -8,7 +8,7 @@ namespace quarn {
 std::string_view LocalDates::textOf(int64_t date) {
   const auto [text, isNew] = m_Texts.try_emplace(date);
   if (isNew) text->second = computeText(date);
-  return text->second.view();
+  return text->second.getText();
 }
 
 LocalDates::Text LocalDates::computeText(int64_t date) {

@@ -16,7 +16,7 @@ class LocalDates {
 public:
   // `date` is in seconds since 1970. Empty where the host can't break the date down, or where the
   // text needs more room than there is. Good for as long as this object.
-  std::string_view textOf(int64_t date);
+  [[nodiscard]] std::string_view textOf(int64_t date);
 
 private:
   static constexpr size_t TextSize = 18; // bytes, the NUL included
@@ -25,9 +25,9 @@ private:
     std::array<char, TextSize> bytes;
     size_t length = 0;
 
-    [[nodiscard]] std::string_view view() const { return {bytes.data(), length}; }
+    [[nodiscard]] std::string_view getText() const { return {bytes.data(), length}; }
   };
-  static Text computeText(int64_t date);
+  [[nodiscard]] static Text computeText(int64_t date);
 
   // By the second, as the offset from universal time may change with any. Dates come from the
   // archive: in a hash table they could be made to lie in one chain.

@@ -14,7 +14,7 @@ namespace quarn {
 
 // Whether a member's name matches a word. Both are cut to what stands behind their last "/" or
 // "\"; "*" and "?" are wildcards, and letter case doesn't count.
-bool memberMatches(const arlib::ArchiveMember& member, std::string_view word);
+[[nodiscard]] bool memberMatches(const arlib::ArchiveMember& member, std::string_view word);
 
 // Finds the members that words mean, in archive order and without the tables. The archive's list
 // must not change while a selection is in use. A word without wildcards is looked up, and not

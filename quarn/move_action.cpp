@@ -29,7 +29,7 @@ public:
     const auto members = run.archive.getMembers();
     m_Position = run.position < 0 ? members.size() : static_cast<size_t>(run.position);
     for (size_t i = 0; i < members.size(); ++i) {
-      m_Places[members[i]] = {i < m_Position ? Part_Front : Part_Back, i};
+      m_Places[members[i]] = {i < m_Position ? Part::Front : Part::Back, i};
     }
   }
 
@@ -38,7 +38,7 @@ public:
   void reorder();
 
 private:
-  enum Part { Part_Front, Part_Moved, Part_Back };
+  enum class Part { Front, Moved, Back };
   using Place = std::pair<Part, size_t>; // then the old index, or the number of the move
 
   Run& m_Run;
@@ -56,7 +56,7 @@ ArchiveMember* Movement::move(const std::string& word) {
                          return m_Places.at(left) < m_Places.at(right);
                        });
   if (first == members.end()) return nullptr;
-  m_Places[*first] = {Part_Moved, m_Moves++};
+  m_Places[*first] = {Part::Moved, m_Moves++};
   return *first;
 }
 
@@ -65,8 +65,8 @@ void Movement::reorder() {
   size_t inFront = 0;
   for (ArchiveMember* member : m_Run.archive.getMembers()) {
     const auto [part, number] = m_Places.at(member);
-    if (part == Part_Moved) moved.emplace_back(number, member);
-    if (part == Part_Front) ++inFront;
+    if (part == Part::Moved) moved.emplace_back(number, member);
+    if (part == Part::Front) ++inFront;
   }
   std::sort(moved.begin(), moved.end());
   std::vector<ArchiveMember*> block;
@@ -82,7 +82,7 @@ void moveMembers(Run& run) {
   for (const std::string& word : run.settings.fileList) {
     const ArchiveMember* member = movement.move(word);
     if (member == nullptr) {
-      reportMessage(messages::ErrorWord, messages::NotPresentInArchive, word, run.archiveName());
+      reportMessage(messages::ErrorWord, messages::NotPresentInArchive, word, run.getArchiveName());
       continue;
     }
     verboseMessage(run.settings, messages::MovedMember, member->getName());

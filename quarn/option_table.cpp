@@ -85,13 +85,13 @@ struct RowName {
     for (size_t i = 0; i < Size; ++i)
       characters[i] = text[i];
   }
-  [[nodiscard]] constexpr std::string_view view() const { return {characters, Size - 1}; }
+  [[nodiscard]] constexpr std::string_view getText() const { return {characters, Size - 1}; }
   char characters[Size] = {};
 };
 
 // The rows that set one option, the one to be shown first in front.
 template <RowName... Names>
-constexpr auto RowsNamed = rowsNamed(Rows, Names.view()...);
+constexpr auto RowsNamed = rowsNamed(Rows, Names.getText()...);
 
 template <RowName... Names>
 constexpr ValueDefinition flagOption() {
@@ -156,13 +156,13 @@ static_assert(listEveryRow(Definitions, Rows));
 
 } // namespace
 
-const OptionTable& optionTable() {
-  static constexpr OptionTable table = {
+const OptionTable& getOptionTable() {
+  static constexpr OptionTable Table = {
       Rows, indexByFirstLetter(Rows), Policy_Warn, Policy_Accept, 0xFFFFFFFF, nullptr};
-  return table;
+  return Table;
 }
 
-std::span<const ValueDefinition> optionDefinitions() {
+std::span<const ValueDefinition> getOptionDefinitions() {
   return Definitions;
 }
 

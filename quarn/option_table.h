@@ -56,8 +56,8 @@ enum OptionId : uint32_t {
   OptionCount,
 };
 
-const tabledrivenparser::OptionTable& optionTable();
-std::span<const tabledrivenparser::ValueDefinition> optionDefinitions();
+[[nodiscard]] const tabledrivenparser::OptionTable& getOptionTable();
+[[nodiscard]] std::span<const tabledrivenparser::ValueDefinition> getOptionDefinitions();
 
 using OptionValues = std::array<tabledrivenparser::ValueRecord, OptionCount>;
 

@@ -89,7 +89,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
   OptionReporter reporter;
   tabledrivenparser::StdioViaFileReader viaFiles;
   OptionValues values;
-  Parser parser({optionTable(), optionDefinitions(), values}, &listener, reporter, viaFiles,
+  Parser parser({getOptionTable(), getOptionDefinitions(), values}, &listener, reporter, viaFiles,
                 memory);
   Settings settings;
   readWords(parser, argc, argv);

@@ -23,7 +23,7 @@ bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&...
 }
 
 // The host's text for an error number. 0 stands for a file that ended too early.
-std::string hostErrorText(int errorNumber);
+[[nodiscard]] std::string hostErrorText(int errorNumber);
 
 // Hands over what stdout has held back. False after a report: what it could not take must not look
 // like success to whoever reads the status only.

@@ -27,7 +27,7 @@ struct Run {
   int32_t position = PositionAtEnd;
   bool isCancelled = false; // there is nothing to do: nothing is written
 
-  [[nodiscard]] const char* archiveName() const { return archive.getFileName(); }
+  [[nodiscard]] const char* getArchiveName() const { return archive.getFileName(); }
 };
 
 // Prints a line like "a - %s" on stdout, where -v asks for it.

@@ -52,7 +52,7 @@ void parse(const std::vector<std::string>& words, std::string_view file, size_t 
   SilentReporter reporter;
   OneFile files(file, pieceSize);
   quarn::OptionValues values;
-  Parser parser({quarn::optionTable(), quarn::optionDefinitions(), values}, nullptr, reporter,
+  Parser parser({quarn::getOptionTable(), quarn::getOptionDefinitions(), values}, nullptr, reporter,
                 files, *region);
   for (size_t i = 0; i < words.size();) {
     i += parser.parseWord(words[i].c_str(), i + 1 < words.size() ? words[i + 1].c_str() : nullptr);

@@ -282,7 +282,7 @@ const Names UnmentionedOptions = {
 TEST(SourceTree, TheHelpMentionsEachOptionOrLeavesItOutDeliberately) {
   const std::string help = std::string(messages::getMessageText(messages::HelpEditOptions)) +
                            std::string(messages::getMessageText(messages::HelpOtherOptions));
-  for (const tabledrivenparser::MatchString& row : quarn::optionTable().rows) {
+  for (const tabledrivenparser::MatchString& row : quarn::getOptionTable().rows) {
     const std::string name(row.name);
     const std::string shown = "\n" + std::string(row.hasLongName() ? "--" : " -") + name + " ";
     const bool isMentioned = help.find(shown) != std::string::npos;
