@@ -161,7 +161,7 @@ struct ValueRecord {
 }
 
 // The list of rows that a definition wants, from their names:
-//   constexpr auto versionRows = rowsNamed(rows, "vsn", "version", "V");
+//   constexpr auto VersionRows = rowsNamed(Rows, "vsn", "version", "V");
 template <class... Names>
 [[nodiscard]] constexpr std::array<const MatchString*, sizeof...(Names) + 1>
 rowsNamed(std::span<const MatchString> rows, Names... names) {

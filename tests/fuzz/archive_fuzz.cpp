@@ -47,8 +47,8 @@ void readAndWrite(support::Host& host, arlib::ErrorHandler* handler) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool isInitialised = (alloclib::initialise(), true);
-  if (!isInitialised) return 0;
+  static const bool IsInitialised = (alloclib::initialise(), true);
+  if (!IsInitialised) return 0;
   LenientHandler lenient;
   for (arlib::ErrorHandler* handler :
        {static_cast<arlib::ErrorHandler*>(&lenient), static_cast<arlib::ErrorHandler*>(nullptr)}) {

@@ -81,8 +81,8 @@ void lookUp(std::string_view name, const LibraryAttributeMap& map) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool isInitialised = (alloclib::initialise(), true);
-  if (!isInitialised) return 0;
+  static const bool IsInitialised = (alloclib::initialise(), true);
+  if (!IsInitialised) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const LibraryAttributeMap map = readMap(text);
   const std::vector<std::string_view> lines = linesOf(text);

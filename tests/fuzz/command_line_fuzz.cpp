@@ -64,8 +64,8 @@ void parse(const std::vector<std::string>& words, std::string_view file, size_t 
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool isInitialised = (alloclib::initialise(), true);
-  if (!isInitialised || size == 0) return 0;
+  static const bool IsInitialised = (alloclib::initialise(), true);
+  if (!IsInitialised || size == 0) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   parse(linesOf(text), text, size_t{data[0]} + 1);
   parse({"--via", "itself"}, text, size_t{data[0]} + 1);

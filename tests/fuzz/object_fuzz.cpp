@@ -101,8 +101,8 @@ void compareRoads(std::span<const uint8_t> bytes) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool isInitialised = (alloclib::initialise(), true);
-  if (!isInitialised || size == 0) return 0;
+  static const bool IsInitialised = (alloclib::initialise(), true);
+  if (!IsInitialised || size == 0) return 0;
   ElfextErrorStringCapture refusing;
   AcceptingHandler accepting;
   for (ErrorHandler* handler :

@@ -118,8 +118,8 @@ bool isPrefix(const std::vector<std::string>& front, const std::vector<std::stri
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool isInitialised = (alloclib::initialise(), true);
-  if (!isInitialised || size == 0) return 0;
+  static const bool IsInitialised = (alloclib::initialise(), true);
+  if (!IsInitialised || size == 0) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const Reading reading = readFile(text, ViaFile::BufferSize);
   expect(readFile(text, size_t{data[0]} + 1) == reading);

@@ -221,7 +221,7 @@ private:
     for (size_t i = 0; i < parsed.size(); ++i)
       EXPECT_EQ(parsed[i].offset, m_Archive->getMembers()[i]->getOffset());
     // Input files and temporaries are wanted no longer.
-    for (const std::string& file : m_Host.names()) {
+    for (const std::string& file : m_Host.getNames()) {
       if (file != "lib.a") {
         EXPECT_EQ(m_Host.remove(file.c_str()), 0);
       }

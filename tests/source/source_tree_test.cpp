@@ -87,10 +87,10 @@ std::vector<fs::path> sourcesOf(const std::string& room) {
 }
 
 std::vector<std::string> includesOf(const fs::path& file) {
-  static const std::regex line("#include \"([^\"]+)\"");
+  static const std::regex Line("#include \"([^\"]+)\"");
   const std::string text = contentsOf(file);
   std::vector<std::string> names;
-  for (std::sregex_iterator match(text.begin(), text.end(), line), end; match != end; ++match) {
+  for (std::sregex_iterator match(text.begin(), text.end(), Line), end; match != end; ++match) {
     names.push_back((*match)[1]);
   }
   return names;
@@ -138,12 +138,12 @@ std::map<std::string, std::string> roomsOfInterfaces() {
 
 // The room that a path from the root leads into: none outside of elfext.
 std::string elfextRoomOf(const fs::path& file) {
-  static const std::map<std::string, std::string> interfaces = roomsOfInterfaces();
+  static const std::map<std::string, std::string> Interfaces = roomsOfInterfaces();
   const std::string name = file.string();
   if (name.starts_with("elfext/src/")) return roomOfSource(fs::relative(file, "elfext/src"));
   if (!name.starts_with("elfext/interface/")) return "";
-  const auto found = interfaces.find(file.stem().string());
-  return found == interfaces.end() ? "" : found->second;
+  const auto found = Interfaces.find(file.stem().string());
+  return found == Interfaces.end() ? "" : found->second;
 }
 
 // Who includes a public header of no room includes what that one does.
@@ -228,6 +228,19 @@ TEST(SourceTree, EveryHeaderIsIncludedOnce) {
     for (const fs::path& file : sourcesOf(room)) {
       if (file.extension() != ".h") continue;
       EXPECT_NE(contentsOf(file).find("\n#pragma once\n"), std::string::npos) << file;
+    }
+  }
+}
+
+// What follows the suite is a sentence about it.
+TEST(SourceTree, TestsAreNamedInCamelCase) {
+  const std::regex test("\\n(?:TYPED_)?TEST(?:_F|_P)?\\((\\w+),\\s*(\\w+)\\)");
+  const std::regex camelCase("(?:[A-Z][a-z0-9]*)+");
+  for (const fs::path& file : sourcesOf("tests")) {
+    const std::string text = contentsOf(file);
+    for (std::sregex_iterator match(text.begin(), text.end(), test), end; match != end; ++match) {
+      EXPECT_TRUE(std::regex_match((*match)[1].str(), camelCase)) << file << ": " << (*match)[1];
+      EXPECT_TRUE(std::regex_match((*match)[2].str(), camelCase)) << file << ": " << (*match)[2];
     }
   }
 }

@@ -42,11 +42,11 @@ public:
     m_Disturbance = std::move(disturbance);
   }
 
-  [[nodiscard]] uint64_t callCount() const { return m_Calls; }
+  [[nodiscard]] uint64_t getCallCount() const { return m_Calls; }
   // Which operation failed, as "rename"; empty if none did.
-  [[nodiscard]] const std::string& failedOperation() const { return m_FailedOperation; }
+  [[nodiscard]] const std::string& getFailedOperation() const { return m_FailedOperation; }
   // The file that it was asked for.
-  [[nodiscard]] const std::string& failedName() const { return m_FailedName; }
+  [[nodiscard]] const std::string& getFailedName() const { return m_FailedName; }
 
   support::HostError openForReading(const char* name, support::FileHandle& file) override;
   support::HostError openForUpdate(const char* name, support::FileHandle& file) override;

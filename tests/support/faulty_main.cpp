@@ -13,7 +13,7 @@
 
 namespace {
 
-testsupport::FaultyHost& faultyHost() {
+testsupport::FaultyHost& getFaultyHost() {
   static testsupport::FaultyHost host(support::getPosixHost());
   return host;
 }
@@ -28,7 +28,7 @@ void writeCallCount() {
   if (name == nullptr) return;
   std::FILE* file = std::fopen(name, "w");
   if (file == nullptr) return;
-  std::fprintf(file, "%llu\n", static_cast<unsigned long long>(faultyHost().callCount()));
+  std::fprintf(file, "%llu\n", static_cast<unsigned long long>(getFaultyHost().getCallCount()));
   std::fclose(file);
 }
 
@@ -39,9 +39,9 @@ int main(int argc, char** argv) {
   const unsigned long call = numberFrom("QUARN_FAIL_CALL");
   const auto signal = static_cast<int>(numberFrom("QUARN_FAIL_SIGNAL"));
   if (signal != 0)
-    faultyHost().raiseAtCall(call, signal);
+    getFaultyHost().raiseAtCall(call, signal);
   else
-    faultyHost().failCall(call, static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
+    getFaultyHost().failCall(call, static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
   std::atexit(writeCallCount);
-  quarn::startUp(argc, argv, faultyHost());
+  quarn::startUp(argc, argv, getFaultyHost());
 }

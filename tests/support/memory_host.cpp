@@ -52,7 +52,7 @@ MemoryHost::File& MemoryHost::at(std::string_view name) const {
   return *m_Files.find(name)->second;
 }
 
-std::vector<std::string> MemoryHost::names() const {
+std::vector<std::string> MemoryHost::getNames() const {
   std::vector<std::string> all;
   for (const auto& entry : m_Files)
     all.push_back(entry.first);

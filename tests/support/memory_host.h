@@ -51,7 +51,7 @@ public:
   [[nodiscard]] File& at(std::string_view name) const;
   [[nodiscard]] std::string read(std::string_view name) const { return at(name).bytes; }
   // All names, sorted.
-  [[nodiscard]] std::vector<std::string> names() const;
+  [[nodiscard]] std::vector<std::string> getNames() const;
 
   // From now on the disk takes so many bytes and then fails with ENOSPC. What fits is written.
   void setRoom(uint64_t bytes) { m_Room = bytes; }
@@ -64,7 +64,7 @@ public:
   // Handles that were opened and not closed.
   [[nodiscard]] size_t openHandles() const;
   // So many bytes have been asked for by readAt, and so many calls were made to it.
-  [[nodiscard]] uint64_t bytesRead() const { return m_BytesRead; }
+  [[nodiscard]] uint64_t getBytesRead() const { return m_BytesRead; }
   [[nodiscard]] uint64_t readCalls() const { return m_ReadCalls; }
 
   support::HostError openForReading(const char* name, support::FileHandle& file) override;

@@ -57,7 +57,7 @@ void readWriteAndReadAgain(const std::string& bytes, Answer answer, SymbolTableM
   ASSERT_TRUE(writeFile("lib.a", archive));
   EXPECT_TRUE(handler.reports.empty());
   EXPECT_EQ(host.openHandles(), 0u);
-  EXPECT_EQ(host.names(), (std::vector<std::string>{"lib.a", "new.o"}));
+  EXPECT_EQ(host.getNames(), (std::vector<std::string>{"lib.a", "new.o"}));
   if (beginsWithoutAName(archive)) return;
   Archive again(host);
   again.setErrorHandler(&handler);

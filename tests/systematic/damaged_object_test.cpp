@@ -187,7 +187,7 @@ std::vector<Member> damagedForms(const std::string& good) {
 
 // All that may be said of an object, with N for numbers and without the names of section types.
 const Names& knownReports() {
-  static const Names reports = {
+  static const Names Reports = {
       "I/O error writing file 'MEMBER': Unknown error -N",
       "Section header table is empty",
       "ELF header refers to section-name string table section #N but the last section is #N",
@@ -258,7 +258,7 @@ const Names& knownReports() {
       "Section/segment mapping in SHT_NOTE section #N maps section #N to segment #N which does not "
       "exist",
   };
-  return reports;
+  return Reports;
 }
 
 void replace(std::string& text, const std::string& from, const std::string& to) {

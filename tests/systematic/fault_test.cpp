@@ -96,10 +96,10 @@ std::string wantedBytes(const Edit& edit) {
 // one has taken its place, and the look at an input file that tells objects from others (a file
 // that can't be looked at is none).
 bool isTolerated(const FaultyHost& host) {
-  const std::string& operation = host.failedOperation();
+  const std::string& operation = host.getFailedOperation();
   if (operation == "setPermissions" || operation == "status") return true;
-  if (host.failedName() == "lib.a") return operation == "close";
-  return host.failedName() == "new.o" &&
+  if (host.getFailedName() == "lib.a") return operation == "close";
+  return host.getFailedName() == "new.o" &&
          (operation == "openForReading" || operation == "readAt" || operation == "statusOf");
 }
 
@@ -120,14 +120,14 @@ void failEachCall(const NamedEdit& each, int error) {
     RecordingHandler handler;
     host.failCall(call, error);
     const bool isDone = run(host, handler, each.edit);
-    const std::string& operation = host.failedOperation();
+    const std::string& operation = host.getFailedOperation();
     SCOPED_TRACE(std::string(each.name) + ", call " + std::to_string(call) + " " + operation);
     EXPECT_EQ(disk.read("lib.a"), isDone ? wanted : old);
-    EXPECT_THAT(disk.names(), testing::ElementsAre("lib.a", "new.o"));
+    EXPECT_THAT(disk.getNames(), testing::ElementsAre("lib.a", "new.o"));
     EXPECT_EQ(disk.openHandles(), 0u);
     EXPECT_EQ(isDone, isHarmless(handler.reports));
     if (isDone && !operation.empty()) {
-      EXPECT_TRUE(isTolerated(host) || operation == "isWritable") << host.failedName();
+      EXPECT_TRUE(isTolerated(host) || operation == "isWritable") << host.getFailedName();
     }
     // The reason is in the report, unless the access test failed, which gives none.
     if (!isDone && operation != "isWritable") {
@@ -157,8 +157,8 @@ TEST(FailingHost, LooksForAnotherNameWhereATemporaryIsInTheWay) {
     fillDisk(disk);
     host.failCall(++call, EEXIST);
     run(host, handler, Edits.front().edit);
-    ASSERT_NE(host.failedOperation(), "") << "no temporary is made";
-  } while (host.failedOperation() != "createTemporary");
+    ASSERT_NE(host.getFailedOperation(), "") << "no temporary is made";
+  } while (host.getFailedOperation() != "createTemporary");
   EXPECT_EQ(disk.read("lib.a"), wantedBytes(Edits.front().edit));
 }
 
@@ -178,7 +178,7 @@ TEST(FullDisk, KeepsTheOldArchive) {
           handler.reports,
           testing::ElementsAre("0 I/O error writing file 'lib.a.0': No space left on device"));
       EXPECT_EQ(disk.read("lib.a"), old);
-      EXPECT_THAT(disk.names(), testing::ElementsAre("lib.a", "new.o"));
+      EXPECT_THAT(disk.getNames(), testing::ElementsAre("lib.a", "new.o"));
     }
     MemoryHost disk;
     fillDisk(disk);
@@ -214,7 +214,7 @@ TEST(FailingHost, NeverGivesWrongContents) {
     if (!isComplete) {
       EXPECT_EQ(handler.reports.size(), 1u) << call;
     }
-    if (host.failedOperation().empty()) break;
+    if (host.getFailedOperation().empty()) break;
   }
   EXPECT_EQ(disk.openHandles(), 0u);
 }

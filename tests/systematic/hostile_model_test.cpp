@@ -108,12 +108,12 @@ std::string withAttributes(uint32_t sectionCount, const std::string& subsections
 
 // Lists of the file and of section 1, of which no entry is like another.
 std::string listsOfCompatibility(std::string (*makeEntry)(uint32_t number)) {
-  constexpr uint32_t count = 60000;
+  constexpr uint32_t Count = 60000;
   std::string ofFile;
   std::string ofSection;
-  for (uint32_t i = 1; i <= count; ++i) {
+  for (uint32_t i = 1; i <= Count; ++i) {
     ofFile += makeEntry(i);
-    ofSection += makeEntry(count + i);
+    ofSection += makeEntry(Count + i);
   }
   return withAttributes(1, subsection(ntbs(QobixVendor) + subSubsection({Tag_File, ofFile}, true) +
                                       subSubsection(sectionPart({1}, ofSection), true)));
@@ -128,11 +128,11 @@ std::string alsoCompatible(uint32_t number) {
 }
 
 std::string sectionsOfAVendorEach() {
-  constexpr uint32_t count = 25000;
+  constexpr uint32_t Count = 25000;
   std::string subsections;
-  for (uint32_t i = 1; i <= count; ++i)
+  for (uint32_t i = 1; i <= Count; ++i)
     subsections += subsection(ntbs(std::to_string(i)) + subSubsection(sectionPart({i}, ""), true));
-  return withAttributes(count, subsections);
+  return withAttributes(Count, subsections);
 }
 
 std::string attributeSections() {

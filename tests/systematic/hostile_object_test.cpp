@@ -78,12 +78,12 @@ std::string manyRelocationSections() {
 
 // Code of which each section has a mapping symbol, a relocation, and a group of its own.
 std::string sectionsWithEverything() {
-  constexpr uint32_t count = 20000;
+  constexpr uint32_t Count = 20000;
   std::string rows(16, '\0');
-  for (uint32_t i = 0; i < count; ++i)
+  for (uint32_t i = 0; i < Count; ++i)
     put(rows, {1, 0, 0, symbolInfo(Local, 0, 3 + 3 * i)});
   ObjectBuilder file = withSymbols(rows, std::string("\0$a\0", 4));
-  for (uint32_t i = 0; i < count; ++i) {
+  for (uint32_t i = 0; i < Count; ++i) {
     const uint32_t code = 3 + 3 * i;
     file.section("", SHT_PROGBITS).flags(SHF_ALLOC | SHF_EXECINSTR | SHF_GROUP).bytes("code");
     file.section("", SHT_REL).link(2).info(code).relocation({.symbol = 1 + i});
@@ -126,9 +126,9 @@ std::string groupsWithOneLongSignature() {
 }
 
 std::string groupsWithLongSignatures() {
-  constexpr uint32_t count = ManySections / 4;
-  ObjectBuilder file = withSymbols(symbolRows(count, symbolInfo(1, 0, 0), 1, 1), longName());
-  for (uint32_t i = 1; i < count; ++i)
+  constexpr uint32_t Count = ManySections / 4;
+  ObjectBuilder file = withSymbols(symbolRows(Count, symbolInfo(1, 0, 0), 1, 1), longName());
+  for (uint32_t i = 1; i < Count; ++i)
     file.section("", SHT_GROUP).link(2).info(i).word(GRP_COMDAT);
   return file.bytes();
 }
@@ -286,15 +286,15 @@ std::string segmentsAndEmptySections(uint32_t segmentType, uint64_t memorySize) 
 
 // All begin and end elsewhere, in the file and in memory; their bytes are those of their headers.
 std::string staggeredSegmentsAndEmptySections() {
-  constexpr uint64_t range = uint64_t{32} * MostSegments;
-  const auto scatter = [](uint64_t number) { return number * 2654435761 % range; };
+  constexpr uint64_t Range = uint64_t{32} * MostSegments;
+  const auto scatter = [](uint64_t number) { return number * 2654435761 % Range; };
   ObjectBuilder file = object().type(ET_EXEC);
   for (uint32_t i = 0; i < MostSegments; ++i) {
     const uint64_t offset = scatter(i);
     const uint64_t address = scatter(i + MostSegments);
     file.segment({.offset = 52 + offset,
                   .vaddr = address,
-                  .filesz = scatter(i + 2 * MostSegments) % (range - offset),
+                  .filesz = scatter(i + 2 * MostSegments) % (Range - offset),
                   .memsz = scatter(i + 3 * MostSegments) % 4096});
   }
   for (uint32_t i = 1; i < MostSections; ++i)

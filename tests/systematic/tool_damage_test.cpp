@@ -18,13 +18,13 @@ using testing::IsEmpty;
 
 // The lines that a damaged archive may cost.
 bool isReport(const std::string& line) {
-  static const std::regex report(
+  static const std::regex Report(
       "Warning: L6974W: 'lib\\.a': malformed archive: (Archive|Padding) .*"
       "|Error: L6829E: 'lib\\.a': malformed archive: (Archive|End of file|Error reading member) .*"
       "|Error: L6826E: 'lib\\.a' not in archive format"
       "|Error: L6835E: Reading file 'lib\\.a' : Unexpected end of file"
       "|Error: L6843E: Writing file '.*' : .*");
-  return std::regex_match(line, report);
+  return std::regex_match(line, Report);
 }
 
 void expectReports(const ToolRun& run) {

@@ -72,7 +72,7 @@ class RecordingRegion final : public Region {
 public:
   void* AllocFull(size_t size, size_t alignment, const char*) override {
     allocations.push_back(size);
-    if (size >= hugeSize)
+    if (size >= HugeSize)
       return mmap(nullptr, size, PROT_READ | PROT_WRITE,
                   MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
     return std::aligned_alloc(std::max<size_t>(alignment, 16),
@@ -80,7 +80,7 @@ public:
   }
   void DiscardFull(void* pointer, size_t size, size_t) override {
     discards.push_back(size);
-    if (size >= hugeSize)
+    if (size >= HugeSize)
       munmap(pointer, size);
     else
       std::free(pointer);
@@ -91,7 +91,7 @@ public:
   std::vector<size_t> discards;
 
 private:
-  static constexpr size_t hugeSize = size_t{1} << 30;
+  static constexpr size_t HugeSize = size_t{1} << 30;
 };
 
 class RegionTest : public testing::Test {

@@ -350,11 +350,11 @@ TEST_F(RegionGeneralTest, APlainRegionCountsItsBlocks) {
 
 #ifndef ASAN_POISON_MEMORY_REGION
 TEST_F(RegionGeneralTest, MoreThanFourGibibytesInOnePieceKeepTheirSize) {
-  constexpr size_t size = (size_t{5} << 30) + 1;
-  char* block = static_cast<char*>(region->allocate(size));
+  constexpr size_t Size = (size_t{5} << 30) + 1;
+  char* block = static_cast<char*>(region->allocate(Size));
   EXPECT_EQ(parent.allocations.back(), (size_t{5} << 30) + 4096);
-  block[size - 1] = 1;
-  region->discard(block, size);
+  block[Size - 1] = 1;
+  region->discard(block, Size);
   EXPECT_THAT(parent.discards, ElementsAre((size_t{5} << 30) + 4096));
 }
 #endif

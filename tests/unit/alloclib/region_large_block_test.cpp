@@ -13,8 +13,8 @@ namespace {
 using testing::ElementsAre;
 using testing::ExitedWithCode;
 
-constexpr size_t page = 4096;
-constexpr size_t chunk = size_t{1} << 20;
+constexpr size_t Page = 4096;
+constexpr size_t Chunk = size_t{1} << 20;
 
 class RegionLargeBlockTest : public RegionTest {
 protected:
@@ -29,9 +29,9 @@ protected:
   }
 
   char* allocate(size_t count) {
-    return static_cast<char*>(pages->AllocFull(count * page, 8, nullptr));
+    return static_cast<char*>(pages->AllocFull(count * Page, 8, nullptr));
   }
-  void discard(char* block, size_t count) { pages->DiscardFull(block, count * page, 8); }
+  void discard(char* block, size_t count) { pages->DiscardFull(block, count * Page, 8); }
 
   RecordingRegion parent;
   RegionLargeBlock* pages = nullptr;
@@ -40,15 +40,15 @@ protected:
 using RegionLargeBlockDeathTest = RegionLargeBlockTest;
 
 TEST_F(RegionLargeBlockTest, TheFirstChunkIsMadeAtConstruction) {
-  EXPECT_THAT(parent.allocations, ElementsAre(sizeof(RegionLargeBlock), chunk));
+  EXPECT_THAT(parent.allocations, ElementsAre(sizeof(RegionLargeBlock), Chunk));
 }
 
 TEST_F(RegionLargeBlockTest, PagesComeFirstFitAndAreAligned) {
   char* first = allocate(1);
   char* second = allocate(2);
   EXPECT_EQ(first, RegionLargeBlockPeer::getChunk(pages, 0));
-  EXPECT_EQ(second, first + page);
-  EXPECT_EQ(reinterpret_cast<uintptr_t>(first) % page, 0u);
+  EXPECT_EQ(second, first + Page);
+  EXPECT_EQ(reinterpret_cast<uintptr_t>(first) % Page, 0u);
   discard(first, 1);
   EXPECT_EQ(allocate(1), first);
 }
@@ -57,7 +57,7 @@ TEST_F(RegionLargeBlockTest, ARunSkipsAHoleThatIsTooSmall) {
   char* first = allocate(1);
   char* second = allocate(1);
   discard(first, 1);
-  EXPECT_EQ(allocate(2), second + page);
+  EXPECT_EQ(allocate(2), second + Page);
   EXPECT_EQ(allocate(1), first);
 }
 
@@ -65,8 +65,8 @@ TEST_F(RegionLargeBlockTest, ARunIsBrokenByAWordOfTakenPages) {
   // Free are the last eight pages of the first word and all of the third.
   RegionLargeBlockPeer::setBits(pages, 0, 24, false);
   RegionLargeBlockPeer::setBits(pages, 32, 32, false);
-  EXPECT_EQ(allocate(20), RegionLargeBlockPeer::getChunk(pages, 0) + 64 * page);
-  EXPECT_EQ(allocate(8), RegionLargeBlockPeer::getChunk(pages, 0) + 24 * page);
+  EXPECT_EQ(allocate(20), RegionLargeBlockPeer::getChunk(pages, 0) + 64 * Page);
+  EXPECT_EQ(allocate(8), RegionLargeBlockPeer::getChunk(pages, 0) + 24 * Page);
 }
 
 TEST_F(RegionLargeBlockTest, TheNextChunkComesWhenTheFirstIsFull) {
@@ -74,7 +74,7 @@ TEST_F(RegionLargeBlockTest, TheNextChunkComesWhenTheFirstIsFull) {
     allocate(1);
   EXPECT_EQ(parent.allocations.size(), 2u);
   allocate(1);
-  EXPECT_THAT(parent.allocations, ElementsAre(sizeof(RegionLargeBlock), chunk, chunk));
+  EXPECT_THAT(parent.allocations, ElementsAre(sizeof(RegionLargeBlock), Chunk, Chunk));
 }
 
 TEST_F(RegionLargeBlockTest, ARunNeverSpansTwoChunks) {
@@ -83,14 +83,14 @@ TEST_F(RegionLargeBlockTest, ARunNeverSpansTwoChunks) {
   // Eight pages are left in the first chunk; all of the next one is free.
   char* run = allocate(31);
   EXPECT_EQ(run, RegionLargeBlockPeer::getChunk(pages, 1));
-  EXPECT_EQ(allocate(8), RegionLargeBlockPeer::getChunk(pages, 0) + 248 * page);
+  EXPECT_EQ(allocate(8), RegionLargeBlockPeer::getChunk(pages, 0) + 248 * Page);
 }
 
 TEST_F(RegionLargeBlockTest, ARunOf32PagesGoesToTheParent) {
   char* block = allocate(32);
-  EXPECT_EQ(parent.allocations.back(), 32 * page);
+  EXPECT_EQ(parent.allocations.back(), 32 * Page);
   discard(block, 32);
-  EXPECT_THAT(parent.discards, ElementsAre(32 * page));
+  EXPECT_THAT(parent.discards, ElementsAre(32 * Page));
 }
 
 TEST_F(RegionLargeBlockTest, SinglePagesMoveTheHintAndDiscardsBringItBack) {
@@ -122,7 +122,7 @@ TEST_F(RegionLargeBlockTest, AnExhaustedMapIsSearchedAgainOnlyAfterADiscard) {
   RegionLargeBlockPeer::setBits(pages, 1, 10239, false);
   char* second = allocate(1);
   RegionLargeBlockPeer::setBits(pages, 1, 1, true);
-  EXPECT_EQ(allocate(1), second + page);
+  EXPECT_EQ(allocate(1), second + Page);
   discard(first, 1);
   EXPECT_EQ(allocate(1), first);
 }
@@ -137,13 +137,13 @@ TEST_F(RegionLargeBlockTest, DiscardsFindTheirWayIntoTheOverflow) {
 TEST_F(RegionLargeBlockTest, TheLastPageOfTheMapIsServed) {
   RegionLargeBlockPeer::setBits(pages, 0, 10239, false);
   char* block = allocate(1);
-  EXPECT_EQ(block, RegionLargeBlockPeer::getChunk(pages, 39) + 255 * page);
+  EXPECT_EQ(block, RegionLargeBlockPeer::getChunk(pages, 39) + 255 * Page);
   EXPECT_EQ(RegionLargeBlockPeer::getOverflow(pages), nullptr);
 }
 
 TEST_F(RegionLargeBlockTest, AFreeHighHalfWordIsFound) {
   RegionLargeBlockPeer::setBits(pages, 0, 16, false);
-  EXPECT_EQ(allocate(20), RegionLargeBlockPeer::getChunk(pages, 0) + 16 * page);
+  EXPECT_EQ(allocate(20), RegionLargeBlockPeer::getChunk(pages, 0) + 16 * Page);
 }
 
 TEST_F(RegionLargeBlockTest, BlocksNeverOverlap) {
@@ -156,14 +156,14 @@ TEST_F(RegionLargeBlockTest, BlocksNeverOverlap) {
       auto [block, count] = blocks[random % blocks.size()];
       std::erase(blocks, std::pair(block, count));
       for (size_t index = 0; index < count; ++index)
-        inUse.erase(block + index * page);
+        inUse.erase(block + index * Page);
       discard(block, count);
       continue;
     }
     const size_t count = 1 + random / 7 % 31;
     char* block = allocate(count);
     for (size_t index = 0; index < count; ++index)
-      ASSERT_TRUE(inUse.insert(block + index * page).second);
+      ASSERT_TRUE(inUse.insert(block + index * Page).second);
     blocks.emplace_back(block, count);
   }
 }
@@ -172,22 +172,22 @@ TEST_F(RegionLargeBlockTest, DiscardedMemoryIsFilledOnRequest) {
   pages->setFillDiscarded(true);
   char* first = allocate(1);
   char* second = allocate(1);
-  std::memset(first, 'x', page);
-  std::memset(second, 'x', page);
+  std::memset(first, 'x', Page);
+  std::memset(second, 'x', Page);
   discard(first, 1);
   discard(second, 1);
-  unpoison(first, 2 * page);
+  unpoison(first, 2 * Page);
   EXPECT_EQ(first[0], 0);
-  EXPECT_EQ(first[page - 1], 0);
+  EXPECT_EQ(first[Page - 1], 0);
   EXPECT_EQ(second[0], 1);
-  EXPECT_EQ(second[page - 1], 1);
+  EXPECT_EQ(second[Page - 1], 1);
 }
 
 TEST_F(RegionLargeBlockTest, DestroyingWithFalseFreesNothing) {
   RecordingRegion other;
   RegionLargeBlock* doomed = RegionLargeBlockPeer::create(&other);
   RegionLargeBlockPeer::setBits(doomed, 0, 10240, false);
-  doomed->AllocFull(page, 8, nullptr);
+  doomed->AllocFull(Page, 8, nullptr);
   RegionLargeBlock* overflow = RegionLargeBlockPeer::getOverflow(doomed);
   doomed->Destroy(false);
   EXPECT_TRUE(other.discards.empty());
@@ -198,7 +198,7 @@ TEST_F(RegionLargeBlockTest, DestroyingWithFalseFreesNothing) {
 }
 
 TEST_F(RegionLargeBlockDeathTest, OnlyWholePagesGoInAndOut) {
-  for (size_t size : {size_t{0}, size_t{1}, page - 1, page + 1, size_t{0x20001}}) {
+  for (size_t size : {size_t{0}, size_t{1}, Page - 1, Page + 1, size_t{0x20001}}) {
     EXPECT_EXIT((void)pages->AllocFull(size, 8, nullptr), ExitedWithCode(1),
                 "^Internal alloclib error: Invalid allocation using RegionLargeBlock\n$");
     EXPECT_EXIT(pages->DiscardFull(nullptr, size, 8), ExitedWithCode(1),
@@ -226,10 +226,10 @@ TEST_F(RegionFastOldTest, TheTransparentModeForwardsEverything) {
   setDebugMode(Debug_Transparent);
   RegionLargeBlock* region = RegionFastOld::Create("pages");
   EXPECT_EQ(RegionLargeBlockPeer::getChunk(region, 0), nullptr);
-  void* block = region->AllocFull(page, 8, nullptr);
+  void* block = region->AllocFull(Page, 8, nullptr);
   EXPECT_EQ(RegionLargeBlockPeer::getChunk(region, 0), nullptr);
   EXPECT_THAT(getReport(false, false), testing::HasSubstr(", all memory,"));
-  region->DiscardFull(block, page, 8);
+  region->DiscardFull(block, Page, 8);
   region->Destroy(true);
   EXPECT_THAT(getReport(false, false), testing::Not(testing::HasSubstr("all memory")));
 }

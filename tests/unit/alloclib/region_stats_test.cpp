@@ -184,27 +184,27 @@ std::string traceAll(uint32_t level, bool accurate) {
   return testing::internal::GetCapturedStderr();
 }
 
-const std::string created = "(loud:2) New region (4096) initial_size. Tracing is ACCURATE\n"
+const std::string Created = "(loud:2) New region (4096) initial_size. Tracing is ACCURATE\n"
                             "(loud:2) region extended\n";
-const std::string used = "(loud:2) Allocation at (0x1000) (10) bytes (6) padding (unknown) type\n"
+const std::string Used = "(loud:2) Allocation at (0x1000) (10) bytes (6) padding (unknown) type\n"
                          "(loud:2) Discarded block at (0x1000) (10) bytes (6) padding\n";
-const std::string moved = "(loud:2) overhead increased (24) bytes \n"
+const std::string Moved = "(loud:2) overhead increased (24) bytes \n"
                           "(loud:2) overhead decreased (20) bytes \n"
                           "(loud:2) fragmentation increased (9) bytes\n"
                           "(loud:2) fragmentation decreased (1) bytes \n";
-const std::string destroyed = "(loud:2) Destroyed region with final size (12) after (1) allocs. "
+const std::string Destroyed = "(loud:2) Destroyed region with final size (12) after (1) allocs. "
                               "Maximum size was (24). Tracing was ACCURATE\n";
 
 TEST_F(RegionStatsTest, LevelOneTracesTheLifeOfARegion) {
-  EXPECT_EQ(traceAll(1, true), created + destroyed);
+  EXPECT_EQ(traceAll(1, true), Created + Destroyed);
 }
 
 TEST_F(RegionStatsTest, LevelTwoTracesAllocationsToo) {
-  EXPECT_EQ(traceAll(2, true), created + used + destroyed);
+  EXPECT_EQ(traceAll(2, true), Created + Used + Destroyed);
 }
 
 TEST_F(RegionStatsTest, LevelThreeTracesOverheadAndFragmentationToo) {
-  EXPECT_EQ(traceAll(3, true), created + used + moved + destroyed);
+  EXPECT_EQ(traceAll(3, true), Created + Used + Moved + Destroyed);
 }
 
 TEST_F(RegionStatsTest, AnInaccurateTraceSaysSo) {

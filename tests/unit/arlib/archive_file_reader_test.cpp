@@ -89,7 +89,7 @@ TEST(ArchiveFileReader, ReadsHeadersAndNotBodies) {
   const Reading reading(builder);
   EXPECT_TRUE(reading.isRead);
   EXPECT_EQ(reading.archive.getMembers().size(), 20u);
-  EXPECT_LT(reading.host.bytesRead(), 60'000u);
+  EXPECT_LT(reading.host.getBytesRead(), 60'000u);
   EXPECT_LT(reading.host.readCalls(), 50u);
 }
 
@@ -548,7 +548,7 @@ TEST(ArchiveFileReader, ReportsAFailedCloseOfWhatWasRead) {
   ASSERT_TRUE(readFile("lib.a", archive));
   host.failCall(1, EIO);
   EXPECT_FALSE(archive.closeFiles());
-  EXPECT_EQ(host.failedOperation(), "close");
+  EXPECT_EQ(host.getFailedOperation(), "close");
   EXPECT_THAT(handler.take(), ElementsAre("0 I/O error closing file 'lib.a': Input/output error"));
   EXPECT_TRUE(archive.closeFiles());
   EXPECT_THAT(handler.reports, IsEmpty());
@@ -563,10 +563,10 @@ TEST(ArchiveFileReader, DoesNotReportAFailedCloseAfterAnotherFailure) {
   Archive archive(host);
   archive.setErrorHandler(&handler);
   EXPECT_FALSE(readFile("lib.a", archive));
-  host.failCall(host.callCount(), EIO);
+  host.failCall(host.getCallCount(), EIO);
   handler.take();
   EXPECT_FALSE(readFile("lib.a", archive));
-  EXPECT_EQ(host.failedOperation(), "close");
+  EXPECT_EQ(host.getFailedOperation(), "close");
   EXPECT_THAT(handler.reports,
               ElementsAre("0 File does not begin with the archive magic number (not an archive "
                           "file?)"));

@@ -39,7 +39,7 @@ protected:
       archive.closeFiles();
       m_Host.failCall(call, error);
       const bool isWritten = writeFile("lib.a", archive);
-      const std::string& failed = m_Host.failedOperation();
+      const std::string& failed = m_Host.getFailedOperation();
       EXPECT_NE(failed, "") << "there is no such call";
       if (failed.empty() || (failed == operation && --occurrence == 0)) return isWritten;
     }
@@ -47,7 +47,7 @@ protected:
 
   void expectOldArchive() {
     EXPECT_EQ(m_Disk.read("lib.a"), m_Old);
-    EXPECT_THAT(m_Disk.names(), ElementsAre("a.o", "lib.a"));
+    EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o", "lib.a"));
     EXPECT_EQ(m_Disk.openHandles(), 0u);
   }
 
@@ -132,7 +132,7 @@ TEST_F(ArchiveFileWriterTest, ReadsEverythingFromTheNewFileWhenItWritesAgain) {
   m_Host.remove(LongName.c_str());
   EXPECT_TRUE(write());
   EXPECT_EQ(written(), before);
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
 }
 
 TEST_F(ArchiveFileWriterTest, WritesWhatIsInMemoryAlone) {
@@ -159,9 +159,9 @@ TEST_F(ArchiveFileWriterTest, RemovesTheTemporaryFilesOfMembers) {
   ArchiveMember* added = m_Archive.addMember("a.o", 5, 6, 7, 0100600);
   added->setContents("bytes", 5);
   EXPECT_TRUE(added->discardContents());
-  EXPECT_THAT(m_Host.names(), ElementsAre("/tmp/quarn.0"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("/tmp/quarn.0"));
   EXPECT_TRUE(write());
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
   EXPECT_EQ(contentsOf(added), "bytes");
 }
 
@@ -182,9 +182,9 @@ TEST_F(ArchiveFileWriterTest, CopiesLargeAndSmallMembersAlike) {
 
 TEST_F(ArchiveFileWriterTest, ReadsEachBodyOnce) {
   add("large.o", std::string(10'000'000, 'x'));
-  const uint64_t before = m_Host.bytesRead();
+  const uint64_t before = m_Host.getBytesRead();
   EXPECT_TRUE(write());
-  EXPECT_LT(m_Host.bytesRead() - before, 10'100'000u);
+  EXPECT_LT(m_Host.getBytesRead() - before, 10'100'000u);
 }
 
 TEST_F(ArchiveFileWriterTest, TakesTheFirstFreeTemporaryName) {
@@ -199,7 +199,7 @@ TEST_F(ArchiveFileWriterTest, TakesTheFirstFreeTemporaryName) {
   EXPECT_TRUE(write());
   EXPECT_EQ(m_Host.read("lib.a.0"), "somebody's");
   EXPECT_EQ(m_Host.read("lib.a.1"), "somebody's");
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a", "lib.a.0", "lib.a.1"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a", "lib.a.0", "lib.a.1"));
 }
 
 TEST_F(ArchiveFileWriterTest, KeepsThePermissionsOfTheOldFile) {
@@ -242,7 +242,7 @@ TEST_F(ArchiveFileWriterTest, RefusesAReadOnlyTarget) {
   EXPECT_FALSE(write());
   EXPECT_THAT(reports(), ElementsAre("0 Output file 'lib.a' is read-only"));
   EXPECT_EQ(written(), "old");
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
 }
 
 TEST_F(ArchiveFileWriterTest, NeverReplacesADirectoryOrADevice) {
@@ -252,7 +252,7 @@ TEST_F(ArchiveFileWriterTest, NeverReplacesADirectoryOrADevice) {
   EXPECT_THAT(reports(), ElementsAre("0 I/O error deleting file 'dir': Is a directory"));
   EXPECT_FALSE(writeFile("pipe", m_Archive));
   EXPECT_THAT(reports(), ElementsAre("0 I/O error deleting file 'pipe': Invalid argument"));
-  EXPECT_THAT(m_Host.names(), ElementsAre("dir", "pipe"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("dir", "pipe"));
 }
 
 TEST_F(ArchiveFileWriterTest, RefusesALayoutOfTwoGibibytesBeforeItBegins) {
@@ -275,7 +275,7 @@ TEST_F(ArchiveFileWriterTest, ReportsAMemberThatHasBecomeShorter) {
   EXPECT_THAT(reports(),
               ElementsAre("0 I/O error reading file 'a.o'", "0 I/O error writing file 'lib.a.0'"));
   EXPECT_EQ(written(), before);
-  EXPECT_THAT(m_Host.names(), ElementsAre("a.o", "lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
 }
 
 TEST_F(ArchiveFileWriterTest, WritesAMemberWhoseFileIsGoneButOpen) {
@@ -293,7 +293,7 @@ TEST_F(ArchiveFileWriterTest, ReportsAMemberWhoseFileIsGone) {
   EXPECT_THAT(reports(),
               ElementsAre("0 I/O error reading file 'a.o': No such file or directory",
                           "0 I/O error writing file 'lib.a.0': No such file or directory"));
-  EXPECT_THAT(m_Host.names(), IsEmpty());
+  EXPECT_THAT(m_Host.getNames(), IsEmpty());
 }
 
 // The old table would give the members wrong names.
@@ -307,7 +307,7 @@ TEST_F(ArchiveFileWriterTest, WritesNothingWhereATableCouldNotBeRebuilt) {
   EXPECT_FALSE(write());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'lib.a': Permission denied"));
   EXPECT_EQ(written(), before);
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
 }
 
 TEST_F(ArchiveFileWriterTest, IsSilentWithoutAHandler) {

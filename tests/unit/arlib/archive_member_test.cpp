@@ -13,7 +13,7 @@ protected:
   ArchiveMemberTest() { m_Host.addFile("a.o", "contents"); }
 
   std::vector<std::string> filesBeside() {
-    std::vector<std::string> names = m_Host.names();
+    std::vector<std::string> names = m_Host.getNames();
     std::erase(names, "a.o");
     return names;
   }
@@ -166,7 +166,7 @@ TEST_F(FailingContents, LeaveNoTemporaryFileBehind) {
                           "0 I/O error writing file '/tmp/quarn.0': No space left on device",
                           "0 I/O error writing file '/tmp/quarn.1': Input/output error",
                           "0 I/O error closing file '/tmp/quarn.2': Input/output error"));
-  EXPECT_THAT(m_Disk.names(), ElementsAre("a.o"));
+  EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o"));
   m_Archive.closeFiles();
   EXPECT_EQ(m_Disk.openHandles(), 0u);
   EXPECT_FALSE(m_InMemory->getContentsLocation().has_value());

@@ -245,9 +245,9 @@ TEST_F(ArchiveListTest, DeletesTheTemporaryFileOfARemovedMember) {
   ArchiveMember* added = m_Archive.addMember("a", 0, 0, 0, 0);
   added->setContents("x", 1);
   added->discardContents();
-  EXPECT_EQ(m_Host.names().size(), 1u);
+  EXPECT_EQ(m_Host.getNames().size(), 1u);
   m_Archive.removeMember(added);
-  EXPECT_THAT(m_Host.names(), IsEmpty());
+  EXPECT_THAT(m_Host.getNames(), IsEmpty());
 }
 
 TEST_F(ArchiveListTest, LeavesTheFileOfARemovedMember) {
@@ -265,7 +265,7 @@ TEST_F(ArchiveListTest, ClearsMembersAndTheirTemporaryFiles) {
   EXPECT_TRUE(m_Archive.getSymbols().empty());
   EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
   EXPECT_THAT(found("a"), IsEmpty());
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
 }
 
 TEST_F(ArchiveListTest, LeavesTemporaryFilesOnDiskWhenItGoes) {
@@ -273,7 +273,7 @@ TEST_F(ArchiveListTest, LeavesTemporaryFilesOnDiskWhenItGoes) {
     Archive archive(m_Host);
     archive.addMember("a", 0, 0, 0, 0)->discardContents();
   }
-  EXPECT_THAT(m_Host.names(), ElementsAre("/tmp/quarn.0"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("/tmp/quarn.0"));
 }
 
 TEST_F(ArchiveListTest, MovesAMemberToAPlaceCountedWithoutIt) {

@@ -60,7 +60,7 @@ TEST_F(ContentsReaderTest, KeepsAFileOpenFromMemberToMember) {
   for (const ArchiveMember* each : archive.getMembers())
     readAll(reader, *each);
   EXPECT_TRUE(reader.finish());
-  EXPECT_LE(host.callCount(), 3u);
+  EXPECT_LE(host.getCallCount(), 3u);
 }
 
 TEST_F(ContentsReaderTest, ReportsEachKindOfFailure) {

@@ -10,8 +10,8 @@ class ErrorHandlerText : public ArchiveTest {
 protected:
   // The attributes are not part of any text.
   static const elfext::FullAttr& attributes() {
-    alignas(16) static const unsigned char bytes[64] = {};
-    return reinterpret_cast<const elfext::FullAttr&>(bytes);
+    alignas(16) static const unsigned char Bytes[64] = {};
+    return reinterpret_cast<const elfext::FullAttr&>(Bytes);
   }
 
   std::string last() {

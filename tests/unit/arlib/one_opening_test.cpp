@@ -82,7 +82,7 @@ Outcomes disturb(const std::function<void(MemoryHost&)>& disturbance) {
       ++(contents == OldContents ? outcomes.old : outcomes.fresh);
     }
     EXPECT_EQ(disk.openHandles(), 0u);
-    if (host.failedOperation().empty()) return outcomes;
+    if (host.getFailedOperation().empty()) return outcomes;
   }
 }
 
@@ -165,7 +165,7 @@ int countRefusals(const std::function<void(MemoryHost&)>& disturbance, uint64_t 
       EXPECT_EQ(disk.read("lib.a"), before);
       EXPECT_THAT(handler.reports, testing::Not(IsEmpty()));
     }
-    if (host.failedOperation().empty()) return refusals;
+    if (host.getFailedOperation().empty()) return refusals;
   }
 }
 

@@ -60,7 +60,7 @@ TEST_F(TableCursorTest, FindsNamesOfAnyLengthInMemoryAndInAFile) {
 TEST_F(TableCursorTest, ManyNamesTakeFewReads) {
   const std::vector<std::string> names(50'000, "nineteen_characters");
   EXPECT_EQ(namesOf(TableCursor(inFile(joined(names)), 0)), names);
-  EXPECT_LE(m_Faulty.callCount(), 17u);
+  EXPECT_LE(m_Faulty.getCallCount(), 17u);
 }
 
 TEST_F(TableCursorTest, ANameWithoutAnEndIsNone) {
@@ -116,10 +116,10 @@ TEST_F(TableCursorTest, AnUnreadableTableEndsTheReadWhereverItFails) {
     unwanted.setErrorHandler(&handler);
     unwanted.setSymbolsWanted(false);
     const bool isRead = readFile("lib.a", unwanted);
-    if (m_Faulty.failedOperation().empty()) break;
+    if (m_Faulty.getFailedOperation().empty()) break;
     if (isRead) continue; // what failed was only a question
     EXPECT_TRUE(unwanted.getMembers().empty());
-    EXPECT_EQ(handler.reports.size(), 1u) << m_Faulty.failedOperation();
+    EXPECT_EQ(handler.reports.size(), 1u) << m_Faulty.getFailedOperation();
   }
 }
 

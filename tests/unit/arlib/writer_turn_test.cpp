@@ -114,11 +114,11 @@ TEST_F(WriterTurnTest, KeepsWhatAnotherHasPutInTheArchivesPlace) {
   EXPECT_FALSE(writeFile("lib.a", m_Archive));
   EXPECT_THAT(reports(), ElementsAre(StaleWrite));
   EXPECT_EQ(m_Host.read("lib.a"), archive().member("a.o", "other").bytes());
-  EXPECT_THAT(m_Host.names(), ElementsAre("lib.a"));
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("lib.a"));
   EXPECT_EQ(m_Host.remove("lib.a"), 0);
   EXPECT_FALSE(writeFile("lib.a", m_Archive));
   EXPECT_THAT(reports(), ElementsAre(StaleWrite));
-  EXPECT_THAT(m_Host.names(), IsEmpty());
+  EXPECT_THAT(m_Host.getNames(), IsEmpty());
 }
 
 TEST_F(WriterTurnTest, KeepsAnArchiveThatWasWrittenToInPlace) {
@@ -181,11 +181,11 @@ TEST_F(WriterTurnTest, NeverReplacesAnArchiveThatHasAppeared) {
     mine.addMemberFromFile("a.o");
     host.disturbCall(call, [&] { disk.addFile("lib.a", others); });
     const NewFile result = writeNewFile("lib.a", mine);
-    const bool isLate = host.failedOperation().empty();
+    const bool isLate = host.getFailedOperation().empty();
     if (result == NewFile::Exists) {
       ++appearances;
       EXPECT_EQ(disk.read("lib.a"), others);
-      EXPECT_THAT(disk.names(), ElementsAre("a.o", "lib.a"));
+      EXPECT_THAT(disk.getNames(), ElementsAre("a.o", "lib.a"));
     }
     EXPECT_NE(result, NewFile::Failed);
     if (isLate) break;

@@ -25,7 +25,7 @@ protected:
   }
 };
 
-const char* const emptyTotals = "\nTotals:\n"
+const char* const EmptyTotals = "\nTotals:\n"
                                 "cold none: 0\ncold low: 0\ncold medium: 0\ncold high: 0\n"
                                 "cold extravagant: 0\n"
                                 "hot none: 0\nhot low: 0\nhot medium: 0\nhot high: 0\n"
@@ -36,7 +36,7 @@ TEST_F(StatisticsTest, StartAndFinishAreAnnounced) {
   EXPECT_EQ(shownText, "Collecting checking statistics\n");
   shownText.clear();
   finishStatistics();
-  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + emptyTotals);
+  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + EmptyTotals);
 }
 
 TEST_F(StatisticsTest, SitesComeByFallingCountAndThenInOrder) {
@@ -76,7 +76,7 @@ TEST_F(StatisticsTest, NothingIsCountedOutsideOfStartAndFinish) {
   QUARN_ASSERT(1, true);
   shownText.clear();
   finishStatistics();
-  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + emptyTotals);
+  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + EmptyTotals);
 }
 
 TEST_F(StatisticsTest, AStartForgetsWhatWasCounted) {
@@ -85,7 +85,7 @@ TEST_F(StatisticsTest, AStartForgetsWhatWasCounted) {
   startStatistics();
   shownText.clear();
   finishStatistics();
-  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + emptyTotals);
+  EXPECT_EQ(shownText, std::string("Finished checking statistics\n") + EmptyTotals);
 }
 
 } // namespace

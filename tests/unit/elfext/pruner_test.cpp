@@ -426,12 +426,12 @@ TEST_F(PrunerTest, CanBeFilledAgainAfterClearing) {
 
 // A quadratic sweep would take minutes.
 TEST_F(PrunerTest, TakesTensOfThousandsOfObjectsQuickly) {
-  constexpr uint32_t count = 40'000;
+  constexpr uint32_t Count = 40'000;
   Section* hub = makeSection();
-  Segment* segment = makeSegment(count * 4);
+  Segment* segment = makeSegment(Count * 4);
   Group* group = module.createGroup("g", "", GRP_COMDAT);
   Symbol* target = makeUndefined("t");
-  for (uint32_t number = 1; number < count; ++number) {
+  for (uint32_t number = 1; number < Count; ++number) {
     Section* section = makeSection();
     section->setLink(hub);
     group->addMember(section);

@@ -236,11 +236,11 @@ TEST(SmoothSortTest, IsLinearOnSortedInput) {
 
 TEST(SmoothSortTest, IsNeverQuadratic) {
   std::mt19937 random(4);
-  constexpr size_t size = 1 << 16;
-  std::vector<int> descending(size);
+  constexpr size_t Size = 1 << 16;
+  std::vector<int> descending(Size);
   std::iota(descending.rbegin(), descending.rend(), 0);
-  EXPECT_LE(countComparisons(descending), size * 16 * 4);
-  EXPECT_LE(countComparisons(randomKeys(random, size, 1u << 30)), size * 16 * 4);
+  EXPECT_LE(countComparisons(descending), Size * 16 * 4);
+  EXPECT_LE(countComparisons(randomKeys(random, Size, 1u << 30)), Size * 16 * 4);
 }
 
 TEST(SmoothSortTest, AsksNothingForFewerThanTwoItems) {

@@ -13,24 +13,24 @@ namespace {
 using namespace features;
 
 TEST(FeatureSetTest, HoldsBitsOfBothWords) {
-  constexpr FeatureSet both = V81_ISA | DSP_MULT;
-  EXPECT_TRUE(both.contains(V81_ISA));
-  EXPECT_TRUE(both.contains(both));
-  EXPECT_FALSE(both.contains(both | HFU_HALF));
-  EXPECT_FALSE(both.contains(both | JAVA_STATE));
-  EXPECT_TRUE(both.contains({}));
-  EXPECT_TRUE(both.intersects(V81_ISA | HFU_HALF));
-  EXPECT_TRUE(both.intersects(DSP_MULT | HFU_HALF));
-  EXPECT_FALSE(both.intersects(HFU_HALF | JAVA_STATE));
-  EXPECT_EQ(both.without(V81_ISA), DSP_MULT);
-  EXPECT_EQ(both.without(DSP_MULT), V81_ISA);
-  EXPECT_EQ(both & V81_ISA, V81_ISA);
+  constexpr FeatureSet Both = V81_ISA | DSP_MULT;
+  EXPECT_TRUE(Both.contains(V81_ISA));
+  EXPECT_TRUE(Both.contains(Both));
+  EXPECT_FALSE(Both.contains(Both | HFU_HALF));
+  EXPECT_FALSE(Both.contains(Both | JAVA_STATE));
+  EXPECT_TRUE(Both.contains({}));
+  EXPECT_TRUE(Both.intersects(V81_ISA | HFU_HALF));
+  EXPECT_TRUE(Both.intersects(DSP_MULT | HFU_HALF));
+  EXPECT_FALSE(Both.intersects(HFU_HALF | JAVA_STATE));
+  EXPECT_EQ(Both.without(V81_ISA), DSP_MULT);
+  EXPECT_EQ(Both.without(DSP_MULT), V81_ISA);
+  EXPECT_EQ(Both & V81_ISA, V81_ISA);
   EXPECT_FALSE(V81_ISA.isEmpty());
   EXPECT_FALSE(DSP_MULT.isEmpty());
-  EXPECT_TRUE(both.without(both).isEmpty());
-  FeatureSet set = both;
+  EXPECT_TRUE(Both.without(Both).isEmpty());
+  FeatureSet set = Both;
   set.put(HFU_HALF, true);
-  EXPECT_EQ(set, both | HFU_HALF);
+  EXPECT_EQ(set, Both | HFU_HALF);
   set.put(V81_ISA | JAVA_STATE, false);
   EXPECT_EQ(set, DSP_MULT | HFU_HALF);
 }
@@ -98,8 +98,8 @@ TEST(FeatureSetTest, ClosureTakesTheRulesInTheirOrder) {
   EXPECT_EQ(closeFeatures(KRELL_DIVIDE | VIRTUALIZATION_EXTENSION),
             DIVIDE_EXTENSION | VIRTUALIZATION_EXTENSION | M_PROFILE);
   // The highest bit of a level is enough for the rules that look at it.
-  constexpr FeatureSet zevBit5 = ZEV_ISAv5.without(ZEV_ISAv4);
-  EXPECT_EQ(closeFeatures(zevBit5 | KRELL_ISAv1 | KRELL_DIVIDE),
+  constexpr FeatureSet ZevBit5 = ZEV_ISAv5.without(ZEV_ISAv4);
+  EXPECT_EQ(closeFeatures(ZevBit5 | KRELL_ISAv1 | KRELL_DIVIDE),
             ZEV_ISAv5 | KRELL_ISAv2 | KRELL_DIVIDE);
 }
 

@@ -72,12 +72,12 @@ TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsWhenTheHostFails) {
   testsupport::FaultyHost host(m_Host);
   for (uint64_t call = 1; call <= 3; ++call) {
     host.failCall(call, EIO);
-    EXPECT_THAT(readBuiltIn(host, "map").rows, SizeIs(14)) << host.failedOperation();
+    EXPECT_THAT(readBuiltIn(host, "map").rows, SizeIs(14)) << host.getFailedOperation();
   }
   host.failCall(4, EIO);
   bool usedDefault = true;
   EXPECT_THAT(readLibraryAttributeMap(host, "map", usedDefault).rows, SizeIs(2));
-  EXPECT_EQ(host.failedOperation(), "close");
+  EXPECT_EQ(host.getFailedOperation(), "close");
   EXPECT_FALSE(usedDefault);
 }
 
@@ -132,7 +132,7 @@ TEST_F(LibraryAttributeMapTest, ReadsMapsThatAreLargerThanItsBuffer) {
   ASSERT_THAT(map.rows, SizeIs(20000));
   EXPECT_EQ(map.rows[19999].pattern, "pattern19999_x");
   EXPECT_EQ(map.rows[19999].className, "class");
-  EXPECT_LE(m_Host.bytesRead(), text.size() + 0x10000);
+  EXPECT_LE(m_Host.getBytesRead(), text.size() + 0x10000);
 }
 
 TEST_F(LibraryAttributeMapTest, ReadsAnEndlessLineInLinearTime) {

@@ -281,9 +281,9 @@ TEST_F(ReadAttributesTest, ASectionThatCannotBeReadIsNoCorruptedOne) {
     module.setErrorHandler(&reports);
     isRead = readElfFile(host, "lib.a", 0, bytes.size(), module, nullptr);
     module.setErrorHandler(nullptr);
-    if (host.failedOperation().empty()) break;
+    if (host.getFailedOperation().empty()) break;
     EXPECT_THAT(reports.m_Texts, ElementsAre("I/O error reading file 'a.o': Input/output error"))
-        << host.failedOperation() << ' ' << call;
+        << host.getFailedOperation() << ' ' << call;
   }
   EXPECT_GT(call, 3u);
 }

@@ -58,8 +58,8 @@ TEST(ElfRecordsTest, HaveTheSizesOfTheirClass) {
 TEST(ElfRecordsTest, AFixedFormatIsTheOneAskedForAndAConstant) {
   for (const RecordFormat format : Formats) {
     const RecordFormat fixed = withFixedFormat(format, [](auto fixedFormat) {
-      constexpr RecordFormat known = fixedFormat;
-      return known;
+      constexpr RecordFormat Known = fixedFormat;
+      return Known;
     });
     EXPECT_EQ(fixed, format);
   }

@@ -77,19 +77,19 @@ TEST_F(ImageBytesTest, ASmallImageIsReadInOneCall) {
   m_Host.failCall(0, 0);
   EXPECT_TRUE(image.prepare());
   EXPECT_TRUE(image.prepare());
-  EXPECT_EQ(m_Host.callCount(), 1U);
+  EXPECT_EQ(m_Host.getCallCount(), 1U);
   expectBytes(image, 0, ImageBytes::WholeReadLimit);
-  EXPECT_EQ(m_Host.callCount(), 1U);
+  EXPECT_EQ(m_Host.getCallCount(), 1U);
 }
 
 TEST_F(ImageBytesTest, OfALargeImageOnlyTheBlocksThatAreLookedAtAreRead) {
   ImageBytes image(m_Host, open(pattern(Large)), 2, Large, true);
   EXPECT_TRUE(image.prepare());
-  EXPECT_EQ(m_Memory.bytesRead(), 0U);
+  EXPECT_EQ(m_Memory.getBytesRead(), 0U);
   expectBytes(image, 0x20010, 16);
-  EXPECT_EQ(m_Memory.bytesRead(), 0x1000U);
+  EXPECT_EQ(m_Memory.getBytesRead(), 0x1000U);
   expectBytes(image, 0x20000, 0x1000);
-  EXPECT_EQ(m_Memory.bytesRead(), 0x1000U);
+  EXPECT_EQ(m_Memory.getBytesRead(), 0x1000U);
 }
 
 TEST_F(ImageBytesTest, BytesKeepTheirAddresses) {
@@ -108,7 +108,7 @@ TEST_F(ImageBytesTest, LooksInAnyOrderGiveTheSameBytes) {
     const uint64_t size = std::min<uint64_t>(i * 131 % 9000, Large - 5 - offset);
     expectBytes(image, offset, size);
   }
-  EXPECT_LE(m_Memory.bytesRead(), Large);
+  EXPECT_LE(m_Memory.getBytesRead(), Large);
 }
 
 TEST_F(ImageBytesTest, MayBeReadToItsEnd) {
@@ -117,7 +117,7 @@ TEST_F(ImageBytesTest, MayBeReadToItsEnd) {
   EXPECT_TRUE(image.prepare());
   expectBytes(image, 0x20010, 16);
   EXPECT_TRUE(image.loadAll());
-  EXPECT_EQ(m_Memory.bytesRead(), Large);
+  EXPECT_EQ(m_Memory.getBytesRead(), Large);
   image.forgetFile();
   EXPECT_EQ(m_Host.close(file), 0);
   expectBytes(image, 0, Large);
@@ -149,7 +149,7 @@ TEST_F(ImageBytesTest, WhoReadsOnIsReadAheadFor) {
   m_Host.failCall(0, 0);
   for (uint64_t offset = 0; offset < Large; offset += 0x100)
     expectBytes(image, offset, 0x100);
-  EXPECT_LE(m_Host.callCount(), 1 + Large / 0x10000 + 1);
+  EXPECT_LE(m_Host.getCallCount(), 1 + Large / 0x10000 + 1);
 }
 
 TEST_F(ImageBytesTest, AHostFailureIsKept) {

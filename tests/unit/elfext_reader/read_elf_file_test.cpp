@@ -131,13 +131,13 @@ protected:
       m_Faulty.failCall(call, EIO);
       const size_t handlesBefore = m_Host.openHandles();
       const bool isRead = readBy(way, selector);
-      if (m_Faulty.failedOperation().empty()) {
+      if (m_Faulty.getFailedOperation().empty()) {
         EXPECT_TRUE(isRead);
         EXPECT_GT(call, way == Way::Memory ? 0U : 1U);
         m_Faulty.failCall(0, 0);
         return;
       }
-      SCOPED_TRACE(m_Faulty.failedOperation() + " as call " + std::to_string(call));
+      SCOPED_TRACE(m_Faulty.getFailedOperation() + " as call " + std::to_string(call));
       EXPECT_FALSE(isRead);
       EXPECT_THAT(m_Reports.m_Texts,
                   ElementsAre("I/O error reading file 'a.o': Input/output error"));
@@ -178,7 +178,7 @@ TEST_P(ReadElfFileInEachWayTest, LooksForTheContentsOfALargeObjectWhenTheyAreWan
   put(largeSample());
   ASSERT_TRUE(readBy(GetParam()));
   if (!isOpenedByCaller(GetParam())) {
-    EXPECT_LT(m_Host.bytesRead(), LargestEagerFile / 2);
+    EXPECT_LT(m_Host.getBytesRead(), LargestEagerFile / 2);
   }
   EXPECT_EQ(m_Host.openHandles(), GetParam() == Way::Memory ? 0U : 1U);
   EXPECT_FALSE(m_Module->hasDeferredContents());
@@ -296,14 +296,14 @@ TEST_P(ReadElfFileInEachWayTest, ReportsAFileThatHasShrunk) {
 
 TEST_P(ReadElfFileInEachWayTest, ReportsASizeForWhichThereIsNoMemory) {
   if (GetParam() == Way::Memory) return;
-  constexpr uint64_t size = uint64_t{1} << 60;
+  constexpr uint64_t Size = uint64_t{1} << 60;
   put(sample());
-  m_Host.at("a.o").toldSize = int64_t{size};
-  m_Host.at("lib.a").toldSize = int64_t{size} + 2;
+  m_Host.at("a.o").toldSize = int64_t{Size};
+  m_Host.at("lib.a").toldSize = int64_t{Size} + 2;
   if (GetParam() == Way::PartOfFile)
-    EXPECT_FALSE(readElfFile(m_Host, "lib.a", 2, size, *m_Module, nullptr));
+    EXPECT_FALSE(readElfFile(m_Host, "lib.a", 2, Size, *m_Module, nullptr));
   else if (GetParam() == Way::PartOfOpenFile)
-    EXPECT_FALSE(readElfFile(m_Host, open("lib.a"), 2, size, *m_Module, nullptr));
+    EXPECT_FALSE(readElfFile(m_Host, open("lib.a"), 2, Size, *m_Module, nullptr));
   else
     EXPECT_FALSE(readBy(GetParam()));
   EXPECT_THAT(m_Reports.m_Texts, ElementsAre("Out of memory"));
@@ -438,7 +438,7 @@ TEST_F(ReadElfFileTest, NothingOfLentMemoryIsCopied) {
   const ObjectBuilder file = sample();
   put(file);
   ASSERT_TRUE(readBy(Way::Memory));
-  EXPECT_EQ(m_Faulty.callCount(), 0U);
+  EXPECT_EQ(m_Faulty.getCallCount(), 0U);
   const uint8_t* lent = lentBytes().data();
   EXPECT_EQ(m_Module->getReadBuffer(), lent);
   EXPECT_EQ(m_Module->getSection(Text)->getContents(), lent + file.offsetOf(Text));
@@ -568,9 +568,9 @@ TEST_F(ReadDeferredTest, ContentsAreReadWhenTheyAreLoaded) {
   ListedSelector selector({Text, Data});
   ASSERT_TRUE(readBy(Way::WholeFile, &selector));
   m_Host.at("a.o").bytes.replace(largeSample().offsetOf(Text), 4, "CODE");
-  const uint64_t bytesBefore = m_Host.bytesRead();
+  const uint64_t bytesBefore = m_Host.getBytesRead();
   ASSERT_TRUE(m_Module->getSection(Text)->loadDeferredContents());
-  EXPECT_EQ(m_Host.bytesRead(), bytesBefore + 4);
+  EXPECT_EQ(m_Host.getBytesRead(), bytesBefore + 4);
   EXPECT_EQ(textOf(*m_Module->getSection(Text)), "CODE");
   EXPECT_THAT(deferredSections(), ElementsAre(Data));
 }
@@ -591,11 +591,11 @@ TEST_F(ReadDeferredTest, AllElseIsReadAtOnce) {
 }
 
 TEST_F(ReadDeferredTest, APreemptionMapIsReadAlsoOfContentsThatStayInTheFile) {
-  constexpr uint32_t address = 0x10000000;
+  constexpr uint32_t Address = 0x10000000;
   ObjectBuilder file = largeSample();
-  SectionBuilder& map = file.section(".map", SHT_PROGBITS).link(4).address(address);
+  SectionBuilder& map = file.section(".map", SHT_PROGBITS).link(4).address(Address);
   map.word(1).textOffset("symbol").textOffset("new").textOffset("old").word(0);
-  file.section(".dynamic", SHT_DYNAMIC).link(4).dynamic(DT_ZEV_PREEMPTMAP, address).dynamic(0, 0);
+  file.section(".dynamic", SHT_DYNAMIC).link(4).dynamic(DT_ZEV_PREEMPTMAP, Address).dynamic(0, 0);
   put(file);
   BySizeDeferredContentsSelector selector;
   for (DeferredContentsSelector* each : {static_cast<DeferredContentsSelector*>(nullptr),
@@ -695,7 +695,7 @@ TEST_F(ReadDeferredTest, AFailureOfTheHostIsReportedWhenTheContentsAreLoaded) {
   ASSERT_TRUE(readBy(Way::WholeFile, &selector));
   m_Faulty.failCall(1, EIO);
   EXPECT_FALSE(m_Module->loadDeferredContents());
-  EXPECT_EQ(m_Faulty.failedOperation(), "readAt");
+  EXPECT_EQ(m_Faulty.getFailedOperation(), "readAt");
   // The file is closed, and what else is in it can't be had either.
   EXPECT_EQ(m_Host.openHandles(), 0U);
   EXPECT_FALSE(m_Module->getSection(Data)->loadDeferredContents());
@@ -721,12 +721,12 @@ TEST_F(ReadDeferredTest, EveryFileIsClosedOnce) {
     m_Faulty.failCall(0, 0);
     ASSERT_TRUE(readBy(Way::WholeFile, each));
     m_Module->clear();
-    const uint64_t calls = m_Faulty.callCount();
+    const uint64_t calls = m_Faulty.getCallCount();
     for (const uint64_t call : {calls, calls - 1}) {
       m_Faulty.failCall(call, EIO);
       static_cast<void>(readBy(Way::WholeFile, each));
       m_Module->clear();
-      EXPECT_EQ(m_Faulty.failedOperation(), call == calls ? "close" : "readAt");
+      EXPECT_EQ(m_Faulty.getFailedOperation(), call == calls ? "close" : "readAt");
     }
   }
 }

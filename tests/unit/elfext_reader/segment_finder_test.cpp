@@ -91,10 +91,10 @@ private:
 };
 
 ProgramHeader randomSegment(Numbers& numbers, bool areMostlyJudgedByRange) {
-  static constexpr uint32_t types[] = {PT_NULL,  PT_LOAD, PT_DYNAMIC, PT_INTERP, PT_NOTE,
+  static constexpr uint32_t Types[] = {PT_NULL,  PT_LOAD, PT_DYNAMIC, PT_INTERP, PT_NOTE,
                                        PT_SHLIB, PT_PHDR, PT_TLS,     PT_LOAD,   PT_ZEV_EXIDX};
   ProgramHeader segment;
-  segment.type = areMostlyJudgedByRange && numbers.upTo(19) != 0 ? PT_LOAD : numbers.oneOf(types);
+  segment.type = areMostlyJudgedByRange && numbers.upTo(19) != 0 ? PT_LOAD : numbers.oneOf(Types);
   segment.offset = numbers.number();
   segment.filesz = numbers.number();
   segment.vaddr = numbers.number();
@@ -103,9 +103,9 @@ ProgramHeader randomSegment(Numbers& numbers, bool areMostlyJudgedByRange) {
 }
 
 SectionHeader randomSection(Numbers& numbers) {
-  static constexpr uint32_t types[] = {SHT_NOBITS, SHT_NOBITS, SHT_NOBITS, SHT_PROGBITS, SHT_NULL};
+  static constexpr uint32_t Types[] = {SHT_NOBITS, SHT_NOBITS, SHT_NOBITS, SHT_PROGBITS, SHT_NULL};
   SectionHeader section;
-  section.type = numbers.oneOf(types);
+  section.type = numbers.oneOf(Types);
   section.offset = numbers.number();
   section.addr = numbers.number();
   section.size = numbers.upTo(2) == 0 ? 0 : numbers.number();

@@ -833,14 +833,14 @@ TEST_F(ValidateLinkedTest, ASectionSymbolIsNoLargerThanItsSection) {
 }
 
 TEST_F(ValidateLinkedTest, PlacementIsCheckedInOneOrder) {
-  constexpr size_t count = 7;
+  constexpr size_t Count = 7;
   SegmentSpec text = load(0, 15);
   text.vaddr += 3;
   text.memsz = 60;
   const SegmentSpec more = load(16, 20);
-  ObjectBuilder file = linked({inFront(PT_LOAD, 0, 4, count), inFront(PT_INTERP, 52, 4, count),
-                               inFront(PT_INTERP, 52, 4, count), inFront(PT_PHDR, 52, 8, count),
-                               inFront(PT_PHDR, 52, 8, count), more, text});
+  ObjectBuilder file = linked({inFront(PT_LOAD, 0, 4, Count), inFront(PT_INTERP, 52, 4, Count),
+                               inFront(PT_INTERP, 52, 4, Count), inFront(PT_PHDR, 52, 8, Count),
+                               inFront(PT_PHDR, 52, 8, Count), more, text});
   file.section(".lost", SHT_PROGBITS).flags(SHF_ALLOC).zeros(4);
   const ReadResult result = readGood(file);
   ModuleBuilder::adoptSize(*result.section(2), 17);

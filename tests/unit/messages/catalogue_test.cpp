@@ -98,10 +98,10 @@ TEST(MessageKey, PacksLetterNumberAndSeverityLetter) {
 }
 
 TEST(MessageKey, GivesBackItsParts) {
-  constexpr Key key = makeKey('X', 16383, 'W');
-  EXPECT_EQ(letterOf(key), 'X');
-  EXPECT_EQ(numberOf(key), 16383u);
-  EXPECT_EQ(severityLetterOf(key), 'W');
+  constexpr Key Largest = makeKey('X', 16383, 'W');
+  EXPECT_EQ(letterOf(Largest), 'X');
+  EXPECT_EQ(numberOf(Largest), 16383u);
+  EXPECT_EQ(severityLetterOf(Largest), 'W');
 }
 
 TEST(MessageKey, PrintsAsLetterFourDigitsAndLetter) {
@@ -364,14 +364,14 @@ TEST_F(CatalogueTest, AMissingRowShowsItsKeyAndTheRunGoesOn) {
   const Key missing = makeKey('L', 1, 'E');
   EXPECT_EQ(getMessageText(missing), "<NotFound Code=L0001E key=0x01300016>");
   EXPECT_TRUE(report(ErrorWord, nullptr, missing, "unused"));
-  EXPECT_EQ(errorText(), "Error: L0001E: <NotFound Code=L0001E key=0x01300016>\n");
+  EXPECT_EQ(getErrorText(), "Error: L0001E: <NotFound Code=L0001E key=0x01300016>\n");
   EXPECT_EQ(getErrorCount(), 1u);
 }
 
 TEST_F(CatalogueTest, AnExternalCatalogueComesFirst) {
-  static constexpr CatalogueRow rows[] = {{OutOfMemory, "No memory"},
+  static constexpr CatalogueRow Rows[] = {{OutOfMemory, "No memory"},
                                           {makeKey('L', 6801, 'E'), "New text"}};
-  setExternalCatalogue(rows);
+  setExternalCatalogue(Rows);
   EXPECT_EQ(getMessageText(OutOfMemory), "No memory");
   EXPECT_EQ(getMessageText(makeKey('L', 6801, 'E')), "New text");
   EXPECT_EQ(getMessageText(NoArchiveSpecified), "No archive specified");
@@ -380,17 +380,17 @@ TEST_F(CatalogueTest, AnExternalCatalogueComesFirst) {
 }
 
 TEST_F(CatalogueTest, AnExternalTextIsFilledLikeABuiltInOne) {
-  static constexpr CatalogueRow rows[] = {{FileDoesNotExist, "No file %s, 100%%"},
+  static constexpr CatalogueRow Rows[] = {{FileDoesNotExist, "No file %s, 100%%"},
                                           {ListedMember, "<%1$s|%1$-6s>\n"}};
   listingMessage(ListedMember, "a.o");
-  setExternalCatalogue(rows);
+  setExternalCatalogue(Rows);
   listingMessage(ListedMember, "a.o");
   listingMessage(AddedMember, "b.o");
   report(ErrorWord, nullptr, FileDoesNotExist, "%d");
   setExternalCatalogue({});
   listingMessage(ListedMember, "c.o");
   EXPECT_EQ(outputText(), "a.o\n<a.o|a.o   >\na - b.o\nc.o\n");
-  EXPECT_EQ(errorText(), "Error: L6833E: No file %d, 100%\n");
+  EXPECT_EQ(getErrorText(), "Error: L6833E: No file %d, 100%\n");
 }
 
 TEST_F(CatalogueTest, AChangeOfLanguageHoldsForTheNextLine) {

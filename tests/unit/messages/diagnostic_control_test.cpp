@@ -21,7 +21,7 @@ uint32_t severityOfNonElf(uint32_t word) {
 TEST_F(DiagnosticControlTest, ANumberSuppressesItsWarning) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticSuppress, "L6875"));
   reportNonElf();
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
   EXPECT_EQ(getCounters().suppressed, 1u);
   EXPECT_EQ(getCounters().warnings, 0u);
 }
@@ -29,14 +29,14 @@ TEST_F(DiagnosticControlTest, ANumberSuppressesItsWarning) {
 TEST_F(DiagnosticControlTest, AWarningRaisedToAnErrorCountsAndKeepsItsLetter) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "6875"));
   reportNonElf();
-  EXPECT_EQ(errorText(), "Error: L6875W: Adding non-ELF object 'a' to archive 'b'\n");
+  EXPECT_EQ(getErrorText(), "Error: L6875W: Adding non-ELF object 'a' to archive 'b'\n");
   EXPECT_EQ(getErrorCount(), 1u);
 }
 
 TEST_F(DiagnosticControlTest, AWarningLoweredToARemarkHasNeitherPrefixNorCode) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticRemark, "L6875W"));
   reportNonElf();
-  EXPECT_EQ(errorText(), "Adding non-ELF object 'a' to archive 'b'\n");
+  EXPECT_EQ(getErrorText(), "Adding non-ELF object 'a' to archive 'b'\n");
 }
 
 TEST_F(DiagnosticControlTest, RaisedWarningsReachTheLimit) {
@@ -94,8 +94,8 @@ TEST_F(DiagnosticControlTest, TheOrderOfMapAndNumberDoesNotMatter) {
 TEST_F(DiagnosticControlTest, RemarkIsABadTargetForAWholeSeverity) {
   EXPECT_TRUE(applyDiagnosticOption(DiagnosticRemark, "warning"));
   EXPECT_TRUE(applyDiagnosticOption(DiagnosticRemark, "Error"));
-  EXPECT_EQ(errorText(), "Warning: L9962I: Unknown diagnostic number warning\n"
-                         "Warning: L9962I: Unknown diagnostic number Error\n");
+  EXPECT_EQ(getErrorText(), "Warning: L9962I: Unknown diagnostic number warning\n"
+                            "Warning: L9962I: Unknown diagnostic number Error\n");
   EXPECT_EQ(severityOfNonElf(WarningWord), Severity_Warning);
 }
 
@@ -103,7 +103,7 @@ TEST_F(DiagnosticControlTest, AnotherToolsLetterIsPassedOver) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "Q6875"));
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticWarning, "Q1234"));
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, "warnings"));
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
   EXPECT_EQ(severityOfNonElf(WarningWord), Severity_Warning);
 }
 
@@ -114,7 +114,7 @@ TEST_F(DiagnosticControlTest, TheToolsLetterCountsInEitherCase) {
 
 TEST_F(DiagnosticControlTest, AnEmptyElementIsNothing) {
   EXPECT_FALSE(applyDiagnosticOption(DiagnosticError, ""));
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
 }
 
 TEST_F(DiagnosticControlTest, NumbersOutsideTheRangeAreBad) {
@@ -124,9 +124,10 @@ TEST_F(DiagnosticControlTest, NumbersOutsideTheRangeAreBad) {
   }
   EXPECT_EQ(severityOfNonElf(WarningWord), Severity_Warning);
   EXPECT_EQ(getCounters().warnings, 12u);
-  EXPECT_TRUE(errorText().starts_with("Warning: L9962I: Unknown diagnostic number 0\n"
-                                      "Warning: L9962I: Unknown diagnostic number 10000\n"
-                                      "Warning: L9962I: Unknown diagnostic number 4294974171\n"));
+  EXPECT_TRUE(
+      getErrorText().starts_with("Warning: L9962I: Unknown diagnostic number 0\n"
+                                 "Warning: L9962I: Unknown diagnostic number 10000\n"
+                                 "Warning: L9962I: Unknown diagnostic number 4294974171\n"));
 }
 
 TEST_F(DiagnosticControlTest, FirstAndLastNumberOfTheRangeAreGood) {
@@ -142,7 +143,7 @@ TEST_F(DiagnosticControlTest, TheReportOfABadElementCannotBeMoved) {
   applyDiagnosticOption(DiagnosticSuppress, "warning");
   applyDiagnosticOption(DiagnosticError, "9962");
   EXPECT_TRUE(applyDiagnosticOption(DiagnosticError, "0"));
-  EXPECT_EQ(errorText(), "Warning: L9962I: Unknown diagnostic number 0\n");
+  EXPECT_EQ(getErrorText(), "Warning: L9962I: Unknown diagnostic number 0\n");
 }
 
 TEST_F(DiagnosticControlTest, AnOverrideDoesNotChangeWhatWasCounted) {
@@ -155,7 +156,7 @@ TEST_F(DiagnosticControlTest, AnOverrideDoesNotChangeWhatWasCounted) {
 TEST_F(DiagnosticControlTest, LiteralFormatsAreOutOfReachOfNumbers) {
   applyDiagnosticOption(DiagnosticSuppress, "warning");
   EXPECT_TRUE(reportFormat(RemarkWord, nullptr, " * %s [%u] : %s", "a", 0u, "a"));
-  EXPECT_EQ(errorText(), " * a [0] : a\n");
+  EXPECT_EQ(getErrorText(), " * a [0] : a\n");
 }
 
 TEST_F(DiagnosticControlTest, InitialiseForgetsAllOverrides) {

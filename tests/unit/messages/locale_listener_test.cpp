@@ -60,17 +60,18 @@ struct LocaleListenerTest : MessagesTest {
 TEST_F(LocaleListenerTest, ActsDuringTheParseAndLetsTheValueBeStored) {
   EXPECT_TRUE(parse("--message_locale=ja_JP.utf8", reportFatal));
   EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
 }
 
 TEST_F(LocaleListenerTest, ReportsABadLocaleWholeAndEndsTheRun) {
   EXPECT_EQ(statusOf([&] { parse("--message_locale=fr_FR.UTF-8", reportFatal); }), 1);
-  EXPECT_EQ(errorText(), "Fatal error: L9780E: Could not initialise message locale fr_FR.UTF-8\n");
+  EXPECT_EQ(getErrorText(),
+            "Fatal error: L9780E: Could not initialise message locale fr_FR.UTF-8\n");
 }
 
 TEST_F(LocaleListenerTest, TellsABadLocaleInPlainWordsWithoutAReporter) {
   EXPECT_EQ(statusOf([&] { parse("--message_locale=C", nullptr); }), 1);
-  EXPECT_EQ(errorText(), "*** Could not initialise message locale 'C'\n");
+  EXPECT_EQ(getErrorText(), "*** Could not initialise message locale 'C'\n");
 }
 
 } // namespace messages

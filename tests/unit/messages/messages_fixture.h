@@ -23,7 +23,7 @@ public:
   }
   void failWith(int errorNumber) { m_Error = errorNumber; }
   size_t writeCount() const { return m_Writes.size(); }
-  std::string text() const {
+  std::string getText() const {
     std::string all;
     for (const std::string& piece : m_Writes)
       all += piece;
@@ -52,11 +52,11 @@ protected:
     setExitHandler(nullptr);
   }
 
-  std::string errorText() const { return m_Error.text(); }
+  std::string getErrorText() const { return m_Error.getText(); }
 
   std::string outputText() {
     flushAll();
-    return m_Output.text();
+    return m_Output.getText();
   }
 
   // The status that the process ended with, or -1 if it went on.

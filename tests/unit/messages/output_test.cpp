@@ -88,7 +88,7 @@ TEST_F(OutputTest, StdoutIsGatheredAndFlushedAtTheEnd) {
   writeRaw("b");
   EXPECT_EQ(m_Output.writeCount(), 0u);
   EXPECT_TRUE(flushAll());
-  EXPECT_EQ(m_Output.text(), "a\nb");
+  EXPECT_EQ(m_Output.getText(), "a\nb");
   EXPECT_EQ(m_Output.writeCount(), 1u);
 }
 
@@ -119,7 +119,7 @@ TEST_F(OutputTest, TextIsEscapedOnBothStreams) {
   writeText(Stream::Output, text);
   writeText(Stream::Error, text);
   EXPECT_EQ(outputText(), "\\000\\037 ~\\177\x80\t\n");
-  EXPECT_EQ(errorText(), outputText());
+  EXPECT_EQ(getErrorText(), outputText());
 }
 
 TEST_F(OutputTest, AByteIsEscapedWhereverItStands) {
@@ -174,7 +174,7 @@ TEST_F(OutputTest, AListingEndsWhereStdoutFails) {
   for (int i = 0; i < 5000; ++i)
     listingMessage(ListedMember, "before.o");
   report(WarningWord, nullptr, NoArchiveSpecified);
-  const std::string before = m_Output.text();
+  const std::string before = m_Output.getText();
   EXPECT_EQ(before.size(), 5000u * 9);
   m_Output.failWith(ENOSPC);
   for (int i = 0; i < 20000; ++i)
@@ -183,7 +183,7 @@ TEST_F(OutputTest, AListingEndsWhereStdoutFails) {
   listingMessage(ListedMember, "late.o");
   EXPECT_FALSE(flushAll());
   EXPECT_EQ(getStdoutError(), ENOSPC);
-  EXPECT_EQ(m_Output.text(), before);
+  EXPECT_EQ(m_Output.getText(), before);
 }
 
 TEST_F(OutputTest, AFailureOfStdoutIsRememberedAndTheRestDropped) {
@@ -197,7 +197,7 @@ TEST_F(OutputTest, AFailureOfStdoutIsRememberedAndTheRestDropped) {
   writeRaw(std::string(MoreThanTheBuffer, 'x'));
   writeRaw("b");
   EXPECT_FALSE(flushAll());
-  EXPECT_EQ(m_Output.text(), "");
+  EXPECT_EQ(m_Output.getText(), "");
 }
 
 TEST_F(OutputTest, AFailureOfALargePieceIsRememberedToo) {

@@ -21,9 +21,9 @@ TEST_F(ReportTest, PrintsPrefixCodeAndText) {
   EXPECT_TRUE(report(ErrorWord, nullptr, NoActionSpecified, "dmpqrtx"));
   EXPECT_TRUE(report(WarningWord, nullptr, AddingNonElfObject, "a.txt", "lib.a"));
   EXPECT_TRUE(report(FatalWord, nullptr, OutOfMemory));
-  EXPECT_EQ(errorText(), "Error: L6839E: One of the actions -[dmpqrtx] must be specified\n"
-                         "Warning: L6875W: Adding non-ELF object 'a.txt' to archive 'lib.a'\n"
-                         "Fatal error: L6800U: Out of memory\n");
+  EXPECT_EQ(getErrorText(), "Error: L6839E: One of the actions -[dmpqrtx] must be specified\n"
+                            "Warning: L6875W: Adding non-ELF object 'a.txt' to archive 'lib.a'\n"
+                            "Fatal error: L6800U: Out of memory\n");
 }
 
 TEST_F(ReportTest, PrintsRemarksWithoutPrefixOrCodeInEveryStyle) {
@@ -31,14 +31,14 @@ TEST_F(ReportTest, PrintsRemarksWithoutPrefixOrCodeInEveryStyle) {
     setStyle(number);
     report(RemarkWord, nullptr, CreatingArchive, "lib.a");
   }
-  EXPECT_EQ(errorText(), "Creating archive 'lib.a'\n"
-                         "quarn : Creating archive 'lib.a'\n"
-                         "Creating archive 'lib.a'\n");
+  EXPECT_EQ(getErrorText(), "Creating archive 'lib.a'\n"
+                            "quarn : Creating archive 'lib.a'\n"
+                            "Creating archive 'lib.a'\n");
 }
 
 TEST_F(ReportTest, AlwaysShowsTheCodeLetterOfTheTool) {
   report(FatalWord, nullptr, UnrecognizedOption, "--", "x");
-  EXPECT_EQ(errorText(), "Fatal error: L3900U: Unrecognized option '--x'.\n");
+  EXPECT_EQ(getErrorText(), "Fatal error: L3900U: Unrecognized option '--x'.\n");
 }
 
 TEST_F(ReportTest, PrintsEachPrefixOfEachStyle) {
@@ -62,7 +62,7 @@ TEST_F(ReportTest, PrintsEachPrefixOfEachStyle) {
   std::string::size_type at = 0;
   while ((at = all.find(" x\n", at)) != std::string::npos)
     all.replace(at, 3, " No archive specified\n");
-  EXPECT_EQ(errorText(), all);
+  EXPECT_EQ(getErrorText(), all);
 }
 
 TEST_F(ReportTest, ShowsWhatIsKnownOfTheLocation) {
@@ -79,7 +79,7 @@ TEST_F(ReportTest, ShowsWhatIsKnownOfTheLocation) {
     }
   }
   EXPECT_EQ(
-      errorText(),
+      getErrorText(),
       "x\n\"a.via\": x\n\"a.via\", line 3: x\n\"a.via\", line 3 (column 9): x\nx\n\"a.via\": x\n"
       "quarn : x\na.via : x\na.via(3) : x\na.via(3,9) : x\nquarn : x\na.via : x\n"
       "x\na.via: x\na.via:3: x\na.via:3:9: x\nx\na.via: x\n");
@@ -88,40 +88,41 @@ TEST_F(ReportTest, ShowsWhatIsKnownOfTheLocation) {
 TEST_F(ReportTest, StyleOneHasToolNameAndNoSeverityLetter) {
   setStyle(1);
   report(ErrorWord, nullptr, NoActionSpecified, "dmpqrtx");
-  EXPECT_EQ(errorText(), "quarn : error L6839:  One of the actions -[dmpqrtx] must be specified\n");
+  EXPECT_EQ(getErrorText(),
+            "quarn : error L6839:  One of the actions -[dmpqrtx] must be specified\n");
 }
 
 TEST_F(ReportTest, PrintsALiteralFormatWithoutCode) {
   EXPECT_TRUE(reportFormat(RemarkWord, nullptr, "[%s %s]", "quarn", "-t 100%s.a"));
   EXPECT_TRUE(reportFormat(WarningWord, nullptr, "odd"));
-  EXPECT_EQ(errorText(), "[quarn -t 100%s.a]\nWarning: odd\n");
+  EXPECT_EQ(getErrorText(), "[quarn -t 100%s.a]\nWarning: odd\n");
   EXPECT_EQ(getCounters().remarks, 1u);
   EXPECT_EQ(getCounters().warnings, 1u);
 }
 
 TEST_F(ReportTest, PrintsNoNewlineBehindAnEmptyText) {
   reportFormat(RemarkWord, nullptr, "");
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
   reportFormat(RemarkWord, nullptr, " * %s clashes with %s\n", "A", "B");
-  EXPECT_EQ(errorText(), " * A clashes with B\n\n");
+  EXPECT_EQ(getErrorText(), " * A clashes with B\n\n");
 }
 
 TEST_F(ReportTest, NeverReadsAnArgumentAsFormat) {
   report(ErrorWord, nullptr, MalformedArchive, "%s%n%d", "%1$s %%");
-  EXPECT_EQ(errorText(), "Error: L6829E: '%s%n%d': malformed archive: %1$s %%\n");
+  EXPECT_EQ(getErrorText(), "Error: L6829E: '%s%n%d': malformed archive: %1$s %%\n");
 }
 
 TEST_F(ReportTest, EscapesControlBytesAndPassesTheOthers) {
   report(ErrorWord, nullptr, FileDoesNotExist, "a\001\r\033[0m\177\\\t\n\xe3\x81\x82\xff");
   EXPECT_EQ(
-      errorText(),
+      getErrorText(),
       "Error: L6833E: File 'a\\001\\015\\033[0m\\177\\\t\n\xe3\x81\x82\xff' does not exist\n");
 }
 
 TEST_F(ReportTest, PrintsVeryLongNamesWhole) {
   const std::string name(100000, 'n');
   report(ErrorWord, nullptr, FileDoesNotExist, name);
-  EXPECT_EQ(errorText(), "Error: L6833E: File '" + name + "' does not exist\n");
+  EXPECT_EQ(getErrorText(), "Error: L6833E: File '" + name + "' does not exist\n");
 }
 
 TEST_F(ReportTest, WritesEachDiagnosticWithOneCall) {
@@ -156,15 +157,15 @@ TEST_F(ReportTest, CountsEachSeverity) {
 TEST_F(ReportTest, ASuppressedMessageIsCountedAndNotPrinted) {
   EXPECT_FALSE(report(severityWord(Severity_Suppressed), nullptr, NoArchiveSpecified));
   EXPECT_FALSE(reportFormat(severityWord(Severity_Suppressed), nullptr, "x"));
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
   EXPECT_EQ(getCounters().suppressed, 2u);
 }
 
 TEST_F(ReportTest, TheFiftyFirstErrorEndsTheRunUnprinted) {
   reportErrors(50);
-  const std::string before = errorText();
+  const std::string before = getErrorText();
   EXPECT_EQ(statusOf([&] { reportErrors(1); }), 1);
-  EXPECT_EQ(errorText(), before);
+  EXPECT_EQ(getErrorText(), before);
   EXPECT_EQ(m_Error.writeCount(), 50u);
 }
 
@@ -207,8 +208,8 @@ TEST_F(ReportTest, PlainMessagesKeepAccountOfTheColumn) {
   EXPECT_EQ(getColumn(), 3u);
   plainMessage(ListedMember, "a.o");
   EXPECT_EQ(getColumn(), 0u);
-  EXPECT_EQ(errorText(), "No archive specifiedNo archive specified"
-                         "The following arguments to option 'x' can be selected:\n aba.o\n");
+  EXPECT_EQ(getErrorText(), "No archive specifiedNo archive specified"
+                            "The following arguments to option 'x' can be selected:\n aba.o\n");
   EXPECT_EQ(getCounters().remarks, 0u);
 }
 
@@ -226,18 +227,18 @@ TEST_F(ReportTest, DiagnosticsAndListingLinesResetTheColumn) {
 TEST_F(ReportTest, ListingsGoToStdoutWhateverTheStreamOfDiagnostics) {
   listingMessage(ListedMember, "a\001.o");
   EXPECT_EQ(outputText(), "a\\001.o\n");
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
   EXPECT_EQ(getCounters().remarks, 0u);
   setDiagnosticStream(Stream::Output);
   report(ErrorWord, nullptr, NoArchiveSpecified);
   plainMessage(ListedMember, "b.o");
   EXPECT_EQ(outputText(), "a\\001.o\nError: L6838E: No archive specified\nb.o\n");
-  EXPECT_EQ(errorText(), "");
+  EXPECT_EQ(getErrorText(), "");
 }
 
 TEST_F(ReportTest, AFormatThatReachesBeyondTwentyArgumentsEndsTheRun) {
   EXPECT_EQ(statusOf([] { reportFormat(RemarkWord, nullptr, "%21$s", "a"); }), 1);
-  EXPECT_EQ(errorText(), "** NLS Fatal Error: Too many arguments in format string\n");
+  EXPECT_EQ(getErrorText(), "** NLS Fatal Error: Too many arguments in format string\n");
 }
 
 TEST_F(ReportTest, InitialiseBringsBackTheStateOfAFreshProcess) {

@@ -33,7 +33,7 @@ TEST_F(ArlibErrorHandlerTest, TellsWhatClashesInTheAttributesOfAGroup) {
   const elfext::FullAttr attributes = elfext::parseAttributeString(
       "$ZEV_ISAv4$M_PROFILE$KRL_ISAv3M$HFUv1$PE$ME$A:L44UL41$IEEE1$STKCKD$~STKCKD$EBA4$EBA8");
   ArlibErrorHandler(true).reportCommonAttributesClash(m_Archive, m_Members, attributes);
-  EXPECT_EQ(errorText(),
+  EXPECT_EQ(getErrorText(),
             "Warning: L6878W: Common attributes of minor variant group beginning with 'a.o' are "
             "incompatible with library attributes.\n"
             " * pure-endian double clashes with mixed-endian double\n\n"
@@ -47,10 +47,10 @@ TEST_F(ArlibErrorHandlerTest, TellsWhatClashesInThoseOfAMember) {
   const elfext::FullAttr attributes = elfext::parseAttributeString("$KCPv3$HFUi1$A:L84UL41$IEEE1");
   EXPECT_TRUE(
       ArlibErrorHandler(true).reportMemberAttributesClash(m_Archive, *m_Members[1], attributes));
-  EXPECT_EQ(errorText(), "Warning: L6879W: Attributes of minor variant member object 'b.o' are "
-                         "incompatible with library attributes.\n"
-                         " * KCP clashes with HFU\n\n"
-                         " * L/S clashes with UL/US\n\n");
+  EXPECT_EQ(getErrorText(), "Warning: L6879W: Attributes of minor variant member object 'b.o' are "
+                            "incompatible with library attributes.\n"
+                            " * KCP clashes with HFU\n\n"
+                            " * L/S clashes with UL/US\n\n");
 }
 
 TEST_F(ArlibErrorHandlerTest, KeepsTheClashesToItselfUnlessAsked) {
@@ -59,10 +59,11 @@ TEST_F(ArlibErrorHandlerTest, KeepsTheClashesToItselfUnlessAsked) {
       ArlibErrorHandler(false).reportCommonAttributesClash(m_Archive, m_Members, attributes));
   EXPECT_TRUE(
       ArlibErrorHandler(false).reportMemberAttributesClash(m_Archive, *m_Members[0], attributes));
-  EXPECT_EQ(errorText(), "Warning: L6878W: Common attributes of minor variant group beginning with "
-                         "'a.o' are incompatible with library attributes.\n"
-                         "Warning: L6879W: Attributes of minor variant member object 'a.o' are "
-                         "incompatible with library attributes.\n");
+  EXPECT_EQ(getErrorText(),
+            "Warning: L6878W: Common attributes of minor variant group beginning with "
+            "'a.o' are incompatible with library attributes.\n"
+            "Warning: L6879W: Attributes of minor variant member object 'a.o' are "
+            "incompatible with library attributes.\n");
 }
 
 } // namespace quarn

@@ -56,7 +56,7 @@ TEST_F(SourceFileTest, TellsWhyItCannotBeOpened) {
   m_Disk.addFile("a", "x");
   m_Host.failCall(2, EIO);
   EXPECT_EQ(m_Files.open("a", file), EIO);
-  EXPECT_EQ(m_Host.failedOperation(), "statusOf");
+  EXPECT_EQ(m_Host.getFailedOperation(), "statusOf");
   EXPECT_EQ(m_Disk.openHandles(), 0u);
 }
 
@@ -255,7 +255,7 @@ TEST_F(SourceFileTest, IsNotKeptIfItCannotBeReadAsItIs) {
   std::shared_ptr<SourceFile> file;
   m_Host.failCall(3, EIO);
   ASSERT_EQ(m_Files.openToKeep("a", file), 0);
-  EXPECT_EQ(m_Host.failedOperation(), "readAt");
+  EXPECT_EQ(m_Host.getFailedOperation(), "readAt");
   EXPECT_FALSE(file->isKept());
   m_Host.failCall(0, 0);
   EXPECT_EQ(textOf(*file), "small");

@@ -38,7 +38,7 @@ protected:
   Session m_Session;
 };
 
-TEST_F(CallBackOption, handsTheWordOver) {
+TEST_F(CallBackOption, HandsTheWordOver) {
   m_Session.parse({"--call=a", "--call", "b", "-k"});
   EXPECT_THAT(m_Handler.m_Lines, ElementsAre("call/a/1", "call/b/2", "k/<null>/1"));
   EXPECT_EQ(m_Session.parser().getRecord(Id_CallBack).firstSet, 1u);
@@ -46,47 +46,47 @@ TEST_F(CallBackOption, handsTheWordOver) {
   EXPECT_THAT(m_Session.m_Listener.m_Lines, IsEmpty());
 }
 
-TEST_F(CallBackOption, mayUseFewerWords) {
+TEST_F(CallBackOption, MayUseFewerWords) {
   m_Handler.m_WordsUsed = 1;
   m_Session.parse({"--call", "b"});
   EXPECT_THAT(m_Session.texts(Id_Words), ElementsAre("b"));
 }
 
-TEST_F(CallBackOption, mayRefuseTheArgument) {
+TEST_F(CallBackOption, MayRefuseTheArgument) {
   m_Handler.m_Answer = false;
   m_Session.parse({"--call=a"});
-  EXPECT_THAT(m_Session.reports(),
+  EXPECT_THAT(m_Session.getReports(),
               ElementsAre("fatal: Argument 'a' not permitted for option 'call'."));
   EXPECT_FALSE(m_Session.parser().isSet(Id_CallBack));
 }
 
-TEST_F(CallBackOption, mayMakeTheWordUnknown) {
+TEST_F(CallBackOption, MayMakeTheWordUnknown) {
   m_Handler.m_Answer = false;
   m_Handler.m_WordsUsed = 0;
   m_Session.parse({"--call=a"});
-  EXPECT_THAT(m_Session.reports(), ElementsAre("fatal: Unrecognized option '--call=a'."));
+  EXPECT_THAT(m_Session.getReports(), ElementsAre("fatal: Unrecognized option '--call=a'."));
 }
 
-TEST_F(CallBackOption, mayStandInAConcatenation) {
+TEST_F(CallBackOption, MayStandInAConcatenation) {
   m_Session.parse({"-kx"});
   EXPECT_THAT(m_Handler.m_Lines, ElementsAre("k/<null>/1"));
   EXPECT_TRUE(m_Session.parser().getBoolean(Id_Boolean));
 }
 
-TEST_F(CallBackOption, isRefusedWithoutAHandler) {
+TEST_F(CallBackOption, IsRefusedWithoutAHandler) {
   m_Session.m_Definitions[Id_CallBack].defaultValue.handler = nullptr;
   m_Session.parse({"--call=a"});
-  EXPECT_THAT(m_Session.reports(),
+  EXPECT_THAT(m_Session.getReports(),
               ElementsAre("fatal: Argument 'a' not permitted for option 'call'."));
 }
 
-TEST_F(CallBackOption, printsItselfWhenSet) {
+TEST_F(CallBackOption, PrintsItselfWhenSet) {
   EXPECT_EQ(m_Session.commandLine(), "");
   m_Session.parse({"-k", "-x"});
   EXPECT_EQ(m_Session.commandLine(), "-x --call=taken");
 }
 
-TEST_F(CallBackOption, isReleased) {
+TEST_F(CallBackOption, IsReleased) {
   m_Session.parse({"-k"});
   m_Session.parser().releaseValues();
   EXPECT_THAT(m_Handler.m_Lines, IsEmpty());

@@ -8,43 +8,43 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 
 // clang-format off
-constexpr MatchString rivalRows[] = {
+constexpr MatchString RivalRows[] = {
   {"A",   0, Kind_Required, {}, nullptr, ',', Flag_OldSyntax | Flag_Public},
   {"a",   0, Kind_Required, {}, nullptr, ',', Flag_OldSyntax | Flag_Public},
-  {"abc", 1, Kind_Implied,  on, nullptr, ',', Flag_OldSyntax | Flag_Public},
+  {"abc", 1, Kind_Implied,  On, nullptr, ',', Flag_OldSyntax | Flag_Public},
   {"ne1", 0, Kind_Required, {}, nullptr, ',', Flag_Public},
   {"ne2", 0, Kind_Required, {}, nullptr, ',', Flag_Public},
-  {"ne3", 1, Kind_Implied,  on, nullptr, ',', Flag_Public},
+  {"ne3", 1, Kind_Implied,  On, nullptr, ',', Flag_Public},
 };
 // clang-format on
-constexpr ValueDefinition rivalDefinitions[] = {textOf(nullptr), flagOf(nullptr)};
-static_assert(areWellFormed(rivalRows, std::size(rivalDefinitions)));
+constexpr ValueDefinition RivalDefinitions[] = {textOf(nullptr), flagOf(nullptr)};
+static_assert(areWellFormed(RivalRows, std::size(RivalDefinitions)));
 
 Lines rivalReports(std::initializer_list<const char*> words) {
-  const OptionTable rivals{rivalRows, indexByFirstLetter(rivalRows)};
-  ParserSession session(rivals, rivalDefinitions);
+  const OptionTable rivals{RivalRows, indexByFirstLetter(RivalRows)};
+  ParserSession session(rivals, RivalDefinitions);
   session.parse(words);
-  return session.reports();
+  return session.getReports();
 }
 
-TEST(RivalRows, giveWayToALongerMatch) {
+TEST(RivalRows, GiveWayToALongerMatch) {
   EXPECT_THAT(rivalReports({"-abx"}),
               ElementsAre("remark: Possible matches for 'abx' include 'A' and 'a'.",
                           "fatal: Unrecognized option '-abx'."));
   EXPECT_THAT(rivalReports({"-abc"}), ElementsAre("warning: Old syntax, please use '--abc'."));
 }
 
-TEST(RivalRows, stayAmbiguousWhenABetterKindTakesTheFirstPlace) {
+TEST(RivalRows, StayAmbiguousWhenABetterKindTakesTheFirstPlace) {
   EXPECT_THAT(rivalReports({"--ne."}),
               ElementsAre("remark: Possible matches for 'ne.' include 'ne3' and 'ne2'.",
                           "fatal: Unrecognized option '--ne.'."));
 }
 
-TEST(LetterBeforeADot, isNoAbbreviation) {
+TEST(LetterBeforeADot, IsNoAbbreviation) {
   Session session;
   session.parse({"-a.o"});
   EXPECT_STREQ(session.parser().getText(Id_After), ".o");
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
 } // namespace tabledrivenparser::tool

@@ -27,20 +27,20 @@ std::string typeReportOf(std::initializer_list<const char*> words) {
 
 } // namespace
 
-TEST(CommandLineReport, isEmptyForNothing) {
+TEST(CommandLineReport, IsEmptyForNothing) {
   EXPECT_EQ(reportOf({}), "");
 }
 
-TEST(CommandLineReport, separatesEntriesByOneBlank) {
+TEST(CommandLineReport, SeparatesEntriesByOneBlank) {
   EXPECT_EQ(reportOf({"--show_cmdline", "-t", "lib.a"}), "--show_cmdline -t lib.a");
 }
 
-TEST(CommandLineReport, goesByIdsAndPutsPositionalWordsLast) {
+TEST(CommandLineReport, GoesByIdsAndPutsPositionalWordsLast) {
   EXPECT_EQ(reportOf({"x.o", "--libattrmap=m", "-v", "--create", "y.o"}),
             "--create -v --libattrmap=m x.o y.o");
 }
 
-TEST(CommandLineReport, showsTheBestRowOfAnOption) {
+TEST(CommandLineReport, ShowsTheBestRowOfAnOption) {
   EXPECT_EQ(reportOf({"-V"}), "--vsn");
   EXPECT_EQ(reportOf({"-h"}), "--help");
   EXPECT_EQ(reportOf({"-q"}), "-r");
@@ -48,47 +48,47 @@ TEST(CommandLineReport, showsTheBestRowOfAnOption) {
   EXPECT_EQ(reportOf({"--no_normalise=0x10"}), "--normalise=16");
 }
 
-TEST(CommandLineReport, leavesOutWhatIsTheDefaultAgain) {
+TEST(CommandLineReport, LeavesOutWhatIsTheDefaultAgain) {
   EXPECT_EQ(reportOf({"--no_debug_symbols", "--normalise=0", "--diag_style=zev"}), "");
   EXPECT_EQ(reportOf({"--debug_symbols", "--no_debug_symbols"}), "");
   EXPECT_EQ(reportOf({"--no_debug_symbols", "--debug_symbols"}), "--debug_symbols");
 }
 
-TEST(CommandLineReport, namesEnumerators) {
+TEST(CommandLineReport, NamesEnumerators) {
   EXPECT_EQ(reportOf({"--diag_style=IDE"}), "--diag_style=ide");
   EXPECT_EQ(reportOf({"--diag_style=list"}), "--diag_style=list");
 }
 
-TEST(CommandLineReport, namesAnEnumeratorAsItWouldBeTakenAgain) {
-  static constexpr MatchString entries[] = {
-      {"hidden", 4, Kind_Required, {}, types::expertMask, 0},
+TEST(CommandLineReport, NamesAnEnumeratorAsItWouldBeTakenAgain) {
+  static constexpr MatchString Entries[] = {
+      {"hidden", 4, Kind_Required, {}, types::ExpertMask, 0},
       {"old", 4, Kind_Required, {}, nullptr, 1},
       {"new", 4},
       {"newer", 4},
   };
-  static constexpr Enumeration enumeration{entries};
+  static constexpr Enumeration Enumerators{Entries};
   types::Session session;
   session.m_Table.restrictionMask = 1;
-  session.m_Definitions[types::Id_Enum].constraint.enumeration = &enumeration;
+  session.m_Definitions[types::Id_Enum].constraint.enumeration = &Enumerators;
   session.parse({"--enum=newer"});
   EXPECT_EQ(session.commandLine(), "--enum=new");
 }
 
-TEST(CommandLineReport, namesADeprecatedEnumeratorThatHasNoOtherName) {
-  static constexpr MatchString entries[] = {{"old", 4, Kind_Required, {}, nullptr, 1}};
-  static constexpr Enumeration enumeration{entries};
+TEST(CommandLineReport, NamesADeprecatedEnumeratorThatHasNoOtherName) {
+  static constexpr MatchString Entries[] = {{"old", 4, Kind_Required, {}, nullptr, 1}};
+  static constexpr Enumeration Enumerators{Entries};
   types::Session session;
-  session.m_Definitions[types::Id_Enum].constraint.enumeration = &enumeration;
+  session.m_Definitions[types::Id_Enum].constraint.enumeration = &Enumerators;
   session.parse({"--enum=old"});
   EXPECT_EQ(session.commandLine(), "--enum=old");
 }
 
-TEST(CommandLineReport, showsEachElementOfAVector) {
+TEST(CommandLineReport, ShowsEachElementOfAVector) {
   EXPECT_EQ(reportOf({"--diag_error=L1,L2", "--diag_warning=w", "--diag_error", ""}),
             "--diag_error=L1 --diag_error=L2 --diag_error= --diag_warning=w");
 }
 
-TEST(CommandLineReport, showsViaFilesBesideTheirWords) {
+TEST(CommandLineReport, ShowsViaFilesBesideTheirWords) {
   tool::Session session;
   session.m_Files.m_Contents["f"] = "-t word";
   session.m_Files.m_Contents["g"] = "";
@@ -96,28 +96,28 @@ TEST(CommandLineReport, showsViaFilesBesideTheirWords) {
   EXPECT_EQ(session.commandLine(), "-t --via=f --via=g word");
 }
 
-TEST(CommandLineReport, quotesValuesWithBlanksAsAWhole) {
+TEST(CommandLineReport, QuotesValuesWithBlanksAsAWhole) {
   EXPECT_EQ(reportOf({"-a", "x y", "--libattrmap=m\tm", "my lib.a", "a\"b"}),
             "-a\"x y\" --libattrmap=\"m\tm\" \"my lib.a\" a\"b");
 }
 
-TEST(CommandLineReport, showsEmptyTexts) {
+TEST(CommandLineReport, ShowsEmptyTexts) {
   EXPECT_EQ(reportOf({"--libattrmap=", "", "x"}), "--libattrmap= \"\" x");
 }
 
-TEST(CommandLineReport, partsALetterFromAValueThatWouldNotReadBack) {
+TEST(CommandLineReport, PartsALetterFromAValueThatWouldNotReadBack) {
   EXPECT_EQ(reportOf({"-a", ""}), "-a=");
   EXPECT_EQ(reportOf({"-a", "=x"}), "-a==x");
   EXPECT_EQ(reportOf({"-a", ",x"}), "-a=,x");
   EXPECT_EQ(reportOf({"-a", "-x"}), "-a-x");
 }
 
-TEST(CommandLineReport, marksTheEndOfOptions) {
+TEST(CommandLineReport, MarksTheEndOfOptions) {
   EXPECT_EQ(reportOf({"-t", "x", "--", "-odd.a"}), "-t -- x -odd.a");
   EXPECT_EQ(reportOf({"-t", "-"}), "-t -");
 }
 
-TEST(CommandLineReport, leavesOutWhatAListenerTook) {
+TEST(CommandLineReport, LeavesOutWhatAListenerTook) {
   tool::Session session;
   session.m_Listener.m_Answer = [](Parser&, uint32_t id, const Value& value) {
     return id == tool::Id_DiagError && std::string_view(value.text) == "bad";
@@ -126,7 +126,7 @@ TEST(CommandLineReport, leavesOutWhatAListenerTook) {
   EXPECT_EQ(session.commandLine(), "--diag_error=L1 --diag_error=L2");
 }
 
-TEST(CommandLineReport, writesEveryType) {
+TEST(CommandLineReport, WritesEveryType) {
   EXPECT_EQ(typeReportOf({"--addr=255"}), "--addr=0xFF");
   EXPECT_EQ(typeReportOf({"--add64=0xABCDEF0123456789"}), "--add64=0xABCDEF0123456789");
   EXPECT_EQ(typeReportOf({"--int=-7"}), "--int=-7");
@@ -137,15 +137,15 @@ TEST(CommandLineReport, writesEveryType) {
   EXPECT_EQ(typeReportOf({"--enum=green", "--enum=choose"}), "--enum=Choose");
 }
 
-TEST(CommandLineReport, writesBooleansAsWordsWhereARowWantsOne) {
+TEST(CommandLineReport, WritesBooleansAsWordsWhereARowWantsOne) {
   types::Session session;
-  const auto onlyLong = rowsNamed(types::rows, "bool");
+  const auto onlyLong = rowsNamed(types::Rows, "bool");
   session.m_Definitions[types::Id_Boolean].rows = onlyLong.data();
   session.parse({"-x"});
   EXPECT_EQ(session.commandLine(), "--bool=true");
 }
 
-TEST(CommandLineReport, prefersARowWithoutArgumentToALongName) {
+TEST(CommandLineReport, PrefersARowWithoutArgumentToALongName) {
   EXPECT_EQ(typeReportOf({"--bool", "y"}), "-x");
   EXPECT_EQ(typeReportOf({"--int=1"}), "--int1");
   EXPECT_EQ(typeReportOf({"--addr=0xABCDEF"}), "--address");
@@ -153,11 +153,11 @@ TEST(CommandLineReport, prefersARowWithoutArgumentToALongName) {
   EXPECT_EQ(typeReportOf({"--enum=red"}), "--red");
 }
 
-TEST(CommandLineReport, prefersARowThatIsNotDeprecated) {
+TEST(CommandLineReport, PrefersARowThatIsNotDeprecated) {
   EXPECT_EQ(typeReportOf({"--text_x"}), "--text=x");
 }
 
-TEST(CommandLineReport, showsARestrictedRowOnlyWhereItIsUsable) {
+TEST(CommandLineReport, ShowsARestrictedRowOnlyWhereItIsUsable) {
   EXPECT_EQ(typeReportOf({"--texts=y"}), "--texts_y");
   types::Session session;
   session.m_Table.restrictionMask = 1;
@@ -165,9 +165,9 @@ TEST(CommandLineReport, showsARestrictedRowOnlyWhereItIsUsable) {
   EXPECT_EQ(session.commandLine(), "--texts=y");
 }
 
-TEST(CommandLineReport, leavesOutAValueThatNoRowFits) {
+TEST(CommandLineReport, LeavesOutAValueThatNoRowFits) {
   types::Session session;
-  const auto onlyFlag = rowsNamed(types::rows, "int1");
+  const auto onlyFlag = rowsNamed(types::Rows, "int1");
   session.m_Definitions[types::Id_Int].rows = onlyFlag.data();
   session.parse({"--int=2", "-x"});
   EXPECT_EQ(session.commandLine(), "-x");
@@ -177,7 +177,7 @@ TEST(CommandLineReport, leavesOutAValueThatNoRowFits) {
   EXPECT_EQ(without.commandLine(), "");
 }
 
-TEST(CommandLineReport, givesTheFallbackHandlerItsTurnBeforeTheWords) {
+TEST(CommandLineReport, GivesTheFallbackHandlerItsTurnBeforeTheWords) {
   class Fallback final : public FallbackHandler {
   public:
     uint32_t takeWord(Parser&, const char*, const char*, uint32_t) override { return 1; }
@@ -193,7 +193,7 @@ TEST(CommandLineReport, givesTheFallbackHandlerItsTurnBeforeTheWords) {
   EXPECT_EQ(session.commandLine(), "--int=2 --mine -- word");
 }
 
-TEST(CommandLineReport, tellsTheSizeNeeded) {
+TEST(CommandLineReport, TellsTheSizeNeeded) {
   tool::Session session;
   session.parse({"-t", "lib.a"});
   std::array<char, 9> enough{};
@@ -246,16 +246,16 @@ private:
   uint32_t pick(uint32_t bound) { return static_cast<uint32_t>(m_Random() % bound); }
 
   std::string text() {
-    static constexpr std::string_view letters = "atvx=,-. \t\n\x01\\%#(;'1A\xc3\xff";
+    static constexpr std::string_view Letters = "atvx=,-. \t\n\x01\\%#(;'1A\xc3\xff";
     std::string result;
     for (uint32_t count = pick(5); count > 0; --count) {
-      result += letters[pick(static_cast<uint32_t>(letters.size()))];
+      result += Letters[pick(static_cast<uint32_t>(Letters.size()))];
     }
     return result;
   }
 
   void addWords(Lines& words) {
-    static const char* const flags[] = {"-t",
+    static const char* const Flags[] = {"-t",
                                         "-tvx",
                                         "--create",
                                         "-q",
@@ -268,28 +268,28 @@ private:
                                         "-C",
                                         "-cT",
                                         "--"};
-    static const char* const options[] = {
+    static const char* const Options[] = {
         "-a", "-b", "-i", "--libattrmap", "--diag_error", "--diag_warning", "--db_check"};
-    static const char* const fixed[] = {"--diag_style=GNU", "--diag_style=list", "--normalise=0x10",
+    static const char* const Fixed[] = {"--diag_style=GNU", "--diag_style=list", "--normalise=0x10",
                                         "--no_normalise=-3", "--diag_error,a,b"};
     switch (pick(5)) {
     case 0:
-      words.push_back(fixed[pick(std::size(fixed))]);
+      words.push_back(Fixed[pick(std::size(Fixed))]);
       return;
     case 1:
       words.push_back(text());
       return;
     case 2: {
-      const std::string option = options[pick(std::size(options))];
+      const std::string option = Options[pick(std::size(Options))];
       words.push_back(option + "=" + text());
       return;
     }
     case 3:
-      words.push_back(options[pick(std::size(options))]);
+      words.push_back(Options[pick(std::size(Options))]);
       words.push_back(text());
       return;
     default:
-      words.push_back(flags[pick(std::size(flags))]);
+      words.push_back(Flags[pick(std::size(Flags))]);
     }
   }
 
@@ -315,7 +315,7 @@ Lines valuesOf(tool::Session& session) {
   return lines;
 }
 
-TEST(CommandLineReport, meansTheSameWhenItIsParsedAgain) {
+TEST(CommandLineReport, MeansTheSameWhenItIsParsedAgain) {
   uint32_t accepted = 0;
   for (uint32_t seed = 0; seed < 4000; ++seed) {
     const Lines words = WordMaker(seed).makeCommandLine();

@@ -7,13 +7,13 @@ namespace tabledrivenparser::tool {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-constexpr uint32_t onlyStyleAndVerbose[] = {Id_DiagStyle, Id_Verbose};
+constexpr uint32_t OnlyStyleAndVerbose[] = {Id_DiagStyle, Id_Verbose};
 
 uint32_t parseFiltered(Session& session, const char* word, const char* next = nullptr) {
-  return session.parser().parseWord(word, next, onlyStyleAndVerbose);
+  return session.parser().parseWord(word, next, OnlyStyleAndVerbose);
 }
 
-TEST(FilteredParse, storesTheListedOptions) {
+TEST(FilteredParse, StoresTheListedOptions) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "--diag_style", "gnu"), 2u);
   EXPECT_EQ(parseFiltered(session, "-v"), 1u);
@@ -21,32 +21,32 @@ TEST(FilteredParse, storesTheListedOptions) {
   EXPECT_TRUE(session.parser().getBoolean(Id_Verbose));
 }
 
-TEST(FilteredParse, passesOverTheOthersWithoutTheirArguments) {
+TEST(FilteredParse, PassesOverTheOthersWithoutTheirArguments) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "-a", "pos"), 1u);
   EXPECT_EQ(parseFiltered(session, "-a"), 1u);
   EXPECT_EQ(parseFiltered(session, "--normalise=abc"), 1u);
   EXPECT_EQ(parseFiltered(session, "word"), 1u);
   EXPECT_EQ(session.parser().getSetCounter(), 0u);
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(FilteredParse, skipsWordsThatNoRowAccepts) {
+TEST(FilteredParse, SkipsWordsThatNoRowAccepts) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "--nonsense"), 0u);
   EXPECT_EQ(parseFiltered(session, "--create=1"), 0u);
   EXPECT_EQ(parseFiltered(session, "-k"), 0u);
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(FilteredParse, stillReportsBadArgumentsOfListedOptions) {
+TEST(FilteredParse, StillReportsBadArgumentsOfListedOptions) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "--diag_style=x"), 1u);
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Argument 'x' not permitted for option 'diag_style'."));
 }
 
-TEST(FilteredParse, readsViaFilesThroughTheFilter) {
+TEST(FilteredParse, ReadsViaFilesThroughTheFilter) {
   Session session;
   session.m_Files.m_Contents["f"] = "-t --diag_style=ide word --via g";
   session.m_Files.m_Contents["g"] = "-v";
@@ -58,7 +58,7 @@ TEST(FilteredParse, readsViaFilesThroughTheFilter) {
   EXPECT_THAT(session.texts(Id_Via), ElementsAre("f", "g"));
 }
 
-TEST(FilteredParse, setsTheEndOfOptions) {
+TEST(FilteredParse, SetsTheEndOfOptions) {
   Session session;
   EXPECT_EQ(parseFiltered(session, "--"), 1u);
   EXPECT_TRUE(session.parser().isEndOfOptions());

@@ -34,13 +34,13 @@ protected:
   IntegerList m_Numbers{*m_Region};
 };
 
-TEST_F(LinkedListTest, startsEmpty) {
+TEST_F(LinkedListTest, StartsEmpty) {
   EXPECT_TRUE(m_Strings.isEmpty());
   EXPECT_EQ(m_Strings.size(), 0u);
   EXPECT_THAT(strings(), IsEmpty());
 }
 
-TEST_F(LinkedListTest, keepsTheOrderOfAppending) {
+TEST_F(LinkedListTest, KeepsTheOrderOfAppending) {
   for (int number : {3, 1, 2})
     m_Numbers.append(number);
   EXPECT_THAT(numbers(), ElementsAre(3, 1, 2));
@@ -48,13 +48,13 @@ TEST_F(LinkedListTest, keepsTheOrderOfAppending) {
   EXPECT_FALSE(m_Numbers.isEmpty());
 }
 
-TEST_F(LinkedListTest, findsTheFirstEqualElement) {
+TEST_F(LinkedListTest, FindsTheFirstEqualElement) {
   appendAll({"a", "b", "b"});
   EXPECT_EQ(m_Strings.indexOf(std::string("b").c_str()), 1u);
   EXPECT_EQ(m_Strings.indexOf("c"), 0xFFFFFFFFu);
 }
 
-TEST_F(LinkedListTest, removesAllEqualElements) {
+TEST_F(LinkedListTest, RemovesAllEqualElements) {
   for (int number : {7, 1, 7, 2, 7})
     m_Numbers.append(number);
   m_Numbers.removeAll(7);
@@ -63,7 +63,7 @@ TEST_F(LinkedListTest, removesAllEqualElements) {
   EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
 }
 
-TEST_F(LinkedListTest, isUsableAgainAfterItsLastElementWentAway) {
+TEST_F(LinkedListTest, IsUsableAgainAfterItsLastElementWentAway) {
   m_Numbers.append(7);
   m_Numbers.removeAll(7);
   EXPECT_TRUE(m_Numbers.isEmpty());
@@ -72,19 +72,19 @@ TEST_F(LinkedListTest, isUsableAgainAfterItsLastElementWentAway) {
   EXPECT_THAT(numbers(), ElementsAre(8));
 }
 
-TEST_F(LinkedListTest, removesByPrefix) {
+TEST_F(LinkedListTest, RemovesByPrefix) {
   appendAll({"no_a", "a", "no_", "n"});
   m_Strings.removeAllWithPrefix("no_");
   EXPECT_THAT(strings(), ElementsAre("a", "n"));
 }
 
-TEST_F(LinkedListTest, removesTextsByTheirCharacters) {
+TEST_F(LinkedListTest, RemovesTextsByTheirCharacters) {
   appendAll({"a", "b"});
   m_Strings.removeAll(std::string("a").c_str());
   EXPECT_THAT(strings(), ElementsAre("b"));
 }
 
-TEST_F(LinkedListTest, forgetsEverything) {
+TEST_F(LinkedListTest, ForgetsEverything) {
   appendAll({"a", "b"});
   m_Strings.clear();
   EXPECT_TRUE(m_Strings.isEmpty());

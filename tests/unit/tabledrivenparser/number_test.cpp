@@ -14,11 +14,11 @@ struct GoodNumber {
 
 class GoodInt : public testing::TestWithParam<GoodNumber> {};
 
-TEST_P(GoodInt, isStored) {
+TEST_P(GoodInt, IsStored) {
   Session session;
   session.parse({"--int", GetParam().text});
   EXPECT_EQ(session.parser().getInteger(Id_Int), GetParam().value);
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -32,11 +32,11 @@ INSTANTIATE_TEST_SUITE_P(
 
 class BadInt : public testing::TestWithParam<const char*> {};
 
-TEST_P(BadInt, isNotPermitted) {
+TEST_P(BadInt, IsNotPermitted) {
   Session session;
   session.parse({"--int", GetParam()});
-  EXPECT_THAT(session.reports(), ElementsAre(std::string("fatal: Argument '") + GetParam() +
-                                             "' not permitted for option 'int'."));
+  EXPECT_THAT(session.getReports(), ElementsAre(std::string("fatal: Argument '") + GetParam() +
+                                                "' not permitted for option 'int'."));
   EXPECT_EQ(session.parser().getInteger(Id_Int), -1);
 }
 
@@ -46,36 +46,36 @@ INSTANTIATE_TEST_SUITE_P(Number, BadInt,
 
 class TooLargeInt : public testing::TestWithParam<const char*> {};
 
-TEST_P(TooLargeInt, isAnOverflow) {
+TEST_P(TooLargeInt, IsAnOverflow) {
   Session session;
   session.parse({"--int", GetParam()});
-  EXPECT_THAT(session.reports(), ElementsAre(std::string("fatal: Overflow: '") + GetParam() +
-                                             "' will not fit in an integer."));
+  EXPECT_THAT(session.getReports(), ElementsAre(std::string("fatal: Overflow: '") + GetParam() +
+                                                "' will not fit in an integer."));
 }
 
 INSTANTIATE_TEST_SUITE_P(Number, TooLargeInt,
                          testing::Values("2147483648", "-2147483649", "5000000000", "0xFFFFFFFF",
                                          "99999999999999999999999999", "5000000000x"));
 
-TEST(Address, isUnsignedAnd32BitsWide) {
+TEST(Address, IsUnsignedAnd32BitsWide) {
   Session session;
   session.parse({"--addr", "4294967295"});
   EXPECT_EQ(session.parser().getAddress(Id_Address), 0xFFFFFFFFu);
   session.parse({"--addr=-1"});
   EXPECT_EQ(session.parser().getAddress(Id_Address), 0xFFFFFFFFu);
   session.parse({"--addr=-0x1"});
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Argument '-0x1' not permitted for option 'addr'."));
 }
 
-TEST(Address, overflowsBeyond32Bits) {
+TEST(Address, OverflowsBeyond32Bits) {
   Session session;
   session.parse({"--addr=0x100000000"});
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Overflow: '0x100000000' will not fit in an integer."));
 }
 
-TEST(Address, takesItsImpliedValue) {
+TEST(Address, TakesItsImpliedValue) {
   Session session;
   session.parse({"--address"});
   EXPECT_EQ(session.parser().getAddress(Id_Address), 0xABCDEFu);
@@ -83,16 +83,16 @@ TEST(Address, takesItsImpliedValue) {
   EXPECT_EQ(session.parser().getAddress(Id_Address), 0x1Fu);
 }
 
-TEST(Address64, is64BitsWide) {
+TEST(Address64, Is64BitsWide) {
   Session session;
   session.parse({"--add64=0xFFFFFFFFFFFFFFFF"});
   EXPECT_EQ(session.parser().getAddress(Id_Address64), 0xFFFFFFFFFFFFFFFFu);
   session.parse({"--add64=18446744073709551616"});
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Overflow: '18446744073709551616' will not fit in an integer."));
 }
 
-TEST(ImpliedInt, isStoredAsItStands) {
+TEST(ImpliedInt, IsStoredAsItStands) {
   Session session;
   session.parse({"--int1"});
   EXPECT_EQ(session.parser().getInteger(Id_Int), 1);

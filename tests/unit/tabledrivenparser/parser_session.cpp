@@ -52,15 +52,15 @@ std::string textOf(const ValueDefinition& definition, const Value& value) {
 } // namespace
 
 alloclib::RegionOwner makeRegion() {
-  static const bool isReady = (alloclib::initialise(), true);
-  EXPECT_TRUE(isReady);
+  static const bool IsReady = (alloclib::initialise(), true);
+  EXPECT_TRUE(IsReady);
   return alloclib::RegionOwner(alloclib::RegionGeneral::Create(4096, "tabledrivenparser tests"));
 }
 
 void RecordingReporter::reportOptionMessage(ReportLevel level, OptionMessage message,
                                             std::span<const OptionMessageArgument> arguments) {
-  static const char* const levels[] = {"remark: ", "warning: ", "error: ", "fatal: "};
-  std::string line = levels[static_cast<uint32_t>(level)];
+  static const char* const Levels[] = {"remark: ", "warning: ", "error: ", "fatal: "};
+  std::string line = Levels[static_cast<uint32_t>(level)];
   std::string_view text = templateOf(message);
   size_t used = 0;
   for (size_t at = 0; at < text.size(); ++at) {

@@ -74,7 +74,7 @@ public:
   void parse(std::initializer_list<const char*> words);
   void parse(const Lines& words);
 
-  const Lines& reports() const { return m_Reporter.m_Lines; }
+  const Lines& getReports() const { return m_Reporter.m_Lines; }
   // The elements of a list of strings.
   Lines texts(uint32_t id);
   std::vector<long long> numbers(uint32_t id);

@@ -7,41 +7,41 @@ namespace tabledrivenparser::tool {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-TEST(PositionalWord, keepsItsOrder) {
+TEST(PositionalWord, KeepsItsOrder) {
   Session session;
   session.parse({"tv", "-t", "lib.a", "x.o"});
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("tv", "lib.a", "x.o"));
 }
 
-TEST(PositionalWord, mayBeEmpty) {
+TEST(PositionalWord, MayBeEmpty) {
   Session session;
   session.parse({"", "x", ""});
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("", "x", ""));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(PositionalWord, keepsSignsAndSeparators) {
+TEST(PositionalWord, KeepsSignsAndSeparators) {
   Session session;
   session.parse({"=x.a", ",y", "a,b", "%s%n"});
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("=x.a", ",y", "a,b", "%s%n"));
 }
 
-TEST(PositionalWord, mayBeASingleDash) {
+TEST(PositionalWord, MayBeASingleDash) {
   Session session;
   session.parse({"-", "-t"});
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("-"));
   EXPECT_TRUE(session.parser().getBoolean(Id_List));
 }
 
-TEST(EndOfOptions, makesEveryWordPositional) {
+TEST(EndOfOptions, MakesEveryWordPositional) {
   Session session;
   session.parse({"-t", "--", "-odd.a", "--", "-", "=x", ""});
   EXPECT_TRUE(session.parser().isEndOfOptions());
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("-odd.a", "--", "-", "=x", ""));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(EndOfOptions, isAWordOfItsOwn) {
+TEST(EndOfOptions, IsAWordOfItsOwn) {
   Session session;
   EXPECT_EQ(session.parser().parseWord("--", "next"), 1u);
   EXPECT_THAT(session.texts(Id_Words), IsEmpty());

@@ -9,48 +9,48 @@ namespace tabledrivenparser::tool {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-TEST(RowLookup, takesALongNameInAnyCase) {
+TEST(RowLookup, TakesALongNameInAnyCase) {
   Session session;
   session.parse({"--CREATE", "--Help"});
   EXPECT_TRUE(session.parser().getBoolean(Id_Create));
   EXPECT_TRUE(session.parser().getBoolean(Id_Help));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, takesAHyphenForAnUnderscore) {
+TEST(RowLookup, TakesAHyphenForAnUnderscore) {
   Session session;
   session.parse({"--new-files_only"});
   EXPECT_TRUE(session.parser().getBoolean(Id_NewFilesOnly));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, completesANameThatEndsInADot) {
+TEST(RowLookup, CompletesANameThatEndsInADot) {
   Session session;
   session.parse({"--cre."});
   EXPECT_TRUE(session.parser().getBoolean(Id_Create));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, refusesADotBehindAWholeName) {
+TEST(RowLookup, RefusesADotBehindAWholeName) {
   EXPECT_THAT(reportsOf({"--create."}), ElementsAre("fatal: Unrecognized option '--create.'."));
 }
 
-TEST(RowLookup, refusesAnUnfinishedNameWithoutADot) {
+TEST(RowLookup, RefusesAnUnfinishedNameWithoutADot) {
   EXPECT_THAT(reportsOf({"--creat"}), ElementsAre("fatal: Unrecognized option '--creat'."));
   EXPECT_THAT(reportsOf({"--created"}), ElementsAre("fatal: Unrecognized option '--created'."));
 }
 
-TEST(RowLookup, refusesADotWithOneDash) {
+TEST(RowLookup, RefusesADotWithOneDash) {
   EXPECT_THAT(reportsOf({"-new."}), ElementsAre("fatal: Unrecognized option '-new.'."));
 }
 
-TEST(RowLookup, takesAnArgumentBehindAnAbbreviation) {
+TEST(RowLookup, TakesAnArgumentBehindAnAbbreviation) {
   Session session;
   session.parse({"--db.=low"});
   EXPECT_STREQ(session.parser().getText(Id_CheckLevel), "low");
 }
 
-TEST(RowLookup, refusesAnArgumentThatTouchesALongName) {
+TEST(RowLookup, RefusesAnArgumentThatTouchesALongName) {
   EXPECT_THAT(reportsOf({"--db_checklow"}),
               ElementsAre("fatal: Unrecognized option '--db_checklow'."));
 }
@@ -63,7 +63,7 @@ struct Ambiguity {
 
 class AmbiguousWord : public testing::TestWithParam<Ambiguity> {};
 
-TEST_P(AmbiguousWord, namesTheBestAndTheLastRowAndIsUnrecognized) {
+TEST_P(AmbiguousWord, NamesTheBestAndTheLastRowAndIsUnrecognized) {
   const std::string word = GetParam().word;
   const Lines reports = reportsOf({GetParam().word});
   EXPECT_THAT(reports,
@@ -80,32 +80,32 @@ INSTANTIATE_TEST_SUITE_P(RowLookup, AmbiguousWord,
                                          Ambiguity{"--s.", "show_cmdline", "sizes"},
                                          Ambiguity{"--v.", "version", "vsn"}));
 
-TEST(RowLookup, prefersARowWithoutArgumentWhereNoneIsGiven) {
+TEST(RowLookup, PrefersARowWithoutArgumentWhereNoneIsGiven) {
   Session session;
   session.parse({"--d."});
   EXPECT_TRUE(session.parser().getBoolean(Id_DebugSymbols));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, prefersARowWithArgumentWhereOneIsGiven) {
+TEST(RowLookup, PrefersARowWithArgumentWhereOneIsGiven) {
   Session session;
   session.parse({"--no_.=5", "--de.", "--no_d."});
   EXPECT_EQ(session.parser().getInteger(Id_Normalise), 5);
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, prefersTheLongerName) {
+TEST(RowLookup, PrefersTheLongerName) {
   Session session;
   session.parse({"--version."});
   EXPECT_TRUE(session.parser().getBoolean(Id_VersionNumber));
   EXPECT_FALSE(session.parser().getBoolean(Id_Version));
 }
 
-TEST(RowLookup, refusesALetterWithTwoDashes) {
+TEST(RowLookup, RefusesALetterWithTwoDashes) {
   EXPECT_THAT(reportsOf({"--d"}), ElementsAre("fatal: Unrecognized option '--d'."));
 }
 
-TEST(RowLookup, tellsTwinLettersApart) {
+TEST(RowLookup, TellsTwinLettersApart) {
   Session session;
   session.parse({"-V", "-T", "-C"});
   EXPECT_TRUE(session.parser().getBoolean(Id_Version));
@@ -114,100 +114,100 @@ TEST(RowLookup, tellsTwinLettersApart) {
   EXPECT_FALSE(session.parser().getBoolean(Id_List));
   EXPECT_TRUE(session.parser().getBoolean(Id_KeepOld));
   EXPECT_FALSE(session.parser().getBoolean(Id_NoBanner));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, warnsOfAnOldLetterInTheOtherCase) {
+TEST(RowLookup, WarnsOfAnOldLetterInTheOtherCase) {
   Session session;
   session.parse({"-D", "-X"});
   EXPECT_TRUE(session.parser().getBoolean(Id_Delete));
   EXPECT_TRUE(session.parser().getBoolean(Id_Extract));
-  EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '-d'.",
-                                             "warning: Old syntax, please use '-x'."));
+  EXPECT_THAT(session.getReports(), ElementsAre("warning: Old syntax, please use '-d'.",
+                                                "warning: Old syntax, please use '-x'."));
 }
 
-TEST(RowLookup, warnsOfAnOldLongNameWithOneDash) {
+TEST(RowLookup, WarnsOfAnOldLongNameWithOneDash) {
   Session session;
   session.parse({"-create"});
   EXPECT_TRUE(session.parser().getBoolean(Id_Create));
-  EXPECT_THAT(session.reports(), ElementsAre("warning: Old syntax, please use '--create'."));
+  EXPECT_THAT(session.getReports(), ElementsAre("warning: Old syntax, please use '--create'."));
 }
 
-TEST(RowLookup, refusesANewLongNameWithOneDash) {
+TEST(RowLookup, RefusesANewLongNameWithOneDash) {
   EXPECT_THAT(reportsOf({"-libattrmap=x"}),
               ElementsAre("fatal: Unrecognized option '-libattrmap=x'."));
 }
 
-TEST(RowLookup, takesOldSyntaxInSilenceWhereThePolicySaysSo) {
-  OptionTable silent = table;
+TEST(RowLookup, TakesOldSyntaxInSilenceWhereThePolicySaysSo) {
+  OptionTable silent = Table;
   for (uint32_t policy : {0u, 3u}) {
     silent.oldSyntaxPolicy = static_cast<SyntaxPolicy>(policy);
-    ParserSession session(silent, definitions);
+    ParserSession session(silent, Definitions);
     session.parse({"-create", "-D"});
     EXPECT_TRUE(session.parser().getBoolean(Id_Create));
     EXPECT_TRUE(session.parser().getBoolean(Id_Delete));
-    EXPECT_THAT(session.reports(), IsEmpty());
+    EXPECT_THAT(session.getReports(), IsEmpty());
   }
 }
 
-TEST(RowLookup, refusesOldSyntaxWhereThePolicySaysSo) {
-  OptionTable strict = table;
+TEST(RowLookup, RefusesOldSyntaxWhereThePolicySaysSo) {
+  OptionTable strict = Table;
   strict.oldSyntaxPolicy = Policy_Reject;
-  ParserSession name(strict, definitions);
+  ParserSession name(strict, Definitions);
   name.parse({"-help"});
-  EXPECT_THAT(name.reports(), ElementsAre("fatal: Unrecognized option '-elp'."));
-  ParserSession letter(strict, definitions);
+  EXPECT_THAT(name.getReports(), ElementsAre("fatal: Unrecognized option '-elp'."));
+  ParserSession letter(strict, Definitions);
   letter.parse({"-D"});
-  EXPECT_THAT(letter.reports(), ElementsAre("fatal: Unrecognized option '-D'."));
-  ParserSession exact(strict, definitions);
+  EXPECT_THAT(letter.getReports(), ElementsAre("fatal: Unrecognized option '-D'."));
+  ParserSession exact(strict, Definitions);
   exact.parse({"-d", "--help"});
-  EXPECT_THAT(exact.reports(), IsEmpty());
+  EXPECT_THAT(exact.getReports(), IsEmpty());
 }
 
-TEST(RowLookup, comparesAWordThatStartsWithNoLetterToo) {
+TEST(RowLookup, ComparesAWordThatStartsWithNoLetterToo) {
   EXPECT_THAT(reportsOf({"-1"}), ElementsAre("fatal: Unrecognized option '-1'."));
   EXPECT_THAT(reportsOf({"--."}), ElementsAre("fatal: Unrecognized option '--.'."));
   EXPECT_THAT(reportsOf({"---x"}), ElementsAre("fatal: Unrecognized option '---x'."));
   EXPECT_THAT(reportsOf({"---"}), ElementsAre("fatal: Unrecognized option '---'."));
 }
 
-TEST(RowLookup, takesBytesAbove127AsPlainCharacters) {
+TEST(RowLookup, TakesBytesAbove127AsPlainCharacters) {
   EXPECT_THAT(reportsOf({"-\xe9"}), ElementsAre("fatal: Unrecognized option '-\xe9'."));
   EXPECT_THAT(reportsOf({"--\xff\x80"}), ElementsAre("fatal: Unrecognized option '--\xff\x80'."));
 }
 
-TEST(RowLookup, refusesALetterThatNoRowStartsWith) {
+TEST(RowLookup, RefusesALetterThatNoRowStartsWith) {
   EXPECT_THAT(reportsOf({"-k"}), ElementsAre("fatal: Unrecognized option '-k'."));
 }
 
-TEST(RowLookup, findsNothingForAnEmptyWordWithDashes) {
+TEST(RowLookup, FindsNothingForAnEmptyWordWithDashes) {
   Session session;
   EXPECT_EQ(session.parser().parseArgument("", "next", 1), 1u);
-  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unrecognized option '-'."));
+  EXPECT_THAT(session.getReports(), ElementsAre("fatal: Unrecognized option '-'."));
 }
 
-TEST(RowLookup, findsNothingForAPositionalWordWithoutItsRow) {
-  OptionTable noWords = table;
+TEST(RowLookup, FindsNothingForAPositionalWordWithoutItsRow) {
+  OptionTable noWords = Table;
   noWords.rows = noWords.rows.subspan(1);
   noWords.firstRows = indexByFirstLetter(noWords.rows);
-  ParserSession session(noWords, definitions);
+  ParserSession session(noWords, Definitions);
   session.parse({"word"});
-  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unrecognized option 'word'."));
+  EXPECT_THAT(session.getReports(), ElementsAre("fatal: Unrecognized option 'word'."));
 }
 
 // Arguments.
 
-TEST(RowArgument, standsBehindALetterOrIsTheNextWord) {
+TEST(RowArgument, StandsBehindALetterOrIsTheNextWord) {
   for (const auto& words : {Lines{"-apos"}, Lines{"-a", "pos"}, Lines{"-a=pos"}}) {
     Session session;
     session.parse(words);
     EXPECT_STREQ(session.parser().getText(Id_After), "pos");
     EXPECT_THAT(session.texts(Id_Words), IsEmpty());
-    EXPECT_THAT(session.reports(), IsEmpty());
+    EXPECT_THAT(session.getReports(), IsEmpty());
   }
 }
 
-TEST(RowArgument, countsTheWordsUsed) {
+TEST(RowArgument, CountsTheWordsUsed) {
   Session session;
   EXPECT_EQ(session.parser().parseWord("-apos", "x", {}), 1u);
   EXPECT_EQ(session.parser().parseWord("-a", "x", {}), 2u);
@@ -215,7 +215,7 @@ TEST(RowArgument, countsTheWordsUsed) {
   EXPECT_EQ(session.parser().parseWord("x", "y", {}), 1u);
 }
 
-TEST(RowArgument, mayLookLikeAnOption) {
+TEST(RowArgument, MayLookLikeAnOption) {
   Session session;
   session.parse({"-a", "-t", "--db_check", "--"});
   EXPECT_STREQ(session.parser().getText(Id_After), "-t");
@@ -224,7 +224,7 @@ TEST(RowArgument, mayLookLikeAnOption) {
   EXPECT_FALSE(session.parser().isEndOfOptions());
 }
 
-TEST(RowArgument, mayBeEmptyBehindTheSign) {
+TEST(RowArgument, MayBeEmptyBehindTheSign) {
   Session session;
   session.parse({"--db_check=", "-a=", "word"});
   EXPECT_STREQ(session.parser().getText(Id_CheckLevel), "");
@@ -232,12 +232,12 @@ TEST(RowArgument, mayBeEmptyBehindTheSign) {
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("word"));
 }
 
-TEST(RowArgument, isMissedAtTheEnd) {
+TEST(RowArgument, IsMissedAtTheEnd) {
   EXPECT_THAT(reportsOf({"--via"}), ElementsAre("fatal: Missing argument for option 'via'."));
   EXPECT_THAT(reportsOf({"-a"}), ElementsAre("fatal: Missing argument for option 'a'."));
 }
 
-TEST(RowArgument, isUnexpectedBehindALongFlag) {
+TEST(RowArgument, IsUnexpectedBehindALongFlag) {
   EXPECT_THAT(reportsOf({"--create=1"}),
               ElementsAre("fatal: Unexpected argument for option '--create'"));
   EXPECT_THAT(reportsOf({"--create,1"}),
@@ -247,24 +247,24 @@ TEST(RowArgument, isUnexpectedBehindALongFlag) {
                           "fatal: Unexpected argument for option '-create'"));
 }
 
-TEST(RowArgument, isNoneForAFlagLetter) {
+TEST(RowArgument, IsNoneForAFlagLetter) {
   EXPECT_THAT(reportsOf({"-t=1"}), ElementsAre("fatal: Unrecognized option '-t=1'."));
   EXPECT_THAT(reportsOf({"-t,1"}), ElementsAre("fatal: Unrecognized option '-t,1'."));
 }
 
-TEST(RowArgument, isNotPartedFromALetterByTheSeparator) {
+TEST(RowArgument, IsNotPartedFromALetterByTheSeparator) {
   EXPECT_THAT(reportsOf({"-a,pos"}), ElementsAre("fatal: Unrecognized option '-a,pos'."));
 }
 
-TEST(RowArgument, behindTheSeparatorIsOldSyntax) {
+TEST(RowArgument, BehindTheSeparatorIsOldSyntax) {
   Session session;
   session.parse({"--diag_error,L6875,L1"});
   EXPECT_THAT(session.texts(Id_DiagError), ElementsAre("L6875", "L1"));
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("warning: Old syntax, please use '--diag_error=L6875,L1'."));
 }
 
-TEST(RowArgument, isTheLastOneGiven) {
+TEST(RowArgument, IsTheLastOneGiven) {
   Session session;
   session.parse({"-b", "one", "-i", "two"});
   EXPECT_STREQ(session.parser().getText(Id_Before), "two");
@@ -272,45 +272,45 @@ TEST(RowArgument, isTheLastOneGiven) {
 
 // A small table with what the big one lacks.
 
-constexpr uint32_t red[] = {1, 0};
-constexpr uint32_t redAndGreen[] = {1, 2, 0};
+constexpr uint32_t Red[] = {1, 0};
+constexpr uint32_t RedAndGreen[] = {1, 2, 0};
 // clang-format off
-constexpr MatchString specialRows[] = {
+constexpr MatchString SpecialRows[] = {
   {"",        0, Kind_Required, {},     nullptr,       0,   Flag_Public},
-  {"1st",     1, Kind_Implied,  on, nullptr,       ',', Flag_Public},
-  {"aged",    2, Kind_Implied,  on, nullptr,       ',', Flag_Public | Flag_Deprecated | Flag_OldSyntax},
-  {"hidden",  3, Kind_Implied,  on, red,        ',', Flag_Public},
-  {"hinted",  3, Kind_Implied,  on, redAndGreen, ',', Flag_Public},
+  {"1st",     1, Kind_Implied,  On, nullptr,       ',', Flag_Public},
+  {"aged",    2, Kind_Implied,  On, nullptr,       ',', Flag_Public | Flag_Deprecated | Flag_OldSyntax},
+  {"hidden",  3, Kind_Implied,  On, Red,        ',', Flag_Public},
+  {"hinted",  3, Kind_Implied,  On, RedAndGreen, ',', Flag_Public},
   {"O",       4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
   {"other",   4, Kind_Optional, {.text = "implied"}, nullptr, ',', Flag_Public},
-  {"private", 1, Kind_Implied,  on, nullptr,       ',', 0},
+  {"private", 1, Kind_Implied,  On, nullptr,       ',', 0},
   {"w",       0, Kind_Required, {},     nullptr,       '=', Flag_Public},
 };
-constexpr ValueDefinition specialDefinitions[] = {
+constexpr ValueDefinition SpecialDefinitions[] = {
   textsOf(nullptr), flagOf(nullptr), flagOf(nullptr), flagOf(nullptr), textOf(nullptr),
 };
 // clang-format on
-static_assert(areWellFormed(specialRows, std::size(specialDefinitions)));
+static_assert(areWellFormed(SpecialRows, std::size(SpecialDefinitions)));
 
 OptionTable specialTable() {
-  return {specialRows, indexByFirstLetter(specialRows), Policy_Warn, Policy_Warn};
+  return {SpecialRows, indexByFirstLetter(SpecialRows), Policy_Warn, Policy_Warn};
 }
 
 Lines specialReports(const OptionTable& special, std::initializer_list<const char*> words) {
-  ParserSession session(special, specialDefinitions);
+  ParserSession session(special, SpecialDefinitions);
   session.parse(words);
-  return session.reports();
+  return session.getReports();
 }
 
-TEST(SpecialRow, mayStartWithADigit) {
+TEST(SpecialRow, MayStartWithADigit) {
   const OptionTable special = specialTable();
-  ParserSession session(special, specialDefinitions);
+  ParserSession session(special, SpecialDefinitions);
   session.parse({"--1ST"});
   EXPECT_TRUE(session.parser().getBoolean(1));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(SpecialRow, warnsOfDeprecationAndThenNotOfOldSyntax) {
+TEST(SpecialRow, WarnsOfDeprecationAndThenNotOfOldSyntax) {
   OptionTable special = specialTable();
   EXPECT_THAT(specialReports(special, {"-aged"}),
               ElementsAre("warning: Option 'aged' is deprecated."));
@@ -320,7 +320,7 @@ TEST(SpecialRow, warnsOfDeprecationAndThenNotOfOldSyntax) {
   EXPECT_THAT(specialReports(special, {"--aged"}), IsEmpty());
 }
 
-TEST(SpecialRow, isHiddenUnlessEveryMaskMeetsTheTables) {
+TEST(SpecialRow, IsHiddenUnlessEveryMaskMeetsTheTables) {
   OptionTable special = specialTable();
   special.restrictionMask = 1;
   EXPECT_THAT(specialReports(special, {"--hidden"}), IsEmpty());
@@ -334,15 +334,15 @@ TEST(SpecialRow, isHiddenUnlessEveryMaskMeetsTheTables) {
   EXPECT_THAT(specialReports(special, {"--hinted"}), IsEmpty());
 }
 
-TEST(SpecialRow, isNotAbbreviatedUnlessPublic) {
+TEST(SpecialRow, IsNotAbbreviatedUnlessPublic) {
   EXPECT_THAT(specialReports(specialTable(), {"--priv."}),
               ElementsAre("fatal: Unrecognized option '--priv.'."));
   EXPECT_THAT(specialReports(specialTable(), {"--private"}), IsEmpty());
 }
 
-TEST(SpecialRow, withAnOptionalArgumentLeavesTheNextWord) {
+TEST(SpecialRow, WithAnOptionalArgumentLeavesTheNextWord) {
   const OptionTable special = specialTable();
-  ParserSession session(special, specialDefinitions);
+  ParserSession session(special, SpecialDefinitions);
   session.parse({"-O", "word"});
   EXPECT_STREQ(session.parser().getText(4), "implied");
   EXPECT_THAT(session.texts(0), ElementsAre("word"));
@@ -354,15 +354,15 @@ TEST(SpecialRow, withAnOptionalArgumentLeavesTheNextWord) {
   EXPECT_STREQ(session.parser().getText(4), "far");
   session.parse({"--other="});
   EXPECT_STREQ(session.parser().getText(4), "");
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(SpecialRow, takesTheEqualsSignAlsoAsItsSeparator) {
+TEST(SpecialRow, TakesTheEqualsSignAlsoAsItsSeparator) {
   const OptionTable special = specialTable();
-  ParserSession session(special, specialDefinitions);
+  ParserSession session(special, SpecialDefinitions);
   session.parse({"-w=x"});
   EXPECT_THAT(session.texts(0), ElementsAre("x"));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
 // The last resort.
@@ -378,37 +378,38 @@ public:
   uint32_t m_Answer = 0;
 };
 
-TEST(FallbackHandling, isOfferedWhatNoRowAccepts) {
+TEST(FallbackHandling, IsOfferedWhatNoRowAccepts) {
   Fallback fallback;
   fallback.m_Answer = 2;
-  OptionTable open = table;
+  OptionTable open = Table;
   open.fallback = &fallback;
-  ParserSession session(open, definitions);
+  ParserSession session(open, Definitions);
   session.parse({"--odd", "word", "-t", "-k", "-tk", "last"});
   EXPECT_THAT(fallback.m_Lines, ElementsAre("2odd/word", "1k/-tk"));
   EXPECT_TRUE(session.parser().getBoolean(Id_List));
   EXPECT_THAT(session.texts(Id_Words), ElementsAre("last"));
-  EXPECT_THAT(session.reports(), IsEmpty());
+  EXPECT_THAT(session.getReports(), IsEmpty());
 }
 
-TEST(FallbackHandling, mayDecline) {
+TEST(FallbackHandling, MayDecline) {
   Fallback fallback;
-  OptionTable open = table;
+  OptionTable open = Table;
   open.fallback = &fallback;
-  ParserSession session(open, definitions);
+  ParserSession session(open, Definitions);
   session.parse({"--create=1"});
   EXPECT_THAT(fallback.m_Lines, ElementsAre("2create=1/<null>"));
-  EXPECT_THAT(session.reports(), ElementsAre("fatal: Unexpected argument for option '--create'"));
+  EXPECT_THAT(session.getReports(),
+              ElementsAre("fatal: Unexpected argument for option '--create'"));
 }
 
-TEST(Failure, endsAllParsing) {
+TEST(Failure, EndsAllParsing) {
   Session session;
   session.parse({"--nonsense", "-t", "--", "-a"});
   EXPECT_TRUE(session.parser().hasFailed());
   EXPECT_FALSE(session.parser().getBoolean(Id_List));
   EXPECT_FALSE(session.parser().isEndOfOptions());
   EXPECT_EQ(session.parser().parseWord("-t", "x"), 1u);
-  EXPECT_EQ(session.reports().size(), 1u);
+  EXPECT_EQ(session.getReports().size(), 1u);
 }
 
 } // namespace tabledrivenparser::tool

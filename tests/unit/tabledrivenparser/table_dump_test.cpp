@@ -10,7 +10,7 @@ namespace tabledrivenparser::types {
 
 using testing::HasSubstr;
 
-TEST(TableDump, showsEveryIdAndEveryRow) {
+TEST(TableDump, ShowsEveryIdAndEveryRow) {
   Session session;
   EXPECT_EQ(session.dump(),
             "  0: STRING_VECTOR unset:<none>\n"
@@ -54,7 +54,7 @@ TEST(TableDump, showsEveryIdAndEveryRow) {
             "\"bad\" no-flags parameter required\n");
 }
 
-TEST(TableDump, showsWhereASetValueCameFrom) {
+TEST(TableDump, ShowsWhereASetValueCameFrom) {
   Session session;
   session.parse({"-x", "--enum=red", "--add64=255", "--int=5", "--many=1,2", "--long=3", "--text=t",
                  "--texts=a b,c"});
@@ -69,7 +69,7 @@ TEST(TableDump, showsWhereASetValueCameFrom) {
   EXPECT_THAT(dump, HasSubstr("  9: STRING_VECTOR set from:<none> to:a b,c\n"));
 }
 
-TEST(TableDump, namesDefaultsWithoutAPrintForm) {
+TEST(TableDump, NamesDefaultsWithoutAPrintForm) {
   const DefaultNode node{nullptr, {.integer = 4}, nullptr};
   Session session;
   session.m_Definitions[Id_Int].defaultKind = Default_List;
@@ -81,21 +81,21 @@ TEST(TableDump, namesDefaultsWithoutAPrintForm) {
   EXPECT_THAT(session.dump(), HasSubstr("  8: STRING set from:<call back> to:t\n"));
 }
 
-TEST(TableDump, joinsSeveralMasksAndFlags) {
-  static constexpr uint32_t masks[] = {0x1, 0xABC, 0};
-  static constexpr MatchString specialRows[] = {
-      {"odd", 0, Kind_Implied, {}, masks, 0, Flag_OldSyntax | Flag_Deprecated | Flag_Public}};
-  static constexpr auto rowList = rowsNamed(specialRows, "odd");
-  static constexpr ValueDefinition specialDefinitions[] = {
-      {Type_Boolean, Default_Fixed, {}, {}, rowList.data()}};
-  const OptionTable special{specialRows, indexByFirstLetter(specialRows)};
-  ParserSession session(special, specialDefinitions);
+TEST(TableDump, JoinsSeveralMasksAndFlags) {
+  static constexpr uint32_t Masks[] = {0x1, 0xABC, 0};
+  static constexpr MatchString SpecialRows[] = {
+      {"odd", 0, Kind_Implied, {}, Masks, 0, Flag_OldSyntax | Flag_Deprecated | Flag_Public}};
+  static constexpr auto OddRows = rowsNamed(SpecialRows, "odd");
+  static constexpr ValueDefinition SpecialDefinitions[] = {
+      {Type_Boolean, Default_Fixed, {}, {}, OddRows.data()}};
+  const OptionTable special{SpecialRows, indexByFirstLetter(SpecialRows)};
+  ParserSession session(special, SpecialDefinitions);
   EXPECT_EQ(session.dump(), "  0: BOOLEAN unset:false\n"
                             "\"odd\" oldSyntax,deprecated,public implied parameter:false soft "
                             "restriction: 0x1,0xABC\n");
 }
 
-TEST(TableDump, tellsTheSizeNeeded) {
+TEST(TableDump, TellsTheSizeNeeded) {
   Session session;
   const size_t size = session.dump().size() + 1;
   TextSink sink({}, TextSink::QuoteMode::Never, ',');

@@ -8,7 +8,7 @@
 
 namespace tabledrivenparser {
 
-TEST(TextSink, goesOnCountingWhenItIsFull) {
+TEST(TextSink, GoesOnCountingWhenItIsFull) {
   std::array<char, 4> buffer{};
   TextSink sink(buffer, TextSink::QuoteMode::Never, ' ');
   sink.put("abcdef");
@@ -17,13 +17,13 @@ TEST(TextSink, goesOnCountingWhenItIsFull) {
   EXPECT_EQ(std::string(buffer.data(), buffer.size()), "abcd");
 }
 
-TEST(TextSink, countsWithoutAnyBuffer) {
+TEST(TextSink, CountsWithoutAnyBuffer) {
   TextSink sink({}, TextSink::QuoteMode::Never, ' ');
   sink.put("abc");
   EXPECT_EQ(sink.getUsed(), 3u);
 }
 
-TEST(TextSink, separatesEntriesAfterTheFirst) {
+TEST(TextSink, SeparatesEntriesAfterTheFirst) {
   std::array<char, 16> buffer{};
   TextSink sink(buffer, TextSink::QuoteMode::Never, ',');
   for (const char* text : {"a", "b", "c"}) {
@@ -44,14 +44,14 @@ std::string valueText(TextSink::QuoteMode mode, bool quoteEmpty, std::string_vie
   return std::string(buffer.data(), sink.getUsed());
 }
 
-TEST(TextSink, quotesAValueWithABlankOrATab) {
+TEST(TextSink, QuotesAValueWithABlankOrATab) {
   EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "a b"), "p=\"a b\"");
   EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "\t"), "p=\"\t\"");
   EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, "ab"), "p=ab");
   EXPECT_EQ(valueText(TextSink::QuoteMode::Never, true, "a b"), "p=a b");
 }
 
-TEST(TextSink, quotesAnEmptyValueOnDemand) {
+TEST(TextSink, QuotesAnEmptyValueOnDemand) {
   EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, false, ""), "p=");
   EXPECT_EQ(valueText(TextSink::QuoteMode::Blanks, true, ""), "p=\"\"");
   EXPECT_EQ(valueText(TextSink::QuoteMode::Never, true, ""), "p=");

@@ -26,10 +26,10 @@ enum Id : uint32_t {
   Id_Count,
 };
 
-inline constexpr uint32_t expertMask[] = {2, 0};
+inline constexpr uint32_t ExpertMask[] = {2, 0};
 
 // clang-format off
-inline constexpr MatchString rows[] = {
+inline constexpr MatchString Rows[] = {
   {"",         Id_Words,        Kind_Required, {},                     nullptr, 0,   0},
   {"add64",    Id_Address64,    Kind_Required, {},                     nullptr, 0,   0},
   {"addr",     Id_Address,      Kind_Required, {},                     nullptr, 0,   0},
@@ -51,63 +51,63 @@ inline constexpr MatchString rows[] = {
   {"text",     Id_String,       Kind_Required, {},                     nullptr, 0,   0},
   {"text_x",   Id_String,       Kind_Implied,  {.text = "x"},          nullptr, 0,   Flag_Deprecated},
   {"texts",    Id_StringVector, Kind_Required, {},                     nullptr, ',', 0},
-  {"texts_y",  Id_StringVector, Kind_Implied,  {.text = "y"},          expertMask, ',', 0},
+  {"texts_y",  Id_StringVector, Kind_Implied,  {.text = "y"},          ExpertMask, ',', 0},
   {"u",        Id_StringVector, Kind_Required, {},                     nullptr, 0,   0},
   {"via",      Id_Via,          Kind_Required, {},                     nullptr, ',', 0},
   {"via0",     Id_Via,          Kind_Implied,  {},                     nullptr, ',', 0},
   {"x",        Id_Boolean,      Kind_Implied,  {.integer = 1},         nullptr, 0,   0},
 };
 
-inline constexpr MatchString colours[] = {
+inline constexpr MatchString Colours[] = {
   {"Choose",  0},
   {"green",   1},
   {"Red",     2},
   {"crimson", 2, Kind_Required, {}, nullptr,    1},
-  {"violet",  3, Kind_Required, {}, expertMask, 0},
+  {"violet",  3, Kind_Required, {}, ExpertMask, 0},
 };
 // clang-format on
-inline constexpr Enumeration colourEnumeration{colours};
+inline constexpr Enumeration ColourEnumeration{Colours};
 
-inline constexpr auto wordsRows = rowsNamed(rows, "");
-inline constexpr auto booleanRows = rowsNamed(rows, "bool", "x");
-inline constexpr auto enumRows = rowsNamed(rows, "enum", "red", "redder");
-inline constexpr auto addressRows = rowsNamed(rows, "addr", "address");
-inline constexpr auto address64Rows = rowsNamed(rows, "add64");
-inline constexpr auto intRows = rowsNamed(rows, "int", "int1");
-inline constexpr auto manyRows = rowsNamed(rows, "many", "many5", "many6");
-inline constexpr auto longRows = rowsNamed(rows, "long", "long_max");
-inline constexpr auto textRows = rowsNamed(rows, "text_x", "text");
-inline constexpr auto textsRows = rowsNamed(rows, "texts", "texts_y", "u");
-inline constexpr auto callRows = rowsNamed(rows, "call", "k");
-inline constexpr auto viaRows = rowsNamed(rows, "via", "via0");
-inline constexpr auto badRows = rowsNamed(rows, "bad");
+inline constexpr auto WordsRows = rowsNamed(Rows, "");
+inline constexpr auto BooleanRows = rowsNamed(Rows, "bool", "x");
+inline constexpr auto EnumRows = rowsNamed(Rows, "enum", "red", "redder");
+inline constexpr auto AddressRows = rowsNamed(Rows, "addr", "address");
+inline constexpr auto Address64Rows = rowsNamed(Rows, "add64");
+inline constexpr auto IntRows = rowsNamed(Rows, "int", "int1");
+inline constexpr auto ManyRows = rowsNamed(Rows, "many", "many5", "many6");
+inline constexpr auto LongRows = rowsNamed(Rows, "long", "long_max");
+inline constexpr auto TextRows = rowsNamed(Rows, "text_x", "text");
+inline constexpr auto TextsRows = rowsNamed(Rows, "texts", "texts_y", "u");
+inline constexpr auto CallRows = rowsNamed(Rows, "call", "k");
+inline constexpr auto ViaRows = rowsNamed(Rows, "via", "via0");
+inline constexpr auto BadRows = rowsNamed(Rows, "bad");
 
 // clang-format off
-inline constexpr std::array<ValueDefinition, Id_Count> definitions = {{
-  {Type_StringVector, Default_Fixed, {.strings = nullptr},      {}, wordsRows.data()},
-  {Type_Boolean,      Default_Fixed, {.integer = 0},            {}, booleanRows.data()},
-  {Type_Enum,         Default_Fixed, {.integer = 1},            {.enumeration = &colourEnumeration}, enumRows.data()},
-  {Type_Address,      Default_Fixed, {.integer = 0x10},         {}, addressRows.data()},
-  {Type_Address64,    Default_None,  {},                        {}, address64Rows.data()},
-  {Type_Int,          Default_Fixed, {.integer = -1},           {}, intRows.data()},
-  {Type_IntVector,    Default_Fixed, {.integers = nullptr},     {}, manyRows.data()},
-  {Type_Int64Vector,  Default_Fixed, {.longIntegers = nullptr}, {}, longRows.data()},
-  {Type_String,       Default_Fixed, {.text = nullptr},         {}, textRows.data()},
-  {Type_StringVector, Default_Fixed, {.strings = nullptr},      {}, textsRows.data()},
-  {Type_CallBack,     Default_Fixed, {.handler = nullptr},      {}, callRows.data()},
-  {Type_ViaFile,      Default_Fixed, {.strings = nullptr},      {}, viaRows.data()},
-  {static_cast<ValueType>(11), Default_Fixed, {},               {}, badRows.data()},
+inline constexpr std::array<ValueDefinition, Id_Count> Definitions = {{
+  {Type_StringVector, Default_Fixed, {.strings = nullptr},      {}, WordsRows.data()},
+  {Type_Boolean,      Default_Fixed, {.integer = 0},            {}, BooleanRows.data()},
+  {Type_Enum,         Default_Fixed, {.integer = 1},            {.enumeration = &ColourEnumeration}, EnumRows.data()},
+  {Type_Address,      Default_Fixed, {.integer = 0x10},         {}, AddressRows.data()},
+  {Type_Address64,    Default_None,  {},                        {}, Address64Rows.data()},
+  {Type_Int,          Default_Fixed, {.integer = -1},           {}, IntRows.data()},
+  {Type_IntVector,    Default_Fixed, {.integers = nullptr},     {}, ManyRows.data()},
+  {Type_Int64Vector,  Default_Fixed, {.longIntegers = nullptr}, {}, LongRows.data()},
+  {Type_String,       Default_Fixed, {.text = nullptr},         {}, TextRows.data()},
+  {Type_StringVector, Default_Fixed, {.strings = nullptr},      {}, TextsRows.data()},
+  {Type_CallBack,     Default_Fixed, {.handler = nullptr},      {}, CallRows.data()},
+  {Type_ViaFile,      Default_Fixed, {.strings = nullptr},      {}, ViaRows.data()},
+  {static_cast<ValueType>(11), Default_Fixed, {},               {}, BadRows.data()},
 }};
 // clang-format on
 
-static_assert(areWellFormed(rows, Id_Count));
+static_assert(areWellFormed(Rows, Id_Count));
 
-inline constexpr OptionTable table{rows, indexByFirstLetter(rows)};
+inline constexpr OptionTable Table{Rows, indexByFirstLetter(Rows)};
 
 // Copies of the tables, which a test may change before it parses.
 struct ChangeableTables {
-  OptionTable m_Table = table;
-  std::array<ValueDefinition, Id_Count> m_Definitions = definitions;
+  OptionTable m_Table = Table;
+  std::array<ValueDefinition, Id_Count> m_Definitions = Definitions;
 };
 
 class Session : public ChangeableTables, public ParserSession {

@@ -7,7 +7,7 @@ namespace tabledrivenparser::types {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-TEST(ValueRecordTest, startsAsItsDefaultAndUnset) {
+TEST(ValueRecordTest, StartsAsItsDefaultAndUnset) {
   Session session;
   session.m_Records[Id_Int].value.integer = 99;
   session.m_Records[Id_Int].lastSet = 99;
@@ -18,7 +18,7 @@ TEST(ValueRecordTest, startsAsItsDefaultAndUnset) {
   EXPECT_TRUE(session.parser().isDefault(Id_Int));
 }
 
-TEST(ValueRecordTest, countsTheFirstAndTheLastTimeItWasSet) {
+TEST(ValueRecordTest, CountsTheFirstAndTheLastTimeItWasSet) {
   Session session;
   session.parse({"--int=1", "-x", "--int=2"});
   EXPECT_EQ(session.parser().getRecord(Id_Int).firstSet, 1u);
@@ -28,14 +28,14 @@ TEST(ValueRecordTest, countsTheFirstAndTheLastTimeItWasSet) {
   EXPECT_EQ(session.parser().getSetCounter(), 3u);
 }
 
-TEST(ValueRecordTest, staysUnsetWhenTheStoreFails) {
+TEST(ValueRecordTest, StaysUnsetWhenTheStoreFails) {
   Session session;
   session.parse({"--int=x"});
   EXPECT_FALSE(session.parser().isSet(Id_Int));
   EXPECT_EQ(session.parser().getSetCounter(), 0u);
 }
 
-TEST(ValueRecordTest, countsAsSetWhenTheListenerTookTheValue) {
+TEST(ValueRecordTest, CountsAsSetWhenTheListenerTookTheValue) {
   Session session;
   session.m_Listener.m_Answer = [](Parser&, uint32_t id, const Value&) { return id == Id_Int; };
   session.parse({"--int=5", "--text=t"});
@@ -45,54 +45,54 @@ TEST(ValueRecordTest, countsAsSetWhenTheListenerTookTheValue) {
   EXPECT_THAT(session.m_Listener.m_Lines, ElementsAre("5=5", "8=t"));
 }
 
-TEST(ValueRecordTest, isRefusedByItsValidator) {
+TEST(ValueRecordTest, IsRefusedByItsValidator) {
   Session session;
   session.m_Records[Id_String].validator = [](const Parser&, uint32_t, const Value&) {
     return false;
   };
   session.parse({"--text=t"});
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Argument 't' not permitted for option 'text'."));
   EXPECT_THAT(session.m_Listener.m_Lines, IsEmpty());
 }
 
-TEST(BooleanOption, takesTheRowsValueWhateverTheText) {
+TEST(BooleanOption, TakesTheRowsValueWhateverTheText) {
   Session session;
   session.parse({"--bool", "false"});
   EXPECT_EQ(session.parser().getRecord(Id_Boolean).value.integer, 1);
   EXPECT_TRUE(session.parser().getBoolean(Id_Boolean));
 }
 
-TEST(StringOption, takesItsImpliedValue) {
+TEST(StringOption, TakesItsImpliedValue) {
   Session session;
   session.parse({"--text_x"});
   EXPECT_STREQ(session.parser().getText(Id_String), "x");
 }
 
-TEST(StringOption, pointsIntoTheCommandLine) {
+TEST(StringOption, PointsIntoTheCommandLine) {
   Session session;
   const char word[] = "--text=abc";
   session.parser().parseWord(word, nullptr);
   EXPECT_EQ(session.parser().getText(Id_String), word + 7);
 }
 
-TEST(BadType, isNeverStored) {
+TEST(BadType, IsNeverStored) {
   Session session;
   session.parse({"--bad=1"});
-  EXPECT_THAT(session.reports(),
+  EXPECT_THAT(session.getReports(),
               ElementsAre("fatal: Argument '1' not permitted for option 'bad'."));
 }
 
-TEST(DefaultOfAValue, mayBeNone) {
+TEST(DefaultOfAValue, MayBeNone) {
   Session session;
   EXPECT_EQ(session.parser().getAddress(Id_Address64), 0u);
 }
 
-TEST(DefaultOfAValue, isTheFirstUsableNode) {
-  static constexpr uint32_t both[] = {1, 2, 0};
+TEST(DefaultOfAValue, IsTheFirstUsableNode) {
+  static constexpr uint32_t Both[] = {1, 2, 0};
   const DefaultNode last{nullptr, {.integer = 30}, nullptr};
-  const DefaultNode middle{expertMask, {.integer = 20}, &last};
-  const DefaultNode head{both, {.integer = 10}, &middle};
+  const DefaultNode middle{ExpertMask, {.integer = 20}, &last};
+  const DefaultNode head{Both, {.integer = 10}, &middle};
   const auto defaultUnder = [&](uint32_t tableMask) {
     Session session;
     session.m_Table.restrictionMask = tableMask;
@@ -105,8 +105,8 @@ TEST(DefaultOfAValue, isTheFirstUsableNode) {
   EXPECT_EQ(defaultUnder(1), 30);
 }
 
-TEST(DefaultOfAValue, isNoneWithoutAUsableNode) {
-  const DefaultNode node{expertMask, {.text = "x"}, nullptr};
+TEST(DefaultOfAValue, IsNoneWithoutAUsableNode) {
+  const DefaultNode node{ExpertMask, {.text = "x"}, nullptr};
   Session session;
   session.m_Table.restrictionMask = 1;
   session.m_Definitions[Id_String].defaultKind = Default_List;
@@ -114,7 +114,7 @@ TEST(DefaultOfAValue, isNoneWithoutAUsableNode) {
   EXPECT_EQ(session.parser().getText(Id_String), nullptr);
 }
 
-TEST(DefaultOfAValue, mayBeComputed) {
+TEST(DefaultOfAValue, MayBeComputed) {
   Session session;
   session.m_Definitions[Id_Int].defaultKind = Default_Computed;
   session.m_Definitions[Id_String].defaultKind = Default_Computed;
@@ -127,7 +127,7 @@ TEST(DefaultOfAValue, mayBeComputed) {
   EXPECT_TRUE(session.parser().isDefault(Id_Int));
 }
 
-TEST(Release, emptiesVectorsAndLeavesOtherValues) {
+TEST(Release, EmptiesVectorsAndLeavesOtherValues) {
   Session session;
   session.m_Files.m_Contents["f"] = "--texts=b --text=c";
   session.parse({"--texts=a", "--many=1", "--long=2", "--int=3", "--via=f"});
