@@ -7,8 +7,8 @@
 #include "bench/compare/numbers.h"
 
 #include "elfext/interface/elf_constants.h"
+#include "tests/support/attribute_bytes.h"
 #include "tests/support/object_builder.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
 
 #include <algorithm>
 #include <array>
@@ -19,11 +19,7 @@ namespace bench {
 namespace {
 
 using namespace elfext;
-using testsupport::ElfClass;
-using testsupport::ElfData;
-using testsupport::RelocationSpec;
-using testsupport::SectionBuilder;
-using testsupport::SymbolSpec;
+using namespace testsupport;
 
 constexpr std::array<const char*, 16> Words = {
     "buffer", "clock", "device", "entry",  "filter", "graph", "handle", "index",

@@ -4,7 +4,7 @@
 // shapes that they are said to have.
 #include "bench/compare/corpus.h"
 
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <algorithm>
 #include <map>

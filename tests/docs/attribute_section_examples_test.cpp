@@ -6,8 +6,8 @@
 #include "elfext/interface/build_attributes_names.h"
 #include "elfext/interface/build_attributes_parsers.h"
 #include "tests/docs/document.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/attribute_bytes.h"
+#include "tests/support/reader_fixture.h"
 
 #include <sstream>
 
@@ -28,20 +28,21 @@ public:
   explicit QobixTeller(DumpWriter& dump) : m_Dump(dump) {}
 
   bool numericTag(uint32_t tag, uint32_t value) override {
-    return tell(elfext::tag(tag, value), tag, std::to_string(value));
+    return tell(testsupport::tag(tag, value), tag, std::to_string(value));
   }
   bool stringTag(uint32_t tag, std::string_view text) override {
-    return tell(elfext::tag(tag, text), tag, inQuotes(text));
+    return tell(testsupport::tag(tag, text), tag, inQuotes(text));
   }
   bool numericAndStringTag(uint32_t tag, uint32_t value, std::string_view text) override {
-    return tell(elfext::tag(tag, value, text), tag, std::to_string(value) + ", " + inQuotes(text));
+    return tell(testsupport::tag(tag, value, text), tag,
+                std::to_string(value) + ", " + inQuotes(text));
   }
   bool nestedNumericTag(uint32_t tag, uint32_t value) override {
-    const std::string nested = elfext::tag(tag, value) + std::string(value == 0 ? 0 : 1, '\0');
+    const std::string nested = testsupport::tag(tag, value) + std::string(value == 0 ? 0 : 1, '\0');
     return tellNested(nested, tag, std::to_string(value));
   }
   bool nestedStringTag(uint32_t tag, std::string_view text) override {
-    return tellNested(elfext::tag(tag, text), tag, inQuotes(text));
+    return tellNested(testsupport::tag(tag, text), tag, inQuotes(text));
   }
 
 private:
@@ -50,7 +51,7 @@ private:
     return true;
   }
   bool tellNested(const std::string& nested, uint32_t tag, const std::string& value) {
-    const std::string bytes = elfext::uleb(elfext::Tag_also_compatible_with) + nested;
+    const std::string bytes = testsupport::uleb(elfext::Tag_also_compatible_with) + nested;
     return tell(bytes, elfext::Tag_also_compatible_with,
                 elfext::getQobixTagName(tag) + ": " + value);
   }
@@ -63,7 +64,7 @@ public:
   explicit ZevTeller(DumpWriter& dump) : m_Dump(dump) {}
 
   bool numericTag(uint32_t tag, uint32_t value) override {
-    m_Dump.tell(elfext::tag(tag, value).size(),
+    m_Dump.tell(testsupport::tag(tag, value).size(),
                 elfext::getZevTagName(tag) + ": " + std::to_string(value));
     return true;
   }
@@ -114,7 +115,7 @@ private:
     else if (vendor == elfext::ZevVendor)
       EXPECT_TRUE(ZevTeller(m_Dump).parse(run));
     else
-      m_Dump.tell(run.size(), "in the vendor's own form: " + inQuotes(elfext::textOf(run)));
+      m_Dump.tell(run.size(), "in the vendor's own form: " + inQuotes(testsupport::textOf(run)));
   }
 
   bool tell(std::string_view vendor, const char* kind, const char* indexWord,
@@ -123,7 +124,7 @@ private:
     m_Dump.tell(1, kind);
     tellLength("size:");
     for (const uint32_t index : indices)
-      m_Dump.tell(elfext::uleb(index).size(), numbered(indexWord, index));
+      m_Dump.tell(testsupport::uleb(index).size(), numbered(indexWord, index));
     if (indexWord != nullptr) m_Dump.tell(1, "end of the indices");
     tellRun(vendor, run);
     return true;
@@ -137,7 +138,7 @@ private:
 void expectToldAsIn(const std::string& dump, bool isLittle) {
   const std::string bytes = bytesOfDump(dump);
   SectionTeller teller(bytes, isLittle);
-  EXPECT_TRUE(teller.parse(elfext::bytesOf(bytes), isLittle));
+  EXPECT_TRUE(teller.parse(testsupport::bytesOf(bytes), isLittle));
   EXPECT_EQ(teller.dump().rest(), "");
   EXPECT_EQ(teller.dump().text(), dump);
 }
@@ -184,20 +185,12 @@ TEST(FormatsDocument, ListsTheTags) {
 
 class FormatsDocumentObject : public elfext::ReaderTest {
 protected:
-  // Sections 1 and 2 are string and symbol table; the next two are of code.
-  static elfext::ObjectBuilder objectWith(const std::vector<testsupport::SymbolSpec>& symbols) {
-    elfext::ObjectBuilder file = elfext::object();
-    file.section(".strtab", elfext::SHT_STRTAB);
-    testsupport::SectionBuilder& table = file.section(".symtab", elfext::SHT_SYMTAB).link(1);
-    table.info(static_cast<uint32_t>(symbols.size() + 1));
-    for (testsupport::SymbolSpec symbol : symbols) {
+  // Sections 1 and 4 are code.
+  static elfext::ObjectBuilder objectWith(std::vector<testsupport::SymbolSpec> symbols) {
+    for (testsupport::SymbolSpec& symbol : symbols)
       symbol.binding = elfext::STB_LOCAL;
-      table.symbol(symbol);
-    }
-    for (const char* name : {".text", ".fast"})
-      file.section(name, elfext::SHT_PROGBITS)
-          .flags(elfext::SHF_ALLOC | elfext::SHF_EXECINSTR)
-          .zeros(8);
+    elfext::ObjectBuilder file = testsupport::objectWithSymbols(symbols);
+    file.section(".fast", elfext::SHT_PROGBITS).flags(elfext::SHF_ALLOC).zeros(8);
     return file;
   }
 
@@ -217,9 +210,9 @@ protected:
   std::string toldOf(const elfext::ObjectBuilder& file, Text text) {
     const elfext::ReadResult result = readGood(file);
     std::string lines = "object     " + text(*result.module) + "\n";
-    for (const uint32_t index : {3, 4})
+    for (const uint32_t index : {1U, 4U})
       lines += numbered("section", index) + "  " + text(*result.section(index)) + "\n";
-    for (const uint32_t index : {1, 2})
+    for (const uint32_t index : {1U, 2U})
       lines += numbered("symbol", index) + "   " + text(*result.symbol(index)) + "\n";
     return lines;
   }
@@ -227,7 +220,7 @@ protected:
 
 TEST_F(FormatsDocumentObject, SaysWhatAnAttributeSectionComesTo) {
   elfext::ObjectBuilder file =
-      objectWith({{.name = "first", .section = 3}, {.name = "second", .section = 4}});
+      objectWith({{.name = "first", .section = 1}, {.name = "second", .section = 4}});
   file.section(".ZEV.attributes", elfext::SHT_ZEV_ATTRIBUTES)
       .bytes(bytesOfDump(example("attribute-section")));
   EXPECT_EQ(toldOf(file, textOf), example("attributes-of-the-section"));

@@ -7,6 +7,7 @@
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/build_attributes_parsers.h"
+#include "tests/support/bytes.h"
 
 #include <cstdlib>
 #include <string>
@@ -16,9 +17,7 @@ namespace {
 
 using namespace elfext;
 
-AttributeBytes bytesOf(const std::string& text) {
-  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
-}
+using testsupport::bytesOf;
 
 BuildAttributes decodeQobix(AttributeBytes run) {
   BuildAttributes attributes;

@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What --show_cmdline says is a command line that does the same. Both are run by the tool, in
 // folders that are alike. The seeds are fixed: a failure comes back.
-#include "elfext/interface/elf_constants.h"
 #include "tests/support/object_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -194,7 +193,7 @@ protected:
                {"\xC3\xA9\xFF", "bytes"},
                {"%s'n", "percent"},
                {"tab\tx", "tab"},
-               {"o.o", objectBytes()},
+               {"o.o", testsupport::objectThatDefines("main").bytes()},
                {"a map", "*_x* $IEEE1$ZEV_ISAv4\n"}};
     for (const char* archive : {"lib.a", "my lib.a", "caf\xC3\xA9\xFF.a"}) {
       restart();
@@ -203,14 +202,6 @@ protected:
       ASSERT_EQ(made.status, 0) << made.errors;
       m_Start[archive] = m_Folder.read(archive);
     }
-  }
-
-  static std::string objectBytes() {
-    auto object = testsupport::object();
-    object.section(".text", elfext::SHT_PROGBITS).zeros(16);
-    object.section(".symtab", elfext::SHT_SYMTAB).link(3).symbol({.name = "main", .section = 1});
-    object.section(".strtab", elfext::SHT_STRTAB);
-    return object.bytes();
   }
 
   void restart() const {

@@ -55,13 +55,6 @@ std::string lookUpName(std::string_view field, std::string_view longNames, std::
 
 } // namespace
 
-std::string bigEndian(uint32_t value) {
-  std::string text;
-  for (int shift = 24; shift >= 0; shift -= 8)
-    text += static_cast<char>(value >> shift & 0xFF);
-  return text;
-}
-
 ArchiveBuilder& ArchiveBuilder::badMagic(std::string_view magic) {
   m_Magic = magic;
   return *this;

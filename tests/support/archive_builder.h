@@ -7,6 +7,8 @@
 // It knows the format on its own account, and shares no line with the writer that it tests.
 #pragma once
 
+#include "tests/support/bytes.h"
+
 #include <array>
 #include <cstdint>
 #include <optional>
@@ -101,8 +103,5 @@ struct ParsedMember {
 // Takes a file apart by the strict rules of a well-formed archive. On any deviation, `error` says
 // which, and the list ends there.
 std::vector<ParsedMember> parseArchive(std::string_view bytes, std::string& error);
-
-// A big-endian word, as the symbol table holds them.
-std::string bigEndian(uint32_t value);
 
 } // namespace testsupport

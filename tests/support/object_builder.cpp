@@ -357,4 +357,14 @@ uint64_t ObjectBuilder::segmentHeaderOffsetOf(uint32_t segment) const {
   return layOut().programHeaders + segment * uint64_t{isWide() ? 56U : 32U};
 }
 
+ObjectBuilder objectWithSymbols(const std::vector<SymbolSpec>& symbols) {
+  ObjectBuilder file = object();
+  file.section(".text", SHT_PROGBITS).flags(SHF_ALLOC | SHF_EXECINSTR).zeros(4);
+  SectionBuilder& table = file.section(".symtab", SHT_SYMTAB).link(3);
+  for (const SymbolSpec& symbol : symbols)
+    table.symbol(symbol);
+  file.section(".strtab", SHT_STRTAB);
+  return file;
+}
+
 } // namespace testsupport

@@ -213,4 +213,11 @@ inline ObjectBuilder object(ElfClass elfClass = ElfClass::Class32, ElfData data 
   return {elfClass, data};
 }
 
+// An object whose sections 1 to 3 are 4 bytes of code, a table of these symbols, and its strings.
+ObjectBuilder objectWithSymbols(const std::vector<SymbolSpec>& symbols);
+// The same with one global symbol, in the code.
+inline ObjectBuilder objectThatDefines(std::string name) {
+  return objectWithSymbols({{.name = std::move(name), .section = 1}});
+}
+
 } // namespace testsupport

@@ -4,7 +4,7 @@
 // in; all succeed, and the library has all of them, whoever made it. QUARN_CONCURRENT_ROUNDS says
 // how often, for a longer look than the suite takes.
 #include "tests/support/archive_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -6,7 +6,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 #include "tests/systematic/two_roads.h"
 
 #include <gmock/gmock.h>

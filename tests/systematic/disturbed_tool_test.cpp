@@ -4,7 +4,7 @@
 #include "tests/support/archive_builder.h"
 #include "tests/support/faulty_host.h"
 #include "tests/support/object_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

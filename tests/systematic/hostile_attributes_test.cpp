@@ -3,8 +3,8 @@
 // are for thousands of sections, lists that are copied for each of them, texts that share their
 // bytes. Whether attributes are asked for or not, each is read or refused in little time and
 // memory.
+#include "tests/support/attribute_bytes.h"
 #include "tests/systematic/hostile_object.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
 
 #include <functional>
 

@@ -10,9 +10,9 @@
 #include "elfext/interface/read_elf_file.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/model/module_builder.h"
+#include "tests/support/attribute_bytes.h"
 #include "tests/support/memory_host.h"
 #include "tests/systematic/hostile_object.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
 
 #include <algorithm>
 #include <ctime>

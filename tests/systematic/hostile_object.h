@@ -7,7 +7,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 #include "tests/systematic/two_roads.h"
 
 #include <gmock/gmock.h>
@@ -51,10 +51,8 @@ inline void PrintTo(const Hostile& hostile, std::ostream* stream) {
 // Rows of words as they are in a file with the low byte first. Rows of a table are many, and far
 // faster made here than piece by piece.
 inline void put(std::string& text, std::initializer_list<uint32_t> words) {
-  for (const uint32_t word : words) {
-    for (const uint32_t shift : {0U, 8U, 16U, 24U})
-      text += static_cast<char>(word >> shift & 0xFF);
-  }
+  for (const uint32_t each : words)
+    text += littleEndian(each);
 }
 
 constexpr uint32_t Local = 0;

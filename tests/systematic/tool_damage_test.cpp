@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The tool on every damaged form of a good archive: it never crashes or hangs, every line it prints
 // is one of its reports, and the file is as it was when the run failed.
+#include "tests/support/tool_folder.h"
 #include "tests/systematic/damaged_archives.h"
-#include "tests/systematic/tool_folder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -4,7 +4,7 @@
 // told whenever what was asked for was not done.
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

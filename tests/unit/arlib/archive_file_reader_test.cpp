@@ -138,7 +138,7 @@ TEST(ArchiveFileReader, ReadsBothTablesAndKeepsTheirBytes) {
   EXPECT_EQ(members[1]->getType(), FileNameTableArchiveMemberType::getInstance());
   EXPECT_TRUE(members[0]->isAuxiliary());
   EXPECT_TRUE(members[1]->hasContents());
-  EXPECT_EQ(asString(members[1]->getContents()), LongName + "/\n");
+  EXPECT_EQ(textOf(members[1]->getContents()), LongName + "/\n");
   EXPECT_EQ(members[2]->getFileNameTableOffset(), 0u);
   EXPECT_FALSE(members[2]->isAuxiliary());
 }

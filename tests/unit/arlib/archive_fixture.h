@@ -31,10 +31,7 @@ using testsupport::FaultyHost;
 using testsupport::MemoryHost;
 using testsupport::object;
 using testsupport::RecordingHandler;
-
-inline std::string asString(std::span<const uint8_t> bytes) {
-  return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
-}
+using testsupport::textOf;
 
 inline std::vector<std::string> namesOf(const Archive& archive) {
   std::vector<std::string> names;
@@ -52,7 +49,7 @@ inline std::vector<std::string> symbolNamesOf(const Archive& archive) {
 
 // The member's bytes, wherever they are; they are in memory afterwards.
 inline std::string contentsOf(ArchiveMember* member) {
-  return member->loadContents() ? asString(member->getContents()) : "(unreadable)";
+  return member->loadContents() ? textOf(member->getContents()) : "(unreadable)";
 }
 
 // All that there is to know of each.

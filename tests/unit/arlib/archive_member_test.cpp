@@ -57,7 +57,7 @@ TEST_F(ArchiveMemberTest, LoadsItsBytesOnDemandAndOnce) {
   ArchiveMember* added = m_Archive.addMemberFromFile("a.o");
   EXPECT_FALSE(added->hasContents());
   EXPECT_TRUE(added->loadContents());
-  EXPECT_EQ(asString(added->getContents()), "contents");
+  EXPECT_EQ(textOf(added->getContents()), "contents");
   m_Host.remove("a.o");
   EXPECT_TRUE(added->loadContents());
 }
@@ -119,7 +119,7 @@ TEST_F(ArchiveMemberTest, MayBeEditedInPlaceOnceItsTypeIsCleared) {
   EXPECT_TRUE(added->clearType());
   added->getModifiableContents()[0] = 'C';
   EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
-  EXPECT_EQ(asString(added->getContents()), "Contents");
+  EXPECT_EQ(textOf(added->getContents()), "Contents");
   EXPECT_DEATH(static_cast<void>(added->getModifiableContents()), "m_Type == NULL");
 }
 

@@ -11,13 +11,7 @@ namespace {
 const std::string Long1 = "first_long_name_of_member.o";
 const std::string Long2 = "second_long_name_of_member.o";
 
-std::string objectThatDefines(const char* name) {
-  testsupport::ObjectBuilder file = object();
-  file.section(".text", elfext::SHT_PROGBITS).zeros(4);
-  file.section(".symtab", elfext::SHT_SYMTAB).link(3).symbol({.name = name, .section = 1});
-  file.section(".strtab", elfext::SHT_STRTAB);
-  return file.bytes();
-}
+using testsupport::objectThatDefines;
 
 class AuxiliaryMembersTest : public ArchiveTest {
 protected:
@@ -30,7 +24,7 @@ protected:
 
   std::string longNameTable() {
     const ArchiveMember* table = m_Archive.getFileNameTable();
-    return table == nullptr ? "(none)" : asString(table->getContents());
+    return table == nullptr ? "(none)" : textOf(table->getContents());
   }
 };
 
@@ -85,7 +79,7 @@ TEST_F(AuxiliaryMembersTest, MakesNewTablesWithZerosInTheirHeaders) {
     EXPECT_EQ(member(i)->getMode(), 0u);
   }
   EXPECT_EQ(member(0)->getSize(), 4u);
-  EXPECT_EQ(asString(member(0)->getContents()), bigEndian(0));
+  EXPECT_EQ(textOf(member(0)->getContents()), bigEndian(0));
 }
 
 TEST_F(AuxiliaryMembersTest, KeepsTheHeaderFieldsOfATableFromTheFile) {
@@ -198,7 +192,7 @@ TEST_F(AuxiliaryMembersTest, DoesNotDecodeTheSymbolsAnew) {
   m_Archive.removeMember(member(1));
   EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
   EXPECT_THAT(symbolNamesOf(m_Archive), ElementsAre("t"));
-  EXPECT_EQ(asString(m_Archive.getSymbolTable()->getContents()), bigEndian(0));
+  EXPECT_EQ(textOf(m_Archive.getSymbolTable()->getContents()), bigEndian(0));
 }
 
 TEST_F(AuxiliaryMembersTest, ReplacesASymbolTableOfAnySize) {
@@ -286,7 +280,7 @@ TEST_F(AuxiliaryMembersTest, LoadsATableThatWasDiscarded) {
 
 // A long name that comes, goes or changes shifts all members, and the symbol table leads to them.
 TEST_F(AuxiliaryMembersTest, KeepsSymbolsRightWhenNamesChangeTheLayout) {
-  const std::string defining = objectThatDefines("f");
+  const std::string defining = objectThatDefines("f").bytes();
   const ArchiveBuilder library = archive()
                                      .symbolTable({{"f", "a.o"}})
                                      .longNames({Long1})

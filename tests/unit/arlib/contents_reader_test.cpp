@@ -18,7 +18,7 @@ protected:
     std::span<const uint8_t> piece;
     do {
       if (!reader.read(piece)) return "(failed)";
-      text += asString(piece);
+      text += textOf(piece);
     } while (!piece.empty());
     return text;
   }

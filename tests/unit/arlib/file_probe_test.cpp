@@ -66,7 +66,7 @@ TEST(FileProbeTest, KeepsTheFileThatItHasLookedAt) {
   std::array<uint8_t, 9> bytes;
   size_t done = 0;
   EXPECT_EQ(old.file->readAt(bytes, 0, done), 0);
-  EXPECT_EQ(asString(bytes), "old bytes");
+  EXPECT_EQ(textOf(bytes), "old bytes");
 }
 
 } // namespace arlib

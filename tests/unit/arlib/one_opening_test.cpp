@@ -49,7 +49,7 @@ Contents readAll(support::Host& host, RecordingHandler& handler) {
     if (!reader.begin(*member)) return {};
     do {
       if (!reader.read(piece)) return {};
-      text += asString(piece);
+      text += textOf(piece);
     } while (!piece.empty());
     all.push_back(text);
   }

@@ -104,15 +104,11 @@ struct Definition {
 };
 
 std::string objectWith(const std::vector<Definition>& definitions) {
-  testsupport::ObjectBuilder file = object();
-  file.section(".text", elfext::SHT_PROGBITS).flags(elfext::SHF_ALLOC).zeros(4);
-  auto& symbols = file.section(".symtab", elfext::SHT_SYMTAB).link(3);
-  for (const Definition& definition : definitions) {
-    symbols.symbol(
+  std::vector<testsupport::SymbolSpec> symbols;
+  for (const Definition& definition : definitions)
+    symbols.push_back(
         {.name = definition.name, .section = definition.section, .binding = definition.binding});
-  }
-  file.section(".strtab", elfext::SHT_STRTAB);
-  return file.bytes();
+  return testsupport::objectWithSymbols(symbols).bytes();
 }
 
 // Members a.o, b.o and c.o, of which the second can't be read.
@@ -127,7 +123,7 @@ protected:
 
   // The names that the table holds.
   std::string publishedNames() {
-    const std::string table = asString(m_Archive.getSymbolTable()->getContents());
+    const std::string table = textOf(m_Archive.getSymbolTable()->getContents());
     return table.substr(4 + 4 * static_cast<unsigned char>(table[3]));
   }
 };

@@ -2,6 +2,7 @@
 // Which bytes are an ELF image.
 #include "elfext/interface/format_recognizer.h"
 
+#include "tests/support/bytes.h"
 #include "tests/support/faulty_host.h"
 #include "tests/support/memory_host.h"
 #include "tests/support/object_builder.h"
@@ -22,7 +23,7 @@ using testsupport::MemoryHost;
 using testsupport::object;
 
 bool isElf(std::string_view bytes) {
-  return isElfData({reinterpret_cast<const uint8_t*>(bytes.data()), bytes.size()});
+  return isElfData(testsupport::bytesOf(bytes));
 }
 
 } // namespace

@@ -7,12 +7,14 @@
 #include "elfext/interface/build_attributes_parsers.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/object_module.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
+#include "tests/support/attribute_bytes.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 namespace elfext {
+
+using namespace testsupport;
 
 class AttributeModuleTest : public testing::Test {
 protected:

@@ -3,6 +3,7 @@
 
 #include "checking/interface/checking.h"
 #include "elfext/src/bytes/checked_reader.h"
+#include "tests/support/attribute_bytes.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -24,18 +25,13 @@ using testing::SizeIs;
 class AttributeTraceTest : public testing::Test {
 protected:
   [[nodiscard]] std::string word(size_t number) const {
-    std::string bytes;
-    for (uint32_t i = 0; i < 4; ++i)
-      bytes += static_cast<char>(number >> 8 * (m_IsLittleEndian ? i : 3 - i));
-    return bytes;
+    return testsupport::word(number, m_IsLittleEndian);
   }
-  // With its size in front of the contents.
-  [[nodiscard]] std::string part(char kind, const std::string& contents) const {
-    return kind + word(5 + contents.size()) + contents;
+  [[nodiscard]] std::string part(uint32_t kind, const std::string& contents) const {
+    return testsupport::subSubsection({kind, contents}, m_IsLittleEndian);
   }
   [[nodiscard]] std::string subsection(const std::string& vendor, const std::string& parts) const {
-    const std::string contents = vendor + '\0' + parts;
-    return word(4 + contents.size()) + contents;
+    return testsupport::subsection(testsupport::ntbs(vendor) + parts, m_IsLittleEndian);
   }
   [[nodiscard]] std::string goodSection() const {
     return "A" +
@@ -158,9 +154,9 @@ TEST_F(AttributeTraceTest, SkipsPartsOfOtherKindsInEveryPassAndAnswersFalse) {
 
 // A kind that there is not makes the section ill formed, and the parts behind it are read on.
 TEST_F(AttributeTraceTest, GoesOnBehindAKindThatThereIsNot) {
-  for (const char kind : {'\0', '\4', '\7'}) {
+  for (const uint32_t kind : {0U, 4U, 7U}) {
     m_Table = {};
-    EXPECT_FALSE(trace("A" + subsection("qobix", part(kind, "") + part(1, "\x06\x0a")))) << +kind;
+    EXPECT_FALSE(trace("A" + subsection("qobix", part(kind, "") + part(1, "\x06\x0a")))) << kind;
     EXPECT_EQ(countPasses(m_Trace), kind == 0 ? 1u : 3u);
     EXPECT_THAT(m_Trace, HasSubstr(" subsubsection (size 5 out of 12) (skipped)\n"
                                    "    File subsubsection (size 7 out of 7):\n"));

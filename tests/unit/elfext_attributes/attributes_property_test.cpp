@@ -5,6 +5,7 @@
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/build_attributes_parsers.h"
+#include "tests/support/bytes.h"
 #include "tests/unit/elfext_attributes/attribute_sets.h"
 #include "tests/unit/elfext_attributes/generated_records.h"
 
@@ -21,10 +22,6 @@ using namespace features;
 
 constexpr int ManySets = 5000;
 
-AttributeBytes asBytes(const std::string& text) {
-  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
-}
-
 struct Encoded {
   std::string qobix;
   std::string zev;
@@ -35,8 +32,8 @@ struct Encoded {
   }
   // False if either was malformed.
   bool decodeInto(BuildAttributes& attributes) const {
-    return QobixBuildAttributesDecodingParser(attributes).parse(asBytes(qobix)) &&
-           ZevBuildAttributesDecodingParser(attributes).parse(asBytes(zev));
+    return QobixBuildAttributesDecodingParser(attributes).parse(testsupport::bytesOf(qobix)) &&
+           ZevBuildAttributesDecodingParser(attributes).parse(testsupport::bytesOf(zev));
   }
   bool operator==(const Encoded&) const = default;
 };

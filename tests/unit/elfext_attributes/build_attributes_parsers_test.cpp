@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/interface/build_attributes_parsers.h"
 
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
+#include "tests/support/attribute_bytes.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -14,6 +14,7 @@
 namespace elfext {
 namespace {
 
+using namespace testsupport;
 using testing::ElementsAre;
 
 // Bytes in a block of their own, so that a sanitizer sees a step beyond them.
@@ -137,20 +138,20 @@ TEST(AttributeSectionTest, IgnoresWhatNobodyAsksFor) {
 TEST(AttributeSectionTest, EndsAtASubsectionOfNoLength) {
   const std::string good = attributeSection({vendorPart("v", {filePart("x")})});
   for (const uint32_t length : {0U, 1U, 4U}) {
-    expectBad(good + lengthField(length, true), {"file v: x"});
-    expectBad(good + lengthField(length, true) + good.substr(1), {"file v: x"});
+    expectBad(good + word(length, true), {"file v: x"});
+    expectBad(good + word(length, true) + good.substr(1), {"file v: x"});
   }
   expectBad(good + "\5", {"file v: x"});
   expectBad(good + std::string("\5\0\0", 3), {"file v: x"});
   // The smallest one has a vendor without a name.
-  expectWell(good + lengthField(5, true) + '\0', {"file v: x"});
-  expectBad(good + lengthField(5, true) + 'v', {"file v: x"});
+  expectWell(good + word(5, true) + '\0', {"file v: x"});
+  expectBad(good + word(5, true) + 'v', {"file v: x"});
 }
 
 TEST(AttributeSectionTest, EndsAtASubsectionThatIsTooLong) {
   const std::string good = attributeSection({vendorPart("v", {filePart("x")})});
   const auto claimed = [&good](uint32_t length) {
-    return "A" + lengthField(length, true) + good.substr(5);
+    return "A" + word(length, true) + good.substr(5);
   };
   const auto size = static_cast<uint32_t>(good.size());
   expectWell(claimed(size - 1), {"file v: x"});
@@ -178,12 +179,11 @@ TEST(AttributeSectionTest, PassesOverTheRestBehindABadSize) {
   expectBad(sectionWith(good + "\1"), {"file v: x", Next});
   expectBad(sectionWith(good + std::string("\1\5\0\0", 4)), {"file v: x", Next});
   for (const uint32_t size : {0U, 4U, 11U, 0x80000000U, 0xFFFFFFFFU})
-    expectBad(sectionWith(good + "\1" + lengthField(size, true) + "12345"), {"file v: x", Next});
-  expectWell(sectionWith(good + "\1" + lengthField(5, true)), {"file v: x", "file v: ", Next});
+    expectBad(sectionWith(good + "\1" + word(size, true) + "12345"), {"file v: x", Next});
+  expectWell(sectionWith(good + "\1" + word(5, true)), {"file v: x", "file v: ", Next});
   // A longer form of the kind counts in the size.
-  expectWell(sectionWith("\x81" + std::string(1, '\0') + lengthField(7, true) + "a"),
-             {"file v: a", Next});
-  expectBad(sectionWith("\x81" + std::string(1, '\0') + lengthField(5, true)), {Next});
+  expectWell(sectionWith("\x81" + std::string(1, '\0') + word(7, true) + "a"), {"file v: a", Next});
+  expectBad(sectionWith("\x81" + std::string(1, '\0') + word(5, true)), {Next});
 }
 
 TEST(AttributeSectionTest, GoesOnBehindAListWithoutAnEnd) {

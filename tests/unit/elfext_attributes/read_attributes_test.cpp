@@ -6,13 +6,15 @@
 #include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/build_attributes_writer.h"
 #include "elfext/src/model/module_builder.h"
+#include "tests/support/attribute_bytes.h"
 #include "tests/support/faulty_host.h"
-#include "tests/unit/elfext_attributes/attribute_bytes.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <cerrno>
 
 namespace elfext {
+
+using namespace testsupport;
 
 using ReadAttributesTest = ReaderTest;
 using ReadAttributesOfEachFormTest = EachFormTest;

@@ -7,7 +7,7 @@
 #include "elfext/interface/preemption.h"
 #include "elfext/interface/symbol_version_definition.h"
 #include "elfext/interface/symbol_version_requirement.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 namespace elfext {
 

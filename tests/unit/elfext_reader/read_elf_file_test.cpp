@@ -5,8 +5,9 @@
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/preemption.h"
 #include "elfext/interface/raw_data_block.h"
+#include "tests/support/bytes.h"
 #include "tests/support/faulty_host.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -107,9 +108,7 @@ protected:
     return readElfFile(m_Faulty, open("lib.a"), 2, m_Bytes.size(), *m_Module, selector);
   }
 
-  std::span<const uint8_t> lentBytes() const {
-    return {reinterpret_cast<const uint8_t*>(m_Bytes.data()), m_Bytes.size()};
-  }
+  std::span<const uint8_t> lentBytes() const { return testsupport::bytesOf(m_Bytes); }
 
   support::FileHandle open(const char* name) {
     support::FileHandle handle;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "elfext/interface/group.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 namespace elfext {
 

@@ -2,7 +2,7 @@
 //
 // Debug overlay sections, and the note that maps sections to segments.
 #include "elfext/interface/segment.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <functional>
 

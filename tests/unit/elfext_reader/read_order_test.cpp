@@ -2,7 +2,7 @@
 //
 // A file in which everything is wrong: what is reported is what the earliest step finds, wherever
 // in the file it is.
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <iterator>
 

@@ -3,7 +3,7 @@
 // Segments, what is tied to what, and the bytes that only segments have.
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 namespace elfext {
 

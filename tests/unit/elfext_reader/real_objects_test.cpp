@@ -3,7 +3,7 @@
 // Objects that compilers made. The numbers are what `readelf -hsrg` says of the same files.
 #include "elfext/interface/relocation.h"
 #include "support/interface/host.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <cctype>
 

@@ -6,7 +6,7 @@
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/model/module_builder.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <cstdio>
 #include <memory>

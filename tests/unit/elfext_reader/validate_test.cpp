@@ -5,7 +5,7 @@
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/model/module_builder.h"
-#include "tests/unit/elfext_reader/reader_fixture.h"
+#include "tests/support/reader_fixture.h"
 
 #include <algorithm>
 #include <functional>

@@ -4,7 +4,7 @@
 
 #include "messages/interface/format.h"
 #include "messages/src/catalogues.h"
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 #include <gmock/gmock.h>
 

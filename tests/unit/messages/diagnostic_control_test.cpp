@@ -2,7 +2,7 @@
 // What the user's severities do to messages, and what they cannot do.
 #include "messages/interface/diagnostic_control.h"
 
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 namespace messages {
 

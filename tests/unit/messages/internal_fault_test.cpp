@@ -2,7 +2,7 @@
 // Faults of the program: their line, their number, and that they end the run.
 #include "alloclib/interface/handlers.h"
 #include "checking/interface/checking.h"
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 #include <new>
 

@@ -7,7 +7,7 @@
 #include "messages/interface/catalogue.h"
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/stdio_via_file_reader.h"
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 namespace messages {
 

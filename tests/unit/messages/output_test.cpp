@@ -3,7 +3,7 @@
 #include "messages/interface/output.h"
 
 #include "messages/src/descriptor_sink.h"
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 #include <atomic>
 #include <cerrno>

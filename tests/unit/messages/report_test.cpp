@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // How diagnostics look, are counted, and end the run.
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 namespace messages {
 

@@ -6,7 +6,7 @@
 #include "elfext/interface/attribute_string.h"
 #include "messages/interface/catalogue.h"
 #include "tests/support/memory_host.h"
-#include "tests/unit/messages/messages_fixture.h"
+#include "tests/support/messages_fixture.h"
 
 #include <vector>
 

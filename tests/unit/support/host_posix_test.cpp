@@ -2,6 +2,8 @@
 // The host that the process runs on, in a folder of its own.
 #include "support/interface/host.h"
 
+#include "tests/support/bytes.h"
+
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -23,6 +25,8 @@
 namespace support {
 
 namespace {
+
+using testsupport::bytesOf;
 
 namespace fs = std::filesystem;
 
@@ -75,10 +79,6 @@ protected:
   fs::path m_Folder;
   Host& m_Host = getPosixHost();
 };
-
-std::span<const uint8_t> bytesOf(std::string_view text) {
-  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
-}
 
 } // namespace
 

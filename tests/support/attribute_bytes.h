@@ -7,14 +7,14 @@
 #pragma once
 
 #include "elfext/interface/build_attributes_tags.h"
+#include "tests/support/bytes.h"
 
 #include <cstdint>
-#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
 
-namespace elfext {
+namespace testsupport {
 
 inline std::string uleb(uint32_t value) {
   std::string bytes;
@@ -25,13 +25,6 @@ inline std::string uleb(uint32_t value) {
 
 inline std::string ntbs(std::string_view text) {
   return std::string(text) + '\0';
-}
-
-inline std::string lengthField(size_t value, bool isLittle) {
-  std::string bytes;
-  for (uint32_t i = 0; i < 4; ++i)
-    bytes += static_cast<char>(value >> 8 * (isLittle ? i : 3 - i));
-  return bytes;
 }
 
 // ---- Attributes
@@ -56,7 +49,7 @@ struct AttributePart {
 };
 
 inline AttributePart filePart(std::string attributes) {
-  return {Tag_File, std::move(attributes)};
+  return {elfext::Tag_File, std::move(attributes)};
 }
 
 inline AttributePart indexedPart(uint32_t kind, const std::vector<uint32_t>& indices,
@@ -71,16 +64,16 @@ inline AttributePart indexedPart(uint32_t kind, const std::vector<uint32_t>& ind
 
 inline AttributePart sectionPart(const std::vector<uint32_t>& indices,
                                  std::string_view attributes) {
-  return indexedPart(Tag_Section, indices, attributes);
+  return indexedPart(elfext::Tag_Section, indices, attributes);
 }
 
 inline AttributePart symbolPart(const std::vector<uint32_t>& indices, std::string_view attributes) {
-  return indexedPart(Tag_Symbol, indices, attributes);
+  return indexedPart(elfext::Tag_Symbol, indices, attributes);
 }
 
 inline std::string subSubsection(const AttributePart& part, bool isLittle) {
   const std::string kind = uleb(part.kind);
-  return kind + lengthField(kind.size() + 4 + part.payload.size(), isLittle) + part.payload;
+  return kind + word(kind.size() + 4 + part.payload.size(), isLittle) + part.payload;
 }
 
 struct VendorPart {
@@ -94,7 +87,7 @@ inline VendorPart vendorPart(std::string vendor, std::vector<AttributePart> part
 
 // A subsection of these bytes.
 inline std::string subsection(std::string_view bytes, bool isLittle = true) {
-  return lengthField(4 + bytes.size(), isLittle) + std::string(bytes);
+  return word(4 + bytes.size(), isLittle) + std::string(bytes);
 }
 
 inline std::string attributeSection(const std::vector<VendorPart>& vendors, bool isLittle = true) {
@@ -108,12 +101,4 @@ inline std::string attributeSection(const std::vector<VendorPart>& vendors, bool
   return bytes;
 }
 
-inline std::span<const uint8_t> bytesOf(std::string_view text) {
-  return {reinterpret_cast<const uint8_t*>(text.data()), text.size()};
-}
-
-inline std::string textOf(std::span<const uint8_t> bytes) {
-  return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
-}
-
-} // namespace elfext
+} // namespace testsupport

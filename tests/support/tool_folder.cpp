@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/systematic/tool_folder.h"
+#include "tests/support/tool_folder.h"
 
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
