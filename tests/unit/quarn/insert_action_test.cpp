@@ -1,0 +1,187 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What goes into an archive: where it stands, what it replaces, and what its header says.
+#include "tests/unit/quarn/driver_fixture.h"
+
+namespace quarn {
+
+// ---- Positions
+
+class InsertPositionTest : public DriverTest {
+protected:
+  InsertPositionTest() {
+    givenLibrary({"a.o", "b.o", "c.o"});
+    for (const char* name : {"x.o", "y.o", "b.o"})
+      givenFile(name);
+  }
+
+  Words namesAfter(const Words& words) {
+    EXPECT_EQ(run(words).status, 0);
+    return names();
+  }
+};
+
+TEST_F(InsertPositionTest, IsTheEndIfNoneIsGiven) {
+  EXPECT_THAT(namesAfter({"-r", "lib.a", "y.o", "x.o"}),
+              ElementsAre("a.o", "b.o", "c.o", "y.o", "x.o"));
+}
+
+TEST_F(InsertPositionTest, IsBehindAMember) {
+  EXPECT_THAT(namesAfter({"-r", "-a", "a.o", "lib.a", "y.o", "x.o"}),
+              ElementsAre("a.o", "y.o", "x.o", "b.o", "c.o"));
+}
+
+TEST_F(InsertPositionTest, IsInFrontOfAMember) {
+  EXPECT_THAT(namesAfter({"-r", "-b", "a.o", "lib.a", "y.o", "x.o"}),
+              ElementsAre("y.o", "x.o", "a.o", "b.o", "c.o"));
+}
+
+TEST_F(InsertPositionTest, LeavesReplacedMembersInTheirPlaces) {
+  EXPECT_THAT(namesAfter({"-r", "-a", "c.o", "lib.a", "b.o", "x.o"}),
+              ElementsAre("a.o", "b.o", "c.o", "x.o"));
+}
+
+TEST_F(InsertPositionTest, IsThatOfTheFirstMemberThatMatches) {
+  EXPECT_THAT(namesAfter({"-r", "-a", "out/?.O", "lib.a", "x.o"}),
+              ElementsAre("a.o", "x.o", "b.o", "c.o"));
+}
+
+TEST_F(InsertPositionTest, MayBeThatOfATable) {
+  ASSERT_EQ(run({"-s", "lib.a"}).status, 0);
+  EXPECT_THAT(namesAfter({"-r", "-b", "*", "lib.a", "x.o"}),
+              ElementsAre("x.o", "a.o", "b.o", "c.o"));
+}
+
+TEST_F(InsertPositionTest, KeepsTheArchiveIfItIsNotThere) {
+  const std::string before = m_Host.read("lib.a");
+  const RunOutcome outcome = run({"-r", "-a", "none.o", "lib.a", "x.o"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6841E: Position 'none.o' not found\n");
+  EXPECT_EQ(m_Host.read("lib.a"), before);
+}
+
+// ---- Update modes
+
+struct UpdateCase {
+  const char* name;
+  Words option;
+  bool takesOlder;
+  bool takesEqual;
+};
+
+void PrintTo(const UpdateCase& updateCase, std::ostream* stream) {
+  *stream << updateCase.name;
+}
+
+class UpdateModeTest : public DriverTest, public testing::WithParamInterface<UpdateCase> {
+protected:
+  // Whether a file of that date takes the place of the member.
+  bool replaces(int64_t date) {
+    givenLibrary({"a.o"});
+    givenFile("a.o", "new", date);
+    Words words = {"-r", "lib.a", "a.o"};
+    words.insert(words.begin(), GetParam().option.begin(), GetParam().option.end());
+    EXPECT_EQ(run(words).status, 0);
+    return texts() == Words{"new"};
+  }
+};
+
+TEST_P(UpdateModeTest, ReplacesByTheDatesOfMemberAndFile) {
+  EXPECT_EQ(replaces(OldDate - 1), GetParam().takesOlder);
+  EXPECT_EQ(replaces(OldDate), GetParam().takesEqual);
+  EXPECT_TRUE(replaces(OldDate + 1));
+}
+
+INSTANTIATE_TEST_SUITE_P(Options, UpdateModeTest,
+                         testing::Values(UpdateCase{"Always", {}, true, true},
+                                         UpdateCase{"NotNewer", {"-u"}, false, true},
+                                         UpdateCase{"Older", {"--new_files_only"}, false, false}),
+                         [](const auto& given) { return given.param.name; });
+
+// ---- What is inserted
+
+using InsertActionTest = DriverTest;
+
+TEST_F(InsertActionTest, TakesDateOwnerAndModeOfTheFile) {
+  givenLibrary({});
+  givenFile("a.o", "", 1234567890);
+  ASSERT_EQ(run({"-r", "lib.a", "a.o"}).status, 0);
+  EXPECT_THAT(members().front().numbers, ElementsAre("1234567890", "1", "2", "100644", "52"));
+}
+
+TEST_F(InsertActionTest, NormalisesTheHeadersOfWhatItInserts) {
+  givenLibrary({"a.o", "b.o"});
+  givenFile("b.o");
+  ASSERT_EQ(run({"-r", "--normalise=7", "lib.a", "b.o"}).status, 0);
+  EXPECT_EQ(members()[0].numbers[0], std::to_string(OldDate));
+  EXPECT_THAT(members()[1].numbers, ElementsAre("7", "0", "0", "100644", "52"));
+}
+
+TEST_F(InsertActionTest, ReplacesOneMemberOfANameForEachWord) {
+  givenLibrary({"a.o", "a.o", "a.o"});
+  givenFile("a.o", "new");
+  ASSERT_EQ(run({"-r", "lib.a", "a.o", "a.o"}).status, 0);
+  EXPECT_THAT(texts(), ElementsAre("new", "new", "a.o"));
+}
+
+TEST_F(InsertActionTest, InsertsTheMembersOfAnArchive) {
+  givenLibrary({"a.o", "b.o"});
+  m_Host.addFile("other.a", m_Host.read("lib.a"));
+  givenLibrary({"b.o"});
+  const RunOutcome outcome = run({"-rv", "lib.a", "other.a"});
+  EXPECT_EQ(outcome.output, "a - a.o\nr - b.o\n");
+  EXPECT_THAT(names(), ElementsAre("b.o", "a.o"));
+}
+
+// The member stays; its header becomes that of the source all the same.
+TEST_F(InsertActionTest, TakesTheHeaderOfATooOldMemberOfAnArchive) {
+  m_Host.addFile("other.a", testsupport::archive()
+                                .member("a.o", objectBytes("old"))
+                                .numbers(OldDate - 1, 7, 8, "100600")
+                                .bytes());
+  givenLibrary({"a.o"});
+  EXPECT_EQ(run({"-ruv", "lib.a", "other.a"}).output, "");
+  EXPECT_THAT(texts(), ElementsAre("a.o"));
+  EXPECT_EQ(members()[0].numbers[1], "7");
+}
+
+TEST_F(InsertActionTest, WarnsOnceOfMembersThatAreNoObjects) {
+  givenLibrary({});
+  m_Host.addFile("one.txt", "1");
+  m_Host.addFile("two.txt", "2");
+  EXPECT_EQ(run({"-r", "lib.a", "one.txt", "two.txt"}).errors,
+            "Warning: L6875W: Adding non-ELF object 'one.txt' to archive 'lib.a'\n");
+  EXPECT_THAT(names(), ElementsAre("one.txt", "two.txt"));
+}
+
+TEST_F(InsertActionTest, KeepsTheArchiveIfAFileIsNotThere) {
+  givenLibrary({"a.o"});
+  givenFile("x.o");
+  const std::string before = m_Host.read("lib.a");
+  const RunOutcome outcome = run({"-r", "lib.a", "none.o", "x.o"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6833E: File 'none.o' does not exist\n");
+  EXPECT_EQ(m_Host.read("lib.a"), before);
+}
+
+TEST_F(InsertActionTest, MakesANewArchiveAndSaysSo) {
+  givenFile("a.o");
+  const RunOutcome outcome = run({"-r", "lib.a", "a.o"});
+  EXPECT_EQ(outcome.errors, "Creating archive 'lib.a'\n");
+  EXPECT_THAT(names(), ElementsAre("a.o"));
+}
+
+TEST_F(InsertActionTest, MakesNoArchiveOfNothing) {
+  EXPECT_EQ(run({"-r", "lib.a"}).status, 0);
+  EXPECT_EQ(run({"--create", "lib.a"}).status, 1);
+  EXPECT_FALSE(m_Host.has("lib.a"));
+}
+
+TEST_F(InsertActionTest, PutsACreatedArchiveInThePlaceOfAnOldOne) {
+  givenLibrary({"a.o", "b.o"});
+  givenFile("x.o");
+  EXPECT_EQ(run({"--create", "lib.a", "x.o"}).errors, "");
+  EXPECT_THAT(names(), ElementsAre("x.o"));
+}
+
+} // namespace quarn
