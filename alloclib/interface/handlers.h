@@ -9,20 +9,20 @@
 
 namespace alloclib {
 
-// The text of a fault inside the library or in the way it is used.
+/// The text of a fault inside the library or in the way it is used.
 using InternalErrorHandler = void (*)(const char* text);
-// `size` is the request in bytes; `systemSize` is what the process holds from the system, in
-// bytes.
+/// `size` is the request in bytes; `systemSize` is what the process holds from the system, in
+/// bytes.
 using OutOfMemoryHandler = void (*)(size_t size, size_t systemSize);
 
-// Each installs its argument, or the default again for a null pointer, and returns what was
-// installed before. A handler should end the process; if it returns, the process is aborted. The
-// defaults write to standard error and exit with status 1, and need no set-up.
+/// Each installs its argument, or the default again for a null pointer, and returns what was
+/// installed before. A handler should end the process; if it returns, the process is aborted. The
+/// defaults write to standard error and exit with status 1, and need no set-up.
 InternalErrorHandler setInternalErrorHandler(InternalErrorHandler handler);
 OutOfMemoryHandler setOutOfMemoryHandler(OutOfMemoryHandler handler);
 
 [[noreturn, gnu::cold]] void internalError(const char* text);
-// Also for callers that take memory from the host's heap themselves. `size` in bytes.
+/// Also for callers that take memory from the host's heap themselves. `size` in bytes.
 [[noreturn, gnu::cold]] void outOfMemory(size_t size);
 
 } // namespace alloclib

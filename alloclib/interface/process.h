@@ -12,42 +12,42 @@ namespace alloclib {
 class Region;
 class RegionLargeBlock;
 
-// What regions made from now on do; those there already stay as they are.
+/// What regions made from now on do; those there already stay as they are.
 enum DebugMode : int {
   Debug_Off = 0,
   Debug_Plain = 1,
-  // Every allocation is counted and can be traced.
+  /// Every allocation is counted and can be traced.
   Debug_Tracing = 2,
-  // Every region allocates from a parent of its own.
+  /// Every region allocates from a parent of its own.
   Debug_Transparent = 3,
 };
 
-// Makes the root region and the first default parent of it. A second call is an internal error.
+/// Makes the root region and the first default parent of it. A second call is an internal error.
 void initialise();
 
-// Undoes initialise; every region must have been destroyed. With false nothing is checked and
-// nothing given back, for a process that is about to exit with regions still alive. An internal
-// error before initialise.
+/// Undoes initialise; every region must have been destroyed. With false nothing is checked and
+/// nothing given back, for a process that is about to exit with regions still alive. An internal
+/// error before initialise.
 void shutDown(bool freeMemory = true);
 
-// The region on which RegionFastOld::Create builds. The pushed region must stay until it is
-// popped and its users are gone.
+/// The region on which RegionFastOld::Create builds. The pushed region must stay until it is
+/// popped and its users are gone.
 void pushDefaultParent(Region* parent);
-// Returns the region that was popped.
+/// Returns the region that was popped.
 Region* popDefaultParent();
 [[nodiscard]] Region* getDefaultParent();
 
-// The page allocator under all general regions, made on the default parent at its first use.
+/// The page allocator under all general regions, made on the default parent at its first use.
 [[nodiscard]] RegionLargeBlock* getProcessLargeBlock();
 
-// Bytes that the root region holds from the host; 0 before initialise.
+/// Bytes that the root region holds from the host; 0 before initialise.
 [[nodiscard]] size_t getSystemSize();
 
 [[nodiscard]] int getDebugMode();
 void setDebugMode(int mode);
 
-// How much regions made from now on tell about themselves on standard error: 1 their life, 2
-// allocations too, 3 overhead and fragmentation too.
+/// How much regions made from now on tell about themselves on standard error: 1 their life, 2
+/// allocations too, 3 overhead and fragmentation too.
 [[nodiscard]] uint32_t getTraceLevel();
 void setTraceLevel(uint32_t level);
 

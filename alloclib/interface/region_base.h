@@ -15,27 +15,27 @@ public:
   Region(const Region&) = delete;
   Region& operator=(const Region&) = delete;
 
-  // Returns `size` bytes, never null; running out of memory ends the process. `alignment` is a
-  // power of two up to 4096, and 8 is free. The tag names the place of the call, for a debugger,
-  // and may be null. The memory belongs to the region and dies with it at the latest.
+  /// Returns `size` bytes, never null; running out of memory ends the process. `alignment` is a
+  /// power of two up to 4096, and 8 is free. The tag names the place of the call, for a debugger,
+  /// and may be null. The memory belongs to the region and dies with it at the latest.
   virtual void* AllocFull(size_t size, size_t alignment, const char* fileLine) = 0;
 
-  // Gives a block back; size and alignment are those of its allocation.
+  /// Gives a block back; size and alignment are those of its allocation.
   virtual void DiscardFull(void* pointer, size_t size, size_t alignment) = 0;
 
-  // Ends the region and all memory in it, whose destructors do not run. With false nothing is
-  // given back, for a process that is about to exit.
+  /// Ends the region and all memory in it, whose destructors do not run. With false nothing is
+  /// given back, for a process that is about to exit.
   virtual void Destroy(bool freeMemory) = 0;
 
-  // Brings the region's statistics up to date where it does not keep them so.
+  /// Brings the region's statistics up to date where it does not keep them so.
   virtual void updateStats() {}
 
-  // Bytes; blocks of whole pages are what a region hands to another without waste.
+  /// Bytes; blocks of whole pages are what a region hands to another without waste.
   [[nodiscard]] virtual size_t getPageSize() const { return 4096; }
 
 protected:
   Region() = default;
-  // A region is ended by Destroy, since it lies in memory of its own.
+  /// A region is ended by Destroy, since it lies in memory of its own.
   ~Region() = default;
 };
 

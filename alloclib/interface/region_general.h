@@ -21,13 +21,13 @@ class RegionStats;
 
 class RegionGeneral final : public Region {
 public:
-  // A region of one page, which grows on the process's RegionLargeBlock. The initial size, in
-  // bytes, counts only in the transparent debug mode. The name is kept, not copied. The caller
-  // ends the region with Destroy. Needs an alloclib::Session.
+  /// A region of one page, which grows on the process's RegionLargeBlock. The initial size, in
+  /// bytes, counts only in the transparent debug mode. The name is kept, not copied. The caller
+  /// ends the region with Destroy. Needs an alloclib::Session.
   static RegionGeneral* Create(size_t initialSize, const char* name);
 
-  // `size` bytes, never null. `alignment` is a power of two up to 4096. The memory belongs to
-  // the region. A size of 0 yields an address that nobody may read or write.
+  /// `size` bytes, never null. `alignment` is a power of two up to 4096. The memory belongs to
+  /// the region. A size of 0 yields an address that nobody may read or write.
   void* allocate(size_t size, size_t alignment = 8) {
     const auto room = static_cast<size_t>(m_FastLimit - m_Cursor);
     const size_t rounded = roundUp(size, 8);
@@ -40,8 +40,8 @@ public:
     return block;
   }
 
-  // Gives a block back early, for use by later allocations. Size and alignment are those of the
-  // allocation.
+  /// Gives a block back early, for use by later allocations. Size and alignment are those of the
+  /// allocation.
   void discard(void* pointer, size_t size, size_t alignment = 8) {
     DiscardFull(pointer, size, alignment);
   }
@@ -62,7 +62,7 @@ private:
     Flags_BucketsTracing = Flags_Buckets | Flags_Tracing,
   };
 
-  // In front of a block's bytes. The sizes are of the whole block.
+  /// In front of a block's bytes. The sizes are of the whole block.
   struct Block {
     size_t size;
     Block* next;
@@ -72,12 +72,12 @@ private:
     LargeBlock* next;
     LargeBlock* previous;
   };
-  // At the start of a returned piece of BucketBound bytes or more.
+  /// At the start of a returned piece of BucketBound bytes or more.
   struct FreeChunk {
     size_t size;
     FreeChunk* next;
   };
-  // At the start of a smaller one; its size is that of its bucket.
+  /// At the start of a smaller one; its size is that of its bucket.
   struct FreePiece {
     FreePiece* next;
   };
@@ -118,14 +118,14 @@ private:
   char* m_FastLimit = nullptr;
   char* m_WorkingEnd = nullptr;
   uint32_t m_FlagsState;
-  // No free chunk has more bytes than this.
+  /// No free chunk has more bytes than this.
   uint16_t m_LargestChunk = 0;
   bool m_OwnedParent = false;
   Block* m_Blocks = nullptr;
   LargeBlock* m_LargeBlocks = nullptr;
   FreeChunk* m_FreeChunks = nullptr;
   size_t m_BucketBytes = 0;
-  // Made in the region itself at the first small discard.
+  /// Made in the region itself at the first small discard.
   FreePiece** m_Buckets = nullptr;
 };
 

@@ -16,13 +16,13 @@ class RegionStats;
 
 class RegionLargeBlock final : public Region {
 public:
-  // Sizes are multiples of a page; anything else is an internal error.
+  /// Sizes are multiples of a page; anything else is an internal error.
   void* AllocFull(size_t size, size_t alignment, const char* fileLine) override;
   void DiscardFull(void* pointer, size_t size, size_t alignment) override;
-  // With true the chunks go back to the parent, whoever still uses them.
+  /// With true the chunks go back to the parent, whoever still uses them.
   void Destroy(bool freeMemory) override;
 
-  // Overwrites what is discarded from now on, with a byte that goes up by one each time.
+  /// Overwrites what is discarded from now on, with a byte that goes up by one each time.
   void setFillDiscarded(bool fill) { m_FillDiscarded = fill; }
 
 private:
@@ -35,7 +35,7 @@ private:
   static constexpr uint32_t MapWords = 320;
   static constexpr uint32_t WordsPerChunk = ChunkSize / PageSize / 32;
   static constexpr uint32_t ChunkCount = MapWords / WordsPerChunk;
-  // A hint behind the map: this instance is not searched.
+  /// A hint behind the map: this instance is not searched.
   static constexpr uint32_t ExhaustedHint = MapWords + 1;
   static constexpr uint32_t NoRun = MapWords * 32;
 
@@ -45,7 +45,7 @@ private:
 
   void* allocatePages(uint32_t pages);
   void* allocateFromOverflow(uint32_t pages);
-  // The first bit of a run of free pages from the hint on; NoRun if there is none.
+  /// The first bit of a run of free pages from the hint on; NoRun if there is none.
   [[nodiscard]] uint32_t findRun(uint32_t pages) const;
   [[nodiscard]] RegionLargeBlock* findOwner(const void* pointer, uint32_t& bit);
   void SetBits(uint32_t firstBit, uint32_t count, bool free);
@@ -64,8 +64,8 @@ private:
   unsigned char m_FillByte = 0;
 };
 
-// Makes a RegionLargeBlock on the default parent; in the transparent debug mode, one that
-// forwards to a system region of its own. The name is kept, not copied.
+/// Makes a RegionLargeBlock on the default parent; in the transparent debug mode, one that
+/// forwards to a system region of its own. The name is kept, not copied.
 struct RegionFastOld {
   static RegionLargeBlock* Create(const char* name);
 };

@@ -12,15 +12,15 @@ class RegionStats;
 
 class RegionMallocFree final : public Region {
 public:
-  // The name is kept, not copied. The caller ends the region with Destroy.
+  /// The name is kept, not copied. The caller ends the region with Destroy.
   static RegionMallocFree* Create(const char* name);
 
   void* AllocFull(size_t size, size_t alignment, const char* fileLine) override;
   void DiscardFull(void* pointer, size_t size, size_t alignment) override;
-  // With true, memory that was not given back is an internal error.
+  /// With true, memory that was not given back is an internal error.
   void Destroy(bool freeMemory) override;
 
-  // Bytes that the region holds from the host now.
+  /// Bytes that the region holds from the host now.
   [[nodiscard]] size_t getCurrentSize() const;
 
 private:

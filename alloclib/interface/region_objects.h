@@ -15,13 +15,13 @@
 
 namespace alloclib {
 
-// A new object in the region. Its destructor does not run when the region goes.
+/// A new object in the region. Its destructor does not run when the region goes.
 template <class T, class... Arguments>
 [[nodiscard]] T* create(RegionGeneral& region, Arguments&&... arguments) {
   return ::new (region.allocate(sizeof(T), alignof(T))) T(std::forward<Arguments>(arguments)...);
 }
 
-// A copy of the text in the region, with a NUL behind it.
+/// A copy of the text in the region, with a NUL behind it.
 [[nodiscard]] inline const char* copyString(RegionGeneral& region, std::string_view text) {
   auto* copy = static_cast<char*>(region.allocate(text.size() + 1, 1));
   if (!text.empty()) std::memcpy(copy, text.data(), text.size());
@@ -33,7 +33,7 @@ struct RegionDeleter {
   void operator()(RegionGeneral* region) const { region->Destroy(true); }
 };
 
-// Ends the region, with all that is in it, when its owner goes.
+/// Ends the region, with all that is in it, when its owner goes.
 using RegionOwner = std::unique_ptr<RegionGeneral, RegionDeleter>;
 
 } // namespace alloclib

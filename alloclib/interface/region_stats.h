@@ -15,16 +15,16 @@ namespace alloclib {
 
 class RegionStats {
 public:
-  // Makes the record of a new region at the end of the live list. The name is kept, not copied.
+  /// Makes the record of a new region at the end of the live list. The name is kept, not copied.
   static RegionStats* start(const char* name, size_t initialSize, bool accurate);
 
-  // Moves the record to the finished list, or merges it into one of the same name there and
-  // frees it. The caller forgets the pointer.
+  /// Moves the record to the finished list, or merges it into one of the same name there and
+  /// frees it. The caller forgets the pointer.
   void finish();
 
-  // Sizes in bytes, padding included; the padding is what the client did not ask for.
+  /// Sizes in bytes, padding included; the padding is what the client did not ask for.
   void allocated(const void* pointer, size_t bytes, size_t padding);
-  // `bytes` is what the client asked for, the padding what lay beside it.
+  /// `bytes` is what the client asked for, the padding what lay beside it.
   void discarded(const void* pointer, size_t bytes, size_t padding);
   void extended();
   void overheadIncreased(size_t bytes);
@@ -32,7 +32,7 @@ public:
   void fragmentationIncreased(size_t bytes);
   void fragmentationDecreased(size_t bytes);
 
-  // Bytes in use: allocated, overhead and fragmentation, without padding and what was freed.
+  /// Bytes in use: allocated, overhead and fragmentation, without padding and what was freed.
   [[nodiscard]] uint64_t getCurrentSize() const {
     return m_BytesAllocated + m_Overhead + m_Fragmentation - m_Padding - m_BytesFreed;
   }
@@ -41,15 +41,15 @@ public:
   [[nodiscard]] uint64_t getFrees() const { return m_Frees; }
   [[nodiscard]] bool isAccurate() const { return m_Accurate; }
 
-  // Above what number of finished records of one name they are merged: the limit minus 10 if it
-  // is above 10, else 1. The limit is 0 at the start.
+  /// Above what number of finished records of one name they are merged: the limit minus 10 if it
+  /// is above 10, else 1. The limit is 0 at the start.
   static void setFinishedLimit(uint32_t limit);
 
-  // Writes the table: finished regions, if wanted, then the live ones. With `flagLive` each live
-  // region but the root gets a line of complaint.
+  /// Writes the table: finished regions, if wanted, then the live ones. With `flagLive` each live
+  /// region but the root gets a line of complaint.
   static void report(std::FILE* stream, bool includeFinished, bool flagLive);
 
-  // Frees the finished records. A live region other than the root is an internal error.
+  /// Frees the finished records. A live region other than the root is an internal error.
   static void freeAll();
 
 private:
@@ -69,7 +69,7 @@ private:
   void release();
   void noteSize();
   void merge(const RegionStats& other);
-  // The finished record that takes this one's counts; null if it gets a place of its own.
+  /// The finished record that takes this one's counts; null if it gets a place of its own.
   [[nodiscard]] RegionStats* findMergeTarget() const;
   void writeLine(std::FILE* stream) const;
   [[nodiscard]] const char* getAccuracyPrefix() const { return m_Accurate ? "" : "IN"; }

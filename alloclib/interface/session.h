@@ -14,18 +14,18 @@
 
 namespace alloclib {
 
-// One at a time.
+/// One at a time.
 class Session {
 public:
   Session() { initialise(); }
-  // Every region must be gone, or that is an internal error.
+  /// Every region must be gone, or that is an internal error.
   ~Session() {
     if (!m_IsLeft) shutDown();
   }
   Session(const Session&) = delete;
   Session& operator=(const Session&) = delete;
 
-  // Ends it now, in a process that is about to exit: what regions still hold is left to the host.
+  /// Ends it now, in a process that is about to exit: what regions still hold is left to the host.
   void leave() {
     shutDown(false);
     m_IsLeft = true;
