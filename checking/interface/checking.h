@@ -27,38 +27,38 @@ enum Level : uint32_t {
   Level_Extravagant = 4,
 };
 
-// The process-wide level. Written by set_checking_level only.
+/// The process-wide level. Written by set_checking_level only.
 inline uint32_t checkingLevel = Level_Low;
 
-// Whether an assertion of this level is to be evaluated.
+/// Whether an assertion of this level is to be evaluated.
 [[nodiscard]] inline bool checking(uint32_t level) {
   return level <= Level_Low && level <= checkingLevel;
 }
 
-// Takes a level's name ("none", "low", "medium", "high", "extravagant"), "show", or "show," and a
-// name. False, with the level as it was, if the text is not one of these; a null text is taken
-// and changes nothing; "show," alone stores level 0.
+/// Takes a level's name ("none", "low", "medium", "high", "extravagant"), "show", or "show," and a
+/// name. False, with the level as it was, if the text is not one of these; a null text is taken
+/// and changes nothing; "show," alone stores level 0.
 bool set_checking_level(const char* text);
 
-// Writes one line to the text sink for each kind of check that the level enables.
+/// Writes one line to the text sink for each kind of check that the level enables.
 void showCheckingLevels();
 
-// A failed assertion: source path relative to the source tree, line, and the expression's text.
+/// A failed assertion: source path relative to the source tree, line, and the expression's text.
 using FailureHandler = void (*)(const char* path, unsigned line, const char* expression);
-// A fault that no expression states.
+/// A fault that no expression states.
 using FaultHandler = void (*)(const char* text);
-// Takes texts that end with their own newline.
+/// Takes texts that end with their own newline.
 using TextSink = void (*)(std::string_view text);
 
-// Each installs its argument, or the default again for a null pointer, and returns what was
-// installed before. A handler should end the process; if it returns, the process is aborted. The
-// default handlers write to standard error and exit with status 1; the default sink writes to
-// standard output.
+/// Each installs its argument, or the default again for a null pointer, and returns what was
+/// installed before. A handler should end the process; if it returns, the process is aborted. The
+/// default handlers write to standard error and exit with status 1; the default sink writes to
+/// standard output.
 FailureHandler setFailureHandler(FailureHandler handler);
 FaultHandler setFaultHandler(FaultHandler handler);
 TextSink setTextSink(TextSink sink);
 
-// Passes a text to the installed sink.
+/// Passes a text to the installed sink.
 void showText(std::string_view text);
 
 [[noreturn, gnu::cold]] void assertionFailed(const char* path, unsigned line,
