@@ -16,25 +16,25 @@
 
 namespace support {
 
-// The host's error number; 0 means success.
+/// The host's error number; 0 means success.
 using HostError = int;
 
 enum class FileKind : uint8_t {
-  Nothing,     // no such name, or the host refuses to say
-  RegularFile, // an ordinary file
+  Nothing,     ///< no such name, or the host refuses to say
+  RegularFile, ///< an ordinary file
   Directory,
-  Special, // a device, FIFO or socket: never opened, never removed
+  Special, ///< a device, FIFO or socket: never opened, never removed
 };
 
-// What the host knows of a file, all in 64 bits: the caller narrows, with checks.
+/// What the host knows of a file, all in 64 bits: the caller narrows, with checks.
 struct FileStatus {
   FileKind kind = FileKind::Nothing;
-  int64_t size = 0;                     // bytes
-  int64_t modificationTime = 0;         // seconds since 1970
-  uint32_t modificationNanoseconds = 0; // behind the second, as far as the host tells
+  int64_t size = 0;                     ///< bytes
+  int64_t modificationTime = 0;         ///< seconds since 1970
+  uint32_t modificationNanoseconds = 0; ///< behind the second, as far as the host tells
   int64_t uid = 0;
   int64_t gid = 0;
-  uint32_t mode = 0; // type and permission bits, as in st_mode
+  uint32_t mode = 0; ///< type and permission bits, as in st_mode
   uint64_t device = 0;
   uint64_t inode = 0;
 
@@ -42,14 +42,14 @@ struct FileStatus {
     return kind != FileKind::Nothing && kind == other.kind && device == other.device &&
            inode == other.inode;
   }
-  // Whether the file has that range of bytes, whatever the two numbers are.
+  /// Whether the file has that range of bytes, whatever the two numbers are.
   [[nodiscard]] bool holds(uint64_t offset, uint64_t count) const {
     const auto available = static_cast<uint64_t>(size);
     return offset <= available && count <= available - offset;
   }
 };
 
-// An open file. A plain number, so that it can be copied; whoever opened it closes it.
+/// An open file. A plain number, so that it can be copied; whoever opened it closes it.
 struct FileHandle {
   int number = -1;
 
@@ -60,74 +60,74 @@ class Host {
 public:
   virtual ~Host() = default;
 
-  // Opens an existing file. Never waits, also not on a FIFO.
+  /// Opens an existing file. Never waits, also not on a FIFO.
   [[nodiscard]] virtual HostError openForReading(const char* name, FileHandle& file) = 0;
 
-  // The same for a file that is going to be locked: a host may want the right to write for that.
+  /// The same for a file that is going to be locked: a host may want the right to write for that.
   [[nodiscard]] virtual HostError openForUpdate(const char* name, FileHandle& file) = 0;
 
-  // Waits until nobody else holds the lock of the file, and takes it. It is the process's own word
-  // to others who lock: who doesn't ask isn't kept from anything. Closing the handle gives it back.
-  // An error means that the host or the file system has no locks.
+  /// Waits until nobody else holds the lock of the file, and takes it. It is the process's own word
+  /// to others who lock: who doesn't ask isn't kept from anything. Closing the handle gives it
+  /// back. An error means that the host or the file system has no locks.
   [[nodiscard]] virtual HostError lock(FileHandle file) = 0;
 
-  // Creates a file that must not exist yet (else EEXIST). It is a temporary: should a signal end
-  // the process before `rename` or `remove` was called with its name, the host removes it.
+  /// Creates a file that must not exist yet (else EEXIST). It is a temporary: should a signal end
+  /// the process before `rename` or `remove` was called with its name, the host removes it.
   [[nodiscard]] virtual HostError createTemporary(const char* name, FileHandle& file) = 0;
 
-  // Creates a temporary with a name of the host's choice in a writable place, and stores the name.
+  /// Creates a temporary with a name of the host's choice in a writable place, and stores the name.
   [[nodiscard]] virtual HostError createUnnamedTemporary(std::string& name, FileHandle& file) = 0;
 
-  // Creates a file, or empties the one that is there.
+  /// Creates a file, or empties the one that is there.
   [[nodiscard]] virtual HostError openForWriting(const char* name, FileHandle& file) = 0;
 
-  // Reads up to bytes.size() bytes at `offset`; `done` is how many there were. Fewer than asked
-  // for with a result of 0 means that the file ends there.
+  /// Reads up to bytes.size() bytes at `offset`; `done` is how many there were. Fewer than asked
+  /// for with a result of 0 means that the file ends there.
   [[nodiscard]] virtual HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                                          size_t& done) = 0;
 
-  // Writes all bytes at the file's position, or fails.
+  /// Writes all bytes at the file's position, or fails.
   [[nodiscard]] virtual HostError write(FileHandle file, std::span<const uint8_t> bytes) = 0;
 
-  // Hands over what the host has held back of earlier writes, so that a full disk shows here and
-  // not at the close.
+  /// Hands over what the host has held back of earlier writes, so that a full disk shows here and
+  /// not at the close.
   [[nodiscard]] virtual HostError flush(FileHandle file) = 0;
 
-  // The handle is closed in any case.
+  /// The handle is closed in any case.
   [[nodiscard]] virtual HostError close(FileHandle file) = 0;
 
-  // Puts `from` in the place of `to` in one step: at no moment is there no `to`.
+  /// Puts `from` in the place of `to` in one step: at no moment is there no `to`.
   [[nodiscard]] virtual HostError rename(const char* from, const char* to) = 0;
 
-  // The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
+  /// The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
   [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
 
   [[nodiscard]] virtual HostError remove(const char* name) = 0;
 
-  // Links are followed. A name that isn't there gives an error and the kind Nothing.
+  /// Links are followed. A name that isn't there gives an error and the kind Nothing.
   [[nodiscard]] virtual HostError status(const char* name, FileStatus& status) = 0;
   [[nodiscard]] virtual HostError statusOf(FileHandle file, FileStatus& status) = 0;
 
-  // Whether the file may be written, by the host's access test.
+  /// Whether the file may be written, by the host's access test.
   [[nodiscard]] virtual bool isWritable(const char* name) = 0;
 
-  // Best effort: the permission bits of `mode`.
+  /// Best effort: the permission bits of `mode`.
   virtual void setPermissions(FileHandle file, uint32_t mode) = 0;
 
-  // The name that a chain of symbolic links leads to, also when nothing is there. A name that is
-  // no link is returned as it is.
+  /// The name that a chain of symbolic links leads to, also when nothing is there. A name that is
+  /// no link is returned as it is.
   [[nodiscard]] virtual std::string followLinks(const char* name) = 0;
 
-  // All names of a directory but "." and "..", in the host's order.
+  /// All names of a directory but "." and "..", in the host's order.
   [[nodiscard]] virtual HostError listDirectory(const char* name,
                                                 std::vector<std::string>& names) = 0;
 };
 
-// The host that the process runs on.
+/// The host that the process runs on.
 [[nodiscard]] Host& getPosixHost();
 
-// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of getPosixHost() before
-// they end the process, and a file size limit shows as a failed write instead of a signal.
+/// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of getPosixHost() before
+/// they end the process, and a file size limit shows as a failed write instead of a signal.
 void installSignalCleanUp();
 
 } // namespace support

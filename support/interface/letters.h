@@ -18,7 +18,7 @@ namespace support {
   return lowered(character) >= 'a' && lowered(character) <= 'z';
 }
 
-// Blank, tab, line feed, vertical tab, form feed, carriage return.
+/// Blank, tab, line feed, vertical tab, form feed, carriage return.
 [[nodiscard]] constexpr bool isWhiteSpace(char character) {
   return character == ' ' || (character >= '\t' && character <= '\r');
 }

@@ -14,26 +14,26 @@ enum PathStyle : uint32_t {
   PathStyle_Detect = 0,
   PathStyle_Windows = 2,
   PathStyle_Posix = 3,
-  PathStyle_Undetermined = 5, // treated as a Windows name
+  PathStyle_Undetermined = 5, ///< treated as a Windows name
 };
 
-// No name that a host takes as a member or leaf is longer; longer ones are cut.
-inline constexpr size_t LongestPathComponent = 1029; // bytes
+/// No name that a host takes as a member or leaf is longer; longer ones are cut.
+inline constexpr size_t LongestPathComponent = 1029; ///< bytes
 
 class path {
 public:
-  // With PathStyle_Detect the style is worked out from the name. In a POSIX name only "/"
-  // separates, there is no drive, and the directory is kept byte for byte; in a Windows name "/"
-  // and "\" both separate, and both become "\".
+  /// With PathStyle_Detect the style is worked out from the name. In a POSIX name only "/"
+  /// separates, there is no drive, and the directory is kept byte for byte; in a Windows name "/"
+  /// and "\" both separate, and both become "\".
   explicit path(std::string_view name, PathStyle style = PathStyle_Detect);
 
   [[nodiscard]] PathStyle getStyle() const { return m_Style; }
-  // "c:" or "\\server\share"
+  /// "c:" or "\\server\share"
   [[nodiscard]] const std::string& getDrive() const { return m_Drive; }
-  // With its last separator.
+  /// With its last separator.
   [[nodiscard]] const std::string& getDirectory() const { return m_Directory; }
   [[nodiscard]] const std::string& getBase() const { return m_Base; }
-  // With its "."; may be empty.
+  /// With its "."; may be empty.
   [[nodiscard]] const std::string& getExtension() const { return m_Extension; }
   [[nodiscard]] std::string getLeaf() const { return m_Base + m_Extension; }
 
@@ -48,10 +48,10 @@ private:
   PathStyle m_Style;
 };
 
-// PathStyle_Windows, PathStyle_Posix or PathStyle_Undetermined.
+/// PathStyle_Windows, PathStyle_Posix or PathStyle_Undetermined.
 [[nodiscard]] PathStyle detectPathStyle(std::string_view name);
 
-// What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
+/// What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
 [[nodiscard]] std::string_view lastPathComponent(std::string_view name);
 
 } // namespace support

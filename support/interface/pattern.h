@@ -7,8 +7,8 @@
 
 namespace support {
 
-// Whether the pattern matches the whole text. Without caseSensitive, A-Z and a-z are equal; other
-// bytes are themselves in any case.
+/// Whether the pattern matches the whole text. Without caseSensitive, A-Z and a-z are equal; other
+/// bytes are themselves in any case.
 [[nodiscard]] bool matchesPattern(std::string_view pattern, std::string_view text,
                                   bool caseSensitive);
 

@@ -14,7 +14,7 @@ namespace support {
 
 class ReadWindow {
 public:
-  // What has been read of another file is forgotten. The file stays the caller's.
+  /// What has been read of another file is forgotten. The file stays the caller's.
   void setFile(SourceFile* file) {
     m_File = file;
     m_Start = 0;
@@ -23,26 +23,26 @@ public:
     m_EndsFile = false;
   }
 
-  // Makes up to `size` bytes at `offset` available; fewer only where the file ends, or on an error.
-  // The view holds until the next call.
+  /// Makes up to `size` bytes at `offset` available; fewer only where the file ends, or on an
+  /// error. The view holds until the next call.
   [[nodiscard]] std::span<const uint8_t> fetch(uint64_t offset, size_t size, HostError& error);
 
 private:
   [[nodiscard]] HostError read(uint64_t offset, size_t size);
 
-  // A step over at most so many bytes is part of a walk, and worth reading ahead for. A longer one
-  // is a leap: reading what it leaps over would cost more than the host call that it saves.
+  /// A step over at most so many bytes is part of a walk, and worth reading ahead for. A longer one
+  /// is a leap: reading what it leaps over would cost more than the host call that it saves.
   static constexpr size_t WalkStep = 0x1000;
   static constexpr size_t AheadSize = 0x8000;
-  // What a leap reads at least: room for a header, its neighbours and a body's first bytes.
+  /// What a leap reads at least: room for a header, its neighbours and a body's first bytes.
   static constexpr size_t LeapSize = 0x200;
 
   SourceFile* m_File = nullptr;
   std::vector<uint8_t> m_Bytes;
-  uint64_t m_Start = 0; // file offset of the first byte
+  uint64_t m_Start = 0; ///< file offset of the first byte
   size_t m_Used = 0;
-  uint64_t m_LastEnd = 0;  // end of the last request
-  bool m_EndsFile = false; // the file has nothing behind the bytes held
+  uint64_t m_LastEnd = 0;  ///< end of the last request
+  bool m_EndsFile = false; ///< the file has nothing behind the bytes held
 };
 
 } // namespace support

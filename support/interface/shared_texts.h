@@ -13,8 +13,8 @@
 
 namespace support {
 
-// Views of the copies, in the order of the texts. `copy` makes the copy of one text, which lives as
-// long as the views are used.
+/// Views of the copies, in the order of the texts. `copy` makes the copy of one text, which lives
+/// as long as the views are used.
 template <class Copy>
 [[nodiscard]] std::vector<std::string_view> copyShared(std::span<const char* const> texts,
                                                        Copy copy) {

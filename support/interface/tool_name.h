@@ -7,9 +7,9 @@
 
 namespace support {
 
-inline constexpr size_t ToolNameSize = 32; // bytes, the NUL included
+inline constexpr size_t ToolNameSize = 32; ///< bytes, the NUL included
 
-// Writes the name, cut to 31 characters, and a NUL. A null argv0 gives the empty name.
+/// Writes the name, cut to 31 characters, and a NUL. A null argv0 gives the empty name.
 void toolNameFrom(const char* argv0, std::span<char, ToolNameSize> buffer);
 
 } // namespace support

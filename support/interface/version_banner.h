@@ -11,22 +11,22 @@ namespace support {
 struct BuildData {
   std::string_view productName;
   std::string_view componentName;
-  std::string_view version;               // "major.minor.patch"; empty counts as "0.0.0"
-  std::string_view delivery;              // a number
-  std::string_view developmentLabel = {}; // empty: none
+  std::string_view version;               ///< "major.minor.patch"; empty counts as "0.0.0"
+  std::string_view delivery;              ///< a number
+  std::string_view developmentLabel = {}; ///< empty: none
   bool isEngineeringRelease = false;
   uint32_t buildStamp = 0;
-  std::string_view furtherLine = {}; // empty: none
-  std::string_view supplier = {};    // empty: none
+  std::string_view furtherLine = {}; ///< empty: none
+  std::string_view supplier = {};    ///< empty: none
 };
 
-// The data of this build.
+/// The data of this build.
 [[nodiscard]] const BuildData& getBuildData();
 
-// The lines that --vsn and the help begin with, without a final newline.
+/// The lines that --vsn and the help begin with, without a final newline.
 [[nodiscard]] std::string bannerText(const BuildData& data);
 
-// One number for the whole version: "1000001" is 1.0.0, delivery 1.
+/// One number for the whole version: "1000001" is 1.0.0, delivery 1.
 [[nodiscard]] std::string versionNumberText(const BuildData& data);
 
 } // namespace support
