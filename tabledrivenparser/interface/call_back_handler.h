@@ -13,15 +13,15 @@ struct MatchString;
 class CallBackHandler {
 public:
   virtual ~CallBackHandler() = default;
-  // argument is null if the row was given none, and else lives as long as the words of the command
-  // line (inside a via file: as long as this call). wordsUsed comes in as the number of words that
-  // the option takes and may be changed. Returns true if the option was accepted. False refuses
-  // the argument; false with wordsUsed set to 0 makes the word an unknown one.
+  /// argument is null if the row was given none, and else lives as long as the words of the command
+  /// line (inside a via file: as long as this call). wordsUsed comes in as the number of words that
+  /// the option takes and may be changed. Returns true if the option was accepted. False refuses
+  /// the argument; false with wordsUsed set to 0 makes the word an unknown one.
   [[nodiscard]] virtual bool takeArgument(Parser& parser, const MatchString& row,
                                           const char* argument, uint32_t& wordsUsed) = 0;
-  // Writes what it has taken as entries of a command line; the default has nothing to write.
+  /// Writes what it has taken as entries of a command line; the default has nothing to write.
   virtual void printCommandLine(const Parser&, TextSink&) const {}
-  // Forgets what it has taken.
+  /// Forgets what it has taken.
   virtual void releaseValues() {}
 };
 

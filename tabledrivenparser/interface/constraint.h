@@ -10,34 +10,34 @@ namespace tabledrivenparser {
 
 struct MatchString;
 
-// The entries need no order. In an entry, id is the enumerator and separator, if not zero, marks
-// it as deprecated.
+/// The entries need no order. In an entry, id is the enumerator and separator, if not zero, marks
+/// it as deprecated.
 struct Enumeration {
   std::span<const MatchString> entries;
 };
 
-// Both ends included. For the unsigned types the ends are taken as unsigned.
+/// Both ends included. For the unsigned types the ends are taken as unsigned.
 struct IntegerRange {
   int64_t low;
   int64_t high;
 };
 
 struct IntegerConstraintNode {
-  const uint32_t* masks = nullptr;      // as MatchString::restrictions
-  const IntegerRange* ranges = nullptr; // ended by a range whose low lies above its high
+  const uint32_t* masks = nullptr;      ///< as MatchString::restrictions
+  const IntegerRange* ranges = nullptr; ///< ended by a range whose low lies above its high
   const IntegerConstraintNode* next = nullptr;
 };
 
 struct StringConstraintNode {
-  const uint32_t* masks = nullptr; // as MatchString::restrictions
-  // Alternatives separated by "|". An alternative that begins with "C" compares the case of
-  // letters; a "*" matches whatever is left.
+  const uint32_t* masks = nullptr; ///< as MatchString::restrictions
+  /// Alternatives separated by "|". An alternative that begins with "C" compares the case of
+  /// letters; a "*" matches whatever is left.
   const char* pattern = nullptr;
   const StringConstraintNode* next = nullptr;
 };
 
-// Which member counts follows from the option's type: enumeration for ENUM (there never null),
-// strings for STRING and STRING_VECTOR, integers for the types of numbers.
+/// Which member counts follows from the option's type: enumeration for ENUM (there never null),
+/// strings for STRING and STRING_VECTOR, integers for the types of numbers.
 union Constraint {
   const void* none = nullptr;
   const Enumeration* enumeration;
@@ -45,8 +45,8 @@ union Constraint {
   const StringConstraintNode* strings;
 };
 
-// Whether every mask of a zero-terminated list has a bit in common with the table's mask. A null
-// list restricts nothing.
+/// Whether every mask of a zero-terminated list has a bit in common with the table's mask. A null
+/// list restricts nothing.
 [[nodiscard]] constexpr bool restrictionsMet(const uint32_t* masks, uint32_t tableMask) {
   if (masks == nullptr) return true;
   for (; *masks != 0; ++masks) {

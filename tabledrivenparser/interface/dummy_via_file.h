@@ -9,7 +9,7 @@ namespace tabledrivenparser {
 
 class DummyViaFile final : public ViaFile {
 public:
-  // text is NUL-terminated and must outlive this object.
+  /// text is NUL-terminated and must outlive this object.
   DummyViaFile(Parser& parser, const char* text) : ViaFile(parser, "", text) {}
 
 protected:

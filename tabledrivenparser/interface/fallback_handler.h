@@ -12,11 +12,11 @@ class TextSink;
 class FallbackHandler {
 public:
   virtual ~FallbackHandler() = default;
-  // word is without its dashes, of which there were 0, 1 or 2; next is the following word or null.
-  // Returns the number of words used, 0 if the word means nothing here either.
+  /// word is without its dashes, of which there were 0, 1 or 2; next is the following word or null.
+  /// Returns the number of words used, 0 if the word means nothing here either.
   [[nodiscard]] virtual uint32_t takeWord(Parser& parser, const char* word, const char* next,
                                           uint32_t dashes) = 0;
-  // Writes what it has taken as entries of a command line; the default has nothing to write.
+  /// Writes what it has taken as entries of a command line; the default has nothing to write.
   virtual void printCommandLine(const Parser&, TextSink&) const {}
 };
 

@@ -20,7 +20,7 @@ struct LinkedListNode {
 };
 
 namespace detail {
-// Texts are equal by their characters, everything else as itself.
+/// Texts are equal by their characters, everything else as itself.
 template <class T>
 [[nodiscard]] bool sameElement(T left, T right) {
   return left == right;
@@ -30,9 +30,9 @@ template <class T>
 }
 } // namespace detail
 
-// The elements are plain values: the list owns its nodes, never what an element points at. The
-// region must live as long as the list. The list stays where it was made, since it may point at
-// its own inside.
+/// The elements are plain values: the list owns its nodes, never what an element points at. The
+/// region must live as long as the list. The list stays where it was made, since it may point at
+/// its own inside.
 template <class T>
 class LinkedList {
 public:
@@ -57,7 +57,7 @@ public:
   LinkedList& operator=(const LinkedList&) = delete;
 
   [[nodiscard]] bool isEmpty() const { return m_Tail == nullptr; }
-  // Counts the elements by walking them.
+  /// Counts the elements by walking them.
   [[nodiscard]] uint32_t size() const {
     uint32_t count = 0;
     for (auto element = begin(); element != end(); ++element)
@@ -78,7 +78,7 @@ public:
     m_Tail = node;
   }
 
-  // The position of the first element equal to value, Absent if there is none.
+  /// The position of the first element equal to value, Absent if there is none.
   [[nodiscard]] uint32_t indexOf(T value) const {
     uint32_t index = 0;
     for (T element : *this) {
@@ -92,7 +92,7 @@ public:
     removeWhere([value](T element) { return detail::sameElement(element, value); });
   }
 
-  // For lists of texts: removes every element that begins with prefix.
+  /// For lists of texts: removes every element that begins with prefix.
   void removeAllWithPrefix(std::string_view prefix) requires requires(T element) {
     std::string_view(element);
   }
@@ -100,14 +100,14 @@ public:
     removeWhere([prefix](T element) { return std::string_view(element).starts_with(prefix); });
   }
 
-  // Forgets all elements; the nodes stay with the region.
+  /// Forgets all elements; the nodes stay with the region.
   void clear() {
     m_First.next = nullptr;
     m_Tail = nullptr;
   }
 
 private:
-  // What stays moves to the front, so that the first element lies in the list object again.
+  /// What stays moves to the front, so that the first element lies in the list object again.
   template <class Predicate>
   void removeWhere(Predicate isUnwanted) {
     if (isEmpty()) return;
@@ -124,7 +124,7 @@ private:
   }
 
   LinkedListNode<T> m_First;
-  LinkedListNode<T>* m_Tail = nullptr; // null while the list is empty
+  LinkedListNode<T>* m_Tail = nullptr; ///< null while the list is empty
   alloclib::RegionGeneral* m_Region;
 };
 

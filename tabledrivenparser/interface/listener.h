@@ -13,10 +13,10 @@ class Parser;
 class Listener {
 public:
   virtual ~Listener() = default;
-  // For a vector option, value is the one element to be appended: integer for numbers, text for
-  // texts. Words that a call-back handler takes and names of via files are not offered. Returns
-  // true if the listener has taken the value: the parser then stores nothing, but the option still
-  // counts as set.
+  /// For a vector option, value is the one element to be appended: integer for numbers, text for
+  /// texts. Words that a call-back handler takes and names of via files are not offered. Returns
+  /// true if the listener has taken the value: the parser then stores nothing, but the option still
+  /// counts as set.
   [[nodiscard]] virtual bool onOption(Parser& parser, uint32_t id, const Value& value) = 0;
 };
 

@@ -10,13 +10,13 @@ namespace tabledrivenparser {
 class Parser;
 class TextSink;
 
-// Writes the options that differ from their defaults, in the order of their ids, then the
-// positional words; a sink with QuoteMode::Blanks and the separator ' ' makes it a command line.
-// Ends with a NUL if it fits. Returns the size needed, the NUL included.
+/// Writes the options that differ from their defaults, in the order of their ids, then the
+/// positional words; a sink with QuoteMode::Blanks and the separator ' ' makes it a command line.
+/// Ends with a NUL if it fits. Returns the size needed, the NUL included.
 size_t printCommandLine(const Parser& parser, TextSink& sink);
 
-// Writes each id with its type and value, and below it each of its rows. A sink with
-// QuoteMode::Never and the separator ',' is meant. Ends and returns like printCommandLine.
+/// Writes each id with its type and value, and below it each of its rows. A sink with
+/// QuoteMode::Never and the separator ',' is meant. Ends and returns like printCommandLine.
 size_t dumpTables(const Parser& parser, TextSink& sink);
 
 } // namespace tabledrivenparser

@@ -21,63 +21,63 @@ class FallbackHandler;
 class Parser;
 
 enum RowKind : uint32_t {
-  Kind_Required = 0, // a parameter is required
-  Kind_Optional = 1, // implied parameter, an argument may replace it
-  Kind_Implied = 2,  // implied parameter, no argument
+  Kind_Required = 0, ///< a parameter is required
+  Kind_Optional = 1, ///< implied parameter, an argument may replace it
+  Kind_Implied = 2,  ///< implied parameter, no argument
 };
 
 enum RowFlag : uint8_t {
-  Flag_OldSyntax = 1,  // a long name also works with one dash, a letter in either case
-  Flag_Deprecated = 2, // see OptionTable::deprecatedPolicy
-  Flag_Public = 4,     // may be abbreviated with a "."
+  Flag_OldSyntax = 1,  ///< a long name also works with one dash, a letter in either case
+  Flag_Deprecated = 2, ///< see OptionTable::deprecatedPolicy
+  Flag_Public = 4,     ///< may be abbreviated with a "."
 };
 
-// One way to write an option, or one entry of an enumeration.
+/// One way to write an option, or one entry of an enumeration.
 struct MatchString {
-  // Without dashes, NUL-terminated; "" for the positional words.
+  /// Without dashes, NUL-terminated; "" for the positional words.
   std::string_view name;
-  // The value id; in an enumeration the enumerator's value.
+  /// The value id; in an enumeration the enumerator's value.
   uint32_t id = 0;
   RowKind kind = Kind_Required;
-  // The implied value of the last two kinds; one element where the option is a vector.
+  /// The implied value of the last two kinds; one element where the option is a vector.
   Value value{};
-  // Zero-terminated masks; the row is usable only if the table's mask has a bit in common with
-  // each.
+  /// Zero-terminated masks; the row is usable only if the table's mask has a bit in common with
+  /// each.
   const uint32_t* restrictions = nullptr;
-  // Between the elements of a list, 0 for none; in an enumeration not 0 for a deprecated entry.
+  /// Between the elements of a list, 0 for none; in an enumeration not 0 for a deprecated entry.
   char separator = 0;
-  // Bits of RowFlag.
+  /// Bits of RowFlag.
   uint8_t flags = 0;
 
   [[nodiscard]] constexpr bool has(RowFlag flag) const { return (flags & flag) != 0; }
   [[nodiscard]] constexpr bool hasLongName() const { return name.size() > 1; }
 };
 
-// Any other number accepts silently.
+/// Any other number accepts silently.
 enum SyntaxPolicy : uint32_t { Policy_Accept = 0, Policy_Warn = 1, Policy_Reject = 2 };
 
 constexpr uint32_t NoRow = 0xFFFFFFFF;
-// For each letter the first row that starts with it in either case, or NoRow.
+/// For each letter the first row that starts with it in either case, or NoRow.
 using FirstLetterIndex = std::array<uint32_t, 26>;
 
 struct OptionTable {
-  std::span<const MatchString> rows; // sorted: see areSorted
-  FirstLetterIndex firstRows;        // indexByFirstLetter(rows)
+  std::span<const MatchString> rows; ///< sorted: see areSorted
+  FirstLetterIndex firstRows;        ///< indexByFirstLetter(rows)
   SyntaxPolicy oldSyntaxPolicy = Policy_Warn;
-  SyntaxPolicy deprecatedPolicy = Policy_Accept; // only Policy_Warn says anything
+  SyntaxPolicy deprecatedPolicy = Policy_Accept; ///< only Policy_Warn says anything
   uint32_t restrictionMask = 0xFFFFFFFF;
-  FallbackHandler* fallback = nullptr; // the client's, null if there is none
+  FallbackHandler* fallback = nullptr; ///< the client's, null if there is none
 };
 
 enum DefaultKind : uint32_t {
   Default_None = 0,
   Default_Fixed = 1,
-  Default_List = 2,     // the first node whose masks all meet the table's mask
-  Default_Computed = 3, // by the record's default call back
+  Default_List = 2,     ///< the first node whose masks all meet the table's mask
+  Default_Computed = 3, ///< by the record's default call back
 };
 
 struct DefaultNode {
-  const uint32_t* masks = nullptr; // as MatchString::restrictions
+  const uint32_t* masks = nullptr; ///< as MatchString::restrictions
   Value value{};
   const DefaultNode* next = nullptr;
 };
@@ -87,18 +87,18 @@ struct ValueDefinition {
   DefaultKind defaultKind = Default_Fixed;
   Value defaultValue{};
   Constraint constraint{};
-  const MatchString* const* rows = nullptr; // null-terminated, in the order reports prefer
+  const MatchString* const* rows = nullptr; ///< null-terminated, in the order reports prefer
 };
 
 using Validator = bool (*)(const Parser& parser, uint32_t id, const Value& value);
-// Is asked more than once: for a vector it gives the same list each time.
+/// Is asked more than once: for a vector it gives the same list each time.
 using DefaultCallBack = Value (*)(const Parser& parser, uint32_t id);
 
-// The parser sets value and both counters at its start, the client the call backs before it.
+/// The parser sets value and both counters at its start, the client the call backs before it.
 struct ValueRecord {
   Value value{};
-  uint32_t firstSet = 0; // the set counter at the first and the last time that the value was set,
-  uint32_t lastSet = 0;  // 0 for never
+  uint32_t firstSet = 0; ///< the set counter at the first and the last time that the value was set,
+  uint32_t lastSet = 0;  ///< 0 for never
   Validator validator = nullptr;
   DefaultCallBack defaultCallBack = nullptr;
 };
@@ -114,7 +114,7 @@ struct ValueRecord {
   return index;
 }
 
-// Without regard to case, and an upper-case letter before its lower-case twin.
+/// Without regard to case, and an upper-case letter before its lower-case twin.
 [[nodiscard]] constexpr bool comesBefore(std::string_view left, std::string_view right) {
   for (size_t at = 0; at < left.size() && at < right.size(); ++at) {
     const auto a = static_cast<unsigned char>(support::lowered(left[at]));
@@ -132,8 +132,8 @@ struct ValueRecord {
   return true;
 }
 
-// Whether the look-up can find the row: it folds the word, but only the first character of a name.
-// Names that start with no letter must sort before those that do.
+/// Whether the look-up can find the row: it folds the word, but only the first character of a name.
+/// Names that start with no letter must sort before those that do.
 [[nodiscard]] constexpr bool isFindable(std::string_view name) {
   if (name.empty()) return true;
   if (static_cast<unsigned char>(support::lowered(name.front())) > 'z') return false;
@@ -143,7 +143,7 @@ struct ValueRecord {
   return true;
 }
 
-// Whether the rows are sorted, can all be found, and their ids lie below idCount.
+/// Whether the rows are sorted, can all be found, and their ids lie below idCount.
 [[nodiscard]] constexpr bool areWellFormed(std::span<const MatchString> rows, size_t idCount) {
   for (const MatchString& row : rows) {
     if (row.id >= idCount || !isFindable(row.name)) return false;
@@ -151,7 +151,7 @@ struct ValueRecord {
   return areSorted(rows);
 }
 
-// The row of that name, null if there is none.
+/// The row of that name, null if there is none.
 [[nodiscard]] constexpr const MatchString* rowNamed(std::span<const MatchString> rows,
                                                     std::string_view name) {
   for (const MatchString& row : rows) {
@@ -160,16 +160,16 @@ struct ValueRecord {
   return nullptr;
 }
 
-// The list of rows that a definition wants, from their names:
-//   constexpr auto VersionRows = rowsNamed(Rows, "vsn", "version", "V");
+/// The list of rows that a definition wants, from their names:
+///   constexpr auto VersionRows = rowsNamed(Rows, "vsn", "version", "V");
 template <class... Names>
 [[nodiscard]] constexpr std::array<const MatchString*, sizeof...(Names) + 1>
 rowsNamed(std::span<const MatchString> rows, Names... names) {
   return {rowNamed(rows, names)..., nullptr};
 }
 
-// Whether each definition lists rows of its own id only, and all lists together hold every row. No
-// definition may be without a list.
+/// Whether each definition lists rows of its own id only, and all lists together hold every row. No
+/// definition may be without a list.
 [[nodiscard]] constexpr bool listEveryRow(std::span<const ValueDefinition> definitions,
                                           std::span<const MatchString> rows) {
   size_t listed = 0;

@@ -26,8 +26,8 @@ class Listener;
 class ViaFileReader;
 struct WordInHand;
 
-// All that the client owns; it must outlive the parser. definitions and values have the same
-// length, which every row's id is below.
+/// All that the client owns; it must outlive the parser. definitions and values have the same
+/// length, which every row's id is below.
 struct ParserTables {
   const OptionTable& options;
   std::span<const ValueDefinition> definitions;
@@ -38,31 +38,31 @@ class Parser {
 public:
   static constexpr uint32_t ViaFileDepthLimit = 10;
 
-  // Sets every value to its default. listener may be null. Everything that the parser copies or
-  // allocates comes from region and goes with it.
+  /// Sets every value to its default. listener may be null. Everything that the parser copies or
+  /// allocates comes from region and goes with it.
   Parser(const ParserTables& tables, Listener* listener, Reporter& reporter, ViaFileReader& files,
          alloclib::RegionGeneral& region);
   Parser(const Parser&) = delete;
   Parser& operator=(const Parser&) = delete;
 
-  // Handles one word with its dashes; next is the following word or null. "--" alone ends the
-  // options. The words must stay where they are for as long as values are looked at. With a filter
-  // only the ids listed there and via files are processed. Returns the number of words used: 1 or
-  // 2, or 0 if a filtered parse found no row for the word.
+  /// Handles one word with its dashes; next is the following word or null. "--" alone ends the
+  /// options. The words must stay where they are for as long as values are looked at. With a filter
+  /// only the ids listed there and via files are processed. Returns the number of words used: 1 or
+  /// 2, or 0 if a filtered parse found no row for the word.
   uint32_t parseWord(const char* word, const char* next, std::span<const uint32_t> filter = {});
-  // The same for a word without its dashes, of which there were 0, 1 or 2. With 0 dashes the word
-  // is a positional one.
+  /// The same for a word without its dashes, of which there were 0, 1 or 2. With 0 dashes the word
+  /// is a positional one.
   uint32_t parseArgument(const char* word, const char* next, uint32_t dashes,
                          std::span<const uint32_t> filter = {});
 
-  // Forgets every vector, what call-back handlers hold, and the list of the parser's copies.
-  // Vectors read as empty afterwards; the memory itself goes with the region.
+  /// Forgets every vector, what call-back handlers hold, and the list of the parser's copies.
+  /// Vectors read as empty afterwards; the memory itself goes with the region.
   void releaseValues();
 
-  // True after a fatal report that returned: later words do nothing and count as one used word.
+  /// True after a fatal report that returned: later words do nothing and count as one used word.
   [[nodiscard]] bool hasFailed() const { return m_Failed; }
   [[nodiscard]] bool isEndOfOptions() const { return m_EndOfOptions; }
-  // Whether the names of some enumeration were listed for the user.
+  /// Whether the names of some enumeration were listed for the user.
   [[nodiscard]] bool hasShownChoices() const { return m_ChoicesShown; }
   [[nodiscard]] uint32_t getViaFileDepth() const { return m_ViaFileDepth; }
   [[nodiscard]] uint32_t getSetCounter() const { return m_SetCounter; }
@@ -74,17 +74,17 @@ public:
   [[nodiscard]] const ValueDefinition& getDefinition(uint32_t id) const;
   [[nodiscard]] const ValueRecord& getRecord(uint32_t id) const;
   [[nodiscard]] bool isSet(uint32_t id) const { return getRecord(id).lastSet != 0; }
-  // The default by the definition's rule; null or zero if it has none.
+  /// The default by the definition's rule; null or zero if it has none.
   [[nodiscard]] Value getDefaultValue(uint32_t id) const;
   [[nodiscard]] bool isDefault(uint32_t id) const;
 
-  // The value of an option of that type; asking for another type is a programming fault.
+  /// The value of an option of that type; asking for another type is a programming fault.
   [[nodiscard]] bool getBoolean(uint32_t id) const;
   [[nodiscard]] uint32_t getEnumerator(uint32_t id) const;
   [[nodiscard]] int32_t getInteger(uint32_t id) const;
-  [[nodiscard]] uint64_t getAddress(uint32_t id) const; // both widths
-  [[nodiscard]] const char* getText(uint32_t id) const; // may be null
-  // Both null for an empty list; the texts are of STRING_VECTOR and VIA_FILE.
+  [[nodiscard]] uint64_t getAddress(uint32_t id) const; ///< both widths
+  [[nodiscard]] const char* getText(uint32_t id) const; ///< may be null
+  /// Both null for an empty list; the texts are of STRING_VECTOR and VIA_FILE.
   [[nodiscard]] const StrList* getTexts(uint32_t id) const;
   [[nodiscard]] const IntegerList* getIntegers(uint32_t id) const;
 
@@ -92,7 +92,7 @@ public:
 
   void report(ReportLevel level, OptionMessage message,
               std::initializer_list<OptionMessageArgument> arguments);
-  // A NUL-terminated copy in the parser's region.
+  /// A NUL-terminated copy in the parser's region.
   [[nodiscard]] const char* copyText(std::string_view text);
   [[nodiscard]] alloclib::RegionGeneral& getRegion() { return m_Region; }
 

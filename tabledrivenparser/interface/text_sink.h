@@ -13,23 +13,23 @@ class TextSink {
 public:
   enum class QuoteMode : bool { Never, Blanks };
 
-  // The buffer is the caller's. With QuoteMode::Blanks, putValue puts double quotes round a value
-  // that holds a blank or a tab.
+  /// The buffer is the caller's. With QuoteMode::Blanks, putValue puts double quotes round a value
+  /// that holds a blank or a tab.
   TextSink(std::span<char> buffer, QuoteMode quoteMode, char separator)
       : m_Buffer(buffer), m_QuoteMode(quoteMode), m_Separator(separator) {}
 
   void put(char character);
   void put(std::string_view text);
-  // A value, after what belongs to it in front.
+  /// A value, after what belongs to it in front.
   void putValue(std::string_view prefix, std::string_view value);
-  // Puts the separator, except before the first entry.
+  /// Puts the separator, except before the first entry.
   void startEntry();
-  // The next entry is the first one again.
+  /// The next entry is the first one again.
   void startList() { m_HasEntries = false; }
-  // Whether putValue writes an empty value as a pair of quotes; false at the start.
+  /// Whether putValue writes an empty value as a pair of quotes; false at the start.
   void setQuoteEmpty(bool quoteEmpty) { m_QuoteEmpty = quoteEmpty; }
 
-  // The characters put so far, also those beyond the buffer.
+  /// The characters put so far, also those beyond the buffer.
   [[nodiscard]] size_t getUsed() const { return m_Used; }
 
 private:
