@@ -19,8 +19,8 @@ class Argument {
 public:
   enum class Kind : uint8_t { String, Character, Integer };
 
-  // A text is only viewed: it must outlive the call that the argument is made for. All of these
-  // are implicit, since the reporting templates exist to take plain values.
+  /// A text is only viewed: it must outlive the call that the argument is made for. All of these
+  /// are implicit, since the reporting templates exist to take plain values.
   Argument(std::string_view text) : m_Text(text), m_Kind(Kind::String) {}
   Argument(const std::string& text) : Argument(std::string_view(text)) {}
   Argument(const char* text) : Argument(std::string_view(text ? text : "(null)")) {}
@@ -34,8 +34,8 @@ public:
   [[nodiscard]] std::string_view getText() const { return m_Text; }
   [[nodiscard]] char getCharacter() const { return static_cast<char>(m_Value); }
 
-  // As in C, the conversion decides whether the bits are read as signed: an unsigned 32-bit
-  // argument of 0xFFFFFFFF shows as -1 under %d.
+  /// As in C, the conversion decides whether the bits are read as signed: an unsigned 32-bit
+  /// argument of 0xFFFFFFFF shows as -1 under %d.
   [[nodiscard]] int64_t getSigned() const {
     return m_IsWide ? static_cast<int64_t>(m_Value) : static_cast<int32_t>(m_Value);
   }

@@ -13,36 +13,36 @@ namespace messages {
 
 struct CatalogueRow {
   Key key;
-  std::string_view text; // UTF-8; a printf format if the message has arguments
+  std::string_view text; ///< UTF-8; a printf format if the message has arguments
 };
 
 inline constexpr uint32_t EnglishCatalogue = 0;
 inline constexpr uint32_t JapaneseCatalogue = 1;
 inline constexpr uint32_t CatalogueCount = 2;
 
-// The rows of a built-in catalogue, ascending by key; index is below CatalogueCount.
+/// The rows of a built-in catalogue, ascending by key; index is below CatalogueCount.
 [[nodiscard]] std::span<const CatalogueRow> getCatalogueRows(uint32_t index);
 
-// The text of a key: from the external catalogue if there is one that has it, else from the chosen
-// built-in one. An unknown key gives "<NotFound Code=... key=...>", good until the next such call;
-// every other text lives as long as its catalogue.
+/// The text of a key: from the external catalogue if there is one that has it, else from the chosen
+/// built-in one. An unknown key gives "<NotFound Code=... key=...>", good until the next such call;
+/// every other text lives as long as its catalogue.
 [[nodiscard]] std::string_view getMessageText(Key key);
 
-// A catalogue that is looked at before the built-in one; its rows must ascend by key and belong to
-// the caller. An empty span takes it away.
+/// A catalogue that is looked at before the built-in one; its rows must ascend by key and belong to
+/// the caller. An empty span takes it away.
 void setExternalCatalogue(std::span<const CatalogueRow> rows);
 
-// Chooses the built-in catalogue and the output code page by a name such as "ja_JP", "ja_JP.UTF-8"
-// or "UTF-8". False if the name is not valid; then nothing has changed.
+/// Chooses the built-in catalogue and the output code page by a name such as "ja_JP", "ja_JP.UTF-8"
+/// or "UTF-8". False if the name is not valid; then nothing has changed.
 [[nodiscard]] bool setLocale(std::string_view name);
 
-// For initialise: English, and the host's own encoding.
+/// For initialise: English, and the host's own encoding.
 void resetLocale();
 
 [[nodiscard]] uint32_t getCurrentCatalogue();
 
-// The code page by its number: 65001 is UTF-8, the default. Texts leave in UTF-8 whatever it is,
-// as a host without code pages has nothing to convert to.
+/// The code page by its number: 65001 is UTF-8, the default. Texts leave in UTF-8 whatever it is,
+/// as a host without code pages has nothing to convert to.
 [[nodiscard]] uint32_t getOutputCodePage();
 
 } // namespace messages

@@ -15,9 +15,9 @@ inline constexpr uint32_t DiagnosticRemark = severityWord(Severity_Remark);
 inline constexpr uint32_t DiagnosticWarning = severityWord(Severity_Warning);
 inline constexpr uint32_t DiagnosticError = severityWord(Severity_Error);
 
-// Applies one element of a --diag_* list: a message number, with or without its letter, or
-// "warning" or "error" for all of that severity. True if the element was bad, which has then been
-// reported; another tool's letter is passed over without a word.
+/// Applies one element of a --diag_* list: a message number, with or without its letter, or
+/// "warning" or "error" for all of that severity. True if the element was bad, which has then been
+/// reported; another tool's letter is passed over without a word.
 bool applyDiagnosticOption(uint32_t severityWord, std::string_view text);
 
 enum DiagnosticStyle : uint32_t {
@@ -28,7 +28,7 @@ enum DiagnosticStyle : uint32_t {
   DiagnosticStyle_Gnu = 4,
 };
 
-// The values of --diag_style, by the number in its enumeration.
+/// The values of --diag_style, by the number in its enumeration.
 void applyDiagnosticStyle(uint32_t enumerator);
 
 } // namespace messages

@@ -14,14 +14,14 @@ namespace messages {
 
 enum class FormatStatus : uint8_t {
   Done,
-  BadFormat,        // unknown conversion, or one that does not fit its argument
-  TooManyArguments, // the format reaches beyond MostFormatArguments
+  BadFormat,        ///< unknown conversion, or one that does not fit its argument
+  TooManyArguments, ///< the format reaches beyond MostFormatArguments
 };
 
 inline constexpr uint32_t MostFormatArguments = 20;
 
-// Appends the formatted text. On another status than Done the text holds what came out before the
-// fault. Arguments that the format does not use are fine.
+/// Appends the formatted text. On another status than Done the text holds what came out before the
+/// fault. Arguments that the format does not use are fine.
 [[nodiscard]] FormatStatus appendFormatted(std::string& text, std::string_view format,
                                            std::span<const Argument> arguments);
 

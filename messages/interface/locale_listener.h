@@ -12,14 +12,14 @@ namespace messages {
 
 class LocaleListener final : public tabledrivenparser::Listener {
 public:
-  // Reports a message at fatal severity, with the name of the locale as its argument.
+  /// Reports a message at fatal severity, with the name of the locale as its argument.
   using FatalReporter = void (*)(Key key, std::string_view locale);
 
-  // Without a reporter a bad locale is told on stderr in plain words.
+  /// Without a reporter a bad locale is told on stderr in plain words.
   explicit LocaleListener(FatalReporter reporter) : m_Reporter(reporter) {}
 
-  // Takes the text of the value, whatever the id. A bad locale ends the process with status 1.
-  // False: the value is stored as well.
+  /// Takes the text of the value, whatever the id. A bad locale ends the process with status 1.
+  /// False: the value is stored as well.
   bool onOption(tabledrivenparser::Parser& parser, uint32_t id,
                 const tabledrivenparser::Value& value) override;
 

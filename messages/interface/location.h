@@ -7,12 +7,12 @@
 
 namespace messages {
 
-// Fields are known from left to right: a line without a file, or a column without a line, is not
-// shown.
+/// Fields are known from left to right: a line without a file, or a column without a line, is not
+/// shown.
 struct Location {
-  std::string_view file; // empty: not known
-  uint32_t line = 0;     // from 1; 0: not known
-  uint32_t column = 0;   // from 1; 0: not known
+  std::string_view file; ///< empty: not known
+  uint32_t line = 0;     ///< from 1; 0: not known
+  uint32_t column = 0;   ///< from 1; 0: not known
 };
 
 } // namespace messages

@@ -34,23 +34,23 @@ inline constexpr uint32_t LargestNumber = 16383;
   return SeverityLetters[valueOf(key) >> 1 & 7];
 }
 
-// "?" where the key holds no letter.
+/// "?" where the key holds no letter.
 [[nodiscard]] constexpr char letterOf(Key key) {
   const char letter = static_cast<char>(valueOf(key) >> 18 & 0x7F);
   const bool isLetter = (letter >= 'A' && letter <= 'Z') || (letter >= 'a' && letter <= 'z');
   return isLetter ? letter : '?';
 }
 
-// The printed form of a key: "L6839E". It owns its characters.
+/// The printed form of a key: "L6839E". It owns its characters.
 class KeyText {
 public:
   explicit KeyText(Key key);
-  // Both views live as long as this object.
+  /// Both views live as long as this object.
   [[nodiscard]] std::string_view getText() const { return {m_Characters, m_Length}; }
   [[nodiscard]] std::string_view getTextBehindLetter() const { return getText().substr(1); }
 
 private:
-  char m_Characters[8]; // a letter, four or five digits, a letter
+  char m_Characters[8]; ///< a letter, four or five digits, a letter
   size_t m_Length;
 };
 

@@ -18,35 +18,35 @@
 
 namespace messages {
 
-// Sets all state back to that of a fresh process (counters, severities, style, language, limit,
-// stream of diagnostics), opens the streams, and takes over the failure reports of the checking
-// and region libraries. The exit handler and the sinks of a test stay.
+/// Sets all state back to that of a fresh process (counters, severities, style, language, limit,
+/// stream of diagnostics), opens the streams, and takes over the failure reports of the checking
+/// and region libraries. The exit handler and the sinks of a test stay.
 void initialise();
 
-// Prints a message of the catalogue: location (null: none), prefix, code, text, newline. Counts it
-// at its effective severity; the error that passes the limit calls the limit handler, unprinted.
-// True if it was printed, false if it was suppressed. A fatal message does not end the process
-// here: its caller does.
+/// Prints a message of the catalogue: location (null: none), prefix, code, text, newline. Counts it
+/// at its effective severity; the error that passes the limit calls the limit handler, unprinted.
+/// True if it was printed, false if it was suppressed. A fatal message does not end the process
+/// here: its caller does.
 bool reportArguments(uint32_t severityWord, const Location* location, Key key,
                      std::span<const Argument> arguments);
 
-// The same for a literal format; no code is printed.
+/// The same for a literal format; no code is printed.
 bool reportFormatArguments(uint32_t severityWord, const Location* location, std::string_view format,
                            std::span<const Argument> arguments);
 
-// Prints only the text of a key to the stream of diagnostics, and keeps account of the column.
+/// Prints only the text of a key to the stream of diagnostics, and keeps account of the column.
 void plainMessageArguments(Key key, std::span<const Argument> arguments);
 
-// Prints a line of a listing to stdout, whatever the stream of diagnostics is. It is no diagnostic:
-// no prefix, no code, not counted.
+/// Prints a line of a listing to stdout, whatever the stream of diagnostics is. It is no
+/// diagnostic: no prefix, no code, not counted.
 void listingMessageArguments(Key key, std::span<const Argument> arguments);
 
-// Reports a fault of the program itself, with a number that names the place, and ends the process
-// with status 1.
+/// Reports a fault of the program itself, with a number that names the place, and ends the process
+/// with status 1.
 [[noreturn]] void internalFaultArguments(std::string_view format,
                                          std::span<const Argument> arguments);
 
-// The same for a failed assertion: "Assertion failed: <path> line <n> (<expression>)".
+/// The same for a failed assertion: "Assertion failed: <path> line <n> (<expression>)".
 [[noreturn]] void assertionFault(const char* path, unsigned line, const char* expression);
 
 template <class... Arguments>
@@ -81,12 +81,12 @@ template <class... Arguments>
   internalFaultArguments(format, ArgumentArray<Arguments...>{Argument(arguments)...});
 }
 
-// The 24-bit number of a fault, from its text before the arguments are put in. The path of an
-// assertion counts from its last component named "work", whichever separator it is written with,
-// so that the place of the source tree doesn't matter.
+/// The 24-bit number of a fault, from its text before the arguments are put in. The path of an
+/// assertion counts from its last component named "work", whichever separator it is written with,
+/// so that the place of the source tree doesn't matter.
 [[nodiscard]] uint32_t computeFaultHash(std::string_view text);
 
-// How many messages came out at each severity.
+/// How many messages came out at each severity.
 struct Counters {
   uint32_t suppressed = 0;
   uint32_t remarks = 0;
@@ -98,24 +98,24 @@ struct Counters {
 [[nodiscard]] Counters getCounters();
 [[nodiscard]] uint32_t getErrorCount();
 
-// The run ends at the report that makes errors, fatal errors and internal faults together exceed
-// the limit. The default handler ends the process with status 1; after one that returns, the
-// report goes on. Null brings the default back.
+/// The run ends at the report that makes errors, fatal errors and internal faults together exceed
+/// the limit. The default handler ends the process with status 1; after one that returns, the
+/// report goes on. Null brings the default back.
 using LimitHandler = void (*)();
 void setLimit(uint32_t limit, LimitHandler handler);
 
-// The look of diagnostics: 0 the tool's own, 1 for development environments, 2 for editors.
+/// The look of diagnostics: 0 the tool's own, 1 for development environments, 2 for editors.
 [[nodiscard]] uint32_t getStyle();
 void setStyle(uint32_t style);
 
-// The stream of diagnostics, stderr unless changed.
+/// The stream of diagnostics, stderr unless changed.
 [[nodiscard]] Stream getDiagnosticStream();
 void setDiagnosticStream(Stream stream);
 
-// The number of characters behind the last newline of what was printed as plain message.
+/// The number of characters behind the last newline of what was printed as plain message.
 [[nodiscard]] uint32_t getColumn();
 
-// The severity that a message comes out with, by the user's overrides and the word's permissions.
+/// The severity that a message comes out with, by the user's overrides and the word's permissions.
 [[nodiscard]] uint32_t computeEffectiveSeverity(uint32_t severityWord, Key key);
 
 } // namespace messages

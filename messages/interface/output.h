@@ -14,49 +14,49 @@ namespace messages {
 
 enum class Stream : uint8_t { Output, Error };
 
-// Duplicates stdout and stderr, unless this was done before. What is written to a stream that is
-// closed at this moment is dropped silently.
+/// Duplicates stdout and stderr, unless this was done before. What is written to a stream that is
+/// closed at this moment is dropped silently.
 void openStreams();
 
-// Flushes stdout and closes both duplicates; what is written afterwards is dropped.
+/// Flushes stdout and closes both duplicates; what is written afterwards is dropped.
 void closeStreams();
 
-// Puts other sinks in place of the descriptors; null brings the descriptor back. The sinks belong
-// to the caller and must outlive their use. What is still buffered goes to the sink it was
-// written for, and an earlier failure of stdout is forgotten.
+/// Puts other sinks in place of the descriptors; null brings the descriptor back. The sinks belong
+/// to the caller and must outlive their use. What is still buffered goes to the sink it was
+/// written for, and an earlier failure of stdout is forgotten.
 void setOutputSinks(OutputSink* output, OutputSink* error);
 
-// Writes a text with its control bytes as backslash and three octal digits, other than tab and
-// line feed. Bytes above 127 pass as they are.
+/// Writes a text with its control bytes as backslash and three octal digits, other than tab and
+/// line feed. Bytes above 127 pass as they are.
 void writeText(Stream stream, std::string_view text);
 
-// Writes bytes to stdout unchanged.
+/// Writes bytes to stdout unchanged.
 void writeRaw(std::string_view bytes);
 
-// Keeps what is written to both streams until it is known whether it is true: a run that finds
-// itself overtaken drops it and starts over. Too much of it, or the end of the process, and it
-// comes out.
+/// Keeps what is written to both streams until it is known whether it is true: a run that finds
+/// itself overtaken drops it and starts over. Too much of it, or the end of the process, and it
+/// comes out.
 class HeldOutput {
 public:
   HeldOutput() = default;
-  // What is still held comes out.
+  /// What is still held comes out.
   ~HeldOutput() { release(); }
   HeldOutput(const HeldOutput&) = delete;
   HeldOutput& operator=(const HeldOutput&) = delete;
 
-  // From now on.
+  /// From now on.
   void hold();
   void release();
-  // Forgets what was written since `hold`. False if some of it is out already.
+  /// Forgets what was written since `hold`. False if some of it is out already.
   [[nodiscard]] bool drop();
 };
 
-// Call at every way out of the process. False if stdout has failed, now or earlier.
+/// Call at every way out of the process. False if stdout has failed, now or earlier.
 bool flushAll();
 
-// Whether a write to stdout failed; from then on everything for stdout is dropped.
+/// Whether a write to stdout failed; from then on everything for stdout is dropped.
 [[nodiscard]] bool hasStdoutFailed();
-// The host's error number of that failure, or 0.
+/// The host's error number of that failure, or 0.
 [[nodiscard]] int getStdoutError();
 
 } // namespace messages

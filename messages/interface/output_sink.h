@@ -9,7 +9,7 @@ namespace messages {
 class OutputSink {
 public:
   virtual ~OutputSink() = default;
-  // Takes all the bytes. 0, or the host's error number, after which an unknown part is written.
+  /// Takes all the bytes. 0, or the host's error number, after which an unknown part is written.
   [[nodiscard]] virtual int write(std::string_view bytes) = 0;
 };
 

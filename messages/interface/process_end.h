@@ -5,14 +5,14 @@
 
 namespace messages {
 
-// Must not return; a test may throw out of it.
+/// Must not return; a test may throw out of it.
 using ExitHandler = void (*)(int status);
 
-// Null brings back the default, which flushes the streams and exits.
+/// Null brings back the default, which flushes the streams and exits.
 void setExitHandler(ExitHandler handler);
 
-// Calls the exit handler. Should the shut-down itself fail and come back here, the process ends at
-// once, with only the streams flushed.
+/// Calls the exit handler. Should the shut-down itself fail and come back here, the process ends at
+/// once, with only the streams flushed.
 [[noreturn]] void endProcess(int status);
 
 } // namespace messages

@@ -16,7 +16,7 @@ enum Severity : uint32_t {
   Severity_InternalFault = 6,
 };
 
-inline constexpr uint32_t SeverityCount = 7; // 0 is not used
+inline constexpr uint32_t SeverityCount = 7; ///< 0 is not used
 
 inline constexpr uint32_t MayBeLowered = 1;
 inline constexpr uint32_t MayBeRaised = 2;
