@@ -11,7 +11,7 @@ namespace elfext {
 template <class T>
 class Array : public ArrayBase<T, HeapStorage> {
 public:
-  // Empty, with room for one element.
+  /// Empty, with room for one element.
   Array() : ArrayBase<T, HeapStorage>(0) {}
 };
 

@@ -41,7 +41,7 @@ public:
     return m_Elements[index];
   }
 
-  // Valid until the array grows.
+  /// Valid until the array grows.
   [[nodiscard]] T* begin() { return m_Elements; }
   [[nodiscard]] T* end() { return m_Elements + m_Used; }
   [[nodiscard]] const T* begin() const { return m_Elements; }
@@ -49,14 +49,14 @@ public:
   [[nodiscard]] std::span<T> getSpan() { return {m_Elements, m_Used}; }
   [[nodiscard]] std::span<const T> getSpan() const { return {m_Elements, m_Used}; }
 
-  // The element may be one of this array.
+  /// The element may be one of this array.
   void append(const T& element) {
     if (m_Used == m_Allocated) return appendGrowing(element);
     std::construct_at(m_Elements + m_Used, element);
     ++m_Used;
   }
 
-  // The elements must not be of this array.
+  /// The elements must not be of this array.
   void append(const T* elements, uint32_t count) {
     QUARN_ASSERT(1, elements != NULL);
     while (count != 0) {
@@ -69,7 +69,7 @@ public:
     }
   }
 
-  // Moves what stands at the index and behind it up by one.
+  /// Moves what stands at the index and behind it up by one.
   void insert(uint32_t index, const T& element) {
     QUARN_ASSERT(1, index <= m_Used);
     const T copy = element;
@@ -78,32 +78,32 @@ public:
     m_Elements[index] = copy;
   }
 
-  // Keeps the order of the others.
+  /// Keeps the order of the others.
   void remove(uint32_t index) {
     QUARN_ASSERT(1, index < m_Used);
     std::copy(m_Elements + index + 1, end(), m_Elements + index);
     --m_Used;
   }
 
-  // Removes the first equal element, if there is one.
+  /// Removes the first equal element, if there is one.
   void removeValue(const T& value) {
     T* found = std::find(begin(), end(), value);
     if (found != end()) remove(static_cast<uint32_t>(found - begin()));
   }
 
-  // A linear search: keep a set beside the array where it is asked often.
+  /// A linear search: keep a set beside the array where it is asked often.
   [[nodiscard]] bool contains(const T& value) const {
     return std::find(begin(), end(), value) != end();
   }
 
-  // New elements are left as they are in memory, for the caller to fill; a smaller size releases
-  // and clears nothing.
+  /// New elements are left as they are in memory, for the caller to fill; a smaller size releases
+  /// and clears nothing.
   void setSize(uint32_t size) {
     reserve(size);
     m_Used = size;
   }
 
-  // Room for so many elements in all.
+  /// Room for so many elements in all.
   void reserve(uint32_t capacity) {
     if (capacity > m_Allocated) grow(capacity);
   }
@@ -114,8 +114,8 @@ public:
     std::uninitialized_copy_n(other.m_Elements, other.m_Used, m_Elements);
   }
 
-  // Not stable; needs no memory, and linear time for sorted input. `isLess(left, right)` is a
-  // strict order.
+  /// Not stable; needs no memory, and linear time for sorted input. `isLess(left, right)` is a
+  /// strict order.
   template <class IsLess>
   void sort(IsLess isLess) {
     smoothSort(getSpan(), isLess);

@@ -16,34 +16,34 @@
 
 namespace elfext {
 
-// What the names of decoration symbols begin with; the text of the attributes follows.
+/// What the names of decoration symbols begin with; the text of the attributes follows.
 constexpr std::string_view DecorationPrefix = "BuildAttributes$";
-// What stands between a symbol's name and the text of its attributes.
+/// What stands between a symbol's name and the text of its attributes.
 constexpr std::string_view DecorationMarker = "$$BuildAttributes$";
 
 [[nodiscard]] FullAttr parseAttributeString(std::string_view text);
 
-// ORs in what the text says, and completes the features.
+/// ORs in what the text says, and completes the features.
 void addAttributeString(FullAttr& record, std::string_view text);
 
 [[nodiscard]] std::string printAttributeString(const FullAttr& record);
-// Writes as much as fits into `size` bytes, with a final zero if there is room for any. A null
-// buffer is as good as none. The length of the whole text.
+/// Writes as much as fits into `size` bytes, with a final zero if there is room for any. A null
+/// buffer is as good as none. The length of the whole text.
 size_t printAttributeString(const FullAttr& record, char* buffer, size_t size);
 
-// The name of a decoration symbol, in the region.
+/// The name of a decoration symbol, in the region.
 [[nodiscard]] const char* buildDecorationName(alloclib::RegionGeneral& region,
                                               const FullAttr& record);
 
-// Options of older compilers that say how code was built: "-otime", "/nointerwork/ropi". An
-// unknown name ends the text.
+/// Options of older compilers that say how code was built: "-otime", "/nointerwork/ropi". An
+/// unknown name ends the text.
 void applyFlagString(uint64_t& flags, std::string_view options);
 
-// Their way to say which accesses are used: "rodata:+UL41-US41". What is no access ends the text.
+/// Their way to say which accesses are used: "rodata:+UL41-US41". What is no access ends the text.
 void applyAccessString(AccessWords& access, std::string_view options);
 
-// What a target is taken to use. The name decides where the architecture's number, that of
-// Tag_CPU_arch, is 0; it may be empty.
+/// What a target is taken to use. The name decides where the architecture's number, that of
+/// Tag_CPU_arch, is 0; it may be empty.
 [[nodiscard]] AccessWords defaultAccessWords(uint32_t architecture, std::string_view targetName);
 
 } // namespace elfext

@@ -22,17 +22,17 @@ namespace elfext {
 template <class Value>
 class AttributeTextCache {
 public:
-  static constexpr size_t LongestText = 1024; // bytes; all words there are need fewer
+  static constexpr size_t LongestText = 1024; ///< bytes; all words there are need fewer
   static constexpr size_t MostTexts = 1024;
 
-  // Has no effect but its value, which depends on the text alone.
+  /// Has no effect but its value, which depends on the text alone.
   using Compute = Value (*)(std::string_view text);
 
   explicit AttributeTextCache(Compute compute) : m_Compute(compute) {}
   AttributeTextCache(const AttributeTextCache&) = delete;
   AttributeTextCache& operator=(const AttributeTextCache&) = delete;
 
-  // Good until the next call.
+  /// Good until the next call.
   [[nodiscard]] const Value& get(std::string_view text) {
     if (text.size() > LongestText) return m_Unkept = m_Compute(text);
     if (m_Last == nullptr || m_Last->first != text) m_Last = &find(text);
@@ -61,8 +61,8 @@ private:
 
   Compute m_Compute;
   Values m_Values;
-  const Entry* m_Last = nullptr; // neighbours mostly have the same text
-  Value m_Unkept;                // for a text that is too long
+  const Entry* m_Last = nullptr; ///< neighbours mostly have the same text
+  Value m_Unkept;                ///< for a text that is too long
 };
 
 } // namespace elfext

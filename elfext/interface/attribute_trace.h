@@ -29,28 +29,28 @@ struct TracedAttribute {
   friend bool operator==(const TracedAttribute&, const TracedAttribute&) = default;
 };
 
-// Attributes that stand together in the section; they may hold of many owners.
+/// Attributes that stand together in the section; they may hold of many owners.
 struct TracedRun {
   std::string_view vendor;
   AttributeScope scope = Tag_File;
-  std::vector<uint32_t> owners; // the numbers of the sections or symbols; empty for the file
+  std::vector<uint32_t> owners; ///< the numbers of the sections or symbols; empty for the file
   std::span<const uint8_t> bytes;
-  // Of the vendors whose tags are known; up to the first tag that can't be.
+  /// Of the vendors whose tags are known; up to the first tag that can't be.
   std::vector<TracedAttribute> attributes;
 };
 
-// Its texts and bytes are those of the sections that it was made from.
+/// Its texts and bytes are those of the sections that it was made from.
 struct AttributeTable {
   std::vector<TracedRun> runs;
 
-  // Which of the runs hold of the file, and of each section and symbol, by its number.
+  /// Which of the runs hold of the file, and of each section and symbol, by its number.
   std::vector<size_t> global;
   std::map<uint32_t, std::vector<size_t>> sections;
   std::map<uint32_t, std::vector<size_t>> symbols;
 };
 
-// Adds what the section says to the table, and the steps to the trace. Whether all of it was well
-// formed.
+/// Adds what the section says to the table, and the steps to the trace. Whether all of it was well
+/// formed.
 bool traceAttributeSection(AttributeTable& table, std::span<const uint8_t> section,
                            bool isLittleEndian, std::string& trace);
 

@@ -15,7 +15,7 @@ class HashSection;
 class RelocationRows;
 class ShndxSection;
 
-// Whether sections of the type have a class of their own, one of those below.
+/// Whether sections of the type have a class of their own, one of those below.
 [[nodiscard]] bool hasOwnSectionClass(uint32_t type);
 
 class NullSection final : public Section {
@@ -29,7 +29,7 @@ public:
   StringTableSection(ObjectModule* objectModule, const char* name, uint32_t flags)
       : Section(objectModule, name, SHT_STRTAB, flags, {true, false, 0}) {}
 
-  // Who uses it.
+  /// Who uses it.
   [[nodiscard]] bool isSectionNameTable() const { return m_IsSectionNameTable; }
   [[nodiscard]] bool isLinkedBySymtab() const { return m_IsLinkedBySymtab; }
   [[nodiscard]] bool isLinkedByDynsym() const { return m_IsLinkedByDynsym; }
@@ -46,10 +46,10 @@ private:
 
 class SymbolTableSection final : public Section {
 public:
-  // The type is SHT_SYMTAB or SHT_DYNSYM.
+  /// The type is SHT_SYMTAB or SHT_DYNSYM.
   SymbolTableSection(ObjectModule* objectModule, const char* name, uint32_t type, uint32_t flags);
 
-  // Null for a table without.
+  /// Null for a table without.
   [[nodiscard]] ShndxSection* getShndxSection() const { return m_ShndxSection; }
   [[nodiscard]] HashSection* getHashSection() const { return m_HashSection; }
 
@@ -63,15 +63,15 @@ private:
 
 class RelocationSection final : public Section {
 public:
-  // The type is SHT_REL or SHT_RELA.
+  /// The type is SHT_REL or SHT_RELA.
   RelocationSection(ObjectModule* objectModule, const char* name, uint32_t type, uint32_t flags);
 
-  // The section that the relocations apply to; null until it is known.
+  /// The section that the relocations apply to; null until it is known.
   [[nodiscard]] Section* getTarget() const { return m_Target; }
-  // Whether its symbols are the dynamic ones.
+  /// Whether its symbols are the dynamic ones.
   [[nodiscard]] bool isDynamic() const { return m_IsDynamic; }
   [[nodiscard]] bool hasAddends() const { return getType() == SHT_RELA; }
-  // Rows that are not relocations yet.
+  /// Rows that are not relocations yet.
   [[nodiscard]] uint32_t getPendingRowCount() const { return m_RowCount; }
 
   [[nodiscard]] RelocationSection* asRelocationSection() override { return this; }
@@ -97,7 +97,7 @@ public:
   GroupSection(ObjectModule* objectModule, const char* name, uint32_t flags)
       : Section(objectModule, name, SHT_GROUP, flags, {true, false, 4}) {}
 
-  // In the symbol table that the section links to.
+  /// In the symbol table that the section links to.
   [[nodiscard]] uint32_t getSignatureSymbolIndex() const { return m_SignatureSymbolIndex; }
 
 private:

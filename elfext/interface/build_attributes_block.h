@@ -13,7 +13,7 @@ namespace elfext {
 
 class BuildAttributesBlock {
 public:
-  // Both outlive the block.
+  /// Both outlive the block.
   BuildAttributesBlock(std::string_view vendor, std::span<const uint8_t> data)
       : m_Vendor(vendor), m_Data(data) {}
 

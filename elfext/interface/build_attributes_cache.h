@@ -21,21 +21,21 @@ namespace elfext {
 
 class BuildAttributesCache {
 public:
-  // The block of that vendor and those bytes, which are copied if it is new.
+  /// The block of that vendor and those bytes, which are copied if it is new.
   const BuildAttributesBlock* getBlock(std::string_view vendor, std::span<const uint8_t> data);
 
-  // The set that equals the given one. Of sets that compare equal, though they differ in what
-  // comparison leaves out, the first one stays.
+  /// The set that equals the given one. Of sets that compare equal, though they differ in what
+  /// comparison leaves out, the first one stays.
   const BuildAttributes* getBuildAttributes(const BuildAttributes& attributes);
 
-  // The set that an attribute text stands for.
+  /// The set that an attribute text stands for.
   const BuildAttributes& getBuildAttributesOf(std::string_view text);
 
 private:
   struct AttributesHash {
     size_t operator()(const BuildAttributes& attributes) const { return attributes.getHash(); }
   };
-  // Vendors are pooled, so their addresses tell them apart.
+  /// Vendors are pooled, so their addresses tell them apart.
   struct BlockKey {
     const std::string* vendor;
     std::string_view data;
@@ -49,7 +49,7 @@ private:
   };
 
   std::unordered_set<std::string> m_Vendors;
-  std::deque<std::string> m_Data; // of the blocks
+  std::deque<std::string> m_Data; ///< of the blocks
   std::deque<BuildAttributesBlock> m_Blocks;
   std::unordered_map<BlockKey, const BuildAttributesBlock*, BlockHash> m_BlocksByContent;
   std::unordered_set<BuildAttributes, AttributesHash> m_Attributes;

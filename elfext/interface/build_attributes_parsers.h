@@ -25,11 +25,11 @@ class BuildAttributesSectionParser {
 public:
   virtual ~BuildAttributesSectionParser() = default;
 
-  // Walks a whole section, and goes on behind what is corrupted as far as the lengths allow. True
-  // if it was well formed and no operation answered false.
+  /// Walks a whole section, and goes on behind what is corrupted as far as the lengths allow. True
+  /// if it was well formed and no operation answered false.
   bool parse(AttributeBytes section, bool isLittleEndian);
 
-  // Called for each sub-subsection, in file order. The indices hold only during the call.
+  /// Called for each sub-subsection, in file order. The indices hold only during the call.
   virtual bool parseFileSubSubsection(std::string_view, AttributeBytes) { return true; }
   virtual bool parseSectionSubSubsection(std::string_view, std::span<const uint32_t>,
                                          AttributeBytes) {
@@ -41,18 +41,18 @@ public:
   }
 };
 
-// A run of attributes of vendor "qobix".
+/// A run of attributes of vendor "qobix".
 class QobixBuildAttributesSubSubsectionParser {
 public:
   virtual ~QobixBuildAttributesSubSubsectionParser() = default;
 
-  // False if the run was malformed, at which the walk ends, or an operation answered false.
+  /// False if the run was malformed, at which the walk ends, or an operation answered false.
   virtual bool parse(AttributeBytes run);
 
   virtual bool numericTag(uint32_t, uint32_t) { return true; }
   virtual bool stringTag(uint32_t, std::string_view) { return true; }
   virtual bool numericAndStringTag(uint32_t, uint32_t, std::string_view) { return true; }
-  // The attribute that Tag_also_compatible_with holds.
+  /// The attribute that Tag_also_compatible_with holds.
   virtual bool nestedNumericTag(uint32_t, uint32_t) { return true; }
   virtual bool nestedStringTag(uint32_t, std::string_view) { return true; }
   virtual bool nestedNumericAndStringTag(uint32_t, uint32_t, std::string_view) { return true; }
@@ -61,7 +61,7 @@ private:
   bool parseNested(std::string_view text);
 };
 
-// A run of attributes of vendor "ZEV". Texts are stepped over.
+/// A run of attributes of vendor "ZEV". Texts are stepped over.
 class ZevBuildAttributesSubSubsectionParser {
 public:
   virtual ~ZevBuildAttributesSubSubsectionParser() = default;
@@ -71,7 +71,7 @@ public:
   virtual bool numericTag(uint32_t, uint32_t) { return true; }
 };
 
-// Both fill a set of attributes, with what is known; the rest is only in the bytes.
+/// Both fill a set of attributes, with what is known; the rest is only in the bytes.
 class QobixBuildAttributesDecodingParser : public QobixBuildAttributesSubSubsectionParser {
 public:
   explicit QobixBuildAttributesDecodingParser(BuildAttributes& attributes);
@@ -87,7 +87,7 @@ private:
   bool addAlsoCompatible(AlsoCompatibilityTag entry);
 
   BuildAttributes& m_Attributes;
-  // The entries of the set: a run may have thousands, and be made so that they all hash alike.
+  /// The entries of the set: a run may have thousands, and be made so that they all hash alike.
   std::set<CompatibilityTag> m_Compatible;
   std::set<AlsoCompatibilityTag> m_AlsoCompatible;
 };

@@ -12,7 +12,7 @@ namespace elfext {
 constexpr std::string_view QobixVendor = "qobix";
 constexpr std::string_view ZevVendor = "ZEV";
 
-// What a run of attributes in a section holds for.
+/// What a run of attributes in a section holds for.
 enum AttributeScope : uint32_t { Tag_File = 1, Tag_Section = 2, Tag_Symbol = 3 };
 [[nodiscard]] constexpr bool isAttributeScope(uint32_t kind) {
   return kind >= Tag_File && kind <= Tag_Symbol;
@@ -60,7 +60,7 @@ enum QobixTag : uint32_t {
   Tag_K2EE_use = 66,
   Tag_conformance = 67,
   Tag_Virtualization_use = 68,
-  // An older number of Tag_MPextension_use; both are one tag.
+  /// An older number of Tag_MPextension_use; both are one tag.
   Tag_MPextension_use_r207 = 70,
 };
 
@@ -77,15 +77,15 @@ enum class ZevTag : uint32_t {
   Tag_ZV_full_isa = 22,
 };
 
-// The lowest number that an attribute may have; smaller ones are scopes.
+/// The lowest number that an attribute may have; smaller ones are scopes.
 constexpr uint32_t FirstAttributeTag = 4;
-// Tags above this one say by being even or odd whether they are numbers or texts.
+/// Tags above this one say by being even or odd whether they are numbers or texts.
 constexpr uint32_t LastIrregularTag = 32;
 
-// Which form the value of a tag has.
+/// Which form the value of a tag has.
 class BuildAttributesTagClassifier {
 public:
-  // A negative number stands for one of 0x80000000 and above.
+  /// A negative number stands for one of 0x80000000 and above.
   [[nodiscard]] static constexpr bool isQobixNumericTag(uint32_t tag) {
     return isQobixNumericTag(static_cast<int32_t>(tag));
   }

@@ -14,28 +14,28 @@ namespace elfext {
 
 class ContentBytes {
 public:
-  // Empty; its own bytes will come from the region.
+  /// Empty; its own bytes will come from the region.
   explicit ContentBytes(alloclib::RegionGeneral& region) : m_Region(&region) {}
 
   [[nodiscard]] uint64_t getSize() const { return m_Size; }
-  // Null when there are none, or when the image can't give them: then `isLost` from now on. Valid
-  // until the next change.
+  /// Null when there are none, or when the image can't give them: then `isLost` from now on. Valid
+  /// until the next change.
   [[nodiscard]] const uint8_t* view() const;
   [[nodiscard]] bool isLost() const { return m_IsLost; }
-  // Of lost bytes: why, as the host's error number.
+  /// Of lost bytes: why, as the host's error number.
   [[nodiscard]] support::HostError getHostError() const { return m_Source->getHostError(); }
 
-  // Whether the bytes are the buffer's own, and so at most UINT32_MAX of them.
+  /// Whether the bytes are the buffer's own, and so at most UINT32_MAX of them.
   [[nodiscard]] bool isOwned() const { return m_Foreign == nullptr && m_Source == nullptr; }
 
-  // Uses the caller's bytes, which must outlive this object or its next change.
+  /// Uses the caller's bytes, which must outlive this object or its next change.
   void borrow(const uint8_t* bytes, uint64_t size);
-  // Will ask the source, which must outlive this object, at the first look.
+  /// Will ask the source, which must outlive this object, at the first look.
   void defer(ImageSource& source, uint64_t offset, uint64_t size);
 
-  // The bytes to write to, all its own from now on; null when there are none, or they are lost.
+  /// The bytes to write to, all its own from now on; null when there are none, or they are lost.
   [[nodiscard]] uint8_t* modify();
-  // New bytes are as they are in memory. Lost bytes stay lost, unless none of them are kept.
+  /// New bytes are as they are in memory. Lost bytes stay lost, unless none of them are kept.
   void setSize(uint64_t size);
   void reserve(uint64_t capacity);
 
@@ -46,7 +46,7 @@ private:
   alloclib::RegionGeneral* m_Region;
   uint64_t m_Size = 0;
   FastArray<unsigned char>* m_Own = nullptr;
-  // Looking at bytes fetches them, which is no change.
+  /// Looking at bytes fetches them, which is no change.
   mutable const uint8_t* m_Foreign = nullptr;
   mutable ImageSource* m_Source = nullptr;
   uint64_t m_SourceOffset = 0;

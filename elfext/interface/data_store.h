@@ -9,16 +9,16 @@ namespace elfext {
 
 class DataStore {
 public:
-  // Both answer true, but for bytes that the file could not give: the module's handler has been
-  // told of these, and nothing is read or written. The range must lie within the store.
+  /// Both answer true, but for bytes that the file could not give: the module's handler has been
+  /// told of these, and nothing is read or written. The range must lie within the store.
   virtual bool read(uint64_t offset, void* destination, uint64_t count) const = 0;
   virtual bool write(uint64_t offset, const void* source, uint64_t count) = 0;
-  // Bytes.
+  /// Bytes.
   [[nodiscard]] virtual uint64_t getSize() const = 0;
   [[nodiscard]] virtual bool isModifiable() const { return true; }
 
 protected:
-  // Stores belong to their module, never to who reads them.
+  /// Stores belong to their module, never to who reads them.
   ~DataStore() = default;
 };
 

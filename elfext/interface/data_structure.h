@@ -21,10 +21,10 @@ enum DataStructureKind : uint32_t {
 class DataStructure {
 public:
   [[nodiscard]] virtual DataStructureKind getKind() const = 0;
-  // Bytes in the file.
+  /// Bytes in the file.
   [[nodiscard]] virtual uint64_t getSize() const = 0;
 
-  // The place that the sequencer gave it.
+  /// The place that the sequencer gave it.
   [[nodiscard]] uint64_t getFileOffset() const { return m_FileOffset; }
   void setFileOffset(uint64_t offset) { m_FileOffset = offset; }
 

@@ -3,8 +3,8 @@
 
 namespace elfext {
 
-// Whether a section of that name holds debug information: one that starts with ".debug" or
-// ".line", or is "C$$fpmap". A null name doesn't.
+/// Whether a section of that name holds debug information: one that starts with ".debug" or
+/// ".line", or is "C$$fpmap". A null name doesn't.
 [[nodiscard]] bool isDebugSectionName(const char* name);
 
 } // namespace elfext

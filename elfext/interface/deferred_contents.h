@@ -10,7 +10,7 @@ namespace elfext {
 
 class DeferredContents {
 public:
-  // Holds one reference to the file, which must outlive this object.
+  /// Holds one reference to the file, which must outlive this object.
   DeferredContents(ReferenceCountedFile* referenceCountedFile, bool usesFile,
                    const SectionHeader& header);
   ~DeferredContents() { m_ReferenceCountedFile->release(); }
@@ -19,7 +19,7 @@ public:
 
   [[nodiscard]] ReferenceCountedFile& getFile() const { return *m_ReferenceCountedFile; }
   [[nodiscard]] bool usesFile() const { return m_UsesFile; }
-  // As it was read: the section's own fields may have changed since.
+  /// As it was read: the section's own fields may have changed since.
   [[nodiscard]] const SectionHeader& getHeader() const { return m_Header; }
 
 private:

@@ -14,14 +14,14 @@ class DeferredContentsSelector {
 public:
   virtual ~DeferredContentsSelector() = default;
 
-  // Asked once for each section that may be deferred; the size is in bytes.
+  /// Asked once for each section that may be deferred; the size is in bytes.
   [[nodiscard]] virtual bool isDeferred(const Section& section, uint64_t size) = 0;
 };
 
-// Defers what is larger than a threshold.
+/// Defers what is larger than a threshold.
 class BySizeDeferredContentsSelector final : public DeferredContentsSelector {
 public:
-  // Bytes; 0 defers all sections that have contents.
+  /// Bytes; 0 defers all sections that have contents.
   [[nodiscard]] uint64_t getThreshold() const { return m_Threshold; }
   void setThreshold(uint64_t threshold) { m_Threshold = threshold; }
 

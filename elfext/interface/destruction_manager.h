@@ -15,12 +15,12 @@ namespace elfext {
 class DestructionManager {
 public:
   DestructionManager() = default;
-  // Runs what is left.
+  /// Runs what is left.
   ~DestructionManager() { run(); }
   DestructionManager(const DestructionManager&) = delete;
   DestructionManager& operator=(const DestructionManager&) = delete;
 
-  // Takes over an object that was allocated in the region as one T.
+  /// Takes over an object that was allocated in the region as one T.
   template <class T>
   void add(alloclib::Region* region, T* object) {
     QUARN_ASSERT(1, region != NULL);
@@ -31,7 +31,7 @@ public:
     });
   }
 
-  // Destroys the objects, the last one added first, and gives their memory back.
+  /// Destroys the objects, the last one added first, and gives their memory back.
   void run();
 
 private:

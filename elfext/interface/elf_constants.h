@@ -8,28 +8,28 @@
 
 namespace elfext {
 
-// e_ident
+/// e_ident
 constexpr uint32_t ELFCLASS32 = 1;
 constexpr uint32_t ELFCLASS64 = 2;
 constexpr uint32_t ELFDATA2LSB = 1;
 constexpr uint32_t ELFDATA2MSB = 2;
 constexpr uint32_t ELFOSABI_ZEV = 64;
 
-// e_type
+/// e_type
 constexpr uint32_t ET_NONE = 0;
 constexpr uint32_t ET_REL = 1;
 constexpr uint32_t ET_EXEC = 2;
 constexpr uint32_t ET_DYN = 3;
 constexpr uint32_t ET_CORE = 4;
 
-// e_machine
+/// e_machine
 constexpr uint32_t EM_ZEV = 40;
 constexpr uint32_t EM_ZEV64 = 183;
 
-// e_version
+/// e_version
 constexpr uint32_t EV_CURRENT = 1;
 
-// st_shndx, e_shstrndx, e_phnum
+/// st_shndx, e_shstrndx, e_phnum
 constexpr uint32_t SHN_UNDEF = 0;
 constexpr uint32_t SHN_LORESERVE = 0xFF00;
 constexpr uint32_t SHN_ABS = 0xFFF1;
@@ -37,7 +37,7 @@ constexpr uint32_t SHN_COMMON = 0xFFF2;
 constexpr uint32_t SHN_XINDEX = 0xFFFF;
 constexpr uint32_t PN_XNUM = 0xFFFF;
 
-// sh_type
+/// sh_type
 constexpr uint32_t SHT_NULL = 0;
 constexpr uint32_t SHT_PROGBITS = 1;
 constexpr uint32_t SHT_SYMTAB = 2;
@@ -63,7 +63,7 @@ constexpr uint32_t SHT_ZEV_PREEMPTMAP = 0x70000002;
 constexpr uint32_t SHT_ZEV_ATTRIBUTES = 0x70000003;
 constexpr uint32_t SHT_ZEV_DEBUGOVERLAY = 0x70000004;
 
-// sh_flags
+/// sh_flags
 constexpr uint32_t SHF_WRITE = 0x1;
 constexpr uint32_t SHF_ALLOC = 0x2;
 constexpr uint32_t SHF_EXECINSTR = 0x4;
@@ -74,10 +74,10 @@ constexpr uint32_t SHF_LINK_ORDER = 0x80;
 constexpr uint32_t SHF_GROUP = 0x200;
 constexpr uint32_t SHF_TLS = 0x400;
 
-// The flags word of a group
+/// The flags word of a group
 constexpr uint32_t GRP_COMDAT = 0x1;
 
-// st_info: binding and type
+/// st_info: binding and type
 constexpr uint32_t STB_LOCAL = 0;
 constexpr uint32_t STB_GLOBAL = 1;
 constexpr uint32_t STB_WEAK = 2;
@@ -89,13 +89,13 @@ constexpr uint32_t STT_FILE = 4;
 constexpr uint32_t STT_COMMON = 5;
 constexpr uint32_t STT_TLS = 6;
 
-// st_other
+/// st_other
 constexpr uint32_t STV_DEFAULT = 0;
 constexpr uint32_t STV_INTERNAL = 1;
 constexpr uint32_t STV_HIDDEN = 2;
 constexpr uint32_t STV_PROTECTED = 3;
 
-// p_type
+/// p_type
 constexpr uint32_t PT_NULL = 0;
 constexpr uint32_t PT_LOAD = 1;
 constexpr uint32_t PT_DYNAMIC = 2;
@@ -106,12 +106,12 @@ constexpr uint32_t PT_PHDR = 6;
 constexpr uint32_t PT_TLS = 7;
 constexpr uint32_t PT_ZEV_EXIDX = 0x70000001;
 
-// p_flags
+/// p_flags
 constexpr uint32_t PF_X = 1;
 constexpr uint32_t PF_W = 2;
 constexpr uint32_t PF_R = 4;
 
-// d_tag
+/// d_tag
 constexpr uint32_t DT_NULL = 0;
 constexpr uint32_t DT_NEEDED = 1;
 constexpr uint32_t DT_INIT = 12;
@@ -134,20 +134,20 @@ constexpr uint32_t DT_VERNEEDNUM = 0x6FFFFFFF;
 constexpr uint32_t DT_ZEV_SYMTABSZ = 0x70000001;
 constexpr uint32_t DT_ZEV_PREEMPTMAP = 0x70000002;
 
-// DT_FLAGS, and the single tags that say the same
+/// DT_FLAGS, and the single tags that say the same
 constexpr uint32_t DF_SYMBOLIC = 0x2;
 constexpr uint32_t DF_TEXTREL = 0x4;
 constexpr uint32_t DF_BIND_NOW = 0x8;
 
-// Versions: vd_flags, and a symbol's word in the versym section
+/// Versions: vd_flags, and a symbol's word in the versym section
 constexpr uint32_t VER_FLG_BASE = 0x1;
 constexpr uint32_t VERSYM_HIDDEN = 0x8000;
 
-// Jump-slot relocations
+/// Jump-slot relocations
 constexpr uint32_t R_ZEV_JUMP_SLOT = 22;
 constexpr uint32_t R_ZEV64_JUMP_SLOT = 1026;
 
-// The section type's name as the constant above is spelt; null for a type without one.
+/// The section type's name as the constant above is spelt; null for a type without one.
 [[nodiscard]] const char* sectionTypeName(uint32_t type);
 
 } // namespace elfext

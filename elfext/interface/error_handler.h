@@ -22,7 +22,7 @@ namespace elfext {
 
 class ObjectModule;
 
-// A row of a symbol table. Rows count from 0, the null symbol.
+/// A row of a symbol table. Rows count from 0, the null symbol.
 struct SymbolPlace {
   uint32_t symbol = 0;
   uint32_t tableSection = 0;
@@ -33,20 +33,20 @@ class ErrorHandler {
 public:
   virtual ~ErrorHandler() = default;
 
-  // `sectionIndex` is the section to blame, 0 where the file as a whole is.
+  /// `sectionIndex` is the section to blame, 0 where the file as a whole is.
   virtual bool report(const ObjectModule& module, uint32_t sectionIndex,
                       const std::string& text) = 0;
 
-  // The file can't be had. Final. An error number of 0 leaves out the system's text, a module
-  // without object name the name.
+  /// The file can't be had. Final. An error number of 0 leaves out the system's text, a module
+  /// without object name the name.
   virtual bool outOfMemory(const ObjectModule& module);
   virtual bool ioErrorReading(const ObjectModule& module, int errorNumber);
-  // Also for bytes that should be inside the file and are not, with error number -1.
+  /// Also for bytes that should be inside the file and are not, with error number -1.
   virtual bool ioErrorWriting(const ObjectModule& module, int errorNumber);
 
-  // An index that should name a section. `lastSection` is the section count minus one. Final, but
-  // for the relocation, group and SHT_SYMTAB_SHNDX sections: these are passed over from then on,
-  // and of a group only the member is.
+  /// An index that should name a section. `lastSection` is the section count minus one. Final, but
+  /// for the relocation, group and SHT_SYMTAB_SHNDX sections: these are passed over from then on,
+  /// and of a group only the member is.
   virtual bool emptySectionHeaderTable(const ObjectModule& module);
   virtual bool sectionNameTableOutOfRange(const ObjectModule& module, uint32_t index,
                                           uint32_t lastSection);
@@ -71,8 +71,8 @@ public:
   virtual bool sectionLinkOutOfRange(const ObjectModule& module, uint32_t section, uint32_t link,
                                      uint32_t lastSection);
 
-  // The section that is named has another type than it should. Final, but for the relocation,
-  // group and SHT_SYMTAB_SHNDX sections: these are passed over from then on.
+  /// The section that is named has another type than it should. Final, but for the relocation,
+  /// group and SHT_SYMTAB_SHNDX sections: these are passed over from then on.
   virtual bool sectionNameTableOfWrongType(const ObjectModule& module, uint32_t index,
                                            uint32_t type);
   virtual bool symbolTableLinkOfWrongType(const ObjectModule& module, uint32_t section,
@@ -90,12 +90,12 @@ public:
   virtual bool dynamicLinkOfWrongType(const ObjectModule& module, uint32_t section, uint32_t link,
                                       uint32_t type);
 
-  // Section names. True: no further names are looked up; this section has none.
+  /// Section names. True: no further names are looked up; this section has none.
   virtual bool nameWithoutNameTable(const ObjectModule& module, uint32_t section);
   virtual bool sectionNameOutOfRange(const ObjectModule& module, uint32_t section, uint32_t offset,
                                      uint64_t tableSize);
 
-  // Counts of rows that do not go together. Final. Row counts include the null symbol's.
+  /// Counts of rows that do not go together. Final. Row counts include the null symbol's.
   virtual bool groupSignatureOutOfRange(const ObjectModule& module, uint32_t section,
                                         uint32_t symbol, uint32_t tableSection, uint64_t rowCount);
   virtual bool secondShndxSection(const ObjectModule& module, uint32_t firstSection,
@@ -103,50 +103,50 @@ public:
   virtual bool shndxCountDiffers(const ObjectModule& module, uint32_t section, uint64_t wordCount,
                                  uint32_t tableSection, uint64_t rowCount);
 
-  // Symbols. Final in a read; sectionSymbolNotHosted also comes from the validation.
+  /// Symbols. Final in a read; sectionSymbolNotHosted also comes from the validation.
   virtual bool symbolNameOutOfRange(const ObjectModule& module, SymbolPlace place, uint32_t offset,
                                     uint32_t stringSection, uint64_t stringSize);
   virtual bool symbolWithoutShndxSection(const ObjectModule& module, SymbolPlace place);
   virtual bool symbolSectionOutOfRange(const ObjectModule& module, SymbolPlace place,
                                        uint32_t section, uint32_t lastSection);
-  // The table goes unnamed when its section is 0.
+  /// The table goes unnamed when its section is 0.
   virtual bool sectionSymbolNotHosted(const ObjectModule& module, SymbolPlace place);
   virtual bool sectionSymbolSizeDiffers(const ObjectModule& module, uint32_t symbol,
                                         uint32_t section, uint64_t size, uint64_t sectionSize);
   virtual bool sectionSymbolTooLarge(const ObjectModule& module, uint32_t symbol, uint32_t section,
                                      uint64_t size, uint64_t sectionSize);
 
-  // Final. Relocations count from 0.
+  /// Final. Relocations count from 0.
   virtual bool relocationSymbolOutOfRange(const ObjectModule& module, uint64_t relocation,
                                           uint32_t section, uint32_t symbol, uint32_t tableSection,
                                           uint64_t rowCount);
-  // True: the section stays in the first group.
+  /// True: the section stays in the first group.
   virtual bool sectionInTwoGroups(const ObjectModule& module, uint32_t section,
                                   uint32_t groupSection, uint32_t otherGroupSection);
-  // True: all attributes are dropped.
+  /// True: all attributes are dropped.
   virtual bool corruptBuildAttributes(const ObjectModule& module, uint32_t section);
-  // String tables. True: a zero byte is added, or the bytes at the bad ends are made zero.
+  /// String tables. True: a zero byte is added, or the bytes at the bad ends are made zero.
   virtual bool emptyStringTable(const ObjectModule& module, uint32_t section);
   virtual bool stringTableNotZeroEnded(const ObjectModule& module, uint32_t section, bool badStart,
                                        bool badEnd);
 
-  // The ELF header's refusals. Final; the answer to the machine is the result of the read.
+  /// The ELF header's refusals. Final; the answer to the machine is the result of the read.
   virtual bool unrecognisedFileType(const ObjectModule& module, uint32_t type);
   virtual bool invalidDataEncoding(const ObjectModule& module, uint32_t encoding);
   virtual bool unsupportedVersion(const ObjectModule& module, uint32_t version);
   virtual bool unsupportedMachine(const ObjectModule& module, uint32_t machine);
 
-  // True: the expected size counts; the size is rounded down.
+  /// True: the expected size counts; the size is rounded down.
   virtual bool wrongEntrySize(const ObjectModule& module, uint32_t section, uint64_t entrySize,
                               uint64_t expected);
   virtual bool sizeNotMultiple(const ObjectModule& module, uint32_t section, uint64_t size,
                                uint64_t entrySize);
 
-  // The validation's own. A true answer goes on to the next check, after the repair told.
+  /// The validation's own. A true answer goes on to the next check, after the repair told.
   virtual bool mixedJumpSlotAddends(const ObjectModule& module);
-  // True: the section is blanked.
+  /// True: the section is blanked.
   virtual bool nullSectionNotNull(const ObjectModule& module, uint32_t section);
-  // True: a null section is put in front of it.
+  /// True: a null section is put in front of it.
   virtual bool firstSectionNotNull(const ObjectModule& module, uint32_t type);
   virtual bool auxiliarySectionHostsSymbol(const ObjectModule& module, uint32_t section);
   virtual bool auxiliarySectionRelocated(const ObjectModule& module, uint32_t section);
@@ -162,7 +162,7 @@ public:
                                           uint32_t laterSegment);
   virtual bool loadableSegmentsOverlap(const ObjectModule& module, uint32_t segment,
                                        uint32_t otherSegment);
-  // Final in a read.
+  /// Final in a read.
   virtual bool sectionsOverlap(const ObjectModule& module, uint32_t section, uint32_t otherSection);
   virtual bool secondInterpreterSegment(const ObjectModule& module, uint32_t segment,
                                         uint32_t otherSegment);
@@ -184,7 +184,7 @@ public:
   virtual bool indexTableFlagsMissing(const ObjectModule& module, uint32_t section,
                                       uint32_t missingFlags);
   virtual bool indexTableLinkUnsuitable(const ObjectModule& module, uint32_t section);
-  // True: the flag is taken away; the flag is set.
+  /// True: the flag is taken away; the flag is set.
   virtual bool groupFlagWithoutGroup(const ObjectModule& module, uint32_t section);
   virtual bool memberWithoutGroupFlag(const ObjectModule& module, uint32_t section,
                                       uint32_t groupSection);
@@ -195,11 +195,11 @@ public:
                                     uint32_t section, uint32_t targetSection);
   virtual bool localSymbolUndefined(const ObjectModule& module, uint32_t symbol, bool isDynamic);
 
-  // Neither form of header. Final.
+  /// Neither form of header. Final.
   virtual bool wrongMagic(const ObjectModule& module);
   virtual bool wrongClass(const ObjectModule& module);
 
-  // For whoever lays out a file anew.
+  /// For whoever lays out a file anew.
   virtual bool segmentAlignmentConflict(const ObjectModule& module, uint32_t segment,
                                         uint32_t otherSegment);
   virtual bool sectionAlignmentConflict(const ObjectModule& module, uint32_t segment,
@@ -208,12 +208,12 @@ public:
   virtual bool sectionHeaderTableAlignmentConflict(const ObjectModule& module, uint32_t segment);
   virtual bool elfHeaderAlignmentConflict(const ObjectModule& module, uint32_t segment);
 
-  // Debug overlay records, from 0. True: the record is passed over.
+  /// Debug overlay records, from 0. True: the record is passed over.
   virtual bool overlayOfOtherSection(const ObjectModule& module, uint64_t record, uint32_t section,
                                      uint32_t named);
   virtual bool overlayOfNoSection(const ObjectModule& module, uint64_t record, uint32_t section,
                                   uint32_t named);
-  // The note that maps sections to segments. True: the section gets no segment.
+  /// The note that maps sections to segments. True: the section gets no segment.
   virtual bool segmentMapCountDiffers(const ObjectModule& module, uint32_t section,
                                       uint64_t entryCount, uint32_t allocatedSections);
   virtual bool segmentMapOutOfRange(const ObjectModule& module, uint32_t noteSection,

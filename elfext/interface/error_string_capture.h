@@ -16,7 +16,7 @@ public:
     return false;
   }
 
-  // The last report's text; empty before the first.
+  /// The last report's text; empty before the first.
   [[nodiscard]] const std::string& getText() const { return m_Text; }
 
 private:

@@ -12,10 +12,10 @@ namespace elfext {
 template <class T>
 class FastArray : public ArrayBase<T, RegionStorage> {
 public:
-  // Empty, with room for one element.
+  /// Empty, with room for one element.
   explicit FastArray(alloclib::Region* region) : FastArray(region, 0) {}
 
-  // So many elements, for the caller to fill.
+  /// So many elements, for the caller to fill.
   FastArray(alloclib::Region* region, uint32_t size) : ArrayBase<T, RegionStorage>(size, region) {}
 };
 

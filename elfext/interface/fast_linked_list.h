@@ -25,8 +25,8 @@ class FastLinkedList : private RegionStorage {
   static_assert(alignof(Node) <= 8, "nodes are aligned for 8");
 
 public:
-  // A place in the list, or the end behind its last element. Valid until its node, or the one
-  // before, is removed by another iterator.
+  /// A place in the list, or the end behind its last element. Valid until its node, or the one
+  /// before, is removed by another iterator.
   class Iterator {
   public:
     [[nodiscard]] T& operator*() const {
@@ -43,9 +43,9 @@ public:
       return m_Current == other.m_Current;
     }
 
-    // Puts an element in front of the current one and stands on it.
+    /// Puts an element in front of the current one and stands on it.
     void insert(const T& element) { m_Current = m_List->insertBehind(m_Previous, element); }
-    // Removes the current element and stands on the next one.
+    /// Removes the current element and stands on the next one.
     void remove() {
       QUARN_ASSERT(1, m_Current != nullptr);
       m_Current = m_List->removeBehind(m_Previous);
@@ -80,7 +80,7 @@ public:
   [[nodiscard]] Iterator end() { return {nullptr, m_Tail, this}; }
 
 private:
-  // Behind nothing is at the head.
+  /// Behind nothing is at the head.
   Node*& getLinkBehind(Node* previous) { return previous != nullptr ? previous->next : m_Head; }
 
   Node* insertBehind(Node* previous, const T& element) {
@@ -91,7 +91,7 @@ private:
     return link;
   }
 
-  // Returns the node that has moved up.
+  /// Returns the node that has moved up.
   Node* removeBehind(Node* previous) {
     Node*& link = getLinkBehind(previous);
     Node* removed = link;

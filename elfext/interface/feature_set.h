@@ -13,18 +13,18 @@ struct FeatureSet {
   uint64_t high = 0;
 
   [[nodiscard]] constexpr bool isEmpty() const { return (low | high) == 0; }
-  // All of the other set.
+  /// All of the other set.
   [[nodiscard]] constexpr bool contains(FeatureSet other) const {
     return (low & other.low) == other.low && (high & other.high) == other.high;
   }
-  // Any of the other set.
+  /// Any of the other set.
   [[nodiscard]] constexpr bool intersects(FeatureSet other) const {
     return ((low & other.low) | (high & other.high)) != 0;
   }
   [[nodiscard]] constexpr FeatureSet without(FeatureSet other) const {
     return {low & ~other.low, high & ~other.high};
   }
-  // Holds the other set, or nothing of it.
+  /// Holds the other set, or nothing of it.
   constexpr void put(FeatureSet other, bool isThere) {
     *this = isThere ? *this | other : without(other);
   }
@@ -42,8 +42,8 @@ struct FeatureSet {
 
 namespace features {
 
-// clang-format off
-// The chains, each from its lowest level to its highest.
+/// clang-format off
+/// The chains, each from its lowest level to its highest.
 constexpr FeatureSet ZEV_ISAv3{0x1};
 constexpr FeatureSet ZEV_ISAv4{0x3};
 constexpr FeatureSet ZEV_ISAv5{0x7};
@@ -74,7 +74,7 @@ constexpr FeatureSet FP_ISA_ZEVv8{0x383000000000000};
 constexpr FeatureSet EXTREGS_D16{0x8000000000000};
 constexpr FeatureSet EXTREGS_D32{0x18000000000000};
 
-// The rest, by bit.
+/// The rest, by bit.
 constexpr FeatureSet V6T2_ISA{0x800};
 constexpr FeatureSet M_PROFILE{0x1000};
 constexpr FeatureSet V8M_INSNS{0x2000};
@@ -110,12 +110,12 @@ constexpr FeatureSet V81_ISA{0, 0x1};
 constexpr FeatureSet HFU_HALF{0, 0x2};
 // clang-format on
 
-// What comparisons look at.
+/// What comparisons look at.
 constexpr FeatureSet Defined{~uint64_t{0}, 0x1F};
 
 } // namespace features
 
-// Completes a set: a level brings the levels below it, and some features bring others.
+/// Completes a set: a level brings the levels below it, and some features bring others.
 [[nodiscard]] FeatureSet closeFeatures(FeatureSet features);
 
 } // namespace elfext

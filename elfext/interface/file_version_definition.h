@@ -9,11 +9,11 @@
 namespace elfext {
 
 struct FileVersionDefinition {
-  // The text of the first name record; the module's own, maybe empty, never null.
+  /// The text of the first name record; the module's own, maybe empty, never null.
   const char* name;
-  // vd_ndx: the number that the words of the versym section mean.
+  /// vd_ndx: the number that the words of the versym section mean.
   uint32_t index;
-  // vd_flags.
+  /// vd_flags.
   uint32_t flags;
 };
 

@@ -15,17 +15,17 @@
 
 namespace elfext {
 
-// So many bytes from the start of a file decide.
+/// So many bytes from the start of a file decide.
 constexpr uint32_t RecognizedBytes = 64;
 
-// Tests the bytes of a whole image, or its first RecognizedBytes.
+/// Tests the bytes of a whole image, or its first RecognizedBytes.
 [[nodiscard]] bool isElfData(std::span<const uint8_t> data);
 
-// Tests a file. One that can't be opened or read, or of 0xFFFFFFFF bytes or more, is no ELF file.
+/// Tests a file. One that can't be opened or read, or of 0xFFFFFFFF bytes or more, is no ELF file.
 [[nodiscard]] bool isElfFile(support::Host& host, const char* fileName);
 [[nodiscard]] bool isElfFile(support::Host& host, support::FileHandle file);
 
-// Tests `size` bytes at `offset` of a file.
+/// Tests `size` bytes at `offset` of a file.
 [[nodiscard]] bool isElfFile(support::Host& host, const char* fileName, uint64_t offset,
                              uint64_t size);
 [[nodiscard]] bool isElfFile(support::Host& host, support::FileHandle file, uint64_t offset,

@@ -10,21 +10,21 @@
 
 namespace elfext {
 
-// Bits of the access words: load or store of so many bytes, with so many of alignment guaranteed.
+/// Bits of the access words: load or store of so many bytes, with so many of alignment guaranteed.
 enum AccessBit : uint16_t {
   Access_44 = 0x10,
   Access_11 = 0x200,
   Access_U41 = 0x4000,
 };
 
-// Access words that targets have.
+/// Access words that targets have.
 enum AccessWord : uint16_t {
-  AccessWord_Bytes = 0x210,      // no target is known
-  AccessWord_Halves = 0x290,     // every target has these
-  AccessWord_Unaligned = 0xC290, // targets that load and store from any address
+  AccessWord_Bytes = 0x210,      ///< no target is known
+  AccessWord_Halves = 0x290,     ///< every target has these
+  AccessWord_Unaligned = 0xC290, ///< targets that load and store from any address
 };
 
-// Which memory accesses are used, in words of the bits above, the same for loads and stores.
+/// Which memory accesses are used, in words of the bits above, the same for loads and stores.
 struct AccessWords {
   uint16_t code = 0;
   uint16_t readOnlyData = 0;
@@ -42,7 +42,7 @@ struct AccessWords {
             static_cast<uint16_t>(a.readOnlyData & b.readOnlyData),
             static_cast<uint16_t>(a.data & b.data), static_cast<uint16_t>(a.stores & b.stores)};
   }
-  // What this has and the other hasn't.
+  /// What this has and the other hasn't.
   [[nodiscard]] constexpr AccessWords without(const AccessWords& other) const {
     const auto complement = [](uint16_t word) { return static_cast<uint16_t>(~word); };
     return *this & AccessWords{complement(other.code), complement(other.readOnlyData),
@@ -51,7 +51,7 @@ struct AccessWords {
   friend constexpr bool operator==(const AccessWords&, const AccessWords&) = default;
 };
 
-// Bits of m_Flags. Those of one subject that stand for levels contain the levels below.
+/// Bits of m_Flags. Those of one subject that stand for levels contain the levels below.
 enum Flag : uint64_t {
   Flag_Interwork = 0x1,
   Flag_NoInterwork = 0x2,
@@ -82,13 +82,13 @@ enum Flag : uint64_t {
   Flag_ThreadedCxx = 0x100000000,
 };
 
-// Bits of m_Stack8: 8-byte alignment of the stack.
+/// Bits of m_Stack8: 8-byte alignment of the stack.
 enum Stack8 : uint64_t { Stack8_Requires = 1, Stack8_Preserves = 2 };
 
-// Of m_AbiLevel.
+/// Of m_AbiLevel.
 enum AbiLevel : uint64_t { AbiLevel_2 = 2 };
 
-// Classes of the targets that a record stems from.
+/// Classes of the targets that a record stems from.
 struct TargetClass {
   uint32_t low = 0;
   uint32_t high = 0;
@@ -107,14 +107,14 @@ struct FullAttr {
   friend constexpr bool operator==(const FullAttr&, const FullAttr&) = default;
 };
 
-// What holds of an object that says nothing of itself.
+/// What holds of an object that says nothing of itself.
 constexpr FullAttr DefaultFullAttr = {.m_Access = AccessWords::all(AccessWord_Halves),
                                       .m_Flags = Flag_Align8 | Flag_OptimizeSpace | Flag_NotShared |
                                                  Flag_UsesV7 | Flag_NotStackChecked | Flag_UsesV6 |
                                                  Flag_Interwork,
                                       .m_AbiLevel = AbiLevel_2};
 
-// What a library's attributes start from.
+/// What a library's attributes start from.
 constexpr FullAttr LibraryFullAttr = {
     .m_Access = {Access_44, AccessWord_Bytes, AccessWord_Bytes, AccessWord_Bytes}};
 

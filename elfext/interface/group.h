@@ -15,27 +15,27 @@ class Section;
 
 class Group {
 public:
-  // Made by ObjectModule::createGroup.
+  /// Made by ObjectModule::createGroup.
   Group(ObjectModule* objectModule, const char* signature, const char* name, uint32_t flags)
       : m_ObjectModule(objectModule), m_Signature(signature), m_Name(name), m_Flags(flags) {}
 
-  // Never null.
+  /// Never null.
   [[nodiscard]] const char* getSignature() const { return m_Signature; }
-  // The name of the group's section, which may be null.
+  /// The name of the group's section, which may be null.
   [[nodiscard]] const char* getName() const { return m_Name; }
-  // The first word of the group's section.
+  /// The first word of the group's section.
   [[nodiscard]] uint32_t getFlags() const { return m_Flags; }
-  // Whether linkers keep one group of each signature only.
+  /// Whether linkers keep one group of each signature only.
   [[nodiscard]] bool isComdat() const;
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] ObjectModule* getObjectModule() const { return m_ObjectModule; }
 
-  // The section that the group was read from; null for a new group.
+  /// The section that the group was read from; null for a new group.
   [[nodiscard]] GroupSection* getGroupSection() const { return m_GroupSection; }
 
   [[nodiscard]] uint32_t getMemberCount() const { return m_Members.getSize(); }
   [[nodiscard]] Section* getMember(uint32_t index) const { return m_Members[index]; }
-  // A section of this module that is in no group yet.
+  /// A section of this module that is in no group yet.
   void addMember(Section* section);
   void removeMember(Section* section);
 

@@ -17,7 +17,7 @@
 
 namespace elfext {
 
-// `Node` has the members `key` and `next`; it owns nothing, as nodes are never destroyed.
+/// `Node` has the members `key` and `next`; it owns nothing, as nodes are never destroyed.
 template <class Node, class Storage>
 class HashBase : protected Storage {
   static_assert(std::is_trivially_destructible_v<Node>, "nodes are never destroyed");
@@ -32,7 +32,7 @@ public:
   [[nodiscard]] uint32_t getSize() const { return m_Entries; }
   [[nodiscard]] uint32_t getBucketCount() const { return m_HashTableSize; }
 
-  // Removes the key; false if it was not there.
+  /// Removes the key; false if it was not there.
   bool remove(const Key& key) {
     for (Node** link = &getBucket(key); *link != nullptr; link = &(*link)->next) {
       if (!((*link)->key == key)) continue;
@@ -63,7 +63,7 @@ protected:
     return node;
   }
 
-  // Takes the key, which is not there yet, and what else the node has.
+  /// Takes the key, which is not there yet, and what else the node has.
   template <class... Values>
   Node* addNode(const Key& key, const Values&... values) {
     Node*& head = getBucket(key);
@@ -72,7 +72,7 @@ protected:
     return head;
   }
 
-  // Comes before each insertion, even of a key that is there.
+  /// Comes before each insertion, even of a key that is there.
   void growIfLoaded() {
     if (m_Entries * 4 <= m_HashTableSize * 3) return;
     const uint32_t newHashTableSize = (m_HashTableSize * 3) / 2 + 1;
@@ -80,7 +80,7 @@ protected:
     rehash(newHashTableSize);
   }
 
-  // The visitor may release the node.
+  /// The visitor may release the node.
   template <class Visitor>
   void forEachNode(Visitor visit) const {
     for (uint32_t bucket = 0; bucket < m_HashTableSize; ++bucket) {
@@ -110,7 +110,7 @@ private:
     this->release(m_Buckets, size_t{m_HashTableSize} * sizeof(Node*));
   }
 
-  // Moves the nodes, from bucket 0 and each chain's head on, to the heads of their new chains.
+  /// Moves the nodes, from bucket 0 and each chain's head on, to the heads of their new chains.
   void rehash(uint32_t newHashTableSize) {
     Node** oldBuckets = m_Buckets;
     const uint32_t oldHashTableSize = m_HashTableSize;
@@ -133,7 +133,7 @@ private:
   uint32_t m_Entries = 0;
 };
 
-// The two kinds of nodes, and what a table exports.
+/// The two kinds of nodes, and what a table exports.
 template <class K, class V>
 struct HashTableNode {
   K key;
@@ -153,11 +153,11 @@ struct HashEntry {
   V value;
 };
 
-// What both families' tables can do.
+/// What both families' tables can do.
 template <class K, class V, class Storage>
 class HashTableBase : public HashBase<HashTableNode<K, V>, Storage> {
 public:
-  // Replaces the value of a key that is there.
+  /// Replaces the value of a key that is there.
   void put(const K& key, const V& value) {
     this->growIfLoaded();
     if (HashTableNode<K, V>* node = this->findNode(key))
@@ -166,14 +166,14 @@ public:
       this->addNode(key, value);
   }
 
-  // The key must be there.
+  /// The key must be there.
   [[nodiscard]] V get(const K& key) const {
     if (const V* value = find(key)) return *value;
     QUARN_ASSERT(1, false);
     return V{};
   }
 
-  // The key's value, in place; null if the key is not there. Valid until the key is removed.
+  /// The key's value, in place; null if the key is not there. Valid until the key is removed.
   [[nodiscard]] V* find(const K& key) const {
     HashTableNode<K, V>* node = this->findNode(key);
     return node == nullptr ? nullptr : &node->value;
@@ -181,7 +181,7 @@ public:
 
   [[nodiscard]] bool containsKey(const K& key) const { return this->findNode(key) != nullptr; }
 
-  // Replaces the array's elements by all HashEntry<K, V>. Sort them before their order can show.
+  /// Replaces the array's elements by all HashEntry<K, V>. Sort them before their order can show.
   template <class EntryArray>
   void exportEntries(EntryArray& entries) const {
     entries.setSize(this->getSize());
@@ -195,11 +195,11 @@ protected:
   using HashBase<HashTableNode<K, V>, Storage>::HashBase;
 };
 
-// What both families' sets can do.
+/// What both families' sets can do.
 template <class K, class Storage>
 class HashSetBase : public HashBase<HashSetNode<K>, Storage> {
 public:
-  // False if the key was there already.
+  /// False if the key was there already.
   bool add(const K& key) {
     this->growIfLoaded();
     if (contains(key)) return false;
@@ -209,7 +209,7 @@ public:
 
   [[nodiscard]] bool contains(const K& key) const { return this->findNode(key) != nullptr; }
 
-  // Replaces the array's elements by all keys. Sort them before their order can show.
+  /// Replaces the array's elements by all keys. Sort them before their order can show.
   template <class KeyArray>
   void exportKeys(KeyArray& keys) const {
     keys.setSize(this->getSize());

@@ -15,7 +15,7 @@ namespace elfext {
 template <class Key>
 using HashFunction = uint32_t (*)(const Key* key);
 
-// The hash of a text: times 31 plus the byte, for each byte, from 0. The empty text has 0.
+/// The hash of a text: times 31 plus the byte, for each byte, from 0. The empty text has 0.
 [[nodiscard]] constexpr uint32_t hashText(std::string_view text) {
   uint32_t hash = 0;
   for (char character : text)
@@ -36,7 +36,7 @@ using HashFunction = uint32_t (*)(const Key* key);
   return static_cast<uint32_t>(value >> 32) ^ static_cast<uint32_t>(value);
 }
 
-// The usual hash for a type of key; a type of a client's own has getHash().
+/// The usual hash for a type of key; a type of a client's own has getHash().
 template <class Key>
 [[nodiscard]] uint32_t hashKey(const Key* key) {
   if constexpr (std::is_pointer_v<Key>)

@@ -14,11 +14,11 @@ class ImageSource {
 public:
   virtual ~ImageSource() = default;
 
-  // `size` bytes at `offset` of the object, valid as long as the source; null if they can't be
-  // had. An object module owns the source that its buffers refer to.
+  /// `size` bytes at `offset` of the object, valid as long as the source; null if they can't be
+  /// had. An object module owns the source that its buffers refer to.
   [[nodiscard]] virtual const uint8_t* view(uint64_t offset, uint64_t size) = 0;
 
-  // Why they could not be had the last time: the host's error number; 0 where it has none.
+  /// Why they could not be had the last time: the host's error number; 0 where it has none.
   [[nodiscard]] virtual support::HostError getHostError() const = 0;
 };
 

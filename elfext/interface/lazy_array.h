@@ -33,7 +33,7 @@ public:
     return m_Array != nullptr && m_Array->contains(value);
   }
 
-  // The array, made in the region now if it wasn't yet.
+  /// The array, made in the region now if it wasn't yet.
   FastArray<T>& get(alloclib::RegionGeneral& region) {
     if (m_Array != nullptr) return *m_Array;
     m_Array = alloclib::create<FastArray<T>>(region, &region);
@@ -43,7 +43,7 @@ public:
 
   void append(alloclib::RegionGeneral& region, const T& element) { get(region).append(element); }
 
-  // Those below do nothing to an array that was never filled. The order of the others stays.
+  /// Those below do nothing to an array that was never filled. The order of the others stays.
   void remove(uint32_t index) {
     QUARN_ASSERT(1, m_Array != nullptr);
     m_Array->remove(index);

@@ -20,25 +20,25 @@ struct LibraryAttributeMap {
   struct Row {
     std::string pattern;
     FullAttr attributes;
-    std::string className; // may be empty
+    std::string className; ///< may be empty
   };
   std::vector<Row> rows;
 };
 
-// A line longer than this, in bytes, counts as several.
+/// A line longer than this, in bytes, counts as several.
 constexpr size_t LibraryAttributeLineLimit = 4096;
 
-// The rows of the file. `usedDefault` tells that these are the built-in ones: the path is null, or
-// stands for no regular file, or the file can't be read.
+/// The rows of the file. `usedDefault` tells that these are the built-in ones: the path is null, or
+/// stands for no regular file, or the file can't be read.
 [[nodiscard]] LibraryAttributeMap readLibraryAttributeMap(support::Host& host, const char* path,
                                                           bool& usedDefault);
 
-// What the rows that match the name say together, also if that can't be on one target. Of a name
-// with backslashes only the end counts, from the last one on. The target class stays as it was.
+/// What the rows that match the name say together, also if that can't be on one target. Of a name
+/// with backslashes only the end counts, from the last one on. The target class stays as it was.
 void getLibraryAttributes(FullAttr& result, std::string_view name, const LibraryAttributeMap& map);
 
-// The class of the first matching row that has one, else the name itself: a view of one or the
-// other.
+/// The class of the first matching row that has one, else the name itself: a view of one or the
+/// other.
 [[nodiscard]] std::string_view getLibraryClass(std::string_view name,
                                                const LibraryAttributeMap& map);
 

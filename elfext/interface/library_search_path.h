@@ -11,13 +11,13 @@ class ObjectModule;
 
 class LibrarySearchPath {
 public:
-  // Made by ObjectModule::createLibrarySearchPath.
+  /// Made by ObjectModule::createLibrarySearchPath.
   LibrarySearchPath(ObjectModule* objectModule, const char* path, uint32_t tag)
       : m_ObjectModule(objectModule), m_Path(path), m_Tag(tag) {}
 
-  // Never null.
+  /// Never null.
   [[nodiscard]] const char* getPath() const { return m_Path; }
-  // DT_RPATH or DT_RUNPATH.
+  /// DT_RPATH or DT_RUNPATH.
   [[nodiscard]] uint32_t getTag() const { return m_Tag; }
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] ObjectModule* getObjectModule() const { return m_ObjectModule; }

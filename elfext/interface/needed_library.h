@@ -11,11 +11,11 @@ class ObjectModule;
 
 class NeededLibrary {
 public:
-  // Made by ObjectModule::createNeededLibrary.
+  /// Made by ObjectModule::createNeededLibrary.
   NeededLibrary(ObjectModule* objectModule, const char* name)
       : m_ObjectModule(objectModule), m_Name(name) {}
 
-  // Never null.
+  /// Never null.
   [[nodiscard]] const char* getName() const { return m_Name; }
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] ObjectModule* getObjectModule() const { return m_ObjectModule; }

@@ -63,29 +63,29 @@ class VerneedSection;
 class VersymSection;
 struct FileVersionDefinition;
 
-// What the reader has seen; a set of bits.
+/// What the reader has seen; a set of bits.
 enum ReadCondition : uint32_t {
-  // The first PT_LOAD segment overlaps the header or the table.
+  /// The first PT_LOAD segment overlaps the header or the table.
   ReadCondition_LoadOverlapsElfHeader = 0x1,
   ReadCondition_LoadOverlapsSectionHeaderTable = 0x2,
   ReadCondition_LoadOverlapsProgramHeaderTable = 0x4,
   ReadCondition_HasBuildAttributesSymbol = 0x8,
   ReadCondition_HasBuildAttributesSection = 0x10,
-  // Texts are copies, and do not point into the read buffer.
+  /// Texts are copies, and do not point into the read buffer.
   ReadCondition_HasCopiedStrings = 0x20,
-  // The dynamic section has tag 0x70000001.
+  /// The dynamic section has tag 0x70000001.
   ReadCondition_HasSymbolTableSizeTag = 0x40,
   ReadCondition_ChecksRepeatedRelocations = 0x80,
   ReadCondition_HasEmptySectionHeaderTable = 0x100,
   ReadCondition_WasRead = 0x200,
-  // p_vaddr and p_offset of some segment differ by no multiple of its alignment.
+  /// p_vaddr and p_offset of some segment differ by no multiple of its alignment.
   ReadCondition_HasIncongruentSegment = 0x20000000,
-  // Some auxiliary section has a symbol, or a relocation, in it.
+  /// Some auxiliary section has a symbol, or a relocation, in it.
   ReadCondition_HasSymbolInAuxiliarySection = 0x40000000,
   ReadCondition_HasRelocationInAuxiliarySection = 0x80000000,
 };
 
-// Values of the dynamic section that the model keeps as they are.
+/// Values of the dynamic section that the model keeps as they are.
 enum DynamicValue : uint32_t {
   DynamicValue_Init,
   DynamicValue_InitArray,
@@ -98,7 +98,7 @@ enum DynamicValue : uint32_t {
   DynamicValue_Count,
 };
 
-// A record of a debug overlay section.
+/// A record of a debug overlay section.
 struct DebugOverlayRecord {
   uint64_t word;
   Section* debugSection;
@@ -107,42 +107,42 @@ struct DebugOverlayRecord {
 
 class ObjectModule final : public ObjectModuleBase, public ObjectWithBuildAttributes {
 public:
-  // An empty module.
+  /// An empty module.
   ObjectModule();
   ~ObjectModule();
 
   // ---- Set-up
 
-  // Not owned; may be null, which is as good as a handler that always refuses to go on.
+  /// Not owned; may be null, which is as good as a handler that always refuses to go on.
   [[nodiscard]] ErrorHandler* getErrorHandler() const { return m_ErrorHandler; }
   void setErrorHandler(ErrorHandler* errorHandler) { m_ErrorHandler = errorHandler; }
 
-  // Null for none. A new name is not possible while contents are deferred, which are in the file
-  // of the old one.
+  /// Null for none. A new name is not possible while contents are deferred, which are in the file
+  /// of the old one.
   [[nodiscard]] const char* getFileName() const { return m_FileName; }
   void setFileName(const char* name);
-  // What messages call the module: a path, or an archive's name and in parentheses the member's.
-  // Null for none.
+  /// What messages call the module: a path, or an archive's name and in parentheses the member's.
+  /// Null for none.
   [[nodiscard]] const char* getObjectName() const { return m_ObjectName; }
   void setObjectName(const char* name);
   void setObjectName(const char* archiveName, const char* memberName);
 
-  // The file's bytes as long as the module needs them, where they are all in memory; null if not.
+  /// The file's bytes as long as the module needs them, where they are all in memory; null if not.
   [[nodiscard]] const uint8_t* getReadBuffer() const { return m_ReadBuffer; }
-  // Whether the file could not give bytes which somebody wanted to look at after the read. The
-  // handler has been told; what was made of the contents since is not to be trusted.
+  /// Whether the file could not give bytes which somebody wanted to look at after the read. The
+  /// handler has been told; what was made of the contents since is not to be trusted.
   [[nodiscard]] bool hasLostContents() const { return m_HasLostContents; }
 
   // ---- Header fields, under the ELF standard's names
 
-  // Sets the sizes of the headers and the alignment of their tables too.
+  /// Sets the sizes of the headers and the alignment of their tables too.
   void setElfClass(uint32_t elfClass);
   [[nodiscard]] uint32_t getElfClass() const { return m_ElfClass; }
   [[nodiscard]] bool isClass64() const { return m_ElfClass == 2; }
-  // e_ident[EI_DATA]. All but 1 reads as big-endian.
+  /// e_ident[EI_DATA]. All but 1 reads as big-endian.
   void setDataEncoding(uint32_t encoding);
   [[nodiscard]] uint32_t getDataEncoding() const { return m_DataEncoding; }
-  // 1 is little-endian. Not possible while contents are deferred.
+  /// 1 is little-endian. Not possible while contents are deferred.
   void setLittleEndian(uint32_t flag);
   [[nodiscard]] uint32_t getLittleEndian() const { return m_LittleEndian; }
   [[nodiscard]] bool isLittleEndian() const { return m_LittleEndian == 1; }
@@ -163,10 +163,10 @@ public:
   void setAbiVersion(uint32_t version) { change(m_AbiVersion, version); }
   void setIdentVersion(uint32_t version) { change(m_IdentVersion, version); }
   void setElfVersion(uint32_t version) { change(m_ElfVersion, version); }
-  // Whether addresses are laid out: ET_EXEC, ET_DYN and ET_CORE.
+  /// Whether addresses are laid out: ET_EXEC, ET_DYN and ET_CORE.
   [[nodiscard]] bool hasLaidOutAddresses() const;
 
-  // What the file's header says of the headers; sizes in bytes.
+  /// What the file's header says of the headers; sizes in bytes.
   [[nodiscard]] uint32_t getElfHeaderSize() const { return m_ElfHeaderSize; }
   [[nodiscard]] uint64_t getSectionHeaderOffset() const { return m_SectionHeaderOffset; }
   [[nodiscard]] uint64_t getProgramHeaderOffset() const { return m_ProgramHeaderOffset; }
@@ -175,39 +175,39 @@ public:
   [[nodiscard]] uint32_t getSectionHeaderEntrySize() const { return m_SectionHeaderEntrySize; }
   [[nodiscard]] uint32_t getProgramHeaderEntrySize() const { return m_ProgramHeaderEntrySize; }
 
-  // The three fixed regions of the file.
+  /// The three fixed regions of the file.
   [[nodiscard]] ELFHeader& getElfHeader() { return m_ElfHeader; }
   [[nodiscard]] SectionHeaderTable& getSectionHeaderTable() { return m_SectionHeaderTable; }
   [[nodiscard]] ProgramHeaderTable& getProgramHeaderTable() { return m_ProgramHeaderTable; }
 
-  // ReadCondition bits.
+  /// ReadCondition bits.
   [[nodiscard]] uint32_t getReadConditions() const { return m_ReadConditions; }
 
   // ---- Dynamic data
 
-  // DT_SONAME; null for none.
+  /// DT_SONAME; null for none.
   [[nodiscard]] const char* getSoname() const { return m_Soname; }
   void setSoname(const char* soname);
   [[nodiscard]] bool hasDynamicValue(DynamicValue value) const {
     return m_DynamicValues[value].exists;
   }
-  // 0 for one that does not exist.
+  /// 0 for one that does not exist.
   [[nodiscard]] uint64_t getDynamicValue(DynamicValue value) const {
     return m_DynamicValues[value].value;
   }
   void setDynamicValue(DynamicValue which, uint64_t value);
-  // DF_... bits.
+  /// DF_... bits.
   [[nodiscard]] bool hasDynamicFlags() const { return m_DynamicFlagsExists; }
   [[nodiscard]] uint32_t getDynamicFlags() const { return m_DynamicFlags; }
-  // ORs the flags in, and makes them exist.
+  /// ORs the flags in, and makes them exist.
   void addDynamicFlags(uint32_t flags);
 
-  // The file's own version; null for none.
+  /// The file's own version; null for none.
   [[nodiscard]] const FileVersionDefinition* getFileVersionDefinition() const {
     return m_FileVersionDefinition;
   }
   void setFileVersionDefinition(const FileVersionDefinition* version);
-  // A version that the file defines, for its symbols or for the call above.
+  /// A version that the file defines, for its symbols or for the call above.
   FileVersionDefinition* createFileVersionDefinition(const char* name, uint32_t index,
                                                      uint32_t flags);
 
@@ -218,32 +218,32 @@ public:
 
   // ---- State
 
-  // Nothing may add, remove or reorder what has an index while indexes are frozen.
+  /// Nothing may add, remove or reorder what has an index while indexes are frozen.
   [[nodiscard]] bool indexesAreFrozen() const { return m_IndexesFrozen; }
   void setIndexesFrozen(bool areFrozen) { m_IndexesFrozen = areFrozen; }
-  // Whether the bytes of auxiliary sections say what the objects do. Any change clears it.
+  /// Whether the bytes of auxiliary sections say what the objects do. Any change clears it.
   [[nodiscard]] bool areAuxiliarySectionsUpToDate() const { return m_AreAuxiliarySectionsUpToDate; }
   [[nodiscard]] bool areSortedViewsUpToDate() const { return m_AreSortedViewsUpToDate; }
-  // Whether the attribute section's bytes say what the blocks and attributes of all objects do. Any
-  // change of these clears it.
+  /// Whether the attribute section's bytes say what the blocks and attributes of all objects do.
+  /// Any change of these clears it.
   [[nodiscard]] bool isBuildAttributesSectionUpToDate() const {
     return m_IsBuildAttributesSectionUpToDate;
   }
 
-  // No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
+  /// No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
   [[nodiscard]] bool isEmpty() const;
   [[nodiscard]] bool hasDeferredContents() const;
-  // Loads all that are deferred, in index order; false at the first failure.
+  /// Loads all that are deferred, in index order; false at the first failure.
   [[nodiscard]] bool loadDeferredContents();
 
-  // The checks that go beyond reading; problems go to the error handler. False at the first
-  // answer not to go on.
+  /// The checks that go beyond reading; problems go to the error handler. False at the first
+  /// answer not to go on.
   [[nodiscard]] bool validate();
 
   // ---- Build attributes
 
   [[nodiscard]] BuildAttributesCache& getBuildAttributesCache();
-  // The highest Tag_ZV_version of all objects' attributes; 0 for none.
+  /// The highest Tag_ZV_version of all objects' attributes; 0 for none.
   [[nodiscard]] uint32_t getHighestTagsVersion() const { return m_HighestTagsVersion; }
 
   // ---- Sections
@@ -253,16 +253,16 @@ public:
   [[nodiscard]] uint32_t getSectionIndex(const Section* section) const;
   void setSectionIndex(Section* section, uint32_t index);
   [[nodiscard]] std::span<Section* const> getSections() const { return m_Sections.getSpan(); }
-  // Room for so many more in all lists of that kind.
+  /// Room for so many more in all lists of that kind.
   void reserveSections(uint32_t count);
 
-  // For a type without a class of its own.
+  /// For a type without a class of its own.
   Section* createSection(const char* name, uint32_t type, uint32_t flags);
   NullSection* createNullSection(const char* name, uint32_t flags);
   StringTableSection* createStringTableSection(const char* name, uint32_t flags);
-  // SHT_SYMTAB or SHT_DYNSYM.
+  /// SHT_SYMTAB or SHT_DYNSYM.
   SymbolTableSection* createSymbolTableSection(const char* name, uint32_t type, uint32_t flags);
-  // SHT_REL or SHT_RELA.
+  /// SHT_REL or SHT_RELA.
   RelocationSection* createRelocationSection(const char* name, uint32_t type, uint32_t flags);
   GroupSection* createGroupSection(const char* name, uint32_t flags);
   ShndxSection* createShndxSection(const char* name, uint32_t flags);
@@ -274,14 +274,14 @@ public:
   DynamicSection* createDynamicSection(const char* name, uint32_t flags);
   BuildAttributesSection* createBuildAttributesSection(const char* name, uint32_t flags);
   DebugOverlaySection* createDebugOverlaySection(const char* name, uint32_t flags);
-  // Of the class that the type has.
+  /// Of the class that the type has.
   Section* createSectionOfType(const char* name, uint32_t type, uint32_t flags);
-  // A SHT_PROGBITS section named ".comment" of `first` and its terminator, `second` without one,
-  // the byte, and `third` with its terminator.
+  /// A SHT_PROGBITS section named ".comment" of `first` and its terminator, `second` without one,
+  /// the byte, and `third` with its terminator.
   Section* createCommentSection(const char* first, const char* second, uint8_t byte,
                                 const char* third);
 
-  // The auxiliary sections of one type each, in the order in which they were made.
+  /// The auxiliary sections of one type each, in the order in which they were made.
   [[nodiscard]] std::span<StringTableSection* const> getStringTableSections() const {
     return m_StringTableSections.getSpan();
   }
@@ -331,7 +331,7 @@ public:
                              uint32_t visibility, Section* section);
   Symbol* createAbsoluteSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
                                uint32_t visibility);
-  // The value is the alignment.
+  /// The value is the alignment.
   Symbol* createCommonSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
                              uint32_t visibility);
   Symbol* createUndefinedSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
@@ -344,7 +344,7 @@ public:
                                     uint32_t binding, uint32_t visibility);
   Symbol* createUndefinedDynamicSymbol(const char* name, uint64_t value, uint32_t type,
                                        uint32_t binding, uint32_t visibility);
-  // Room for so many more.
+  /// Room for so many more.
   void reserveSymbols(uint32_t count);
   void reserveDynamicSymbols(uint32_t count);
 
@@ -352,7 +352,7 @@ public:
   [[nodiscard]] Symbol* getSymbol(uint32_t index) const;
   [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
   void setSymbolIndex(Symbol* symbol, uint32_t index);
-  // Without the null symbol.
+  /// Without the null symbol.
   [[nodiscard]] std::span<Symbol* const> getSymbols() const { return m_Symbols.getSpan(); }
 
   [[nodiscard]] uint32_t getDynamicSymbolCount() const;
@@ -409,9 +409,9 @@ public:
   [[nodiscard]] Group* getGroup(uint32_t index) const { return m_Groups[index]; }
   [[nodiscard]] uint32_t getGroupIndex(const Group* group) const;
   void setGroupIndex(Group* group, uint32_t index);
-  // The name, which may be null, is that of the group's section.
+  /// The name, which may be null, is that of the group's section.
   Group* createGroup(const char* signature, const char* name, uint32_t flags);
-  // The first comdat group of that signature; null if there is none.
+  /// The first comdat group of that signature; null if there is none.
   [[nodiscard]] Group* findComdatGroup(const char* signature);
 
   [[nodiscard]] uint32_t getSegmentCount() const { return m_Segments.getSize(); }
@@ -419,8 +419,8 @@ public:
   [[nodiscard]] uint32_t getSegmentIndex(const Segment* segment) const;
   void setSegmentIndex(Segment* segment, uint32_t index);
   [[nodiscard]] std::span<Segment* const> getSegments() const { return m_Segments.getSpan(); }
-  // For each section, by its index: the first of these segments that wholly contains it at a known
-  // distance, or null. For all sections at once, where Section::isInSegment is for one.
+  /// For each section, by its index: the first of these segments that wholly contains it at a known
+  /// distance, or null. For all sections at once, where Section::isInSegment is for one.
   [[nodiscard]] std::vector<Segment*> findHolders(std::span<Segment* const> segments) const;
   Segment* createSegment(uint32_t type, uint64_t offset, uint64_t vaddr, uint64_t paddr,
                          uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align);
@@ -452,7 +452,7 @@ public:
   [[nodiscard]] std::span<RawDataBlock* const> getRawDataBlocks() const {
     return m_RawDataBlocks.getSpan();
   }
-  // `size` bytes of the segment; the caller gives them.
+  /// `size` bytes of the segment; the caller gives them.
   RawDataBlock* createRawDataBlock(Segment* segment, uint64_t size);
 
   // ---- Deletion
@@ -468,9 +468,9 @@ public:
   void deleteNeededLibrary(NeededLibrary* neededLibrary);
   void deleteLibrarySearchPath(LibrarySearchPath* librarySearchPath);
   void deletePreemption(Preemption* preemption);
-  // All that the criterion says, in one pass over the module.
+  /// All that the criterion says, in one pass over the module.
   void prune(const PruneCriterion& criterion);
-  // Leaves an empty module, which keeps its names, its handler and what its header says.
+  /// Leaves an empty module, which keeps its names, its handler and what its header says.
   void clear();
 
   // ---- Look-ups
@@ -482,9 +482,9 @@ public:
   bool getSectionsByName(const char* name, SectionList* sections) const;
   bool getSymbolsByName(const char* name, SymbolList* symbols);
   bool getDynamicSymbolsByName(const char* name, SymbolList* symbols);
-  // Static symbols of the classes in the mask, a set of Symbol::Class: at addresses from the first
-  // to the last, both included; at one address; at the highest address not above the given one at
-  // which there is one; at the lowest address not below it at which there is one.
+  /// Static symbols of the classes in the mask, a set of Symbol::Class: at addresses from the first
+  /// to the last, both included; at one address; at the highest address not above the given one at
+  /// which there is one; at the lowest address not below it at which there is one.
   bool getSymbolsInRange(uint64_t fromAddress, uint64_t toAddress, uint32_t mask,
                          SymbolList* symbols);
   bool getSymbolsAtAddress(uint64_t address, uint32_t mask, SymbolList* symbols);
@@ -529,14 +529,14 @@ private:
     markChanged();
   }
 
-  // The text, or a copy of it in the object region, as the builder has said of names. Null stays
-  // null.
+  /// The text, or a copy of it in the object region, as the builder has said of names. Null stays
+  /// null.
   [[nodiscard]] const char* keepText(const char* text) const;
-  // A copy of the text in the object region. Null stays null.
+  /// A copy of the text in the object region. Null stays null.
   [[nodiscard]] const char* copyText(const char* text) const;
   void reportLostContents(support::HostError error);
 
-  // The sizes also become those of the regions.
+  /// The sizes also become those of the regions.
   void setElfHeaderSize(uint32_t size);
   void setSectionHeaderEntrySize(uint32_t size);
   void setProgramHeaderEntrySize(uint32_t size);
@@ -553,7 +553,7 @@ private:
 
   template <class Object>
   void move(FastArray<Object*>& list, Object* object, uint32_t index, uint32_t firstIndex);
-  // Hosted symbols are in lists of their sections.
+  /// Hosted symbols are in lists of their sections.
   [[nodiscard]] FastArray<Symbol*>& getCategoryList(Symbol::Category category, bool isDynamic);
   void materializeAllRelocations();
   [[nodiscard]] uint32_t findInCategory(const FastArray<Symbol*>& list, const Symbol* symbol) const;
@@ -610,7 +610,7 @@ private:
   bool m_AreSortedViewsUpToDate = true;
   bool m_IsBuildAttributesSectionUpToDate = false;
   uint32_t m_HighestTagsVersion = 0;
-  // Made when it is first asked for.
+  /// Made when it is first asked for.
   std::unique_ptr<BuildAttributesCache> m_BuildAttributesCache;
 
   ELFHeader m_ElfHeader;
@@ -655,7 +655,7 @@ private:
   FastArray<Symbol*> m_SymbolsSortedByName;
   FastArray<Symbol*> m_DynamicSymbolsSortedByName;
   FastHashTable<Stringlett, Group*> m_MapSignaturesToComdatGroups;
-  // Groups that came after the last look into the map.
+  /// Groups that came after the last look into the map.
   FastArray<Group*> m_UnnotedGroups;
 };
 

@@ -12,9 +12,9 @@ public:
   ObjectModuleBase(const ObjectModuleBase&) = delete;
   ObjectModuleBase& operator=(const ObjectModuleBase&) = delete;
 
-  // For objects and texts.
+  /// For objects and texts.
   [[nodiscard]] alloclib::RegionGeneral& getObjectRegion() const { return *m_ObjectRegion; }
-  // For what arrays and tables store.
+  /// For what arrays and tables store.
   [[nodiscard]] alloclib::RegionGeneral& getContainerRegion() const { return *m_ContainerRegion; }
 
 protected:

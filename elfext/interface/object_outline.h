@@ -22,20 +22,20 @@ namespace elfext {
 class ErrorHandler;
 struct ImageMemory;
 
-// One outline serves any number of objects, one after the other; that is quicker than a new one for
-// each.
+/// One outline serves any number of objects, one after the other; that is quicker than a new one
+/// for each.
 class ObjectOutline {
 public:
   struct OutlinedSection {
-    const char* name; // null for none
+    const char* name; ///< null for none
     uint32_t type;
     uint64_t flags;
   };
   struct OutlinedSymbol {
-    const char* name; // null for none
+    const char* name; ///< null for none
     Symbol::Category category;
     uint32_t binding;
-    const char* sectionName; // of a hosted symbol; null for none
+    const char* sectionName; ///< of a hosted symbol; null for none
   };
 
   ObjectOutline();
@@ -43,30 +43,30 @@ public:
   ObjectOutline(const ObjectOutline&) = delete;
   ObjectOutline& operator=(const ObjectOutline&) = delete;
 
-  // Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
-  // to the handler, which may be null; the outline is then empty, as it is when the handler lets a
-  // foreign machine pass. The handler must live as long as somebody asks for sizes. The object's
-  // name, which may be null too, goes with reports and is copied. Attributes must be wanted
-  // beforehand.
+  /// Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
+  /// to the handler, which may be null; the outline is then empty, as it is when the handler lets a
+  /// foreign machine pass. The handler must live as long as somebody asks for sizes. The object's
+  /// name, which may be null too, goes with reports and is copied. Attributes must be wanted
+  /// beforehand.
   [[nodiscard]] bool read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
                           ErrorHandler* errorHandler, const char* objectName,
                           bool wantsAttributes = false);
 
-  // Texts live until the next read.
+  /// Texts live until the next read.
   [[nodiscard]] std::vector<OutlinedSection> getSections() const;
-  // The static ones, in their order, without the null symbol; good until the next read.
+  /// The static ones, in their order, without the null symbol; good until the next read.
   [[nodiscard]] std::span<const OutlinedSymbol> getSymbols();
   [[nodiscard]] uint64_t getEntry() const;
-  // The attributes of the object as a whole; null if it has none, or if they were not wanted.
+  /// The attributes of the object as a whole; null if it has none, or if they were not wanted.
   [[nodiscard]] const FullAttr* getOwnAttributes() const;
-  // Nothing, after a report, if bytes that have to be looked at can't be had.
+  /// Nothing, after a report, if bytes that have to be looked at can't be had.
   [[nodiscard]] std::optional<SizesStatistics> computeSizes();
 
 private:
   struct Content;
 
-  // What serves one object after the other: objects of an archive are neighbours, and much alike.
-  std::shared_ptr<support::SourceFile> m_File; // that was read last
+  /// What serves one object after the other: objects of an archive are neighbours, and much alike.
+  std::shared_ptr<support::SourceFile> m_File; ///< that was read last
   std::unique_ptr<ImageMemory> m_Memory;
   std::vector<OutlinedSymbol> m_Symbols;
 

@@ -27,7 +27,7 @@ public:
   T* operator->() { return m_Value.get(); }
   const T* operator->() const { return m_Value.get(); }
 
-  // The value, made now if there is none.
+  /// The value, made now if there is none.
   T& make() {
     if (m_Value == nullptr) m_Value = std::make_unique<T>();
     return *m_Value;

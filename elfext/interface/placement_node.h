@@ -15,25 +15,25 @@ namespace elfext {
 class PlacementNode {
 public:
   PlacementNode() = default;
-  // A node that goes leaves the distances between the others as they are.
+  /// A node that goes leaves the distances between the others as they are.
   ~PlacementNode() { remove(); }
   PlacementNode(const PlacementNode&) = delete;
   PlacementNode& operator=(const PlacementNode&) = delete;
 
-  // The root of the node's tree; stores the node's distance from it.
+  /// The root of the node's tree; stores the node's distance from it.
   PlacementNode* find(uint64_t* offset);
 
-  // Says that `second` starts `delta` bytes after `first`. False, with the forest as it was, if
-  // the two are in one tree already at another distance, or if a distance does not fit 64 bits.
+  /// Says that `second` starts `delta` bytes after `first`. False, with the forest as it was, if
+  /// the two are in one tree already at another distance, or if a distance does not fit 64 bits.
   static bool link(PlacementNode& first, PlacementNode& second, uint64_t delta);
 
-  // Takes the node out of its tree.
+  /// Takes the node out of its tree.
   void remove();
 
-  // Keeps only these nodes in their trees, at the distances that they have; the caller then makes
-  // all others forget. Linear, where taking the others out one by one might not be.
+  /// Keeps only these nodes in their trees, at the distances that they have; the caller then makes
+  /// all others forget. Linear, where taking the others out one by one might not be.
   static void keepOnly(std::span<PlacementNode* const> nodes);
-  // Makes the node a tree of its own without a look at its neighbours, which go the same way.
+  /// Makes the node a tree of its own without a look at its neighbours, which go the same way.
   void forget();
 
 private:
@@ -43,9 +43,9 @@ private:
   void giveChildrenToParent();
 
   PlacementNode* m_Parent = nullptr;
-  // From the parent; 0 in a root.
+  /// From the parent; 0 in a root.
   uint64_t m_Offset = 0;
-  // In a root: no node of the tree is further away.
+  /// In a root: no node of the tree is further away.
   uint64_t m_Reach = 0;
   PlacementNode* m_FirstChild = nullptr;
   PlacementNode* m_PreviousSibling = nullptr;

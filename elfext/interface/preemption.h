@@ -13,23 +13,23 @@ class ObjectModule;
 
 class Preemption {
 public:
-  // Made by ObjectModule::createPreemption.
+  /// Made by ObjectModule::createPreemption.
   Preemption(ObjectModule* objectModule, const char* symbolName, const char* preemptingDllName)
       : m_ObjectModule(objectModule), m_SymbolName(symbolName),
         m_PreemptingDllName(preemptingDllName) {}
 
-  // Never null, both.
+  /// Never null, both.
   [[nodiscard]] const char* getSymbolName() const { return m_SymbolName; }
   [[nodiscard]] const char* getPreemptingDllName() const { return m_PreemptingDllName; }
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] ObjectModule* getObjectModule() const { return m_ObjectModule; }
 
-  // The libraries whose symbols are preempted.
+  /// The libraries whose symbols are preempted.
   [[nodiscard]] uint32_t getPreemptedDllCount() const { return m_PreemptedDllNames.getSize(); }
   [[nodiscard]] const char* getPreemptedDllName(uint32_t index) const {
     return m_PreemptedDllNames[index];
   }
-  // The name is kept as the texts of the module's creators are.
+  /// The name is kept as the texts of the module's creators are.
   void addPreemptedDll(const char* name);
 
 private:

@@ -13,14 +13,14 @@ class Section;
 class Segment;
 class Symbol;
 
-// Each operation is asked once for each object and answers whether it goes; by default nothing
-// does.
+/// Each operation is asked once for each object and answers whether it goes; by default nothing
+/// does.
 class PruneCriterion {
 public:
   [[nodiscard]] virtual bool goes(const Section&) const { return false; }
   [[nodiscard]] virtual bool goes(const Group&) const { return false; }
   [[nodiscard]] virtual bool goes(const Segment&) const { return false; }
-  // Static and dynamic symbols.
+  /// Static and dynamic symbols.
   [[nodiscard]] virtual bool goes(const Symbol&) const { return false; }
   [[nodiscard]] virtual bool goes(const NeededLibrary&) const { return false; }
   [[nodiscard]] virtual bool goes(const LibrarySearchPath&) const { return false; }

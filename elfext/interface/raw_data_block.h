@@ -13,17 +13,17 @@ class Segment;
 
 class RawDataBlock final : public FileRegion, public DataStore {
 public:
-  // Made by ObjectModule::createRawDataBlock. The size, in bytes, is fixed; the bytes are the
-  // caller's to give.
+  /// Made by ObjectModule::createRawDataBlock. The size, in bytes, is fixed; the bytes are the
+  /// caller's to give.
   RawDataBlock(ObjectModule* objectModule, Segment* segment, uint64_t size);
 
-  // The segment that the bytes belong to; the block goes with it.
+  /// The segment that the bytes belong to; the block goes with it.
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
 
   [[nodiscard]] uint64_t getFileSize() const override { return m_Size; }
   void getAlignment(uint64_t* remainder, uint64_t* alignment) const override;
   DataStore* getDataStore() override { return this; }
-  // Never called: a block has no record of its own in a layout.
+  /// Never called: a block has no record of its own in a layout.
   DataStructure* createDataStructure(alloclib::RegionGeneral& region,
                                      uint64_t currentOffset) override;
 

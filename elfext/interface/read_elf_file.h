@@ -28,32 +28,32 @@ namespace elfext {
 class DeferredContentsSelector;
 class ObjectModule;
 
-// A whole file, whose name becomes the module's file name.
+/// A whole file, whose name becomes the module's file name.
 [[nodiscard]] bool readElfFile(support::Host& host, const char* fileName, ObjectModule& module,
                                DeferredContentsSelector* selector);
 
-// `size` bytes at `offset` of a file: a member of an archive. Offsets inside are relative to it.
+/// `size` bytes at `offset` of a file: a member of an archive. Offsets inside are relative to it.
 [[nodiscard]] bool readElfFile(support::Host& host, const char* fileName, uint64_t offset,
                                uint64_t size, ObjectModule& module,
                                DeferredContentsSelector* selector);
 
-// Bytes in memory, which must outlive the module's contents: nothing of them is copied. The name
-// becomes the module's file name.
+/// Bytes in memory, which must outlive the module's contents: nothing of them is copied. The name
+/// becomes the module's file name.
 [[nodiscard]] bool readElfFile(support::Host& host, const char* fileName,
                                std::span<const uint8_t> bytes, ObjectModule& module,
                                DeferredContentsSelector* selector);
 
-// A whole open file. With deferred contents the module closes the file when the last of them is
-// loaded or dropped. Without, and after a failure, it remains the caller's to close, at any time.
+/// A whole open file. With deferred contents the module closes the file when the last of them is
+/// loaded or dropped. Without, and after a failure, it remains the caller's to close, at any time.
 [[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile,
                                ObjectModule& module, DeferredContentsSelector* selector);
 
-// The second form for an open file, which remains the caller's to close, at any time.
+/// The second form for an open file, which remains the caller's to close, at any time.
 [[nodiscard]] bool readElfFile(support::Host& host, support::FileHandle elfFile, uint64_t offset,
                                uint64_t size, ObjectModule& module,
                                DeferredContentsSelector* selector);
 
-// The second form for a file that others read as well, all through its one opening.
+/// The second form for a file that others read as well, all through its one opening.
 [[nodiscard]] bool readElfFile(std::shared_ptr<support::SourceFile> file, uint64_t offset,
                                uint64_t size, ObjectModule& module,
                                DeferredContentsSelector* selector);

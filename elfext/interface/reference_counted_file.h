@@ -12,21 +12,21 @@ namespace elfext {
 
 class ReferenceCountedFile {
 public:
-  // Takes over the open file, with a count of 0. The host must outlive this object.
+  /// Takes over the open file, with a count of 0. The host must outlive this object.
   ReferenceCountedFile(support::Host& host, support::FileHandle file)
       : m_Host(&host), m_File(file) {}
 
   void addReference() { ++m_Count; }
-  // Closes the file at 0. The host's error number of the close, or 0.
+  /// Closes the file at 0. The host's error number of the close, or 0.
   support::HostError release();
-  // Closes the file now, whatever the count; nothing can be read any more.
+  /// Closes the file now, whatever the count; nothing can be read any more.
   support::HostError close();
-  // Gives the file back to who opened it; nothing can be read any more.
+  /// Gives the file back to who opened it; nothing can be read any more.
   void leaveFileOpen() { m_File = {}; }
 
   [[nodiscard]] uint32_t getCount() const { return m_Count; }
   [[nodiscard]] bool isOpen() const { return m_File.isOpen(); }
-  // Fills the span with the bytes at `offset`; false if the file can't give them all.
+  /// Fills the span with the bytes at `offset`; false if the file can't give them all.
   [[nodiscard]] bool read(std::span<uint8_t> bytes, uint64_t offset);
 
 private:

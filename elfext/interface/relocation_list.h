@@ -13,7 +13,7 @@ class Relocation;
 
 class RelocationList : public ResultList<Relocation, 7> {
 public:
-  // Fills a place that setSize has made.
+  /// Fills a place that setSize has made.
   void set(uint32_t index, Relocation* relocation) {
     QUARN_ASSERT(1, relocation != NULL);
     store(index, relocation);

@@ -10,13 +10,13 @@ class Section;
 
 class RelocationRows {
 public:
-  // Makes the relocations: `target.addRelocation` for each row, in order. Called once at most. The
-  // rows' symbols still have the places in the symbol tables that they were read at. Neither
-  // whether the target may be relocated nor whether indexes are frozen matters here.
+  /// Makes the relocations: `target.addRelocation` for each row, in order. Called once at most. The
+  /// rows' symbols still have the places in the symbol tables that they were read at. Neither
+  /// whether the target may be relocated nor whether indexes are frozen matters here.
   virtual void appendTo(Section& target) = 0;
 
 protected:
-  // Rows live in a region of the module and have nothing to give back.
+  /// Rows live in a region of the module and have nothing to give back.
   ~RelocationRows() = default;
 };
 

@@ -22,8 +22,8 @@ public:
 
   [[nodiscard]] uint32_t getSize() const { return m_Size; }
 
-  // The new elements are unset until `set`. What overflow array there is serves again if it is
-  // large enough.
+  /// The new elements are unset until `set`. What overflow array there is serves again if it is
+  /// large enough.
   void setSize(uint32_t size) {
     const uint32_t overflow = size > InlineSlots ? size - InlineSlots : 0;
     if (overflow > m_OverflowCapacity) {
@@ -40,7 +40,7 @@ public:
   }
 
 protected:
-  // The caller has asserted that `element` is not null, under the name that its users know.
+  /// The caller has asserted that `element` is not null, under the name that its users know.
   void store(uint32_t index, T* element) {
     QUARN_ASSERT(1, index < m_Size);
     (index < m_InlineUsed ? m_Inline[index] : m_Overflow[index - m_InlineUsed]) = element;

@@ -27,77 +27,77 @@ class Segment;
 class Symbol;
 struct HostedViews;
 
-// What getRelocationIndex and its like answer for what is not in the list.
+/// What getRelocationIndex and its like answer for what is not in the list.
 constexpr uint32_t NoIndex = 0x80000000;
 
 class Section : public ObjectWithBuildAttributes, public FileRegion, public DataStore {
 public:
-  // What the creators of ObjectModule say of each class.
+  /// What the creators of ObjectModule say of each class.
   struct Traits {
     bool isAuxiliary;
     bool isRelocatable;
     uint64_t entrySize;
   };
 
-  // Made by ObjectModule::createSection and its like.
+  /// Made by ObjectModule::createSection and its like.
   Section(ObjectModule* objectModule, const char* name, uint32_t type, uint32_t flags,
           const Traits& traits);
   virtual ~Section();
 
-  // Null for a section without a name.
+  /// Null for a section without a name.
   [[nodiscard]] const char* getName() const { return m_Name; }
   [[nodiscard]] uint32_t getType() const { return m_Type; }
   [[nodiscard]] uint32_t getFlags() const { return m_Flags; }
-  // sh_addr.
+  /// sh_addr.
   [[nodiscard]] uint64_t getAddress() const { return m_Address; }
-  // sh_size: bytes, also of a section that has none in the file.
+  /// sh_size: bytes, also of a section that has none in the file.
   [[nodiscard]] uint64_t getSize() const override { return m_Size; }
-  // Bytes in the file.
+  /// Bytes in the file.
   [[nodiscard]] uint64_t getFileSize() const override;
-  // sh_addralign.
+  /// sh_addralign.
   [[nodiscard]] uint64_t getAlignment() const { return m_Alignment; }
-  // sh_entsize.
+  /// sh_entsize.
   [[nodiscard]] uint64_t getEntrySize() const { return m_EntrySize; }
-  // sh_link; null for none.
+  /// sh_link; null for none.
   [[nodiscard]] Section* getLink() const { return m_Link; }
-  // sh_info, where that is no section.
+  /// sh_info, where that is no section.
   [[nodiscard]] uint32_t getInfo() const { return m_Info; }
-  // In the section header table.
+  /// In the section header table.
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] bool isAuxiliary() const { return m_IsAuxiliary; }
-  // Whether relocations may apply to the section.
+  /// Whether relocations may apply to the section.
   [[nodiscard]] bool isRelocatable() const { return m_IsRelocatable; }
-  // Null for a section in no group.
+  /// Null for a section in no group.
   [[nodiscard]] Group* getGroup() const { return m_Group; }
-  // Sections whose links point here, in the order in which they were linked.
+  /// Sections whose links point here, in the order in which they were linked.
   [[nodiscard]] std::span<Section* const> getLinkingSections() const {
     return m_LinkingSections.getSpan();
   }
-  // The segment that a section/segment note names; null if there is none.
+  /// The segment that a section/segment note names; null if there is none.
   [[nodiscard]] Segment* getSegment() const { return m_Segment; }
 
-  // The text is copied. Null clears it.
+  /// The text is copied. Null clears it.
   void setName(const char* name);
   void setFlags(uint32_t flags);
   void addFlags(uint32_t flags);
   void setAddress(uint64_t address);
   void setEntrySize(uint64_t size);
-  // A section of the same module.
+  /// A section of the same module.
   void setLink(Section* link);
   void setInfo(uint32_t value);
-  // Sets the size in bytes, and that of the contents. New bytes are for the caller to fill.
+  /// Sets the size in bytes, and that of the contents. New bytes are for the caller to fill.
   void setSize(uint64_t size);
-  // Adds to the size field only; returns the old size.
+  /// Adds to the size field only; returns the old size.
   uint64_t addSize(uint64_t delta);
-  // 0 or a power of two.
+  /// 0 or a power of two.
   void setAlignment(uint64_t alignment) override;
-  // The same, if it is greater than the present one.
+  /// The same, if it is greater than the present one.
   void increaseAlignment(uint64_t alignment);
-  // Makes it a SHT_PROGBITS section with contents of its size, for the caller to fill.
+  /// Makes it a SHT_PROGBITS section with contents of its size, for the caller to fill.
   void makeProgBits();
 
-  // Contents. Reading needs them to be here; writing also needs an ordinary section whose contents
-  // are in memory. Offsets and sizes are in bytes; words have the module's byte order. See Buffer.
+  /// Contents. Reading needs them to be here; writing also needs an ordinary section whose contents
+  /// are in memory. Offsets and sizes are in bytes; words have the module's byte order. See Buffer.
   [[nodiscard]] const uint8_t* getContents() const { return getReadableBuffer().getContents(); }
   [[nodiscard]] uint64_t getContentsSize() const { return getReadableBuffer().getSize(); }
   [[nodiscard]] uint8_t getByte(uint64_t offset) const {
@@ -122,30 +122,30 @@ public:
   void set32(uint64_t offset, uint32_t value) { getWritableBuffer().set32(offset, value); }
   void set64(uint64_t offset, uint64_t value) { getWritableBuffer().set64(offset, value); }
   bool write(uint64_t offset, const void* source, uint64_t count) override;
-  // Each adds to the size field too, and returns the old size of the contents.
+  /// Each adds to the size field too, and returns the old size of the contents.
   uint64_t appendByte(uint8_t value);
   uint64_t append16(uint16_t value);
   uint64_t append32(uint32_t value);
   uint64_t append64(uint64_t value);
   [[nodiscard]] bool isModifiable() const override;
 
-  // Contents that are still in a file that stays open for them.
+  /// Contents that are still in a file that stays open for them.
   [[nodiscard]] bool isContentsDeferred() const { return m_DeferredContents != nullptr; }
-  // True if the contents are here now. A failure is reported to the module's error handler, and
-  // the file is closed.
+  /// True if the contents are here now. A failure is reported to the module's error handler, and
+  /// the file is closed.
   [[nodiscard]] bool loadDeferredContents();
 
-  // Contents that stay outside of the model.
+  /// Contents that stay outside of the model.
   [[nodiscard]] bool hasExternalContents() const { return m_HasExternalContents; }
   void setExternalContents(ExternalDataFunction function, void* handle, uint64_t size);
 
-  // Relocations that apply to this section, static and dynamic together. What a file said becomes
-  // objects when somebody asks for one; the counts and tests that come after `removeAll...` know
-  // without.
+  /// Relocations that apply to this section, static and dynamic together. What a file said becomes
+  /// objects when somebody asks for one; the counts and tests that come after `removeAll...` know
+  /// without.
   Relocation* addRelocation(uint64_t offset, uint32_t type, Symbol* target);
   Relocation* addRelocation(uint64_t offset, uint32_t type, Symbol* target, int64_t addend);
   [[nodiscard]] Relocation* getRelocation(uint32_t index);
-  // NoIndex for one that is not in the list.
+  /// NoIndex for one that is not in the list.
   [[nodiscard]] uint32_t getRelocationIndex(const Relocation* relocation);
   void setRelocationIndex(Relocation* relocation, uint32_t index);
   void removeRelocation(Relocation* relocation);
@@ -155,24 +155,24 @@ public:
   [[nodiscard]] bool hasStaticRelocationsWithoutAddend() const;
   [[nodiscard]] bool hasDynamicRelocationsWithAddend() const;
   [[nodiscard]] bool hasDynamicRelocationsWithoutAddend() const;
-  // Dynamic relocations only, told apart by whether they are for a jump slot.
+  /// Dynamic relocations only, told apart by whether they are for a jump slot.
   [[nodiscard]] uint32_t getJumpSlotCountWithoutAddend();
   [[nodiscard]] uint32_t getJumpSlotCountWithAddend();
   [[nodiscard]] uint32_t getOtherDynamicCountWithoutAddend();
   [[nodiscard]] uint32_t getOtherDynamicCountWithAddend();
-  // Those at offsets from the first to the last, both included, in the order of their offsets.
+  /// Those at offsets from the first to the last, both included, in the order of their offsets.
   void getRelocationsInRange(uint64_t fromOffset, uint64_t toOffset, RelocationList* relocations);
-  // The sections that say so in the file.
+  /// The sections that say so in the file.
   [[nodiscard]] std::span<RelocationSection* const> getStaticRelocationSections() const {
     return m_StaticRelocationSections.getSpan();
   }
   [[nodiscard]] std::span<RelocationSection* const> getDynamicRelocationSections() const {
     return m_DynamicRelocationSections.getSpan();
   }
-  // Makes all relocations that are still rows.
+  /// Makes all relocations that are still rows.
   void materializeRelocations();
 
-  // Symbols that are defined in this section. Indexes that are not found are NoIndex.
+  /// Symbols that are defined in this section. Indexes that are not found are NoIndex.
   [[nodiscard]] uint32_t getHostedSymbolCount() const { return m_HostedSymbols.getSize(); }
   [[nodiscard]] Symbol* getHostedSymbol(uint32_t index) const { return m_HostedSymbols[index]; }
   [[nodiscard]] uint32_t getHostedSymbolIndex(const Symbol* symbol) const;
@@ -186,25 +186,25 @@ public:
   [[nodiscard]] uint32_t getHostedDynamicSymbolIndex(const Symbol* symbol) const;
   void setHostedDynamicSymbolIndex(Symbol* symbol, uint32_t index);
 
-  // Queries. Each fills the list, in the order of the offsets (by name: of the hosted lists), and
-  // answers whether it found something.
-  //
-  // The mapping symbols at offsets from the first to the last, both included.
+  /// Queries. Each fills the list, in the order of the offsets (by name: of the hosted lists), and
+  /// answers whether it found something.
+  ///
+  /// The mapping symbols at offsets from the first to the last, both included.
   bool getSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolList* symbols);
-  // The symbols of the classes in the mask, at the highest offset not above the given one at which
-  // there is one.
+  /// The symbols of the classes in the mask, at the highest offset not above the given one at which
+  /// there is one.
   bool getPrecedingSymbols(uint64_t offset, uint32_t mask, SymbolList* symbols);
-  // The mapping symbols at the lowest offset not below the given one at which there is one.
+  /// The mapping symbols at the lowest offset not below the given one at which there is one.
   bool getFollowingMappingSymbols(uint64_t offset, SymbolList* symbols);
-  // All symbols of exactly that name.
+  /// All symbols of exactly that name.
   bool getSymbolsByName(const char* name, SymbolList* symbols);
-  // The same of the dynamic symbols; the first yields those of all classes.
+  /// The same of the dynamic symbols; the first yields those of all classes.
   bool getDynamicSymbolsInRange(uint64_t fromOffset, uint64_t toOffset, SymbolList* symbols);
   bool getDynamicSymbolsByName(const char* name, SymbolList* symbols);
 
-  // Whether a segment at a known distance wholly contains the section; the index of the first
-  // such segment goes to the pointer, which may be null. Looks through the segments: who asks for
-  // many sections has ObjectModule::findHolders.
+  /// Whether a segment at a known distance wholly contains the section; the index of the first
+  /// such segment goes to the pointer, which may be null. Looks through the segments: who asks for
+  /// many sections has ObjectModule::findHolders.
   bool isInSegment(uint32_t* segmentIndex);
 
   [[nodiscard]] virtual RelocationSection* asRelocationSection() { return nullptr; }
@@ -213,7 +213,7 @@ public:
   [[nodiscard]] bool inheritsBuildAttributes() const override { return true; }
   void getInheritedBuildAttributes(BuildAttributes& result) const override;
 
-  // The file offset is always a multiple of something; 16 in sh_addralign still means 4 here.
+  /// The file offset is always a multiple of something; 16 in sh_addralign still means 4 here.
   void getAlignment(uint64_t* remainder, uint64_t* alignment) const override;
   DataStore* getDataStore() override;
   DataStructure* createDataStructure(alloclib::RegionGeneral& region,
@@ -273,7 +273,7 @@ private:
   bool m_AreRelocationsSorted = true;
   bool m_Goes = false;
   Buffer m_Contents;
-  // Rows of the relocation sections for this one that are no objects yet.
+  /// Rows of the relocation sections for this one that are no objects yet.
   uint32_t m_PendingRelocationCount = 0;
   DeferredContents* m_DeferredContents = nullptr;
   Group* m_Group = nullptr;

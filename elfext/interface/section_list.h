@@ -13,7 +13,7 @@ class Section;
 
 class SectionList : public ResultList<Section, 7> {
 public:
-  // Fills a place that setSize has made.
+  /// Fills a place that setSize has made.
   void set(uint32_t index, Section* section) {
     QUARN_ASSERT(1, section != NULL);
     store(index, section);

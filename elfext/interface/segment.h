@@ -13,7 +13,7 @@ class ObjectModule;
 
 class Segment final : public FileRegion {
 public:
-  // Made by ObjectModule::createSegment. The fields are those of the program header.
+  /// Made by ObjectModule::createSegment. The fields are those of the program header.
   Segment(ObjectModule* objectModule, uint32_t type, uint64_t offset, uint64_t vaddr,
           uint64_t paddr, uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align);
 
@@ -21,15 +21,15 @@ public:
   [[nodiscard]] uint32_t getFlags() const { return m_Flags; }
   [[nodiscard]] uint64_t getVirtualAddress() const { return m_VirtualAddress; }
   [[nodiscard]] uint64_t getPhysicalAddress() const { return m_PhysicalAddress; }
-  // p_memsz, in bytes.
+  /// p_memsz, in bytes.
   [[nodiscard]] uint64_t getMemorySize() const { return m_MemorySize; }
-  // p_align as it stands, which may be 0.
+  /// p_align as it stands, which may be 0.
   [[nodiscard]] uint64_t getSegmentAlignment() const { return m_Alignment; }
-  // Its place in the program header table, from 0.
+  /// Its place in the program header table, from 0.
   [[nodiscard]] uint32_t getIndex() const { return m_Index; }
   [[nodiscard]] ObjectModule* getObjectModule() const { return m_ObjectModule; }
 
-  // p_filesz.
+  /// p_filesz.
   [[nodiscard]] uint64_t getFileSize() const override { return m_FileSize; }
   void getAlignment(uint64_t* remainder, uint64_t* alignment) const override;
   DataStructure* createDataStructure(alloclib::RegionGeneral& region,

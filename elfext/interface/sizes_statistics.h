@@ -11,7 +11,7 @@ namespace elfext {
 
 class ObjectModule;
 
-// Bytes.
+/// Bytes.
 struct SizesStatistics {
   uint64_t m_Code = 0;
   uint64_t m_LiteralPools = 0;
@@ -23,12 +23,12 @@ struct SizesStatistics {
   uint64_t m_InternalPadding = 0;
 };
 
-// Changes nothing of the module but its views of symbols, which are made on demand. A module that
-// was read can always be counted; of one that has lost contents since, the bytes that can't be
-// looked at are missing.
+/// Changes nothing of the module but its views of symbols, which are made on demand. A module that
+/// was read can always be counted; of one that has lost contents since, the bytes that can't be
+/// looked at are missing.
 [[nodiscard]] SizesStatistics computeSizesStatistics(ObjectModule* objectModule);
 
-// The eight totals, each cut to 32 bits, between two rules.
+/// The eight totals, each cut to 32 bits, between two rules.
 void printSizesStatistics(const SizesStatistics& statistics, std::FILE* f);
 
 } // namespace elfext

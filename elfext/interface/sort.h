@@ -23,19 +23,19 @@
 
 namespace elfext {
 
-// Below 0, 0 or above 0 as the left item comes before, with or after the right one.
+/// Below 0, 0 or above 0 as the left item comes before, with or after the right one.
 using CompareProc = int (*)(const void* left, const void* right, void* context);
 
-// Sorts an array of 8-byte items, such as pointers; the procedure gets pointers to items and the
-// context word. Stable.
+/// Sorts an array of 8-byte items, such as pointers; the procedure gets pointers to items and the
+/// context word. Stable.
 void sort(void* base, size_t count, CompareProc compareProc, void* context);
 
 namespace sorting {
 
-// For a temporary array on the heap; never null.
+/// For a temporary array on the heap; never null.
 [[nodiscard]] void* allocateScratch(size_t count, size_t itemSize);
 
-// Merges the sorted halves [0, middle) and [middle, count) by way of the scratch array.
+/// Merges the sorted halves [0, middle) and [middle, count) by way of the scratch array.
 template <class T, class Compare>
 void merge(T* items, size_t middle, size_t count, T* scratch, Compare& compare) {
   std::copy_n(items, middle, scratch);
@@ -57,8 +57,8 @@ void mergeSortHalves(T* items, size_t count, T* scratch, Compare& compare) {
   merge(items, middle, count, scratch, compare);
 }
 
-// The row of heaps. `bm0` is the mask, `size` the Leonardo number of bit 0, `below` the one
-// before it.
+/// The row of heaps. `bm0` is the mask, `size` the Leonardo number of bit 0, `below` the one
+/// before it.
 struct Shape {
   uint64_t bm0 = 1;
   size_t size = 1;
@@ -76,7 +76,7 @@ struct Shape {
     size = below;
     below = smaller;
   }
-  // Up to the next heap in the row.
+  /// Up to the next heap in the row.
   void normalise() {
     while ((bm0 & 1) == 0)
       stepUp();
@@ -95,7 +95,7 @@ public:
   }
 
 private:
-  // Lets the root's item sink in its heap.
+  /// Lets the root's item sink in its heap.
   void sift(size_t root, size_t size, size_t below) {
     while (size >= 3) {
       const size_t right = root - 1;
@@ -111,7 +111,7 @@ private:
     }
   }
 
-  // Whether the item of another heap's root belongs above the root and both its children.
+  /// Whether the item of another heap's root belongs above the root and both its children.
   [[nodiscard]] bool isAboveHeap(size_t candidate, size_t root, size_t size, size_t below) const {
     if (!m_IsLess(m_Items[root], m_Items[candidate])) return false;
     if (size < 3) return true;
@@ -121,8 +121,8 @@ private:
            m_IsLess(m_Items[left], m_Items[candidate]);
   }
 
-  // Moves the root's item along the row, to the left, as long as the root there is greater; then
-  // lets it sink. The roots of the row ascend afterwards.
+  /// Moves the root's item along the row, to the left, as long as the root there is greater; then
+  /// lets it sink. The roots of the row ascend afterwards.
   void trinkle(size_t root, const Shape* sptr) {
     Shape shape = *sptr;
     QUARN_ASSERT(1, (sptr->bm0 & 1));
@@ -137,8 +137,8 @@ private:
     sift(root, shape.size, shape.below);
   }
 
-  // Grows the row by one item at a time. A heap that will be part of a larger one before the end
-  // need not be in order with its neighbours yet.
+  /// Grows the row by one item at a time. A heap that will be part of a larger one before the end
+  /// need not be in order with its neighbours yet.
   Shape makeHeaps(size_t count) {
     Shape shape;
     for (size_t root = 0; root + 1 < count; ++root) {
@@ -160,7 +160,7 @@ private:
     return shape;
   }
 
-  // Adds a heap of one item at the end of the row.
+  /// Adds a heap of one item at the end of the row.
   static void startSingle(Shape& shape) {
     do
       shape.stepDown();
@@ -168,7 +168,7 @@ private:
     shape.bm0 |= 1;
   }
 
-  // Takes the greatest item, the last root, off the row; what was below it makes two heaps.
+  /// Takes the greatest item, the last root, off the row; what was below it makes two heaps.
   void removeLast(size_t root, Shape& shape) {
     shape.bm0 &= ~uint64_t{1};
     if (shape.size == 1) {
@@ -190,8 +190,8 @@ private:
 
 } // namespace sorting
 
-// Puts the items into another order before a sort whose result must not depend on it, in the
-// builds that look for such dependence; nothing in all others.
+/// Puts the items into another order before a sort whose result must not depend on it, in the
+/// builds that look for such dependence; nothing in all others.
 template <class T>
 void shakeOrder([[maybe_unused]] std::span<T> items) {
 #ifdef QUARN_SHAKE_ORDER
@@ -203,7 +203,7 @@ void shakeOrder([[maybe_unused]] std::span<T> items) {
 #endif
 }
 
-// Stable. `compare(left, right)` answers as a CompareProc does.
+/// Stable. `compare(left, right)` answers as a CompareProc does.
 template <class T, class Compare>
 void mergeSort(std::span<T> items, Compare compare) {
   static_assert(std::is_trivially_copyable_v<T>);
@@ -215,7 +215,7 @@ void mergeSort(std::span<T> items, Compare compare) {
   std::free(scratch);
 }
 
-// Not stable, without memory of its own. `isLess(left, right)` is a strict order.
+/// Not stable, without memory of its own. `isLess(left, right)` is a strict order.
 template <class T, class IsLess>
 void smoothSort(std::span<T> items, IsLess isLess) {
   if (items.size() < 2) return;

@@ -19,7 +19,7 @@ namespace elfext {
 // Products of a 32-bit count and an element size must not wrap.
 static_assert(sizeof(size_t) == 8);
 
-// Memory of a region, which may be destroyed before the container.
+/// Memory of a region, which may be destroyed before the container.
 class RegionStorage {
 protected:
   explicit RegionStorage(alloclib::Region* region) : m_Region(region) {
@@ -31,8 +31,8 @@ protected:
   [[nodiscard]] void* allocate(size_t bytes) { return m_Region->AllocFull(bytes, 8, nullptr); }
   void release(void* start, size_t bytes) { m_Region->DiscardFull(start, bytes, 8); }
 
-  // A block of elements is padded to a multiple of 8 and ends with one more word, which holds the
-  // block's own start: both ends of what goes back to the region follow from the elements alone.
+  /// A block of elements is padded to a multiple of 8 and ends with one more word, which holds the
+  /// block's own start: both ends of what goes back to the region follow from the elements alone.
   [[nodiscard]] void* allocateElements(size_t bytes) {
     const size_t padded = alloclib::roundUp(bytes, 8);
     void* start = allocate(padded + sizeof start);
@@ -50,7 +50,7 @@ protected:
   alloclib::Region* m_Region;
 };
 
-// Memory of the general heap, for containers that outlive any region.
+/// Memory of the general heap, for containers that outlive any region.
 class HeapStorage {
 protected:
   void mustBeUsable() const {}

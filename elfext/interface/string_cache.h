@@ -17,7 +17,7 @@ public:
   StringCache(const StringCache&) = delete;
   StringCache& operator=(const StringCache&) = delete;
 
-  // The canonical copy of the text, the same pointer for equal texts; it belongs to the cache.
+  /// The canonical copy of the text, the same pointer for equal texts; it belongs to the cache.
   [[nodiscard]] const char* lookup(const char* s);
 
 private:

@@ -10,14 +10,14 @@ namespace elfext {
 
 class Stringlett {
 public:
-  // The text, which may be null, is not copied.
+  /// The text, which may be null, is not copied.
   explicit Stringlett(const char* text);
 
   [[nodiscard]] const char* getText() const { return m_Text; }
-  // 0 for a null text.
+  /// 0 for a null text.
   [[nodiscard]] uint32_t getHash() const { return m_Hash; }
 
-  // Whether both texts are null, or the same bytes.
+  /// Whether both texts are null, or the same bytes.
   [[nodiscard]] bool operator==(const Stringlett& other) const;
 
 private:

@@ -13,7 +13,7 @@ class Symbol;
 
 class SymbolList : public ResultList<Symbol, 7> {
 public:
-  // Fills a place that setSize has made.
+  /// Fills a place that setSize has made.
   void set(uint32_t index, Symbol* symbol) {
     QUARN_ASSERT(1, symbol != NULL);
     store(index, symbol);

@@ -9,7 +9,7 @@ struct FileVersionDefinition;
 
 struct SymbolVersionDefinition {
   const FileVersionDefinition* version;
-  // Only references that name the version reach the symbol.
+  /// Only references that name the version reach the symbol.
   bool isHidden;
 };
 

@@ -8,9 +8,9 @@
 namespace elfext {
 
 struct SymbolVersionRequirement {
-  // vna_other: the number that the words of the versym section mean.
+  /// vna_other: the number that the words of the versym section mean.
   uint32_t version;
-  // The module's own texts, maybe empty, never null: the version's, and the file's that has it.
+  /// The module's own texts, maybe empty, never null: the version's, and the file's that has it.
   const char* versionName;
   const char* fileName;
   bool isHidden;
