@@ -9,22 +9,22 @@ namespace arlib {
 
 class Archive;
 
-// True means that the file now holds the archive, and that every member's location points into it.
-// False means that the failure has been reported; the file is then as it was, and no temporary file
-// is left.
-//
-// Under the archive's own name the file must be the one that the archive was read from. If somebody
-// else has replaced it or written to it meanwhile, his work is kept, and the write fails with
-// ESTALE.
+/// True means that the file now holds the archive, and that every member's location points into it.
+/// False means that the failure has been reported; the file is then as it was, and no temporary
+/// file is left.
+///
+/// Under the archive's own name the file must be the one that the archive was read from. If
+/// somebody else has replaced it or written to it meanwhile, his work is kept, and the write fails
+/// with ESTALE.
 bool writeFile(const char* fileName, Archive& archive);
 
 enum class NewFile {
   Written,
-  Failed, // after a report
-  Exists, // a file has appeared at the name: it is left as it is, and nothing is reported
+  Failed, ///< after a report
+  Exists, ///< a file has appeared at the name: it is left as it is, and nothing is reported
 };
 
-// The same for an archive that must not replace anything.
+/// The same for an archive that must not replace anything.
 [[nodiscard]] NewFile writeNewFile(const char* fileName, Archive& archive);
 
 } // namespace arlib

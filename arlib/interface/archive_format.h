@@ -35,9 +35,9 @@ constexpr uint8_t PaddingByte = 0x0A;
 
 constexpr uint32_t MemberHeaderSize = 60;
 constexpr size_t MaximumShortName = 15;
-constexpr uint64_t MaximumFileSize = 0x7FFFFFFF; // archives and members stay below 2 GiB
+constexpr uint64_t MaximumFileSize = 0x7FFFFFFF; ///< archives and members stay below 2 GiB
 
-// Where a field stands in the member header, in bytes.
+/// Where a field stands in the member header, in bytes.
 struct HeaderField {
   uint32_t position;
   uint32_t width;
@@ -51,13 +51,13 @@ constexpr HeaderField ModeField = {40, 8};
 constexpr HeaderField SizeField = {48, 10};
 constexpr HeaderField MagicField = {58, 2};
 
-// The name fields of the two tables, whole.
+/// The name fields of the two tables, whole.
 constexpr std::string_view SymbolTableName = "/               ";
 constexpr std::string_view FileNameTableName = "//              ";
 static_assert(SymbolTableName.size() == NameField.width);
 static_assert(FileNameTableName.size() == NameField.width);
 
-// A member header of a file as text. The view lives as long as the bytes.
+/// A member header of a file as text. The view lives as long as the bytes.
 class MemberHeaderView {
 public:
   explicit MemberHeaderView(std::span<const uint8_t, MemberHeaderSize> bytes)
@@ -71,36 +71,36 @@ private:
   std::string_view m_Text;
 };
 
-// The numbers of a member header.
+/// The numbers of a member header.
 struct MemberHeaderNumbers {
-  uint32_t date = 0; // seconds since 1970
+  uint32_t date = 0; ///< seconds since 1970
   uint32_t uid = 0;
   uint32_t gid = 0;
   uint32_t mode = 0;
-  uint32_t size = 0; // bytes of the contents, without padding
+  uint32_t size = 0; ///< bytes of the contents, without padding
 };
 
-// Fills a header. The name is cut or padded to its field; a number with too many digits loses its
-// last ones, as the field has no more room.
+/// Fills a header. The name is cut or padded to its field; a number with too many digits loses its
+/// last ones, as the field has no more room.
 void putMemberHeader(std::span<uint8_t, MemberHeaderSize> bytes, std::string_view name,
                      const MemberHeaderNumbers& numbers);
 
-// Reads a number field: blanks, digits, blanks, filling exactly `width` characters. The first
-// character that is a digit but not one of the base ends the number and is stepped over. False if
-// there is no digit, anything else stands in the field, or the number needs more than 32 bits;
-// `result` is then what had been read so far.
+/// Reads a number field: blanks, digits, blanks, filling exactly `width` characters. The first
+/// character that is a digit but not one of the base ends the number and is stepped over. False if
+/// there is no digit, anything else stands in the field, or the number needs more than 32 bits;
+/// `result` is then what had been read so far.
 bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uint32_t& result);
 
 [[nodiscard]] constexpr uint64_t roundUpToEven(uint64_t value) {
   return value + (value & 1);
 }
 
-// Whether a name goes in the long-name table.
+/// Whether a name goes in the long-name table.
 constexpr bool isLongName(std::string_view name) {
   return name.size() > MaximumShortName;
 }
 
-// Where the next header starts, for a header at `offset` whose contents have `size` bytes.
+/// Where the next header starts, for a header at `offset` whose contents have `size` bytes.
 [[nodiscard]] constexpr uint64_t nextHeaderOffset(uint64_t offset, uint64_t size) {
   return roundUpToEven(offset + MemberHeaderSize + size);
 }

@@ -24,18 +24,18 @@ class Archive;
 class Symbol;
 struct FileProbe;
 
-// Lives in the archive's object region. It is never freed by itself; what it holds outside the
-// region (a temporary file) is released by releaseContentsLocation.
-//
-// It always has contents in memory, or a contents location, or both, and if both, the same bytes.
+/// Lives in the archive's object region. It is never freed by itself; what it holds outside the
+/// region (a temporary file) is released by releaseContentsLocation.
+///
+/// It always has contents in memory, or a contents location, or both, and if both, the same bytes.
 class ArchiveMember {
 public:
-  // Where the bytes lie on disk; their number is the member's size.
+  /// Where the bytes lie on disk; their number is the member's size.
   struct ContentsLocation {
-    support::SourceFile* file = nullptr; // held by the archive
-    const char* fileName = nullptr;      // its name
-    uint32_t offset = 0;                 // of the contents, in that file
-    bool isTemporary = false;            // made by this run, deleted when the location is released
+    support::SourceFile* file = nullptr; ///< held by the archive
+    const char* fileName = nullptr;      ///< its name
+    uint32_t offset = 0;                 ///< of the contents, in that file
+    bool isTemporary = false; ///< made by this run, deleted when the location is released
   };
 
   static constexpr uint32_t NoFileNameTableOffset = 0xFFFFFFFF;
@@ -53,10 +53,10 @@ public:
   [[nodiscard]] Archive* getArchive() const { return m_Archive; }
   [[nodiscard]] bool isModified() const { return m_Modified; }
 
-  // File offset of the header. Only while the archive's offsets are up to date.
+  /// File offset of the header. Only while the archive's offsets are up to date.
   [[nodiscard]] uint32_t getOffset() const;
 
-  // True for the symbol table and the long-name table.
+  /// True for the symbol table and the long-name table.
   [[nodiscard]] bool isAuxiliary() const;
 
   void setDate(int64_t date);
@@ -64,62 +64,62 @@ public:
   void setGid(uint32_t gid);
   void setMode(uint32_t mode);
 
-  // Copies the name. Not for auxiliary members, whose names are the format's own.
+  /// Copies the name. Not for auxiliary members, whose names are the format's own.
   void setName(std::string_view name);
 
-  // The bytes in memory. They stay valid until they are discarded or replaced.
+  /// The bytes in memory. They stay valid until they are discarded or replaced.
   [[nodiscard]] bool hasContents() const { return m_Contents.has_value(); }
   [[nodiscard]] std::span<const uint8_t> getContents() const;
-  // The same to edit in place: only behind clearType, since the type rests on the bytes.
+  /// The same to edit in place: only behind clearType, since the type rests on the bytes.
   [[nodiscard]] std::span<uint8_t> getModifiableContents();
 
   [[nodiscard]] const std::optional<ContentsLocation>& getContentsLocation() const;
 
-  // Brings the bytes into memory. False after a report; there are then no contents in memory.
+  /// Brings the bytes into memory. False after a report; there are then no contents in memory.
   bool loadContents();
 
-  // Gives a member that lives in memory alone a temporary file. False after a report.
+  /// Gives a member that lives in memory alone a temporary file. False after a report.
   bool flushContents();
 
-  // Frees the bytes in memory, after having given them a location. Bytes that can't be flushed are
-  // lost, as the report has said. Always true.
+  /// Frees the bytes in memory, after having given them a location. Bytes that can't be flushed are
+  /// lost, as the report has said. Always true.
   bool discardContents();
 
-  // Replaces the bytes.
+  /// Replaces the bytes.
   void setContents(const void* data, uint32_t size);
 
-  // Replaces the bytes by those of a file, or of a region of it, and takes date, uid, gid and mode
-  // from the file. The file is not read now. False after a report; nothing has then changed.
+  /// Replaces the bytes by those of a file, or of a region of it, and takes date, uid, gid and mode
+  /// from the file. The file is not read now. False after a report; nothing has then changed.
   bool setContentsFromFile(const char* fileName);
   bool setContentsFromFile(const char* fileName, const FileProbe& probe);
   bool setContentsFromFileRegion(const char* fileName, uint32_t offset, uint32_t size);
 
-  // Replaces the bytes and the header's numbers by those of a member of another archive, through
-  // the file that that archive was read from.
+  /// Replaces the bytes and the header's numbers by those of a member of another archive, through
+  /// the file that that archive was read from.
   void setContentsFromMember(const ArchiveMember& source);
 
-  // Date, uid, gid and mode become those of the other member.
+  /// Date, uid, gid and mode become those of the other member.
   void takeHeaderNumbers(const ArchiveMember& source);
 
-  // Position of a symbol in the archive's list of symbols, or Archive::NotFound.
+  /// Position of a symbol in the archive's list of symbols, or Archive::NotFound.
   [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
 
-  // For a client that is about to edit the contents in place: loads them, and leaves the type to be
-  // determined anew. False if they could not be loaded.
+  /// For a client that is about to edit the contents in place: loads them, and leaves the type to
+  /// be determined anew. False if they could not be loaded.
   bool clearType();
 
-  // Only while the type is not known.
+  /// Only while the type is not known.
   void determineType();
 
-  // Reads the member's bytes as an object. A module of the caller's reports to its own handler, a
-  // new one to nobody. It must not outlive the archive's host. Null or false if the object can't be
-  // read.
+  /// Reads the member's bytes as an object. A module of the caller's reports to its own handler, a
+  /// new one to nobody. It must not outlive the archive's host. Null or false if the object can't
+  /// be read.
   std::unique_ptr<elfext::ObjectModule>
   createObjectModule(elfext::DeferredContentsSelector* selector);
   bool readObjectModule(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector);
 
-  // Forgets where the bytes lie on disk, and deletes the file if it was a temporary one. False if
-  // that failed, after a report; the location is gone all the same.
+  /// Forgets where the bytes lie on disk, and deletes the file if it was a temporary one. False if
+  /// that failed, after a report; the location is gone all the same.
   bool releaseContentsLocation();
 
 private:
@@ -131,21 +131,21 @@ private:
   struct Contents {
     uint8_t* bytes;
     uint32_t size;
-    uint32_t capacity; // at least 1
+    uint32_t capacity; ///< at least 1
   };
 
-  // Uninitialised bytes in the archive's container region; the old ones are freed, except those of
-  // a table that came from the file, into which names point: they go when the archive is cleared.
+  /// Uninitialised bytes in the archive's container region; the old ones are freed, except those of
+  /// a table that came from the file, into which names point: they go when the archive is cleared.
   std::span<uint8_t> replaceContents(uint32_t size);
-  // The same with bytes of that region which are filled already.
+  /// The same with bytes of that region which are filled already.
   void takeContents(std::span<uint8_t> bytes);
   void freeContents();
-  // The archive holds the file from now on.
+  /// The archive holds the file from now on.
   void setLocation(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
                    bool isTemporary);
   void takeFile(const std::shared_ptr<support::SourceFile>& file, uint32_t offset, uint32_t size);
   bool readContents(std::span<uint8_t> bytes);
-  // From the location, which there must be, under the module's own handler.
+  /// From the location, which there must be, under the module's own handler.
   bool readInto(elfext::ObjectModule& module, elfext::DeferredContentsSelector* selector) const;
 
   std::string_view m_Name;
@@ -161,7 +161,7 @@ private:
   std::optional<Contents> m_Contents;
   std::optional<ContentsLocation> m_ContentsLocation;
   bool m_Modified = false;
-  bool m_ContentsAreViewed = false; // names or symbols are views of the bytes: never free them
+  bool m_ContentsAreViewed = false; ///< names or symbols are views of the bytes: never free them
 };
 
 } // namespace arlib

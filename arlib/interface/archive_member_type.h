@@ -23,11 +23,11 @@ namespace arlib {
 
 class ArchiveMember;
 
-// What decoration texts say: members of a library have thousands of them, of which few differ.
+/// What decoration texts say: members of a library have thousands of them, of which few differ.
 using AttributeRecords = elfext::AttributeTextCache<elfext::FullAttr>;
 
-// What serves all objects that are read one after the other, for one is like the next. It ends with
-// the last of them; the records may go on.
+/// What serves all objects that are read one after the other, for one is like the next. It ends
+/// with the last of them; the records may go on.
 struct ObjectReading {
   AttributeRecords& records;
   elfext::ObjectOutline outline = {};
@@ -44,15 +44,15 @@ public:
   [[nodiscard]] virtual bool isElfImage(const ArchiveMember*) const { return false; }
   [[nodiscard]] virtual bool isAuxiliaryType() const = 0;
 
-  // The one rule that decides a member's type: an ELF image by the test of its bytes, or unknown.
-  // The auxiliary types are set by the reader and by the rebuild of the tables alone.
+  /// The one rule that decides a member's type: an ELF image by the test of its bytes, or unknown.
+  /// The auxiliary types are set by the reader and by the rebuild of the tables alone.
   [[nodiscard]] static const ArchiveMemberType* decide(const ArchiveMember* archiveMember);
 
-  // The same rule for a caller that has the first elfext::RecognizedBytes at hand.
+  /// The same rule for a caller that has the first elfext::RecognizedBytes at hand.
   [[nodiscard]] static const ArchiveMemberType* decide(std::span<const uint8_t> firstBytes);
 };
 
-// Any file that the archive can't look into.
+/// Any file that the archive can't look into.
 class UnknownArchiveMemberType final : public ArchiveMemberType {
 public:
   [[nodiscard]] static const UnknownArchiveMemberType* getInstance();
@@ -71,25 +71,25 @@ public:
   [[nodiscard]] bool isAuxiliaryType() const override { return true; }
 };
 
-// An object whose symbols the symbol table publishes.
+/// An object whose symbols the symbol table publishes.
 class ObjectModuleArchiveMemberType : public ArchiveMemberType {
 public:
   [[nodiscard]] bool isObjectModule() const override { return true; }
   [[nodiscard]] bool isAuxiliaryType() const override { return false; }
 
-  // Fills `names` with what the symbol table should hold for this member. False if the object
-  // can't be read; `reason` then says why, or is empty if that has been reported already.
+  /// Fills `names` with what the symbol table should hold for this member. False if the object
+  /// can't be read; `reason` then says why, or is empty if that has been reported already.
   virtual bool getSymbolNames(ArchiveMember* archiveMember, SymbolNameList& names,
                               std::string& reason) const = 0;
 
-  // What the member needs of its target: as its decoration symbols say, or with
-  // `useObjectAttributes` what the object as a whole has. False if the object can't be read, or
-  // says nothing.
+  /// What the member needs of its target: as its decoration symbols say, or with
+  /// `useObjectAttributes` what the object as a whole has. False if the object can't be read, or
+  /// says nothing.
   virtual bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                                   bool useObjectAttributes) const = 0;
 
-  // Both at the cost of one read, as the archive wants its objects' attributes. Without attributes
-  // the object says nothing.
+  /// Both at the cost of one read, as the archive wants its objects' attributes. Without attributes
+  /// the object says nothing.
   virtual bool getPublished(ArchiveMember* archiveMember, ObjectReading& reading,
                             SymbolNameList& names, std::optional<elfext::FullAttr>& attributes,
                             std::string& reason) const = 0;
@@ -107,8 +107,8 @@ public:
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
 
-  // Reads what the member's object says of itself, under that handler, which may be null. False
-  // after a report, if any.
+  /// Reads what the member's object says of itself, under that handler, which may be null. False
+  /// after a report, if any.
   static bool readOutline(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
                           bool wantsAttributes, elfext::ObjectOutline& outline);
 };

@@ -33,14 +33,14 @@ namespace arlib {
 class Archive;
 class ArchiveMember;
 
-// Members that are builds of one module, in file order; never empty. The first gives the group its
-// name.
+/// Members that are builds of one module, in file order; never empty. The first gives the group its
+/// name.
 using MinorVariantGroup = std::span<const ArchiveMember* const>;
 
 enum class Severity : uint32_t {
-  Fatal = 0,    // the operation can't go on
-  Doubtful = 1, // a value is not what it should be
-  Partial = 2,  // something is missing, the rest is usable
+  Fatal = 0,    ///< the operation can't go on
+  Doubtful = 1, ///< a value is not what it should be
+  Partial = 2,  ///< something is missing, the rest is usable
 };
 
 class ErrorHandler {
@@ -50,8 +50,8 @@ public:
   virtual bool report(const Archive& archive, Severity severity, std::string_view text) = 0;
   virtual bool reportOutOfMemory(const Archive& archive);
 
-  // Host failures. `fileName` may be null: the archive's own file. `errorNumber` 0 means that the
-  // host gave no reason (a file that ended too early).
+  /// Host failures. `fileName` may be null: the archive's own file. `errorNumber` 0 means that the
+  /// host gave no reason (a file that ended too early).
   virtual bool reportReadError(const Archive& archive, const char* fileName, int errorNumber);
   virtual bool reportSeekError(const Archive& archive, const char* fileName, int errorNumber);
   virtual bool reportCloseError(const Archive& archive, const char* fileName, int errorNumber);
@@ -59,8 +59,8 @@ public:
   virtual bool reportWriteError(const Archive& archive, const char* fileName, int errorNumber);
   virtual bool reportReadOnlyOutput(const Archive& archive, const char* fileName);
 
-  // The file's format. `offset` is the file offset of the member's header, `field` the characters
-  // of a header field as they stand there.
+  /// The file's format. `offset` is the file offset of the member's header, `field` the characters
+  /// of a header field as they stand there.
   virtual bool reportBadArchiveMagic(const Archive& archive);
   virtual bool reportTruncatedMemberHeader(const Archive& archive, uint64_t offset);
   virtual bool reportBadDate(const Archive& archive, uint64_t offset, std::string_view field);
@@ -76,14 +76,14 @@ public:
                                              uint32_t index, uint32_t tableSize);
   virtual bool reportNoNameTerminator(const Archive& archive, uint64_t offset);
   virtual bool reportTrailingNameCharacter(const Archive& archive, uint64_t offset);
-  // `offset` is that of the padding byte; `value` is shown as a signed decimal.
+  /// `offset` is that of the padding byte; `value` is shown as a signed decimal.
   virtual bool reportBadPadding(const Archive& archive, uint64_t offset, int value);
-  // Without a `memberName` the region is no member. All numbers in bytes.
+  /// Without a `memberName` the region is no member. All numbers in bytes.
   virtual bool reportRegionOutsideFile(const Archive& archive, const char* fileName,
                                        std::optional<std::string_view> memberName, uint64_t offset,
                                        uint64_t size, uint64_t fileSize);
 
-  // The symbol table. `index` counts all entries from 0; positions are positions in its contents.
+  /// The symbol table. `index` counts all entries from 0; positions are positions in its contents.
   virtual bool reportSymbolTableTooShort(const Archive& archive, uint32_t size);
   virtual bool reportSymbolTableCountTooLarge(const Archive& archive, uint32_t size, uint32_t count,
                                               uint64_t required);
@@ -95,11 +95,11 @@ public:
   virtual bool reportSymbolTableTrailingData(const Archive& archive, uint32_t offset,
                                              uint32_t expectedEnd);
 
-  // What the members hold. An empty reason is left out of the text.
+  /// What the members hold. An empty reason is left out of the text.
   virtual bool reportUnreadableMemberSymbols(const Archive& archive, const ArchiveMember& member,
                                              std::string_view reason);
 
-  // Minor variants. With several base variants, `baseVariants` are those alone.
+  /// Minor variants. With several base variants, `baseVariants` are those alone.
   virtual bool reportNoBaseVariant(const Archive& archive, MinorVariantGroup group);
   virtual bool reportMultipleBaseVariants(const Archive& archive, MinorVariantGroup baseVariants);
   virtual bool reportUndecoratableDifference(const Archive& archive, const ArchiveMember& member,

@@ -16,12 +16,12 @@
 namespace arlib {
 
 struct FileProbe {
-  support::HostError statusError = 0; // why the host told nothing, or 0
+  support::HostError statusError = 0; ///< why the host told nothing, or 0
   support::FileStatus status;
   std::array<uint8_t, elfext::RecognizedBytes> bytes = {};
-  uint32_t byteCount = 0; // 0 also for a file that can't be opened
-  // Of a regular file. One that can't be opened now is tried again when its bytes are wanted, and
-  // tells why then.
+  uint32_t byteCount = 0; ///< 0 also for a file that can't be opened
+  /// Of a regular file. One that can't be opened now is tried again when its bytes are wanted, and
+  /// tells why then.
   std::shared_ptr<support::SourceFile> file;
 
   [[nodiscard]] std::span<const uint8_t> getFirstBytes() const {
@@ -29,21 +29,21 @@ struct FileProbe {
   }
   [[nodiscard]] bool exists() const { return status.kind != support::FileKind::Nothing; }
 
-  // Whether the file begins as an archive does.
+  /// Whether the file begins as an archive does.
   [[nodiscard]] bool hasArchiveMagic() const;
 
-  // Why the file can't become a member: 0, or the error number to report. It must be a regular
-  // file, and the numbers that go in the header must not be negative as signed 32-bit values.
+  /// Why the file can't become a member: 0, or the error number to report. It must be a regular
+  /// file, and the numbers that go in the header must not be negative as signed 32-bit values.
   [[nodiscard]] support::HostError getRefusal() const;
 };
 
-// Opens regular files only: looking at a device or a FIFO could have effects, or wait.
+/// Opens regular files only: looking at a device or a FIFO could have effects, or wait.
 [[nodiscard]] FileProbe probeFile(support::SourceFiles& files, const char* fileName);
 
-// The same without the first bytes.
+/// The same without the first bytes.
 [[nodiscard]] FileProbe openProbe(support::SourceFiles& files, const char* fileName);
 
-// What may be said of a file's status alone, as FileProbe::getRefusal does.
+/// What may be said of a file's status alone, as FileProbe::getRefusal does.
 [[nodiscard]] support::HostError refusalOf(const support::FileStatus& status);
 
 } // namespace arlib

@@ -15,7 +15,7 @@ namespace arlib {
   return static_cast<unsigned char>(support::lowered(character));
 }
 
-// Below, above or equal to 0.
+/// Below, above or equal to 0.
 [[nodiscard]] constexpr int compareIgnoringCase(std::string_view left, std::string_view right) {
   const size_t common = std::min(left.size(), right.size());
   for (size_t i = 0; i < common; ++i) {
