@@ -324,26 +324,59 @@ public:
 
   // ---- Symbols
   //
-  // Four categories, each static and dynamic. The name may be null; type, binding and visibility
-  // are those of st_info and st_other.
+  // Four categories, each static and dynamic.
+
+  /// What a new symbol is. The name may be null; type, binding and visibility are those of st_info
+  /// and st_other. The value is an offset in its section for a hosted one, which has a section, and
+  /// the alignment for a common one.
+  struct NewSymbol {
+    Symbol::Category category;
+    bool isDynamic;
+    const char* name;
+    uint64_t value;
+    uint32_t type;
+    uint32_t binding;
+    uint32_t visibility;
+    Section* section = nullptr;
+  };
+  /// The one way in which symbols come to be; the next eight say the category and the table.
+  Symbol* createSymbol(const NewSymbol& info);
 
   Symbol* createHostedSymbol(const char* name, uint64_t offset, uint32_t type, uint32_t binding,
-                             uint32_t visibility, Section* section);
+                             uint32_t visibility, Section* section) {
+    return createSymbol(
+        {Symbol::Category_Hosted, false, name, offset, type, binding, visibility, section});
+  }
   Symbol* createAbsoluteSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
-                               uint32_t visibility);
-  /// The value is the alignment.
+                               uint32_t visibility) {
+    return createSymbol({Symbol::Category_Absolute, false, name, value, type, binding, visibility});
+  }
   Symbol* createCommonSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
-                             uint32_t visibility);
+                             uint32_t visibility) {
+    return createSymbol({Symbol::Category_Common, false, name, value, type, binding, visibility});
+  }
   Symbol* createUndefinedSymbol(const char* name, uint64_t value, uint32_t type, uint32_t binding,
-                                uint32_t visibility);
+                                uint32_t visibility) {
+    return createSymbol(
+        {Symbol::Category_Undefined, false, name, value, type, binding, visibility});
+  }
   Symbol* createHostedDynamicSymbol(const char* name, uint64_t offset, uint32_t type,
-                                    uint32_t binding, uint32_t visibility, Section* section);
+                                    uint32_t binding, uint32_t visibility, Section* section) {
+    return createSymbol(
+        {Symbol::Category_Hosted, true, name, offset, type, binding, visibility, section});
+  }
   Symbol* createAbsoluteDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                      uint32_t binding, uint32_t visibility);
+                                      uint32_t binding, uint32_t visibility) {
+    return createSymbol({Symbol::Category_Absolute, true, name, value, type, binding, visibility});
+  }
   Symbol* createCommonDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                    uint32_t binding, uint32_t visibility);
+                                    uint32_t binding, uint32_t visibility) {
+    return createSymbol({Symbol::Category_Common, true, name, value, type, binding, visibility});
+  }
   Symbol* createUndefinedDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                       uint32_t binding, uint32_t visibility);
+                                       uint32_t binding, uint32_t visibility) {
+    return createSymbol({Symbol::Category_Undefined, true, name, value, type, binding, visibility});
+  }
   /// Room for so many more.
   void reserveSymbols(uint32_t count);
   void reserveDynamicSymbols(uint32_t count);
@@ -505,13 +538,6 @@ private:
   friend class Section;
   friend class Symbol;
 
-  struct SymbolInfo {
-    const char* name;
-    uint32_t type;
-    uint32_t binding;
-    uint32_t visibility;
-    bool isDynamic;
-  };
   struct OptionalValue {
     uint64_t value = 0;
     bool exists = false;
@@ -543,9 +569,6 @@ private:
 
   template <class SectionClass, class... Arguments>
   SectionClass* makeSection(const char* name, Arguments... arguments);
-  Symbol* makeSymbol(const SymbolInfo& info, Symbol::Category category, Section* section,
-                     uint64_t word);
-  Symbol* makeHostedSymbol(const SymbolInfo& info, uint64_t offset, Section* section);
   template <class Object, class... Arguments>
   Object* makeListed(FastArray<Object*>& list, Arguments... arguments);
   void noteComdatGroup(Group* group);

@@ -193,73 +193,24 @@ FastArray<Symbol*>& ObjectModule::getCategoryList(Symbol::Category category, boo
 }
 
 // A new symbol is in its table but in no other list yet.
-Symbol* ObjectModule::makeSymbol(const SymbolInfo& info, Symbol::Category category,
-                                 Section* section, uint64_t word) {
+Symbol* ObjectModule::createSymbol(const NewSymbol& info) {
   QUARN_ASSERT(1, !m_IndexesFrozen);
+  Section* section = info.section;
+  if (info.category == Symbol::Category_Hosted) {
+    QUARN_ASSERT(1, section != NULL);
+    QUARN_ASSERT(1, section->m_ObjectModule == this);
+  }
   auto* symbol = alloclib::create<Symbol>(getObjectRegion(), this, keepText(info.name), info.type,
                                           info.binding, info.visibility, info.isDynamic);
   FastArray<Symbol*>& table = info.isDynamic ? m_DynamicSymbols : m_Symbols;
   table.append(symbol);
   symbol->m_Index = table.getSize();
-  symbol->m_Category = category;
+  symbol->m_Category = info.category;
   symbol->m_Section = section;
-  symbol->m_Word = word;
+  symbol->m_Word = info.value;
   symbol->joinList();
   symbol->markChanged();
   return symbol;
-}
-
-Symbol* ObjectModule::makeHostedSymbol(const SymbolInfo& info, uint64_t offset, Section* section) {
-  QUARN_ASSERT(1, section != NULL);
-  QUARN_ASSERT(1, section->m_ObjectModule == this);
-  return makeSymbol(info, Symbol::Category_Hosted, section, offset);
-}
-
-Symbol* ObjectModule::createHostedSymbol(const char* name, uint64_t offset, uint32_t type,
-                                         uint32_t binding, uint32_t visibility, Section* section) {
-  return makeHostedSymbol({name, type, binding, visibility, false}, offset, section);
-}
-
-Symbol* ObjectModule::createAbsoluteSymbol(const char* name, uint64_t value, uint32_t type,
-                                           uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, false}, Symbol::Category_Absolute, nullptr,
-                    value);
-}
-
-Symbol* ObjectModule::createCommonSymbol(const char* name, uint64_t value, uint32_t type,
-                                         uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, false}, Symbol::Category_Common, nullptr,
-                    value);
-}
-
-Symbol* ObjectModule::createUndefinedSymbol(const char* name, uint64_t value, uint32_t type,
-                                            uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, false}, Symbol::Category_Undefined, nullptr,
-                    value);
-}
-
-Symbol* ObjectModule::createHostedDynamicSymbol(const char* name, uint64_t offset, uint32_t type,
-                                                uint32_t binding, uint32_t visibility,
-                                                Section* section) {
-  return makeHostedSymbol({name, type, binding, visibility, true}, offset, section);
-}
-
-Symbol* ObjectModule::createAbsoluteDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                                  uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, true}, Symbol::Category_Absolute, nullptr,
-                    value);
-}
-
-Symbol* ObjectModule::createCommonDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                                uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, true}, Symbol::Category_Common, nullptr,
-                    value);
-}
-
-Symbol* ObjectModule::createUndefinedDynamicSymbol(const char* name, uint64_t value, uint32_t type,
-                                                   uint32_t binding, uint32_t visibility) {
-  return makeSymbol({name, type, binding, visibility, true}, Symbol::Category_Undefined, nullptr,
-                    value);
 }
 
 // ---- The other lists

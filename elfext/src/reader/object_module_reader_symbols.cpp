@@ -9,32 +9,16 @@ namespace {
 
 Symbol* createSymbol(ReadContext& context, const SymbolTable& table, const char* strings,
                      const SymbolRow& row, const SymbolHome& home) {
-  ObjectModule& module = context.module;
-  const char* name = row.name == 0 ? nullptr : strings + row.name;
-  const uint32_t type = row.getType();
-  const uint32_t binding = row.getBinding();
-  const uint32_t visibility = row.other & 0x3U;
-  const bool isDynamic = table.isDynamic;
-  switch (home.category) {
-  case Symbol::Category_Absolute:
-    return isDynamic
-               ? module.createAbsoluteDynamicSymbol(name, row.value, type, binding, visibility)
-               : module.createAbsoluteSymbol(name, row.value, type, binding, visibility);
-  case Symbol::Category_Common:
-    return isDynamic ? module.createCommonDynamicSymbol(name, row.value, type, binding, visibility)
-                     : module.createCommonSymbol(name, row.value, type, binding, visibility);
-  case Symbol::Category_Undefined:
-    return isDynamic
-               ? module.createUndefinedDynamicSymbol(name, row.value, type, binding, visibility)
-               : module.createUndefinedSymbol(name, row.value, type, binding, visibility);
-  case Symbol::Category_Hosted:
-    break;
-  }
-  Section* section = module.getSection(home.section);
-  const uint64_t offset = context.placeInHome(row, home);
-  return isDynamic
-             ? module.createHostedDynamicSymbol(name, offset, type, binding, visibility, section)
-             : module.createHostedSymbol(name, offset, type, binding, visibility, section);
+  const bool isHosted = home.category == Symbol::Category_Hosted;
+  return context.module.createSymbol(
+      {.category = home.category,
+       .isDynamic = table.isDynamic,
+       .name = row.name == 0 ? nullptr : strings + row.name,
+       .value = isHosted ? context.placeInHome(row, home) : row.value,
+       .type = row.getType(),
+       .binding = row.getBinding(),
+       .visibility = row.other & 0x3U,
+       .section = isHosted ? context.module.getSection(home.section) : nullptr});
 }
 
 void createSymbolsOf(ReadContext& context, const SymbolTable& table) {
