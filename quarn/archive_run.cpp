@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The road of one archive, from the first look at its name to the last byte written.
 #include "quarn/archive_run.h"
 
 #include "arlib/interface/archive.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Each failure of the archive library as a message of the catalogue. What it answers decides
+// whether the library goes on: what is wrong with an archive in small things is a warning, and the
+// run goes on; what would lose members or write wrong ones is an error, and keeps the old file.
 #include "quarn/arlib_error_handler.h"
 
 #include "arlib/interface/archive.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The texts of --help and --vsn, which are also those of a command line that asks for nothing.
 #include "quarn/banner.h"
 
 #include "messages/interface/messages.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What the tool says of itself, where there is nothing to do or help was asked for.
 #pragma once
 
 namespace quarn {

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Only the leaf of a word may be a pattern: its directory is taken as it stands. Order is that of
+// the bytes of the names, not that of the host's directory, so that a run gives the same archive on
+// every machine.
 #include "quarn/file_list.h"
 
 #include "support/interface/host_files.h"

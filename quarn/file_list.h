@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Which files the words of a command line mean. Shells expand patterns before the tool sees them;
+// this is for words in quotes, in via files, and for hosts whose shells don't.
 #pragma once
 
 #include "support/interface/host.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A date is broken down by the host's time zone once, and then found again: members of a library
+// mostly have the same few dates, and the break-down is what a long listing would spend its time
+// on. A date that the host can't break down is shown as an empty text.
 #include "quarn/local_dates.h"
 
 #include <ctime>

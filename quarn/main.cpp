@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The program: the host's real files, and clean-up on signals from the first moment on. All else is
+// a library, so that tests can run it on other hosts.
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
 

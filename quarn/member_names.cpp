@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Sorted once by name, ignoring the case of ASCII letters, and by position among equals: a run with
+// 10,000 words looks each up in a few steps. A library may hold one name thousands of times, and
+// each replacement takes the next of them, so how many are done with is kept at the first.
 #include "quarn/member_names.h"
 
 #include "arlib/interface/name_order.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// How a word is matched with a member's name: by the leaf alone, cut to what a host's path
+// component can hold, so that a name in an archive can't be made to match by what stands in front
+// of a slash. A word without wildcards is looked up; only a pattern is held against every member.
 #include "quarn/member_selection.h"
 
 #include "quarn/reporting.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Which options act at once, and on what. All others wait in the table of values.
 #include "quarn/option_listeners.h"
 
 #include "messages/interface/diagnostic_control.h"

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One message of the catalogue for each complaint of the parser; a total switch, so that a new one
+// can't be forgotten. What the user wrote is only ever an argument of a message.
 #include "quarn/option_reporter.h"
 
 #include "quarn/reporting.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The rows are sorted by name, as the look-up by prefix wants them, and the compiler checks that
+// they are. Several rows may lead to one id ("r" and "q" insert); a row's value is what its option
+// stores without an argument, so "no_..." is the same id with another value.
 #include "quarn/option_table.h"
 
 #include "messages/interface/diagnostic_control.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The step from what was written on the command line to what the run is to do.
 #pragma once
 
 #include "quarn/settings.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The driver's work, between the start of the process and its end.
 #pragma once
 
 #include "alloclib/interface/region_general.h"

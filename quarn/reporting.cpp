@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Host errors in words, and the two questions that decide a run's status: was an error counted, and
+// could stdout take what it was given?
 #include "quarn/reporting.h"
 
 #include <cstring>

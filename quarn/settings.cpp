@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One action a run, and an access mode that is only raised: an option that reads can't make a run
+// that writes forget to.
 #include "quarn/settings.h"
 
 #include "checking/interface/checking.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Order matters here: regions before what lives in them, messages before the first word can be
+// wrong, and the way out before anything that may end the run. The session and the driver's region
+// are never destroyed as objects, since a message may end the process from anywhere, with regions
+// in use.
 #include "quarn/start_up.h"
 
 #include "alloclib/interface/region.h"

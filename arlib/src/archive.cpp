@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What an edit does to an archive: to the list of members, and to what is derived from it. An edit
+// only marks; the views that look-ups need are sorted when somebody asks, and the tables are made
+// again by updateAuxiliaryMembers, which a write calls. Forgetting a mark would leave a symbol
+// table whose offsets lead to other members, so which edit makes what stale stands in one table
+// (StaleRows) and nowhere else.
+//
+// Thousands of members go or move in one call: these operations cost one pass over the list,
+// however many members they are given. Members are then looked up by address, in an order that
+// shows nowhere.
 #include "arlib/interface/archive.h"
 
 #include "arlib/interface/archive_format.h"

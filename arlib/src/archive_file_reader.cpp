@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From the bytes of an archive to its members: magic, then for each member header, name, contents
+// and padding, in the order in which a forward reader meets them, since the first failure is the
+// one that is told. Fields and their places are those of archive_format.h.
+//
+// Sizes, offsets and indices are the file's word against ours: each is compared with the bytes that
+// are there before anything rests on it. A member that claims more than the file has, a long name
+// whose index leads out of its table or into the middle of an end, a number field with letters, a
+// second long-name table: each has its report here. No pass is longer than the file, and memory
+// grows with the members that there are, not with those that a header promises.
 #include "arlib/src/archive_file_reader.h"
 
 #include "arlib/interface/archive_file_reader.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A member header's fields, put and got side by side: 60 bytes of text, numbers in decimal (the
+// mode in octal), each filled up with blanks. What is put can always be got again; what is got may
+// have been written by anybody, so a number ends at what is no digit, must fill its field, and must
+// fit in 32 bits.
 #include "arlib/interface/archive_format.h"
 
 #include <algorithm>

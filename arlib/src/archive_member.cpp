@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Where a member's bytes are: in memory, in a file, or in both, and then they are the same. They
+// stay where they are until somebody wants them, and are read through the file that was opened
+// first, so that a name which leads to another file meanwhile does no harm. Tables that were read
+// are never freed before the archive is: names and symbols are views of their bytes.
 #include "arlib/interface/archive_member.h"
 
 #include "arlib/interface/archive.h"

@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What an object member publishes: its outline is read in place, and its names go to the symbol
+// table. Which symbols count is decided here: any definition that is not local, outside debug
+// sections unless they are wanted, with a name.
+//
+// A hostile object lets thousands of symbols share the bytes of one long name. Names are kept as
+// views of one copy, so that they cost no more than the object, and of names that share bytes only
+// a bounded number is read as decoration.
 #include "arlib/interface/archive_member_type.h"
 
 #include "arlib/interface/archive.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A member's bytes in pieces, for who writes, prints or extracts: memory stays the same for a
+// member of a kilobyte and of a gigabyte. A file that somebody writes to meanwhile would give half
+// old and half new bytes, so it is checked when the reader turns to the next file, and at the end.
 #include "arlib/interface/contents_reader.h"
 
 #include "support/interface/read_window.h"

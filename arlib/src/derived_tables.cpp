@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The layout of an archive and its long-name table, which holds each name longer than 15 bytes
+// followed by "/" and a newline, in list order. Sums are in 64 bits; what the format can't hold is
+// refused before anything is allocated for it.
 #include "arlib/src/derived_tables.h"
 
 #include "arlib/interface/archive_format.h"

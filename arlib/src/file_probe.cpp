@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Looks at a file that may become a member: what it is, its numbers, and its first bytes, which
+// decide the member's type. The header has room for 32-bit numbers only, and a directory or a
+// device has no contents to keep, so both are refused here, before the archive has changed.
 #include "arlib/interface/file_probe.h"
 
 #include "arlib/interface/archive_format.h"

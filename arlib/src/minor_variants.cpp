@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Finds the builds of one module, and decorates the names of those that are not the base. Members
+// are compared by a cheap key first and by all of their names only where keys are equal, in sorted
+// order: names can be chosen so that any hash of theirs is equal, and must not make this slow. Nor
+// may names that share their bytes: a member whose names are far longer than itself is compared
+// with none.
 #include "arlib/src/minor_variants.h"
 
 #include "arlib/interface/archive_format.h"

@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The checks of a symbol table: a count, that many offsets, that many names with a NUL each, all in
+// big endian, and nothing behind them. It is walked with two cursors, as offsets and names lie
+// apart.
+//
+// A count that promises more than there is, names without an end, offsets in the middle of a
+// member: each ends the read or is told by its index. Each entry costs one look-up at most, so that
+// a table of entries which all lead nowhere takes no longer than a good one.
 #include "arlib/src/read_symbol_table.h"
 
 #include "arlib/interface/archive_format.h"

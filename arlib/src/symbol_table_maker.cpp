@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The order of the table is the order in which a linker finds a name: builds of one module first,
+// each with its decoration, then all other members in file order. An object that can't be read is
+// told of and publishes nothing; it stays a member, and the others are published as ever.
 #include "arlib/src/symbol_table_maker.h"
 
 #include "arlib/interface/archive_format.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Reads a table's bytes from memory or through a window of the file, so that a table of many
+// megabytes need not be held. A name may cross from one piece to the next, and may be as long as
+// the table.
 #include "arlib/src/table_cursor.h"
 
 #include "checking/interface/checking.h"

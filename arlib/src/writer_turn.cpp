@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Takes turns at an archive by a lock on its file. The name is looked at again when the lock has
+// come: who had the turn before has put a new file in its place, and the lock on the old one is
+// worth nothing.
 #include "arlib/interface/writer_turn.h"
 
 #include "support/interface/host_files.h"

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Questions about files that are more than one call of the host: kinds, times, and the search for
+// files by a pattern, sorted by name because hosts list directories in any order.
 #include "support/interface/host_files.h"
 
 #include "support/interface/pattern.h"

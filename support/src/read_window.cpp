@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One buffer over a file, refilled where somebody looks. Whoever walks forward in small steps gets
+// large reads; whoever jumps gets no more than he asked for, since what lies between is not wanted.
 #include "support/interface/read_window.h"
 
 #include <algorithm>
