@@ -80,7 +80,7 @@ void Extraction::operator()(ArchiveMember& member) {
 // False if the member could not be read, or changed meanwhile, which has been reported. A failed
 // write ends the copy.
 bool Extraction::copy(const ArchiveMember& member, support::FileHandle file, int& writeError) {
-  if (!m_Contents.begin(member)) return false;
+  if (!m_Contents.start(member)) return false;
   while (writeError == 0) {
     std::span<const uint8_t> piece;
     if (!m_Contents.read(piece)) return false;
@@ -112,7 +112,7 @@ public:
 
   void operator()(ArchiveMember& member) override {
     verboseMessage(m_Settings, messages::PrintedMember, member.getName());
-    if (!m_Contents.begin(member)) return;
+    if (!m_Contents.start(member)) return;
     std::span<const uint8_t> piece;
     while (m_Contents.read(piece) && !piece.empty()) {
       messages::writeRaw({reinterpret_cast<const char*>(piece.data()), piece.size()});

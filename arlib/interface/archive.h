@@ -210,7 +210,7 @@ public:
 
   /// The same for a failure that ends the operation whatever the handler says. Always false.
   template <class... P, class... A>
-  bool end(bool (ErrorHandler::*operation)(const Archive&, P...), A&&... details) const {
+  bool stop(bool (ErrorHandler::*operation)(const Archive&, P...), A&&... details) const {
     static_cast<void>(goOn(operation, std::forward<A>(details)...));
     return false;
   }

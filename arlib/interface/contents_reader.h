@@ -27,14 +27,14 @@ public:
   ContentsReader& operator=(const ContentsReader&) = delete;
 
   /// Turns to a member. False after a report.
-  [[nodiscard]] bool begin(const ArchiveMember& member);
+  [[nodiscard]] bool start(const ArchiveMember& member);
 
   /// The next piece; empty at the end of the member. It holds until the next call. False after a
   /// report.
   [[nodiscard]] bool read(std::span<const uint8_t>& piece);
 
   /// Makes sure that the file of the members read so far was not written to meanwhile: what came of
-  /// them could be old in one place and new in another. `begin` does so where it turns to another
+  /// them could be old in one place and new in another. `start` does so where it turns to another
   /// file. False after a report.
   bool finish();
 

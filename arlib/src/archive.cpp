@@ -193,13 +193,13 @@ support::SourceFile* Archive::hold(const std::shared_ptr<support::SourceFile>& f
 bool Archive::checkOwnFile() {
   if (m_OwnFile == nullptr) return true;
   const int error = m_OwnFile->checkUnchanged();
-  return error == 0 || end(&ErrorHandler::reportReadError, m_OwnFile->getName(), error);
+  return error == 0 || stop(&ErrorHandler::reportReadError, m_OwnFile->getName(), error);
 }
 
 int Archive::reportCloseErrors() {
   std::string name;
   const int error = m_SourceFiles.takeCloseError(name);
-  if (error != 0) end(&ErrorHandler::reportCloseError, name.c_str(), error);
+  if (error != 0) stop(&ErrorHandler::reportCloseError, name.c_str(), error);
   return error;
 }
 

@@ -49,7 +49,7 @@ bool readFile(const std::shared_ptr<support::SourceFile>& file, Archive& archive
   return ArchiveFileReader(archive).read(file);
 }
 
-void ArchiveFileReader::begin(const char* fileName) {
+void ArchiveFileReader::start(const char* fileName) {
   m_Archive.clear();
   m_Archive.setFileName(fileName);
   m_Archive.m_ReadOnly = false;
@@ -57,20 +57,20 @@ void ArchiveFileReader::begin(const char* fileName) {
 }
 
 bool ArchiveFileReader::read(const char* fileName) {
-  begin(fileName);
+  start(fileName);
   // A device or a socket is not even opened: that could have effects, or fail in words of its own.
   if (support::fileKind(m_Host, fileName) == support::FileKind::Special) {
-    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, EINVAL);
+    return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, EINVAL);
   }
   if (const int error = m_Archive.m_SourceFiles.open(fileName, m_File); error != 0) {
-    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
   return readTables();
 }
 
 bool ArchiveFileReader::read(const std::shared_ptr<support::SourceFile>& file) {
   m_File = file;
-  begin(file->getName());
+  start(file->getName());
   return readTables();
 }
 
@@ -87,14 +87,14 @@ bool ArchiveFileReader::readTables() {
 // Headers of one state of the file and tables of another would name wrong members.
 bool ArchiveFileReader::checkUnchanged() {
   const int error = m_File->checkUnchanged();
-  return error == 0 || m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+  return error == 0 || m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
 }
 
 bool ArchiveFileReader::readOpenFile() {
   m_Status = m_File->getStatus();
   if (m_Status.kind != support::FileKind::RegularFile) {
     const int error = m_Status.kind == support::FileKind::Directory ? EISDIR : EINVAL;
-    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
   m_Window.setFile(m_File.get());
   return readMagic() && readMembers();
@@ -104,10 +104,10 @@ bool ArchiveFileReader::readMagic() {
   int error = 0;
   const std::string_view magic = asText(m_Window.fetch(0, ArchiveMagic.size(), error));
   if (magic.size() < ArchiveMagic.size()) {
-    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
   if (magic == ArchiveMagic) return true;
-  return m_Archive.end(&ErrorHandler::reportBadArchiveMagic);
+  return m_Archive.stop(&ErrorHandler::reportBadArchiveMagic);
 }
 
 bool ArchiveFileReader::readMembers() {
@@ -151,12 +151,12 @@ ArchiveFileReader::Pass ArchiveFileReader::readHeader() {
   const std::span<const uint8_t> bytes =
       m_Window.fetch(m_Offset, MemberHeaderSize + elfext::RecognizedBytes, error);
   if (error != 0) {
-    m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+    m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
     return Pass::Failure;
   }
   if (bytes.empty()) return Pass::End;
   if (bytes.size() < MemberHeaderSize) {
-    m_Archive.end(&ErrorHandler::reportTruncatedMemberHeader, m_Offset);
+    m_Archive.stop(&ErrorHandler::reportTruncatedMemberHeader, m_Offset);
     return Pass::Failure;
   }
   std::memcpy(m_HeaderBytes, bytes.data(), MemberHeaderSize);
@@ -190,7 +190,7 @@ bool ArchiveFileReader::parseNumber(HeaderField which, uint32_t base, FieldRepor
 bool ArchiveFileReader::parseSize() {
   const std::string_view text = field(SizeField);
   if (parseHeaderNumber(text, 10, SizeField.width, m_Numbers.size)) return true;
-  return m_Archive.end(&ErrorHandler::reportBadSize, m_Offset, untilNul(text));
+  return m_Archive.stop(&ErrorHandler::reportBadSize, m_Offset, untilNul(text));
 }
 
 bool ArchiveFileReader::parseName(std::string_view& name) {
@@ -250,7 +250,7 @@ bool ArchiveFileReader::checkHostFile() {
   m_HostFileIsChecked = true;
   const int error = refusalOf(m_Status);
   if (error == 0) return true;
-  return m_Archive.end(&ErrorHandler::reportReadError, m_File->getName(), error);
+  return m_Archive.stop(&ErrorHandler::reportReadError, m_File->getName(), error);
 }
 
 ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
@@ -287,7 +287,7 @@ bool ArchiveFileReader::takeAuxiliaryContents(ArchiveMember* member) {
   size_t done = 0;
   const int error = m_File->readAt(bytes, m_Offset + MemberHeaderSize, done);
   if (error != 0 || done < m_Numbers.size) {
-    return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+    return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
   if (member == m_Archive.m_FileNameTable) {
     m_LongNames = asText(bytes);
@@ -302,7 +302,7 @@ bool ArchiveFileReader::skipContents() {
   if (m_Offset + MemberHeaderSize + m_Numbers.size <= static_cast<uint64_t>(m_Status.size)) {
     return true;
   }
-  return m_Archive.end(&ErrorHandler::reportReadError, nullptr, 0);
+  return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, 0);
 }
 
 bool ArchiveFileReader::skipPadding() {
@@ -312,7 +312,7 @@ bool ArchiveFileReader::skipPadding() {
   // The next header comes along, as it will be wanted next.
   const std::span<const uint8_t> bytes =
       m_Window.fetch(offset, 1 + MemberHeaderSize + elfext::RecognizedBytes, error);
-  if (bytes.empty()) return m_Archive.end(&ErrorHandler::reportReadError, nullptr, error);
+  if (bytes.empty()) return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   if (bytes[0] == PaddingByte) return true;
   return m_Archive.goOn(&ErrorHandler::reportBadPadding, offset, static_cast<int8_t>(bytes[0]));
 }

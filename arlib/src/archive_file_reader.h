@@ -30,7 +30,7 @@ private:
 
   enum class Pass { Member, End, Failure };
 
-  void begin(const char* fileName);
+  void start(const char* fileName);
   bool readOpenFile();
   bool readTables();
   bool readMagic();

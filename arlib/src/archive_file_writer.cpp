@@ -206,7 +206,7 @@ int ArchiveFileWriter::writeHeader(GatheringOutput& output, const ArchiveMember&
 }
 
 bool ArchiveFileWriter::writeContents(GatheringOutput& output, const ArchiveMember& member) {
-  if (!m_Contents.begin(member)) return failToWrite(m_Contents.getError());
+  if (!m_Contents.start(member)) return failToWrite(m_Contents.getError());
   for (;;) {
     std::span<const uint8_t> piece;
     if (!m_Contents.read(piece)) return failToWrite(m_Contents.getError());

@@ -36,7 +36,7 @@ bool ContentsReader::failToRead(int error) {
   return m_Archive.fail(&ErrorHandler::reportReadError, m_File->getName(), error);
 }
 
-bool ContentsReader::begin(const ArchiveMember& member) {
+bool ContentsReader::start(const ArchiveMember& member) {
   m_Remaining = member.getSize();
   m_Memory = nullptr;
   if (member.hasContents()) {

@@ -16,7 +16,7 @@ namespace arlib {
 namespace {
 
 bool failToRead(const Archive& archive, const TableCursor& cursor) {
-  return archive.end(&ErrorHandler::reportReadError, nullptr, cursor.getError());
+  return archive.stop(&ErrorHandler::reportReadError, nullptr, cursor.getError());
 }
 
 } // namespace
@@ -48,14 +48,14 @@ bool ReadSymbolTable::check(const Archive& archive) {
 // small size.
 bool ReadSymbolTable::checkCount(const Archive& archive) {
   const auto size = static_cast<uint32_t>(m_Source.size);
-  if (size < CountSize) return archive.end(&ErrorHandler::reportSymbolTableTooShort, size);
+  if (size < CountSize) return archive.stop(&ErrorHandler::reportSymbolTableTooShort, size);
   TableCursor cursor(m_Source, 0);
   const std::optional<uint32_t> count = cursor.takeWord();
   if (!count) return failToRead(archive, cursor);
   m_Count = *count;
   const uint64_t required = getNamesStart();
   if (size >= required) return true;
-  return archive.end(&ErrorHandler::reportSymbolTableCountTooLarge, size, m_Count, required);
+  return archive.stop(&ErrorHandler::reportSymbolTableCountTooLarge, size, m_Count, required);
 }
 
 bool ReadSymbolTable::checkEntries(const Archive& archive, TableCursor& names) {
@@ -63,7 +63,7 @@ bool ReadSymbolTable::checkEntries(const Archive& archive, TableCursor& names) {
   for (uint32_t i = 0; i < m_Count; ++i) {
     const std::optional<std::string_view> name = names.takeName();
     if (!name && names.hasFailed()) return failToRead(archive, names);
-    if (!name) return archive.end(&ErrorHandler::reportSymbolNameUnterminated, i, m_Count);
+    if (!name) return archive.stop(&ErrorHandler::reportSymbolNameUnterminated, i, m_Count);
     const std::optional<uint32_t> offset = offsets.takeWord();
     if (!offset) return failToRead(archive, offsets);
     if (!checkEntry(archive, i, *name, *offset)) return false;

@@ -21,7 +21,7 @@ constexpr Corpus Corpora[] = {
 
 } // namespace
 
-std::span<const Corpus> allCorpora() {
+std::span<const Corpus> getAllCorpora() {
   return Corpora;
 }
 

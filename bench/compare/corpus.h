@@ -31,7 +31,7 @@ struct Corpus {
   uint64_t bytes;             // of all objects together, about
 };
 
-std::span<const Corpus> allCorpora();
+std::span<const Corpus> getAllCorpora();
 
 // Null if there is none of this name.
 const Corpus* findCorpus(std::string_view name);

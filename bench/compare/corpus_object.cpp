@@ -138,7 +138,7 @@ private:
   uint32_t addSectionSymbol(uint32_t section) {
     return addLocal({.section = static_cast<uint16_t>(section), .type = STT_SECTION});
   }
-  [[nodiscard]] uint32_t absoluteType() const { return m_Corpus.isWide ? 257 : 2; }
+  [[nodiscard]] uint32_t getAbsoluteType() const { return m_Corpus.isWide ? 257 : 2; }
 
   const Corpus& m_Corpus;
   uint32_t m_Module;
@@ -217,7 +217,7 @@ void ObjectMaker::appendFunction(Code& code, const std::string& name, uint8_t bi
   if (!code.isMarked) addLocal({.name = "$d", .section = section, .value = start + size - 4});
   for (uint64_t place = start; place < start + size; place += m_Corpus.codePerRelocation) {
     const uint32_t symbol = 1 + m_Shape.below(static_cast<uint32_t>(m_Locals.size()));
-    code.relocations.push_back({.offset = place, .symbol = symbol, .type = absoluteType()});
+    code.relocations.push_back({.offset = place, .symbol = symbol, .type = getAbsoluteType()});
   }
   code.bytes += m_Contents.bytes(size);
   m_Globals.push_back({.name = name,
@@ -294,7 +294,7 @@ void ObjectMaker::addDebugSection(const DebugSection& row, uint32_t bytes, uint3
   for (uint32_t i = 0; i < relocations; ++i)
     rows.push_back({.offset = uint64_t{i} * distance,
                     .symbol = i % 4 == 0 ? m_TextSymbol : sectionSymbol,
-                    .type = absoluteType()});
+                    .type = getAbsoluteType()});
   addRelocations(row.name, section, 0, rows);
 }
 

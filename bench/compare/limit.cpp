@@ -38,8 +38,8 @@ constexpr uint64_t RoomForFiles = 64 * 1024 * 1024;
 
 // The window is on the library's file. What it holds is read in one piece.
 ObjectPlace placeOf(const InputFile& library, Window& window, const Member& member) {
-  ObjectPlace place = {&library, member.contentsOffset(), {}};
-  if (window.holds(member.size())) place.whole = window.at(place.offset, member.size());
+  ObjectPlace place = {&library, member.getContentsOffset(), {}};
+  if (window.holds(member.getSize())) place.whole = window.at(place.offset, member.getSize());
   return place;
 }
 
@@ -52,7 +52,7 @@ public:
   }
 
   void publish(Member& member) { member.isOld() ? publishOld(member) : publishFile(member); }
-  [[nodiscard]] const PublishedNames& names() const { return m_Names; }
+  [[nodiscard]] const PublishedNames& getNames() const { return m_Names; }
 
 private:
   void publishOld(const Member& member) {
@@ -62,11 +62,11 @@ private:
   void publishFile(Member& member) {
     const InputFile file(member.path);
     describe(member, file);
-    if (file.size() <= SmallFile && m_Kept + file.size() <= RoomForFiles) {
-      const auto& room = m_Files.emplace_back(makeRoom(file.size()));
-      file.read(room.get(), 0, file.size());
-      m_Kept += file.size();
-      member.kept = {room.get(), file.size()};
+    if (file.getSize() <= SmallFile && m_Kept + file.getSize() <= RoomForFiles) {
+      const auto& room = m_Files.emplace_back(makeRoom(file.getSize()));
+      file.read(room.get(), 0, file.getSize());
+      m_Kept += file.getSize();
+      member.kept = {room.get(), file.getSize()};
     }
     publishNames({&file, 0, member.kept}, m_Buffers, m_Names);
   }
@@ -83,7 +83,7 @@ void writeWithTable(const std::string& path, std::vector<Member>& members, const
   Publisher publisher(old);
   for (Member& member : members)
     publisher.publish(member);
-  writeLibrary(path, members, &publisher.names(), old);
+  writeLibrary(path, members, &publisher.getNames(), old);
 }
 
 std::vector<Member> membersFromFiles(const Words& files) {
@@ -171,7 +171,7 @@ void listLong(const std::string& path, const Words&) {
     output.putNumber(headerNumber(member.header, arlib::UidField), 6);
     output.put('/');
     output.putNumber(headerNumber(member.header, arlib::GidField), 6);
-    output.putNumber(member.size(), 7);
+    output.putNumber(member.getSize(), 7);
     output.put(' ');
     output.put(date.of(headerNumber(member.header, arlib::DateField)));
     output.put(' ');
@@ -187,12 +187,12 @@ void extract(const std::string& path, const Words&) {
   const CheckedLibrary library(path);
   Window window(library.file);
   for (const Member& member : library.members) {
-    const bool isSmall = window.holds(member.size());
+    const bool isSmall = window.holds(member.getSize());
     OutputFile output(member.name, isSmall ? 0 : BufferSize);
     if (isSmall)
-      output.put(window.at(member.contentsOffset(), member.size()));
+      output.put(window.at(member.getContentsOffset(), member.getSize()));
     else
-      output.copy(library.file, member.contentsOffset(), member.size());
+      output.copy(library.file, member.getContentsOffset(), member.getSize());
     output.flush();
   }
 }

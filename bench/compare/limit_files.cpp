@@ -44,7 +44,7 @@ void InputFile::read(char* place, uint64_t offset, size_t count) const {
 std::string_view Window::at(uint64_t offset, size_t count) {
   if (offset < m_Start || offset + count > m_Start + m_Filled) {
     m_Start = offset;
-    m_Filled = std::min<uint64_t>(m_Size, m_File.size() - offset);
+    m_Filled = std::min<uint64_t>(m_Size, m_File.getSize() - offset);
     m_File.read(m_Bytes.get(), offset, m_Filled);
     if (count > m_Filled) fail("unexpected end");
   }

@@ -31,8 +31,8 @@ public:
   InputFile(const InputFile&) = delete;
   InputFile& operator=(const InputFile&) = delete;
 
-  [[nodiscard]] const struct stat& status() const { return m_Status; }
-  [[nodiscard]] uint64_t size() const { return static_cast<uint64_t>(m_Status.st_size); }
+  [[nodiscard]] const struct stat& getStatus() const { return m_Status; }
+  [[nodiscard]] uint64_t getSize() const { return static_cast<uint64_t>(m_Status.st_size); }
 
   // Fills the place with bytes that must be there.
   void read(char* place, uint64_t offset, size_t count) const;

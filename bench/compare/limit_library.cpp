@@ -72,7 +72,7 @@ std::string symbolTable(const std::vector<Member>& members, const PublishedNames
   for (size_t i = 0; i < members.size(); ++i) {
     for (uint32_t left = names.counts[i]; left > 0; --left)
       putBigEndian32(place += 4, static_cast<uint32_t>(offset));
-    offset += spaceOf(members[i].size());
+    offset += spaceOf(members[i].getSize());
   }
   return table;
 }
@@ -120,13 +120,13 @@ void LibraryWriter::putOldMember(const Member& member, std::string_view nameFiel
   MemberHeader header = member.header;
   setNameField(header, nameField);
   if (header == member.header && member.offset == m_RangeEnd) {
-    m_RangeEnd = member.end();
+    m_RangeEnd = member.getEnd();
     return;
   }
   copyRange();
   m_Output.put(textOf(header));
-  m_RangeStart = member.contentsOffset();
-  m_RangeEnd = member.end();
+  m_RangeStart = member.getContentsOffset();
+  m_RangeEnd = member.getEnd();
 }
 
 void LibraryWriter::putFile(Member& member, std::string_view nameField) {
@@ -135,10 +135,10 @@ void LibraryWriter::putFile(Member& member, std::string_view nameField) {
   setNameField(member.header, nameField);
   m_Output.put(textOf(member.header));
   if (file)
-    m_Output.copy(*file, 0, file->size());
+    m_Output.copy(*file, 0, file->getSize());
   else
     m_Output.put(member.kept);
-  putPadding(member.size());
+  putPadding(member.getSize());
 }
 
 void LibraryWriter::putPadding(uint64_t size) {
@@ -167,17 +167,17 @@ Library::Library(const std::string& path) : file(path) {
   Window window(file, HeaderWindow);
   std::string longNames;
   Member member;
-  for (uint64_t offset = ArchiveMagic.size(); offset < file.size(); offset = member.end()) {
+  for (uint64_t offset = ArchiveMagic.size(); offset < file.getSize(); offset = member.getEnd()) {
     const std::string_view header = window.at(offset, MemberHeaderSize);
     std::copy(header.begin(), header.end(), member.header.begin());
     member.offset = offset;
     const std::string_view field = header.substr(0, NameField.width);
     if (field == SymbolTableName) {
-      m_SymbolTableOffset = member.contentsOffset();
-      m_SymbolTableSize = member.size();
+      m_SymbolTableOffset = member.getContentsOffset();
+      m_SymbolTableSize = member.getSize();
     } else if (field == FileNameTableName) {
-      longNames.resize(member.size());
-      file.read(longNames.data(), member.contentsOffset(), longNames.size());
+      longNames.resize(member.getSize());
+      file.read(longNames.data(), member.getContentsOffset(), longNames.size());
     } else {
       const size_t place = field[0] == '/' ? std::strtoul(field.data() + 1, nullptr, 10) : 0;
       const std::string_view text = field[0] == '/' ? longNames : field;
@@ -212,7 +212,7 @@ void Library::checkSymbolTable() const {
   forEachPiece(firstName, m_SymbolTableSize, [&](std::string_view texts) {
     names += static_cast<uint64_t>(std::count(texts.begin(), texts.end(), '\0'));
   });
-  if (largest >= file.size() || names != count) fail("symbol table");
+  if (largest >= file.getSize() || names != count) fail("symbol table");
 }
 
 Member memberFromFile(const std::string& path) {
@@ -220,7 +220,7 @@ Member memberFromFile(const std::string& path) {
 }
 
 void describe(Member& member, const InputFile& file) {
-  const struct stat& status = file.status();
+  const struct stat& status = file.getStatus();
   member.header = makeHeader("", {.date = static_cast<uint32_t>(status.st_mtime),
                                   .uid = status.st_uid,
                                   .gid = status.st_gid,

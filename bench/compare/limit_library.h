@@ -29,9 +29,9 @@ struct Member {
   std::string_view kept = {}; // that file's bytes, if they are in memory
 
   [[nodiscard]] bool isOld() const { return path.empty(); }
-  [[nodiscard]] uint64_t size() const { return headerNumber(header, arlib::SizeField); }
-  [[nodiscard]] uint64_t end() const { return arlib::nextHeaderOffset(offset, size()); }
-  [[nodiscard]] uint64_t contentsOffset() const { return offset + arlib::MemberHeaderSize; }
+  [[nodiscard]] uint64_t getSize() const { return headerNumber(header, arlib::SizeField); }
+  [[nodiscard]] uint64_t getEnd() const { return arlib::nextHeaderOffset(offset, getSize()); }
+  [[nodiscard]] uint64_t getContentsOffset() const { return offset + arlib::MemberHeaderSize; }
 };
 
 struct Library {

@@ -15,7 +15,7 @@
 namespace {
 
 int listCorpora() {
-  for (const bench::Corpus& corpus : bench::allCorpora()) {
+  for (const bench::Corpus& corpus : bench::getAllCorpora()) {
     std::printf("%s %u %u %llu\n", std::string(corpus.name).c_str(), corpus.objects, corpus.builds,
                 static_cast<unsigned long long>(corpus.bytes));
   }

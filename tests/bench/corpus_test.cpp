@@ -64,7 +64,7 @@ TEST_F(CorpusTest, AreTheSameOnEveryMachine) {
                                                          {"variants", 0x8F7EFD98724A40B2},
                                                          {"debug", 0x301C977188FCA6B6},
                                                          {"big", 0x285845EB50646689}};
-  for (const Corpus& corpus : allCorpora())
+  for (const Corpus& corpus : getAllCorpora())
     EXPECT_EQ(hashOf(objectBytes(corpus, 1, 1)), expected.at(corpus.name)) << corpus.name;
 }
 
@@ -74,7 +74,7 @@ TEST_F(CorpusTest, OtherSeedsAndNumbersGiveOtherObjects) {
 }
 
 TEST_F(CorpusTest, AllReadWithoutAComplaint) {
-  for (const Corpus& corpus : allCorpora())
+  for (const Corpus& corpus : getAllCorpora())
     readGood(objectBytes(corpus, 1, 0));
 }
 
@@ -86,7 +86,7 @@ TEST_F(CorpusTest, ScaleIsThePartOfTheObjectsAndNeverNone) {
 }
 
 TEST_F(CorpusTest, AreAboutAsLargeAsTheySay) {
-  for (const Corpus& corpus : allCorpora()) {
+  for (const Corpus& corpus : getAllCorpora()) {
     EXPECT_NEAR(static_cast<double>(estimatedBytes(corpus)) / static_cast<double>(corpus.bytes), 1,
                 0.15)
         << corpus.name;

@@ -203,7 +203,7 @@ TEST(FailingHost, NeverGivesWrongContents) {
       ContentsReader reader(archive);
       std::string text;
       std::span<const uint8_t> piece;
-      isComplete = reader.begin(*archive.getMembers()[3]);
+      isComplete = reader.start(*archive.getMembers()[3]);
       while (isComplete && (isComplete = reader.read(piece)) && !piece.empty())
         text.append(piece.begin(), piece.end());
       if (isComplete) {

@@ -14,7 +14,7 @@ class ContentsReaderTest : public ArchiveTest {
 protected:
   static std::string readAll(ContentsReader& reader, const ArchiveMember& member) {
     std::string text;
-    if (!reader.begin(member)) return "(failed)";
+    if (!reader.start(member)) return "(failed)";
     std::span<const uint8_t> piece;
     do {
       if (!reader.read(piece)) return "(failed)";
@@ -74,11 +74,11 @@ TEST_F(ContentsReaderTest, ReportsEachKindOfFailure) {
   std::span<const uint8_t> piece;
   archive.closeFiles();
   host.failCall(1, EMFILE);
-  EXPECT_TRUE(reader.begin(*added));
+  EXPECT_TRUE(reader.start(*added));
   EXPECT_FALSE(reader.read(piece));
   EXPECT_EQ(reader.getError(), EMFILE);
   host.failCall(3, EIO);
-  EXPECT_TRUE(reader.begin(*added));
+  EXPECT_TRUE(reader.start(*added));
   EXPECT_FALSE(reader.read(piece));
   EXPECT_EQ(reader.getError(), EIO);
   host.failCall(1, EIO);
@@ -119,10 +119,10 @@ TEST_F(ContentsReaderTest, ReportsAFileThatWasWrittenToMeanwhile) {
   m_Host.at("x").bytes += "5";
   EXPECT_FALSE(reader.finish());
   EXPECT_EQ(reader.getError(), ESTALE);
-  EXPECT_FALSE(reader.begin(*rewritten));
+  EXPECT_FALSE(reader.start(*rewritten));
   EXPECT_EQ(readAll(reader, *rewritten), "1234");
   m_Host.at("y").modificationTime += 1;
-  EXPECT_FALSE(reader.begin(*kept));
+  EXPECT_FALSE(reader.start(*kept));
   EXPECT_EQ(readAll(reader, *kept), "1234");
   EXPECT_TRUE(reader.finish());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'x': Stale file handle",

@@ -46,7 +46,7 @@ Contents readAll(support::Host& host, RecordingHandler& handler) {
     if (member->isAuxiliary()) continue;
     std::string text;
     std::span<const uint8_t> piece;
-    if (!reader.begin(*member)) return {};
+    if (!reader.start(*member)) return {};
     do {
       if (!reader.read(piece)) return {};
       text += textOf(piece);
