@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The merge sort for items whose type is not known here: eight bytes each, which it moves as
-// numbers and shows to the compare procedure in place.
+// numbers and shows to the compare procedure in place. Who knows the type of his items calls the
+// templates of the header.
 
 #include "elfext/interface/sort.h"
 

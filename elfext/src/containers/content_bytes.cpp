@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides where a buffer's bytes are at any moment, and when they move. There are four states: own
+// bytes in the module's region; bytes that somebody lent; bytes of the image that were looked at;
+// bytes of the image that nobody has asked for yet. Buffer is the only caller. A file can't make
+// this room reserve more than it holds: the tables have compared each extent with the image before
+// a buffer hears of it, and a view copies nothing.
 #include "elfext/interface/content_bytes.h"
 
 #include "alloclib/interface/region_objects.h"
@@ -14,6 +20,7 @@ const uint8_t* ContentBytes::fetch() const {
   if (m_IsLost) return nullptr;
   m_Foreign = m_Source->view(m_SourceOffset, m_Size);
   m_IsLost = m_Foreign == nullptr;
+  // The source stays where it failed: it is the one that knows the host's error number.
   if (!m_IsLost) m_Source = nullptr;
   return m_Foreign;
 }
@@ -40,6 +47,7 @@ void ContentBytes::defer(ImageSource& source, uint64_t offset, uint64_t size) {
 }
 
 FastArray<unsigned char>* ContentBytes::own() {
+  // Fetched before anything is reserved, so that lost bytes cost no memory.
   const uint8_t* foreign = isOwned() ? nullptr : view();
   if (m_IsLost) return nullptr;
   if (m_Own == nullptr) m_Own = alloclib::create<FastArray<unsigned char>>(*m_Region, m_Region);
@@ -58,6 +66,7 @@ uint8_t* ContentBytes::modify() {
 }
 
 void ContentBytes::setSize(uint64_t size) {
+  // Nothing is kept of bytes that are cut to none, so those that were lost are forgiven.
   if (size == 0 && !isOwned()) borrow(nullptr, 0);
   // Less of somebody else's bytes is still a view of them.
   const bool mustOwn = isOwned() || size > m_Size;

@@ -19,6 +19,7 @@ void DestructionManager::push(alloclib::Region* region, void* object, Destroyer 
 
 void DestructionManager::run() {
   while (m_Head != nullptr) {
+    // The record is off the list before its object goes, as a destructor may add more.
     const Record record = *m_Head;
     std::free(m_Head);
     m_Head = record.next;

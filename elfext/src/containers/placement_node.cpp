@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Keeps the forest in shape: a disjoint-set forest whose links carry distances. The reader links
+// the regions of a file that overlap, editing takes single nodes out, and pruning keeps only some.
+// A file may have ten thousands of regions that all hang in one tree, and sizes that don't fit 64
+// bits when added up; so no walk recurses, and `m_Reach` says in advance whether a sum would wrap.
 #include "elfext/interface/placement_node.h"
 
 #include "elfext/interface/hash_table.h"
@@ -20,6 +25,7 @@ void PlacementNode::hangUnder(PlacementNode* parent, uint64_t offset) {
 
 void PlacementNode::unhang() {
   if (m_Parent == nullptr) return;
+  // Children are linked both ways, so that one of ten thousand siblings leaves without a search.
   if (m_PreviousSibling != nullptr)
     m_PreviousSibling->m_NextSibling = m_NextSibling;
   else
@@ -36,6 +42,8 @@ PlacementNode* PlacementNode::find(uint64_t* offset) {
   *offset = 0;
   for (; root->m_Parent != nullptr; root = root->m_Parent)
     *offset += root->m_Offset;
+  // Path compression, in a second walk: each node that was passed now hangs at the root. What is
+  // still above it is what its own distance leaves of the whole.
   uint64_t distance = *offset;
   for (PlacementNode* node = this; node != root && node->m_Parent != root;) {
     PlacementNode* parent = node->m_Parent;
@@ -56,12 +64,15 @@ bool PlacementNode::link(PlacementNode& first, PlacementNode& second, uint64_t d
   PlacementNode* secondRoot = second.find(&secondOffset);
   if (firstRoot == secondRoot)
     return firstOffset <= secondOffset && secondOffset - firstOffset == delta;
+  // Offsets are not negative, so a tree can only be told of what fits: distances come from the
+  // file.
   if (delta > Furthest - firstOffset) return false;
   // Where `second` is, as the first root and as its own root see it.
   const uint64_t wanted = firstOffset + delta;
   PlacementNode* lower = wanted >= secondOffset ? firstRoot : secondRoot;
   PlacementNode* upper = wanted >= secondOffset ? secondRoot : firstRoot;
   const uint64_t distance = std::max(wanted, secondOffset) - std::min(wanted, secondOffset);
+  // No node of the upper tree may come to lie at a distance that wraps, now or after later finds.
   if (distance > Furthest - upper->m_Reach) return false;
   lower->m_Reach = std::max(lower->m_Reach, distance + upper->m_Reach);
   upper->hangUnder(lower, distance);
@@ -71,6 +82,7 @@ bool PlacementNode::link(PlacementNode& first, PlacementNode& second, uint64_t d
 void PlacementNode::promoteLowestChild() {
   PlacementNode* lowest = m_FirstChild;
   for (PlacementNode* child = m_FirstChild; child != nullptr; child = child->m_NextSibling)
+    // The first of equally low ones, in the order of the list.
     if (child->m_Offset < lowest->m_Offset) lowest = child;
   const uint64_t distance = lowest->m_Offset;
   lowest->unhang();
@@ -84,6 +96,7 @@ void PlacementNode::promoteLowestChild() {
 
 void PlacementNode::giveChildrenToParent() {
   while (PlacementNode* child = m_FirstChild) {
+    // No more than the root's reach, so this can't wrap.
     const uint64_t offset = child->m_Offset + m_Offset;
     child->unhang();
     child->hangUnder(m_Parent, offset);
@@ -91,6 +104,7 @@ void PlacementNode::giveChildrenToParent() {
 }
 
 void PlacementNode::remove() {
+  // Either way the nodes that stay keep their distances from each other.
   if (m_Parent != nullptr)
     giveChildrenToParent();
   else if (m_FirstChild != nullptr)
@@ -111,6 +125,7 @@ void PlacementNode::forget() {
 // A tree of which nodes go keeps its distances; its lowest node that stays becomes the root, the
 // first one of these in the order given.
 void PlacementNode::keepOnly(std::span<PlacementNode* const> nodes) {
+  // All places are read first: as soon as one node forgets, the walks to its root end early.
   struct Place {
     PlacementNode* root;
     uint64_t offset;

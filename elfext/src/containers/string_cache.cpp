@@ -29,6 +29,7 @@ const char* StringCache::lookup(const char* s) {
   QUARN_ASSERT(1, s != NULL);
   if (const char** known = m_Texts.find(Stringlett(s))) return *known;
   char* copy = copyOnHeap(s);
+  // The table frees nothing that its keys point to, so the copies have a list of their own.
   m_Copies.append(copy);
   m_Texts.put(Stringlett(copy), copy);
   return copy;

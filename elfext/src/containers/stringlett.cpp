@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A text as a key.
+// A text as a key. The hash decides most comparisons: texts whose hashes differ are never read, and
+// those of one address need not be. Files can choose names whose hashes collide; that costs time in
+// one bucket, but no two texts are ever taken for one.
 
 #include "elfext/interface/stringlett.h"
 
