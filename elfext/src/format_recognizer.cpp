@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides whether bytes are an ELF object, by the rules of a read's first step. The archive asks
+// this of members and of files that it is given; what is not ELF is a member like any other and no
+// error.
 #include "elfext/interface/format_recognizer.h"
 
 #include "checking/interface/checking.h"
@@ -10,6 +14,7 @@ namespace elfext {
 
 namespace {
 
+// Sizes and places of the ELF standard; the headers must be whole.
 constexpr size_t IdentSize = 16;
 constexpr size_t ClassPosition = 4;
 constexpr size_t Header32Size = 52;
@@ -20,6 +25,9 @@ constexpr std::array<uint8_t, 4> Magic = {0x7F, 'E', 'L', 'F'};
 
 bool isElfData(std::span<const uint8_t> data) {
   if (data.size() < IdentSize) return false;
+  // Class 2 decides alone, as it does when the object is read: with the magic looked at in one
+  // place and not in the other, a member could be an object to one half of a run and none to the
+  // other.
   if (data[ClassPosition] == 2) return data.size() >= Header64Size;
   return data[ClassPosition] == 1 && data.size() >= Header32Size &&
          std::equal(Magic.begin(), Magic.end(), data.begin());
@@ -35,6 +43,7 @@ bool isElfFile(support::Host& host, support::FileHandle file, uint64_t offset, u
 
 bool isElfFile(support::Host& host, support::FileHandle file) {
   support::FileStatus status;
+  // Larger files have no place in an archive, whose sizes have 32 bits.
   if (host.statusOf(file, status) != 0 || status.size >= 0xFFFFFFFF) return false;
   return isElfFile(host, file, 0, static_cast<uint64_t>(status.size));
 }

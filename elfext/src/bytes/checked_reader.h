@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Reads the numbers and texts of an attribute section one after the other. Reading past the end
-// stops the program.
+// Reads the numbers and texts of an attribute section one after the other, for its trace. Reading
+// past the end stops the program; the parsers that read attributes of objects are others, and
+// answer false instead.
 #pragma once
 
 #include <cstddef>

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides which sections are debug information: those whose names start with ".debug" or ".line",
+// and "C$$fpmap". Sizes, the records of debug overlays and the archive's symbol table ask, the last
+// for each symbol of each object, so most names are told apart before they are compared.
 #include "elfext/interface/debug_section_name.h"
 
 #include <cstring>

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The names of section types, as the ELF standard and the processor's supplement spell them, for
+// reports. Types that these don't name are shown by number alone.
 #include "elfext/interface/elf_constants.h"
 
 namespace elfext {

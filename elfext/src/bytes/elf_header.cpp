@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The ELF header as a file region: always at offset 0, and aligned to a word. Its size is e_ehsize
+// as the file has it.
 #include "elfext/interface/elf_header.h"
 
 #include "alloclib/interface/region_objects.h"

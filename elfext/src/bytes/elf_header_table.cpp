@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The two tables of headers as file regions. What they hold is the model's sections and segments;
+// here is only where they lie, and the layout record that each of them becomes.
 #include "elfext/interface/elf_header_table.h"
 
 #include "alloclib/interface/region_objects.h"

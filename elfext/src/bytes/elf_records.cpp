@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The fields of each record in file order, as codeSymbol has those of symbols.
+// The fields of each record in file order, as codeSymbol has those of symbols. One function serves
+// both directions, so that what is written can't come to differ from what is read. The names are
+// those of the ELF standard without their prefixes; the widths are the class's.
+//
+// Nothing is judged here: each value is passed on as it stands, whatever it says, and the tables
+// decide what it may be. That the bytes are there has been checked by who calls.
 #include "elfext/src/bytes/elf_records.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -45,6 +50,7 @@ void codeSectionHeader(Codec codec, Record& record) {
 template <class Codec, class Record>
 void codeProgramHeader(Codec codec, Record& record) {
   codec.field(record.type);
+  // p_flags moved up in class 2, where it keeps the 8-byte fields behind it aligned.
   if (codec.isWide()) codec.field(record.flags);
   codec.wideField(record.offset);
   codec.wideField(record.vaddr);
@@ -66,6 +72,7 @@ uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass) {
   case SHT_REL:
   case SHT_RELA:
     return relocationRowSize(isWide, type == SHT_RELA);
+  // Both are tables of 32-bit words in either class.
   case SHT_GROUP:
   case SHT_SYMTAB_SHNDX:
     return sizeof(uint32_t);
@@ -95,6 +102,7 @@ void putRecord(RecordFormat format, const ProgramHeader& record, uint8_t* bytes)
   codeProgramHeader(FieldPutter(format, bytes), record);
 }
 
+// Its other half is inline, in the header.
 void putRecord(RecordFormat format, const SymbolRow& record, uint8_t* bytes) {
   codeSymbol(FieldPutter(format, bytes), record);
 }

@@ -16,6 +16,8 @@
 
 namespace elfext {
 
+// How the words of one object are laid out, e_ident[EI_CLASS] and e_ident[EI_DATA] in short. It is
+// passed by value: two objects may be read in turns, and no byte order is a state of the program.
 struct RecordFormat {
   bool isWide = false; // class 2
   bool isLittle = true;
@@ -30,6 +32,7 @@ constexpr size_t EI_VERSION = 6;
 constexpr size_t EI_OSABI = 7;
 constexpr size_t EI_ABIVERSION = 8;
 
+// Elf32_Ehdr and Elf64_Ehdr.
 struct FileHeader {
   std::array<uint8_t, 16> ident = {};
   uint16_t type = 0;
@@ -47,6 +50,8 @@ struct FileHeader {
   uint16_t shstrndx = 0;
 };
 
+// Elf32_Phdr and Elf64_Phdr, whose flags stand at different places; the order here is that of class
+// 2. Section headers are public, as sections keep theirs.
 struct ProgramHeader {
   uint32_t type = 0;
   uint32_t flags = 0;
@@ -58,6 +63,7 @@ struct ProgramHeader {
   uint64_t align = 0;
 };
 
+// Elf32_Sym and Elf64_Sym.
 struct SymbolRow {
   uint32_t name = 0;
   uint8_t info = 0;
@@ -97,6 +103,7 @@ struct RelocationRow {
 // What sh_entsize should be in a table of fixed rows; 0 for all other types. Bytes.
 [[nodiscard]] uint64_t expectedEntrySize(uint32_t type, uint32_t elfClass);
 
+// Plain shifts, which both compilers turn into one instruction.
 [[nodiscard]] inline uint16_t swapBytes(uint16_t word) {
   return static_cast<uint16_t>(word << 8 | word >> 8);
 }
@@ -112,6 +119,7 @@ struct RelocationRow {
 template <class Word>
 [[nodiscard]] Word getWord(const uint8_t* bytes, bool isLittle) {
   Word word;
+  // Not a cast: the bytes may stand at any address.
   std::memcpy(&word, bytes, sizeof word);
   return isLittle == (std::endian::native == std::endian::little) ? word : swapBytes(word);
 }

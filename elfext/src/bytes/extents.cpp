@@ -1,4 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Overlaps and holders among many extents. The tables ask whether sections overlap in the file and
+// which segment holds each section, of every object that is read; so the usual case, extents that
+// ascend, must cost one pass, and the worst no more than sorting. The answers are those of trying
+// all pairs in the order of their ids, since reports and models depend on which pair is named
+// first.
+//
+// Extents come from headers that anybody may have written: they leave the image, wrap, repeat each
+// other or all share one byte. Ends are already cut to the largest number by who asks.
 #include "elfext/src/bytes/extents.h"
 
 #include "elfext/src/bytes/first_holders.h"
@@ -15,6 +24,7 @@ bool startsBefore(const Extent& left, const Extent& right) {
   return left.start != right.start ? left.start < right.start : left.id < right.id;
 }
 
+// Beyond these, dealing and merging cost more than a sort does.
 constexpr size_t MostRuns = 4;
 constexpr size_t FewExtents = 64; // that are sorted sooner than dealt
 using Runs = std::array<std::vector<Extent>, MostRuns>;
@@ -26,6 +36,7 @@ bool dealIntoRuns(std::span<const Extent> extents, Runs& runs) {
       return other.empty() || startsBefore(other.back(), extent);
     });
     if (run == runs.end()) return false;
+    // One reservation, as nearly all of them may come to lie here.
     if (run->empty()) run->reserve(extents.size());
     run->push_back(extent);
   }
@@ -89,6 +100,7 @@ std::vector<uint64_t> sortedEnds(std::span<const Extent> extents) {
 // An extent overlaps another exactly when more extents than itself start below its end and do not
 // end at or before its start.
 std::optional<std::pair<uint32_t, uint32_t>> findFirstOverlap(std::span<const Extent> extents) {
+  // Extents that ascend without touching, as most files have them, are done after one look.
   if (!hasOverlap(extents)) return std::nullopt;
   const std::vector<Extent> sorted = sortedByStart(extents);
   if (!hasOverlap(sorted)) return std::nullopt;
@@ -100,9 +112,12 @@ std::optional<std::pair<uint32_t, uint32_t>> findFirstOverlap(std::span<const Ex
   const auto overlapsAny = [&](const Extent& extent) {
     const size_t ended = static_cast<size_t>(
         std::upper_bound(ends.begin(), ends.end(), extent.start) - ends.begin());
+    // No extent is empty, so those that end at or before this start also start below this end, and
+    // the difference counts exactly those that share a byte with it: itself and the others.
     return countBelow(starts, extent.end) - ended > 1;
   };
   const auto first = std::find_if(extents.begin(), extents.end(), overlapsAny);
+  // The partner comes later in the list: had it come earlier, it would have been the first itself.
   const auto second = std::find_if(first + 1, extents.end(), [&](const Extent& other) {
     return other.start < first->end && first->start < other.end;
   });

@@ -19,6 +19,7 @@ struct Extent {
   uint32_t id = 0;
 };
 
+// No table has so many rows, so this is nobody's id.
 constexpr uint32_t NoExtent = 0xFFFFFFFF;
 
 // Of the extents, none of which is empty and whose ids ascend: the lowest id that shares a byte

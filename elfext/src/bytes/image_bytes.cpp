@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides which bytes of an object are read from its file, and when. The tables and, later on, the
+// buffers of a model ask for views; what nobody looks at is never read. A view is made only of an
+// extent that lies in the image, compared by subtraction, so offsets and sizes may come from the
+// file as they are. Memory is asked for without exceptions: an image whose claimed size can't be
+// had is a failure to be told, and not the end of the program.
 #include "elfext/src/bytes/image_bytes.h"
 
 #include <algorithm>
@@ -9,6 +15,7 @@ namespace elfext {
 
 namespace {
 
+// A page of the host's file cache, below which a smaller read saves nothing.
 constexpr uint64_t BlockSize = 0x1000;
 // Who looks behind what is loaded will mostly look on: so many blocks are read at once then.
 constexpr size_t BlocksAhead = 16;
@@ -48,6 +55,7 @@ bool ImageBytes::fail(ImageFailure failure, support::HostError error) {
 
 bool ImageBytes::prepare() {
   if (m_Bytes != nullptr || m_Size == 0) return m_Failure == ImageFailure::None;
+  // Left as it comes: pages that nothing is read into never cost memory.
   m_OwnMemory.reset(new (std::nothrow) uint8_t[m_Size]);
   return beginLoading(m_OwnMemory.get());
 }
@@ -68,6 +76,7 @@ bool ImageBytes::beginLoading(uint8_t* memory) {
   m_Loaded = memory;
   m_Bytes = memory;
   m_MissingBlocks = (m_Size - 1) / BlockSize + 1;
+  // One bit a block, where a list of loaded ranges would have to be searched at each look.
   m_IsBlockLoaded.resize(m_MissingBlocks);
   return m_Size > WholeReadLimit || loadBlocks(0, m_MissingBlocks);
 }
@@ -77,6 +86,7 @@ bool ImageBytes::loadAll() {
 }
 
 const uint8_t* ImageBytes::view(uint64_t offset, uint64_t size) {
+  // The only way to a view, and so the one place where an extent is compared with what there is.
   if (!contains(offset, size)) {
     static_cast<void>(fail(ImageFailure::Outside));
     return nullptr;
@@ -93,6 +103,8 @@ bool ImageBytes::load(uint64_t offset, uint64_t size) {
       ++block;
       continue;
     }
+    // Looking right behind the last read is how tables are walked through; elsewhere, one look at a
+    // header costs only its own block.
     const bool readsOn = block > 0 && m_IsBlockLoaded[block - 1];
     const size_t wanted = readsOn ? std::max(end, block + BlocksAhead) : end;
     const size_t runEnd = endOfMissing(block, std::min(wanted, m_IsBlockLoaded.size()));
@@ -118,6 +130,7 @@ bool ImageBytes::loadBlocks(size_t first, size_t end) {
   const uint64_t offset = first * BlockSize;
   const uint64_t size = std::min(end * BlockSize, m_Size) - offset;
   size_t done = 0;
+  // A short read is a failure: the file has been cut since its size was taken.
   const support::HostError error = readAt({m_Loaded + offset, size}, m_FileOffset + offset, done);
   if (error != 0 || done < size) return fail(ImageFailure::Unreadable, error);
   std::fill(m_IsBlockLoaded.begin() + static_cast<ptrdiff_t>(first),

@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Numbers of any length: seven bits a byte, the least significant ones first, the top bit set on
-// all bytes but the last.
+// all bytes but the last. Attribute sections are made of them. A hostile one is a run of set top
+// bits without an end: the bytes that there are bound the loop, and bits that leave 32 never shift
+// by more than the language allows.
 #pragma once
 
 #include <cstddef>
@@ -25,6 +27,7 @@ inline bool readUleb(std::span<const uint8_t> bytes, size_t& position, uint32_t&
   return false;
 }
 
+// The shortest form, at most five bytes.
 inline void appendUleb(std::string& bytes, uint32_t value) {
   while (value >= 0x80) {
     bytes += static_cast<char>(value | 0x80);
