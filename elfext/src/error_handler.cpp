@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The texts of all reports. They reach users letter for letter, and other tools look for them.
+// The texts of all reports. They reach users letter for letter, and other tools look for them, so
+// each stands here whole where it can, with its numbers put between the words. Whatever a file says
+// of itself comes in as a number; the object's name is only ever a piece of a text and never a
+// format.
 #include "elfext/interface/error_handler.h"
 
 #include "elfext/interface/elf_constants.h"

@@ -2,6 +2,10 @@
 //
 // Report and decide in one expression: `if (!goOn(module, &ErrorHandler::x, ...)) return false;`.
 // The teller is the module that is wrong, or the reporter of a read.
+//
+// The tables, validation and a module that has lost contents report through these three, so the
+// test for a handler that is not there stands here. Which of the three is taken says what a report
+// means: a question, an end that the handler only hears of, or an end that it must not deny.
 #pragma once
 
 #include "checking/interface/checking.h"

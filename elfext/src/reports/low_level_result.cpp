@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Which report each failure of the lowest layer becomes. None of them leaves anything to go on
+// with, so a handler that answers "go on" to one of them is at fault.
 #include "elfext/src/reports/low_level_result.h"
 
 #include "elfext/src/reports/go_on.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What the lowest layer of reading answers, and which report each answer becomes.
+//
+// The layer is what hands out bytes of the image and the file header. Of hostile files it sees
+// extents that leave the image, counts that no memory could hold, and files that became shorter.
 #pragma once
 
 #include <cstdint>
