@@ -1,7 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Tells the address sanitizer which bytes of a region nobody owns, so that it finds a use after a
-// discard as it does with the host's heap. Without the sanitizer these are nothing.
+// discard as it does with the host's heap. Without this a region would hide exactly the faults that
+// broken objects are to bring to light in the sanitized runs: to the sanitizer a block of the
+// parent is one allocation, all of it good.
+//
+// Every path that hands out bytes unpoisons as many as were asked for, and not the rounding behind
+// them; every path that takes some back poisons them. Without the sanitizer these are nothing.
 
 #pragma once
 

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The region system of the process: its start and end, and what new regions are made of.
+// The region system of the process: its start and end, and what new regions are made of. Below all
+// others stands the root region, which is made here and asks the host; on it the one page allocator
+// that all general regions share; and these belong to whoever made them. Programs go through
+// alloclib::Session; the functions are open for tests, which put other parents in.
 
 #pragma once
 
@@ -13,6 +16,7 @@ class Region;
 class RegionLargeBlock;
 
 /// What regions made from now on do; those there already stay as they are.
+/// The tool leaves it off: the other modes are for whoever looks for a leak or a misuse.
 enum DebugMode : int {
   Debug_Off = 0,
   Debug_Plain = 1,
@@ -38,6 +42,7 @@ Region* popDefaultParent();
 [[nodiscard]] Region* getDefaultParent();
 
 /// The page allocator under all general regions, made on the default parent at its first use.
+/// One for all, as it takes 1 MiB of the host before the first page is asked for.
 [[nodiscard]] RegionLargeBlock* getProcessLargeBlock();
 
 /// Bytes that the root region holds from the host; 0 before initialise.

@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Where memory comes from, for clients that do not care which region it is. Regions stack up: a
-// RegionGeneral carves small objects from pages of a RegionLargeBlock, which takes chunks from
-// the RegionMallocFree at the root. None of them is thread-safe.
+// RegionGeneral carves small objects from pages of a RegionLargeBlock, which takes chunks from the
+// RegionMallocFree at the root. None of them is thread-safe: the tool is one thread.
+//
+// What lives as long as an archive or an object model is allocated here, and goes with it in a few
+// calls, however many objects there are. So nothing in a region may own what lies outside it.
 
 #pragma once
 
@@ -20,7 +23,8 @@ public:
   /// and may be null. The memory belongs to the region and dies with it at the latest.
   virtual void* AllocFull(size_t size, size_t alignment, const char* fileLine) = 0;
 
-  /// Gives a block back; size and alignment are those of its allocation.
+  /// Gives a block back; size and alignment are those of its allocation, as no header in front of a
+  /// small block remembers them.
   virtual void DiscardFull(void* pointer, size_t size, size_t alignment) = 0;
 
   /// Ends the region and all memory in it, whose destructors do not run. With false nothing is
@@ -39,6 +43,8 @@ protected:
   ~Region() = default;
 };
 
+/// To the next multiple, itself a power of two. Wraps near the largest size: callers compare first,
+/// or test what comes out.
 [[nodiscard]] constexpr size_t roundUp(size_t size, size_t multiple) {
   return (size + multiple - 1) & ~(multiple - 1);
 }

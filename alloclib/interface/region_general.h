@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The region of the many small objects. Allocation moves a cursor through a working block: a
-// compare and an add, inlined at the call. Whatever does not fit goes the slow way, which also
-// holds all decisions: large objects get a block of their own, discarded pieces come to use
-// again, tracing regions count.
+// The region of the many small objects: archives, object models, the parser's copies and scratch
+// tables all live in one. Allocation moves a cursor through a working block: a compare and an add,
+// inlined at the call. Whatever does not fit goes the slow way, which also holds all decisions:
+// large objects get a block of their own, discarded pieces come to use again, tracing regions
+// count.
 //
 // The inline path stays right in every state because the slow one sets the fast limit: at the
 // cursor itself where each allocation has to be looked at.
+//
+// A size may come from a file. The two comparisons of the inline path stand so that no size,
+// however large, wraps into one that seems to fit.
 
 #pragma once
 
@@ -51,6 +55,7 @@ public:
   void Destroy(bool freeMemory) override;
 
 private:
+  /// For tests, which look at the states and lists.
   friend class RegionGeneralPeer;
 
   enum FlagsState : uint32_t {
@@ -62,11 +67,12 @@ private:
     Flags_BucketsTracing = Flags_Buckets | Flags_Tracing,
   };
 
-  /// In front of a block's bytes. The sizes are of the whole block.
+  /// In front of a block's bytes. The sizes are of the whole block, as the parent wants them back.
   struct Block {
     size_t size;
     Block* next;
   };
+  /// Linked both ways, since a single one may be given back at any time.
   struct LargeBlock {
     size_t size;
     LargeBlock* next;
@@ -83,6 +89,7 @@ private:
   };
 
   static constexpr size_t PageSize = 4096;
+  // What these numbers decide is said at the head of the source.
   static constexpr size_t LargeSize = 10240;
   static constexpr size_t BucketBound = 128;
   static constexpr size_t BucketCount = BucketBound / 8;

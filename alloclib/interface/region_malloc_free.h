@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The root of all regions: it forwards to the host's heap.
+// The root of all regions: it forwards to the host's heap, and is where the process finds that
+// memory has run out. As all else is given back through it, the balance that it checks at the end
+// shows memory that some region above has kept.
 
 #pragma once
 

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Objects and texts in regions. Nothing in a region is destructed when the region goes: an object
-// that owns an outside resource must be destructed by its owner first.
+// that owns an outside resource must be destructed by its owner first. Classes that live here by
+// the thousand assert at their own place that they are trivially destructible.
 
 #pragma once
 

@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What one region has used. The records of all regions stand in two lists, of live and of
-// finished regions, from which the report is made. A region that counts blocks instead of single
+// What one region has used. The records of all regions stand in two lists, of live and of finished
+// regions, from which the report is made. A region that counts blocks instead of single
 // allocations, which a plain RegionGeneral does to keep its inline path short, is marked as not
 // accurate.
+//
+// Regions that come and go, as those of one object model after the other, would fill the finished
+// list with one record each: records of one name are merged there above a bound.
 
 #pragma once
 

@@ -8,6 +8,9 @@
 //     arlib::Archive archive(support::getPosixHost());
 //     ...
 //   }
+//
+// The tool is the exception: a message may end it in the middle, so it calls leave().
+
 #pragma once
 
 #include "alloclib/interface/process.h"

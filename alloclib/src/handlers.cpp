@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The installed handlers. They work before the region system is initialised, and after it has
-// been shut down, since that is when faults of the start-up show.
+// The installed handlers. They work before the region system is initialised, and after it has been
+// shut down, since that is when faults of the start-up show. So they are plain pointers with a
+// constant start value, and the defaults need nothing but the C library.
 
 #include "alloclib/interface/handlers.h"
 
@@ -43,6 +44,7 @@ OutOfMemoryHandler setOutOfMemoryHandler(OutOfMemoryHandler handler) {
 
 void internalError(const char* text) {
   internalErrorHandler(text);
+  // A handler that comes back would let the caller go on with memory that is not there.
   std::abort();
 }
 

@@ -3,6 +3,10 @@
 // The one place that holds state of the process for the region system. The default parents are a
 // stack of small records in the root region, so that the root must see them popped before it can
 // end in balance.
+//
+// The end goes from the top down: pages, parents, the records of the regions, the root. Faults show
+// on the way: a region that still lives by its record, and memory that somebody has kept by the
+// balance of the root.
 
 #include "alloclib/interface/process.h"
 
@@ -51,6 +55,7 @@ void initialise() {
 
 void shutDown(bool freeMemory) {
   mustBeInitialised();
+  // The process exits: giving back page by page what the host takes as a whole is time lost.
   if (!freeMemory) return;
   destroyLargeBlock();
   while (state.defaultParents != nullptr)

@@ -1,12 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The slow side of the general region. One number, 10240 bytes, serves three times: larger
-// requests bypass the working block, the fast limit keeps the inline path below that size, and it
-// is the sum of small discarded pieces above which they are preferred to fresh memory.
+// The slow side of the general region. One number, 10240 bytes, serves three times: larger requests
+// bypass the working block, the fast limit keeps the inline path below that size, and it is the sum
+// of small discarded pieces above which they are preferred to fresh memory.
 //
 // A block of the parent starts with its header; the region object itself stands behind the header
 // of the first one. Discarded pieces are lists through the pieces themselves: by size in buckets
 // below 128 bytes, in one first-fit list above.
+//
+// A size may come from a file, through a client. What could wrap when headers and pages are added
+// is turned away as memory that is not there, before any sum is made.
 
 #include "alloclib/interface/region_general.h"
 
@@ -24,12 +27,14 @@
 namespace alloclib {
 namespace {
 
-// A working block holds this much beyond the request that made it, and is then cut to pages.
+// A working block holds this much beyond the request that made it, and is then rounded up to pages:
+// a region of few objects stays at a page or two.
 constexpr size_t BlockReserve = 3000;
 
 // Far below where adding headers and pages could wrap.
 constexpr size_t LargestRequest = PTRDIFF_MAX - (size_t{1} << 16);
 
+// The bytes from the address to the next aligned one: its negative, modulo a power of two.
 size_t gapBefore(const char* address, size_t alignment) {
   return -reinterpret_cast<uintptr_t>(address) & (alignment - 1);
 }
@@ -48,7 +53,8 @@ size_t getLargeHeaderSize(size_t header, size_t alignment) {
 
 } // namespace
 
-// The documented footprints: a header costs 16 or 24 bytes, the region 96.
+// The documented footprints: a header costs 16 or 24 bytes, the region 96. A field more would cost
+// every region, and there are two for each object model.
 static_assert(sizeof(RegionGeneral) == 96);
 
 RegionGeneral* RegionGeneral::Create(size_t initialSize, const char* name) {
@@ -157,6 +163,8 @@ void* RegionGeneral::allocateSlow(size_t size, size_t alignment) {
   const size_t bytes = roundUp(size, 8);
 
   void* block = nullptr;
+  // Pieces first, then the large, then fresh memory: the state is Buckets only while there are
+  // enough pieces for the look to pay.
   if ((m_FlagsState & Flags_Buckets) != 0) block = allocateFromBucket(bytes, alignment);
   if (block == nullptr && size >= LargeSize) block = allocateLarge(bytes, alignment);
   if (block == nullptr) block = allocateFromWorkingBlock(bytes, alignment);
@@ -168,6 +176,7 @@ void* RegionGeneral::allocateSlow(size_t size, size_t alignment) {
 }
 
 void* RegionGeneral::allocateLarge(size_t bytes, size_t alignment) {
+  // discardLarge finds the header again by the same alignment, so clients must tell it truly.
   const size_t header = getLargeHeaderSize(sizeof(LargeBlock), alignment);
   const size_t total = (bytes + header - 1 + PageSize) / PageSize * PageSize;
   void* memory = m_Parent->AllocFull(total, PageSize, nullptr);
@@ -193,6 +202,7 @@ void* RegionGeneral::allocateFromBucket(size_t bytes, size_t alignment) {
   if (isTracing()) m_Stats->fragmentationDecreased(pieceBytes);
   poison(piece, pieceBytes);
   const size_t gap = gapBefore(piece, alignment);
+  // What lies before and behind the aligned object is a smaller piece each, and not lost.
   putAside(piece, gap);
   putAside(piece + gap + bytes, pieceBytes - gap - bytes);
   return piece + gap;
@@ -212,6 +222,7 @@ void RegionGeneral::makeWorkingBlock(size_t bytes, size_t alignment) {
   noteFragmentation(static_cast<size_t>(m_WorkingEnd - m_Cursor));
   if (reuseFreeChunk(bytes, alignment)) return;
 
+  // Blocks start at a page and their bytes at a multiple of 8, so 8 of the alignment are certain.
   const size_t worstGap = alignment > 8 ? alignment - 8 : 0;
   const size_t total =
       (bytes + worstGap + BlockReserve + sizeof(Block) - 1 + PageSize) / PageSize * PageSize;
@@ -319,8 +330,11 @@ void RegionGeneral::SetBlockWorkingState() {
 void RegionGeneral::setFastLimit() {
   switch (m_FlagsState) {
   case Flags_Fast:
+    // Below 10240 also where the block has more room: a large request must come to the slow way,
+    // which gives it a block of its own.
     m_FastLimit = m_Cursor + std::min(static_cast<size_t>(m_WorkingEnd - m_Cursor), LargeSize);
     return;
+  // No room in sight: every allocation comes to the slow way, to the buckets or to be counted.
   case Flags_Buckets:
   case Flags_FastTracing:
   case Flags_BucketsTracing:

@@ -2,6 +2,10 @@
 //
 // The page map and its search. A map covers 40 MiB; when it has no run for a request, a further
 // instance takes over, and this one is left alone until pages come back to it.
+//
+// The search goes word by word from a hint, below which no page is free (but in a map that was
+// given up), and takes the first run that is long enough. A request is less than 32 pages, since
+// larger ones have gone to the parent, so a search costs at most the 320 words of the map.
 
 #include "alloclib/interface/region_large_block.h"
 
@@ -51,6 +55,8 @@ RegionLargeBlock* RegionLargeBlock::createOn(Region* parent, const char* name, b
 RegionLargeBlock::RegionLargeBlock(RegionStats* stats, Region* parent, bool transparent,
                                    bool ownedParent)
     : m_Stats(stats), m_Parent(parent), m_Transparent(transparent), m_OwnedParent(ownedParent) {
+  // Pages are free before their chunk exists; the chunk is made when the first of them is given
+  // out.
   std::fill(std::begin(m_Bitmap), std::end(m_Bitmap), ~uint32_t{0});
   m_Stats->overheadIncreased(sizeof(RegionLargeBlock));
   if (!transparent) makeChunk(0);
@@ -70,6 +76,7 @@ void RegionLargeBlock::DiscardFull(void* pointer, size_t size, size_t alignment)
   if (size == 0 || size % PageSize != 0) internalError("Invalid discard using RegionLargeBlock");
   if (m_Transparent) return m_Parent->DiscardFull(pointer, size, alignment);
   m_Stats->discarded(pointer, size, 0);
+  // The byte goes up, so that two discards of one address can be told apart in a debugger.
   if (m_FillDiscarded) std::memset(pointer, m_FillByte++, size);
   if (size >= ForwardSize) return m_Parent->DiscardFull(pointer, size, alignment);
 
@@ -106,6 +113,7 @@ void RegionLargeBlock::releaseChunks() {
 void* RegionLargeBlock::allocatePages(uint32_t pages) {
   const uint32_t firstBit = findRun(pages);
   if (firstBit == NoRun) return allocateFromOverflow(pages);
+  // Only a search for one page shows that nothing before it is free.
   if (pages == 1) m_Hint = firstBit / 32;
   const uint32_t chunk = firstBit / 32 / WordsPerChunk;
   if (m_Chunks[chunk] == nullptr) makeChunk(chunk);
@@ -114,6 +122,8 @@ void* RegionLargeBlock::allocatePages(uint32_t pages) {
 }
 
 void* RegionLargeBlock::allocateFromOverflow(uint32_t pages) {
+  // The map may still have short runs; looking for them at each request would cost more than the
+  // pages are worth.
   m_Hint = ExhaustedHint;
   if (m_Overflow == nullptr) {
     void* memory =
@@ -130,6 +140,7 @@ uint32_t RegionLargeBlock::findRun(uint32_t pages) const {
     // Pages of two chunks are no neighbours.
     if (bits == 0 || word % WordsPerChunk == 0) length = 0;
     if (bits == 0) continue;
+    // Half a word is passed over at once where nothing in it can begin a run.
     const uint32_t start = length == 0 && (bits & 0xFFFF) == 0 ? 16 : 0;
     for (uint32_t bit = start; bit < 32; ++bit) {
       length = (bits >> bit & 1) != 0 ? length + 1 : 0;
@@ -141,8 +152,11 @@ uint32_t RegionLargeBlock::findRun(uint32_t pages) const {
 
 RegionLargeBlock* RegionLargeBlock::findOwner(const void* pointer, uint32_t& bit) {
   const auto address = reinterpret_cast<uintptr_t>(pointer);
+  // Few chunks in few instances, looked at once for each block of pages: no index is worth its
+  // upkeep.
   for (RegionLargeBlock* owner = this; owner != nullptr; owner = owner->m_Overflow) {
     for (uint32_t chunk = 0; chunk < ChunkCount; ++chunk) {
+      // Wraps for an address below the chunk, and is then far beyond its size.
       const uintptr_t offset = address - reinterpret_cast<uintptr_t>(owner->m_Chunks[chunk]);
       if (owner->m_Chunks[chunk] == nullptr || offset >= ChunkSize) continue;
       bit = chunk * WordsPerChunk * 32 + static_cast<uint32_t>(offset / PageSize);

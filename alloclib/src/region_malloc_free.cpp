@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// All memory of the regions comes through here. The object and its record stand outside the
-// balance that Destroy checks.
+// All memory of the regions comes through here, and here it shows when the host refuses. The object
+// and its record stand outside the balance that Destroy checks: they come from the host's heap
+// directly, since there must be one region that needs no other.
 
 #include "alloclib/interface/region_malloc_free.h"
 
@@ -34,6 +35,7 @@ RegionMallocFree* RegionMallocFree::Create(const char* name) {
 }
 
 void* RegionMallocFree::AllocFull(size_t size, size_t alignment, const char*) {
+  // The heap may answer null to this, which could not be told from having no memory.
   if (size == 0) internalError("Cannot allocate 0 bytes of memory from the system");
   void* block = allocateFromHost(size, alignment);
   if (block == nullptr) outOfMemory(size);
