@@ -28,6 +28,7 @@ enum Level : uint32_t {
 };
 
 /// The process-wide level. Written by set_checking_level only.
+/// The option --db_check moves it, up to any level; above 1 that enables nothing in this build.
 inline uint32_t checkingLevel = Level_Low;
 
 /// Whether an assertion of this level is to be evaluated.

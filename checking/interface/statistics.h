@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Counts how often each assertion is evaluated, for whoever wonders what the checks cost. The
-// assertion macro counts only in a build with QUARN_CHECKING_STATISTICS, so that an ordinary
-// build pays nothing, and then only between start and finish.
+// assertion macro counts only in a build with QUARN_CHECKING_STATISTICS, so that an ordinary build
+// pays nothing, and then only between start and finish. The tool itself never starts it.
 
 #pragma once
 

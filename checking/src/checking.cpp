@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The level's text form, and the ways out for failures and texts. The defaults serve a program
-// that has not installed its message stream yet, and tests.
+// The level's text form, and the ways out for failures and texts. The defaults serve a program that
+// has not installed its message stream yet, and tests.
+//
+// The text comes from the command line. A name with anything behind it is refused and leaves the
+// level alone; "show" and "show," are words of their own in front of the names.
 
 #include "checking/interface/checking.h"
 
@@ -89,6 +92,8 @@ void showText(std::string_view text) {
 
 void assertionFailed(const char* path, unsigned line, const char* expression) {
   failureHandler(path, line, expression);
+  // The caller's invariant is broken: nothing behind a failed assertion may run, whatever the
+  // handler does.
   std::abort();
 }
 

@@ -1,7 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The tree of assertion sites. It is the one place of the ground that uses the general heap for
-// a container: it must not count, or disturb, what it measures in the regions.
+// The tree of assertion sites. It is the one place of the ground that uses the general heap for a
+// container: it must not count, or disturb, what it measures in the regions.
+//
+// A site is known by path, line, temperature and level. The tree keeps them in that order, which is
+// the order of sites with the same count in the report: nothing depends on where they lie in
+// memory.
 
 #include "checking/interface/statistics.h"
 
