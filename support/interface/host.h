@@ -6,6 +6,12 @@
 // Errors come back as the host's own error number (errno), at once; 0 is success. Nothing is kept
 // in a process-wide error variable between two calls. Names are NUL-terminated byte strings; only
 // "/" separates their parts.
+//
+// Others change the same files meanwhile, and a name may lead to a FIFO, a device, a link or a file
+// that grows: an opening never waits, a status tells what a thing is before it is used, and a
+// temporary is created only where nothing stands. Names are resolved anew by each call that takes
+// one; whoever wants to stay with one file keeps its handle (see source_file.h).
+
 #pragma once
 
 #include <cstddef>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Questions about files that are put together from the host's plain operations.
+// Questions about files that are put together from the host's plain operations, and the search for
+// the files that a word of the command line means. They answer and change nothing; a host that
+// can't tell is no failure here, since whoever goes on to open the file hears why.
+
 #pragma once
 
 #include "support/interface/host.h"
@@ -18,7 +21,7 @@ namespace support {
 /// Modification time in seconds since 1970, or -1 if the host doesn't tell.
 [[nodiscard]] int64_t fileTime(Host& host, const char* name);
 
-/// Whether a name or pattern holds one of the two wildcard characters.
+/// Whether a name or pattern holds "?" or "*".
 [[nodiscard]] bool hasWildcard(std::string_view text);
 
 /// The part of a file word that names the directory, up to and including the last "/"; may be

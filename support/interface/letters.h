@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What counts as a letter and as white space, whatever the locale: bytes above 127 are plain
-// characters.
+// characters. The C library's own functions would ask the locale, and may not be given a negative
+// char. Option names, patterns, attribute texts and words of via files all go by these.
+
 #pragma once
 
 #include <cstddef>
@@ -9,6 +11,7 @@
 
 namespace support {
 
+/// A-Z become a-z; every other byte is itself.
 [[nodiscard]] constexpr char lowered(char character) {
   return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a')
                                               : character;
@@ -23,6 +26,7 @@ namespace support {
   return character == ' ' || (character >= '\t' && character <= '\r');
 }
 
+/// Over the whole of both texts, and for A-Z only.
 [[nodiscard]] constexpr bool equalIgnoringCase(std::string_view left, std::string_view right) {
   if (left.size() != right.size()) return false;
   for (size_t at = 0; at < left.size(); ++at) {

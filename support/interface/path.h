@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A file name taken apart, so that its leaf can be replaced. Nothing is lost: an unchanged path
-// gives back the text it was made from, but for the separators of a Windows name.
+// gives back the text it was made from, but for the separators of a Windows name. Names of members
+// reach lastPathComponent from archives that anybody may have made: it cuts at either separator, so
+// that a member "../../x" can be written to no place but "x".
+
 #pragma once
 
 #include <cstddef>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The patterns of file_list words: "*" is any run of characters, also none, and "?" any one
-// character. There are no sets and no escapes.
+// character. There are no sets and no escapes. They are matched against names in a folder, with
+// letter case, and against names of members and the parts of a library's name, without.
+
 #pragma once
 
 #include <string_view>

@@ -1,7 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A view of a file through a buffer: whoever walks a file in small steps gets its bytes without a
-// host call for each step, and whoever leaps over large bodies doesn't read them.
+// host call for each step, and whoever leaps over large bodies doesn't read them. Archives are
+// walked through it from header to header, and objects in them from table to table.
+//
+// An offset may be any number that a file names: behind the end there are simply no bytes. The
+// buffer grows to what is asked for, so who takes a size from a file compares it with what is there
+// first.
+
 #pragma once
 
 #include "support/interface/source_file.h"

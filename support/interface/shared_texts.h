@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Copies of texts that may be ends of one another, as names in a string table are: each byte is
-// copied once, however many texts it belongs to.
+// copied once, however many texts it belongs to. That is a matter of safety: a string table of a
+// megabyte without a NUL but its last, and a symbol for each of its bytes, would otherwise come to
+// half a terabyte of copies.
+
 #pragma once
 
 #include <algorithm>

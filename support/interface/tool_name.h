@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The name that the tool was called by, for its help and the echo of its command line.
+//
+// The name that the tool was called by, for its help and the echo of its command line. What argv[0]
+// holds is the caller's choice: it may be missing, empty or long.
+
 #pragma once
 
 #include <cstddef>

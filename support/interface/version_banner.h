@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The texts by which a build of the tool says which one it is.
+//
+// The texts by which a build of the tool says which one it is: the banner in front of the help, the
+// number of --version_number, and the same number in reports of internal faults. The data are
+// settled when the build is configured; nothing is asked at run time.
+
 #pragma once
 
 #include <cstdint>
@@ -26,7 +30,8 @@ struct BuildData {
 /// The lines that --vsn and the help begin with, without a final newline.
 [[nodiscard]] std::string bannerText(const BuildData& data);
 
-/// One number for the whole version: "1000001" is 1.0.0, delivery 1.
+/// One number for the whole version: "1000001" is 1.0.0, delivery 1. Minor version, patch and
+/// delivery have two digits each.
 [[nodiscard]] std::string versionNumberText(const BuildData& data);
 
 } // namespace support

@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Questions about files that are more than one call of the host: kinds, times, and the search for
-// files by a pattern, sorted by name because hosts list directories in any order.
+// What a word of the command line means as files: the folder that it names, the pattern for its
+// leaf, and the names in that folder which fit. The folder may hold anything and change meanwhile,
+// so a name found here may be gone, or be no plain file, when somebody opens it: that is reported
+// there, with the host's reason.
+
 #include "support/interface/host_files.h"
 
 #include "support/interface/pattern.h"
@@ -38,6 +41,7 @@ std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
   if (host.listDirectory(place.c_str(), names) != 0) return {};
   std::erase_if(names,
                 [leaf](const std::string& name) { return !matchesPattern(leaf, name, true); });
+  // A host lists a folder in an order of its own, and the members of an archive would follow it.
   std::sort(names.begin(), names.end());
   return names;
 }

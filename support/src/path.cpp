@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Parsing of path names. Each string takes its front off what is left of the name, so that
-// rebuilding is plain joining.
+// rebuilding is plain joining. Order: drive or share, folder up to the last separator, base,
+// extension from the last dot of the leaf. Any of them may be empty.
+
 #include "support/interface/path.h"
 
 #include <algorithm>

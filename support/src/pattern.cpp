@@ -1,7 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The matcher remembers only the last star: when a later character does not fit, that star takes
-// one character more. What earlier stars took never has to be looked at again, so a pattern of
-// many stars costs at most its length times that of the text.
+// one character more. What earlier stars took never has to be looked at again, so a pattern of many
+// stars costs at most its length times that of the text. A recursive matcher would take longer than
+// anyone waits for "*a*a*a*a*b" against a long row of "a", and names in archives are long if
+// somebody wants them to be.
+
 #include "support/interface/pattern.h"
 
 #include "support/interface/letters.h"
@@ -38,6 +42,7 @@ bool matchesPattern(std::string_view pattern, std::string_view text, bool caseSe
       return false;
     }
   }
+  // The text is used up: stars that are left match nothing of it.
   return pattern.find_first_not_of('*', patternAt) == std::string_view::npos;
 }
 

@@ -4,6 +4,11 @@
 // in a small table until it is renamed or removed. The signal handler walks that table with
 // `unlink` alone, which is allowed in a handler; the signals are held back while the table and the
 // disk disagree.
+//
+// Opens, locks, reads and writes that a signal interrupts are made again, and short ones go on
+// where they stopped, so that callers see only whole results and true failures. Descriptors are
+// closed on exec: nothing that the tool opens is handed to a child.
+
 #include "support/interface/host.h"
 
 #include <algorithm>
@@ -77,6 +82,7 @@ extern "C" void removeTemporariesAndEnd(int signal) {
   for (TemporarySlot& slot : temporarySlots) {
     if (slot.isUsed != 0) unlink(slot.name);
   }
+  // The process ends by the signal itself, so that the caller's shell sees what has ended it.
   std::signal(signal, SIG_DFL);
   std::raise(signal);
 }
@@ -103,6 +109,8 @@ FileStatus statusFrom(const struct stat& native) {
 
 HostError openNative(const char* name, int flags, FileHandle& file) {
   do {
+    // 0666 is cut by the user's mask; what an archive shall have at the end is set from the old
+    // one.
     file.number = ::open(name, flags | O_CLOEXEC, 0666);
   } while (file.number < 0 && errno == EINTR);
   return file.isOpen() ? 0 : errno;
@@ -163,6 +171,7 @@ public:
   }
 
   HostError lock(FileHandle file) override {
+    // There is no bound to the wait: who holds the lock is another run that writes, and it ends.
     while (lockNative(file.number) != 0) {
       if (errno != EINTR) return errno;
     }
@@ -210,6 +219,7 @@ public:
   HostError write(FileHandle file, std::span<const uint8_t> bytes) override {
     while (!bytes.empty()) {
       const ssize_t count = ::write(file.number, bytes.data(), bytes.size());
+      // No progress and no reason: going on would never end.
       if (count == 0) return EIO;
       if (count > 0) {
         bytes = bytes.subspan(static_cast<size_t>(count));
@@ -312,6 +322,7 @@ void installSignalCleanUp() {
     if (sigaction(signal, nullptr, &before) == 0 && before.sa_handler == SIG_IGN) continue;
     std::signal(signal, removeTemporariesAndEnd);
   }
+  // The write then fails with EFBIG, and the clean-up of a failed write runs as for a full disk.
   std::signal(SIGXFSZ, SIG_IGN);
 }
 

@@ -3,6 +3,12 @@
 // The files that are open stand in a queue. Who comes in when it is full sends out the one that has
 // been in it longest: runs go through their files in order, so that is the one that is not wanted
 // for the longest time.
+//
+// A file that was sent out is opened by its name again when somebody reads on, and compared with
+// the status of the first opening: device, inode, size and time to the nanosecond. That is what
+// stops a library that is replaced, or an object that is compiled anew, from being half the old and
+// half the new one in the archive that is written.
+
 #include "support/interface/source_file.h"
 
 #include <algorithm>
@@ -47,6 +53,7 @@ struct SourceFiles::Shared {
   void leave(SourceFile* file) {
     // Mostly the first: who makes room is the oldest.
     const auto place = std::find(open.begin(), open.end(), file);
+    // One that is kept open for its lock isn't in the queue.
     if (place != open.end()) open.erase(place);
   }
 
@@ -145,6 +152,7 @@ void SourceFile::keepIfSmall() {
   auto bytes = std::make_unique_for_overwrite<uint8_t[]>(static_cast<size_t>(size));
   size_t done = 0;
   if (readAt({bytes.get(), static_cast<size_t>(size)}, 0, done) != 0 || done < size) return;
+  // Between the opening and here somebody may have written: bytes of two versions are not kept.
   if (checkUnchanged() != 0) return;
   m_Kept = std::move(bytes);
   m_KeptSize = done;
@@ -174,6 +182,7 @@ HostError SourceFile::checkUnchanged() {
 
 HostError SourceFile::lock() {
   if (const HostError error = m_Shared->host.lock(m_Handle); error != 0) return error;
+  // Whoever had the lock before may have written: the file is taken as it is from here on.
   FileStatus now;
   if (m_Shared->host.statusOf(m_Handle, now) == 0) m_Status = now;
   return 0;

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // From the path of the program to the name in its messages: the extension of a program file goes,
 // then everything up to the last separator, where "." counts as one, so "quarn-1.2" is called "2".
+// A "zq" in front is no part of the name either. The rest is cut to the buffer, whatever the caller
+// has put into argv[0].
+
 #include "support/interface/tool_name.h"
 
 #include <algorithm>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Builds the banner and the version number text. An engineering release shows the full component
-// name, in which the delivery number follows the version that the name ends with.
+// name, in which the delivery number follows the version that the name ends with. Parts that are
+// missing, or no numbers, count as 0: a build with odd data still says something.
+
 #include "support/interface/version_banner.h"
 
 #include <algorithm>
