@@ -154,8 +154,8 @@ constexpr ValueDefinition Definitions[] = {
     option<Type_ViaFile, "via">(NoTexts),
 };
 
-static_assert(areWellFormed(Rows, OptionCount));
-static_assert(std::size(Definitions) == OptionCount);
+static_assert(areWellFormed(Rows, Option_Count));
+static_assert(std::size(Definitions) == Option_Count);
 static_assert(listEveryRow(Definitions, Rows));
 
 } // namespace

@@ -53,12 +53,12 @@ enum OptionId : uint32_t {
   Option_Words,
   Option_LibraryAttributeMap,
   Option_ViaFile,
-  OptionCount,
+  Option_Count,
 };
 
 [[nodiscard]] const tabledrivenparser::OptionTable& getOptionTable();
 [[nodiscard]] std::span<const tabledrivenparser::ValueDefinition> getOptionDefinitions();
 
-using OptionValues = std::array<tabledrivenparser::ValueRecord, OptionCount>;
+using OptionValues = std::array<tabledrivenparser::ValueRecord, Option_Count>;
 
 } // namespace quarn

@@ -68,7 +68,7 @@ ArchiveBuilder& ArchiveBuilder::append(std::string_view name, std::string_view n
   member.contents = contents;
   if (contents.size() % 2 != 0) member.padding = "\n";
   m_Members.push_back(member);
-  return setField(Size, std::to_string(contents.size()));
+  return setField(Field_Size, std::to_string(contents.size()));
 }
 
 ArchiveBuilder& ArchiveBuilder::symbolTable(const std::vector<Symbol>& symbols) {
@@ -111,14 +111,14 @@ ArchiveBuilder& ArchiveBuilder::setField(Field field, std::string_view text) {
 
 ArchiveBuilder& ArchiveBuilder::numbers(int64_t date, uint32_t uid, uint32_t gid,
                                         std::string_view octalMode) {
-  setField(Date, std::to_string(date));
-  setField(Uid, std::to_string(uid));
-  setField(Gid, std::to_string(gid));
-  return setField(Mode, octalMode);
+  setField(Field_Date, std::to_string(date));
+  setField(Field_Uid, std::to_string(uid));
+  setField(Field_Gid, std::to_string(gid));
+  return setField(Field_Mode, octalMode);
 }
 
 ArchiveBuilder& ArchiveBuilder::blankNumbers() {
-  for (const Field field : {Date, Uid, Gid, Mode})
+  for (const Field field : {Field_Date, Field_Uid, Field_Gid, Field_Mode})
     setField(field, "");
   return *this;
 }
@@ -141,7 +141,9 @@ ArchiveBuilder& ArchiveBuilder::tail(std::string_view bytes) {
 uint32_t ArchiveBuilder::offsetOf(std::string_view name) const {
   size_t offset = m_Magic.size();
   for (const Member& member : m_Members) {
-    if (member.name == name && member.fields[Name] != "/" && member.fields[Name] != "//") break;
+    if (member.name == name && member.fields[Field_Name] != "/" &&
+        member.fields[Field_Name] != "//")
+      break;
     offset += HeaderSize + member.contents.size() + member.padding.size();
   }
   return static_cast<uint32_t>(offset);

@@ -47,12 +47,12 @@ public:
 
   // What follows changes the last member. Texts are padded with blanks to their field.
   ArchiveBuilder& numbers(int64_t date, uint32_t uid, uint32_t gid, std::string_view octalMode);
-  ArchiveBuilder& badDate(std::string_view text) { return setField(Date, text); }
-  ArchiveBuilder& badUid(std::string_view text) { return setField(Uid, text); }
-  ArchiveBuilder& badGid(std::string_view text) { return setField(Gid, text); }
-  ArchiveBuilder& badMode(std::string_view text) { return setField(Mode, text); }
-  ArchiveBuilder& badSize(std::string_view text) { return setField(Size, text); }
-  ArchiveBuilder& badMemberMagic(std::string_view text) { return setField(Magic, text); }
+  ArchiveBuilder& badDate(std::string_view text) { return setField(Field_Date, text); }
+  ArchiveBuilder& badUid(std::string_view text) { return setField(Field_Uid, text); }
+  ArchiveBuilder& badGid(std::string_view text) { return setField(Field_Gid, text); }
+  ArchiveBuilder& badMode(std::string_view text) { return setField(Field_Mode, text); }
+  ArchiveBuilder& badSize(std::string_view text) { return setField(Field_Size, text); }
+  ArchiveBuilder& badMemberMagic(std::string_view text) { return setField(Field_Magic, text); }
   ArchiveBuilder& blankNumbers(); // all but the size
   ArchiveBuilder& badPadding(char padding);
   ArchiveBuilder& noPadding();
@@ -66,11 +66,20 @@ public:
   [[nodiscard]] uint32_t offsetOf(std::string_view name) const;
 
 private:
-  enum Field { Name, Date, Uid, Gid, Mode, Size, Magic, FieldCount };
+  enum Field {
+    Field_Name,
+    Field_Date,
+    Field_Uid,
+    Field_Gid,
+    Field_Mode,
+    Field_Size,
+    Field_Magic,
+    Field_Count
+  };
 
   struct Member {
     std::string name;
-    std::array<std::string, FieldCount> fields;
+    std::array<std::string, Field_Count> fields;
     std::string contents;
     std::optional<std::vector<Symbol>> symbols;
     std::string padding;

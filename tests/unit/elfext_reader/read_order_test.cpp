@@ -12,18 +12,18 @@ namespace {
 
 // The sections of the file below.
 enum SectionIndex : uint32_t {
-  Attributes = 1,
-  Note,
-  Overlay,
-  GroupTable,
-  Relocations,
-  Plain,
-  SymbolTable,
-  Strings,
-  Debug,
-  OverlappingOne,
-  OverlappingOther,
-  SectionCount = OverlappingOther + 2, // with section 0 and the section-name table
+  Section_Attributes = 1,
+  Section_Note,
+  Section_Overlay,
+  Section_GroupTable,
+  Section_Relocations,
+  Section_Plain,
+  Section_SymbolTable,
+  Section_Strings,
+  Section_Debug,
+  Section_OverlappingOne,
+  Section_OverlappingOther,
+  Section_Count = Section_OverlappingOther + 2, // with section 0 and the section-name table
 };
 
 // The problems in the order of the steps that find them.
@@ -59,26 +59,26 @@ ObjectBuilder withProblemsFrom(size_t first) {
   file.section(".overlay", SHT_ZEV_DEBUGOVERLAY)
       .entrySize(8)
       .word(1)
-      .half(static_cast<uint16_t>(either(11, Plain, Debug)))
-      .half(Plain);
+      .half(static_cast<uint16_t>(either(11, Section_Plain, Section_Debug)))
+      .half(Section_Plain);
   file.section(".group", SHT_GROUP)
-      .link(SymbolTable)
+      .link(Section_SymbolTable)
       .entrySize(either(0, 8, 4))
       .word(1)
-      .word(either(8, 99, Plain));
+      .word(either(8, 99, Section_Plain));
   file.section(".rel", SHT_REL)
-      .link(SymbolTable)
-      .info(Plain)
+      .link(Section_SymbolTable)
+      .info(Section_Plain)
       .relocation({.symbol = either(7, 9, 1)});
   file.section(".text", SHT_PROGBITS).flags(SHF_ALLOC).zeros(4).link(either(5, 99, 0));
   file.section(".symtab", SHT_SYMTAB)
-      .link(either(4, 99, Strings))
-      .symbol({.section = static_cast<uint16_t>(either(6, 77, Plain))});
+      .link(either(4, 99, Section_Strings))
+      .symbol({.section = static_cast<uint16_t>(either(6, 77, Section_Plain))});
   file.section(".strtab", SHT_STRTAB).bytes(has(1) ? std::string("x\0", 2) : std::string(2, '\0'));
   file.section(".debug", SHT_PROGBITS).zeros(4);
   file.section(".one", SHT_PROGBITS).zeros(4);
   SectionBuilder& other = file.section(".other", SHT_PROGBITS).zeros(4);
-  if (has(9)) other.offset(file.offsetOf(OverlappingOne));
+  if (has(9)) other.offset(file.offsetOf(Section_OverlappingOne));
   if (has(2)) file.header(HeaderField::ShStrNdx, 99);
   return file;
 }
@@ -91,7 +91,7 @@ TEST_F(ReadOrderTest, TheEarliestStepReports) {
   for (size_t first = 0; first < std::size(Reports); ++first)
     EXPECT_THAT(read(withProblemsFrom(first)).reports, ElementsAre(HasSubstr(Reports[first])));
   const ReadResult good = readGood(withProblemsFrom(std::size(Reports)));
-  EXPECT_EQ(good.module->getSectionCount(), SectionCount);
+  EXPECT_EQ(good.module->getSectionCount(), Section_Count);
 }
 
 } // namespace elfext
