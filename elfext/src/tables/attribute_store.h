@@ -2,6 +2,10 @@
 //
 // What build attributes hang on while they are read: the object as a whole, its sections and its
 // static symbols. They are those of a model, or of an object's tables, of which none is made.
+//
+// The reader of attributes works on this interface alone, so that both roads take the same steps
+// and give up at the same places. Its two halves are a module
+// (reader/object_module_reader_attributes.cpp) and LooseAttributeStore.
 #pragma once
 
 #include "elfext/interface/symbol.h"

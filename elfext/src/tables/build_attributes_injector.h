@@ -3,6 +3,9 @@
 // Gives the holders in a store what an attribute section says of them: in three walks over the
 // section, so that what holds for the file is there before what holds for its sections, and that
 // before what holds for symbols, in whatever order the section has them.
+//
+// Indexes in a section are those of the section header table and of the static symbols, both from
+// 1; the base class has decoded them. One that names nothing makes the section corrupted.
 #pragma once
 
 #include "elfext/interface/build_attributes_parsers.h"
@@ -37,6 +40,7 @@ public:
   }
 
 private:
+  // A small object with an honest section needs far less; a large one gets more by its size.
   static constexpr uint64_t Base = 2 << 20;
   static constexpr uint64_t PerByte = 4;
   static constexpr uint64_t AlwaysCovered = 80;

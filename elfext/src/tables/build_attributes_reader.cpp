@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides which statement of build attributes counts, and whom it is for. Sections are walked
+// first, then, for who keeps attributes, the symbols whose names are decorations:
+// "BuildAttributes$" and a text for the file or the section of the symbol, name,
+// "$$BuildAttributes$" and a text for the first symbol of that name. It is the last step of a read,
+// since holders must have been checked before anything hangs on them.
+//
+// What is tried here: attribute sections that lie (the parsers and the injector's budget stop
+// them), and thousands of decorations whose names are the ends of one long text, so that looking at
+// each is a square of the file (NameReader stops those).
 #include "elfext/src/tables/build_attributes_reader.h"
 
 #include "elfext/interface/attribute_string.h"
@@ -19,6 +29,7 @@ namespace {
 // Where nothing is kept, nothing has to be there before something else.
 bool parseSection(const ObjectTables& tables, AttributeStore& store, AttributeBytes bytes,
                   InjectionBudget& budget) {
+  // One walk finds the same faults as three.
   if (!store.isKept())
     return BuildAttributesInjector(store, std::nullopt, budget)
         .parse(bytes, tables.format.isLittle);
@@ -39,11 +50,13 @@ bool readAttributeSections(ObjectTables& tables, AttributeStore& store, SectionS
     if (tables.typeOf(i) != SHT_ZEV_ATTRIBUTES) continue;
     const uint64_t size = tables.sectionHeaders[i].size;
     const uint8_t* contents = size == 0 ? nullptr : tables.viewSection(i);
+    // Bytes that can't be had are not a corrupted section: this has been reported.
     if (size != 0 && contents == nullptr) return false;
     state = SectionState::Read;
     if (parseSection(tables, store, {contents, size}, budget)) continue;
     state = SectionState::Corrupt;
     if (!goOn(tables.reporter, &ErrorHandler::corruptBuildAttributes, i)) return false;
+    // Half of what an object says of itself would be taken for all of it.
     if (store.isKept()) store.drop();
     return true;
   }
@@ -65,6 +78,8 @@ public:
 
   // Empty once too much has been read, as for a symbol without a name.
   [[nodiscard]] std::string_view read(const char* name) {
+    // The string table ends with a zero byte, so this looks at no more than the table, and at no
+    // more than is left.
     const size_t length = name == nullptr ? 0 : strnlen(name, m_Left + 1);
     const bool isTooLong = length > m_Left;
     m_Left -= std::min<uint64_t>(length, m_Left);
@@ -82,6 +97,7 @@ bool startsAsDecoration(const AttributeSymbol& symbol) {
   const bool canBe =
       symbol.category == Symbol::Category_Hosted || symbol.category == Symbol::Category_Absolute;
   return canBe && symbol.name != nullptr &&
+         // Ends at the name's own end, so it takes no part of what NameReader counts.
          std::strncmp(symbol.name, DecorationPrefix.data(), DecorationPrefix.size()) == 0;
 }
 
@@ -92,6 +108,7 @@ bool readDecoration(const AttributeSymbol& symbol, NameReader& names, Decoration
     decoration.text.remove_prefix(DecorationPrefix.size());
     return true;
   }
+  // Before the name is read: most symbols are not absolute and cost nothing.
   if (symbol.category != Symbol::Category_Absolute) return false;
   const std::string_view name = names.read(symbol.name);
   const size_t marker = name.find(DecorationMarker);
@@ -109,7 +126,8 @@ std::vector<Decoration> findDecorations(const AttributeStore& store, NameReader&
   return decorations;
 }
 
-// By the names of the symbols that decorations are for: the first symbol of that name, if any.
+// By the names of the symbols that decorations are for: the first symbol of that name, if any. One
+// walk over all symbols fills it, where looking for each name would be decorations times symbols.
 using BaseSymbols = std::unordered_map<std::string_view, std::optional<uint32_t>>;
 
 BaseSymbols findBaseSymbols(const AttributeStore& store, std::span<const Decoration> decorations,
@@ -151,6 +169,7 @@ void readDecorationSymbols(const ObjectTables& tables, AttributeStore& store, Se
   const std::vector<Decoration> decorations = findDecorations(store, names);
   if (decorations.empty()) return;
   if (state == SectionState::Read) {
+    // Only tools that are new enough state a version.
     if (store.getHighestTagsVersion() > 0) return;
     store.drop();
   }

@@ -2,6 +2,8 @@
 //
 // Build attributes, from the two places where objects state them. A section of a new enough tool
 // outranks decoration symbols, and these outrank the section of an older one.
+//
+// Both roads end here: the outline with a store of its own, the model with its module.
 #pragma once
 
 #include "elfext/src/tables/attribute_store.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Attributes by holder, in a hash table that has entries only for who got some: of ten thousand
+// symbols mostly none did. The outline makes one for each object and asks it for the file's
+// attributes alone. Symbols are not stored at all but decoded from their rows when one is asked
+// for.
 #include "elfext/src/tables/loose_attribute_store.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -25,8 +30,11 @@ LooseAttributeStore::LooseAttributeStore(const ObjectTables& tables, bool isWant
   for (const SymbolTable& table : tables.symbolTables) {
     if (table.isDynamic) continue;
     m_Parts.push_back({m_SymbolCount, &table});
+    // Tables with contents only, so there is a null symbol to leave out.
     m_SymbolCount += table.rowCount - 1;
   }
+  // Reports must not depend on whether attributes are wanted: whether a section uses up the budget
+  // is only known by taking all the steps.
   if (isWanted || !InjectionBudget::alwaysCovers(countSectionBytes(tables))) m_Cache.emplace();
 }
 
@@ -34,6 +42,7 @@ AttributeSymbol LooseAttributeStore::getSymbol(uint32_t index) const {
   const auto startsBehind = [](uint32_t wanted, const Part& part) {
     return wanted < part.firstIndex;
   };
+  // The last part that starts at the index or before.
   const Part& part = *(std::upper_bound(m_Parts.begin(), m_Parts.end(), index, startsBehind) - 1);
   const uint32_t rowIndex = index - part.firstIndex + 1;
   const SymbolRow row = m_Tables.getSymbolRow(*part.table, rowIndex);
@@ -51,6 +60,7 @@ void LooseAttributeStore::setBlock(AttributeHolder holder, const BuildAttributes
   const auto sameVendor = [block](const BuildAttributesBlock* other) {
     return other->getVendor() == block->getVendor();
   };
+  // One vendor or two; of more, the injector has taken each look from its budget.
   const auto found = std::find_if(blocks.begin(), blocks.end(), sameVendor);
   if (found == blocks.end())
     blocks.push_back(block);

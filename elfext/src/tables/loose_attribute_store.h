@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The build attributes of an object of which no model is made.
+//
+// It serves the outline. Most objects have attributes for the file alone, so a holder costs nothing
+// until it gets some.
 #pragma once
 
 #include "elfext/interface/build_attributes_cache.h"

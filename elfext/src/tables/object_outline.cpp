@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// An object's tables, kept from one read to the next question: what the archive and its reports ask
+// of each member. Names, categories and attributes are views and values taken from the tables when
+// asked for; no model is made. The order of a read is that of a model's: headers, tables,
+// attributes; so both roads reject the same objects with the same words.
+//
+// It is read once a member, ten thousand times a run, so memory is handed on: the image's from this
+// object, the arrays' from the object before.
 #include "elfext/interface/object_outline.h"
 
 #include "elfext/interface/build_attributes.h"
@@ -14,6 +22,8 @@
 
 namespace elfext {
 
+// Everything that refers to one image, made and dropped as one. The order of the fields is that of
+// their dependence.
 struct ObjectOutline::Content {
   Content(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
           ErrorHandler* errorHandler, const char* name)
@@ -71,6 +81,7 @@ void addMappingSymbols(const ObjectTables& tables, SizesSource& source) {
     const SymbolHome home = tables.homeOf(table, index, row);
     if (home.category != Symbol::Category_Hosted) return;
     const SectionHeader& header = tables.sectionHeaders[home.section];
+    // Only executable sections are split by mapping symbols; the others count whole.
     if (!isCode(header)) return;
     source.mappingSymbols.push_back({home.section, tables.placeInHome(row, home), name});
   });
@@ -115,17 +126,21 @@ ObjectOutline::~ObjectOutline() = default;
 
 bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
                          ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
+  // The window serves one file; members of one archive come from the same.
   if (m_File != file) m_Memory->window.setFile(file.get());
   m_File = file;
+  // Asked before the file goes to the content, and told after the reporter is there.
   const bool isInFile = file->getStatus().holds(offset, size);
   auto content = std::make_unique<Content>(std::move(file), offset, size, errorHandler, objectName);
   ObjectTables& tables = content->tables;
   if (m_Content != nullptr) tables.takeMemory(m_Content->tables);
+  // The former image used the same memory; from here on its views would be wrong.
   m_Content.reset();
   if (!isInFile) return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
   bool isForeign = false;
   if (!content->image.prepare(*m_Memory)) return tables.failRead();
   if (!checkHeaders(tables, isForeign)) return false;
+  // The handler let it pass: an object about which nothing is known, and no error.
   if (isForeign) return true;
   if (!checkTables(tables)) return false;
   content->attributes.emplace(tables, wantsAttributes);

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The order of the checks, and the ELF header.
+// The order of the checks, the ELF header (e_ident, e_type, e_machine, e_version), and what all
+// steps ask of the tables. A header is 52 bytes in class 1 and 64 in class 2. Its offsets and
+// counts are believed by nobody: the steps that follow compare each with the image.
 #include "elfext/src/tables/object_tables.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -16,6 +18,7 @@ constexpr std::array<uint8_t, 4> Magic = {0x7F, 'E', 'L', 'F'};
 constexpr uint32_t EM_ZEV64_SECOND = 184;
 
 bool readFileHeader(ObjectTables& tables) {
+  // First only what says how long the header is.
   const uint8_t* ident = tables.view(0, IdentSize);
   if (ident == nullptr) return false;
   const bool isWide = ident[EI_CLASS] == ELFCLASS64;
@@ -34,6 +37,7 @@ bool readFileHeader(ObjectTables& tables) {
 bool checkFileHeader(const ObjectTables& tables) {
   const FileHeader& header = tables.fileHeader;
   const uint8_t encoding = header.ident[EI_DATA];
+  // The order of these is that of their reports; each ends the read.
   if (header.type < ET_REL || header.type > ET_CORE)
     return refuse(tables.reporter, &ErrorHandler::unrecognisedFileType, header.type);
   if (encoding != ELFDATA2LSB && encoding != ELFDATA2MSB)
@@ -52,12 +56,16 @@ bool isMachineSupported(uint16_t machine) {
 bool checkHeaders(ObjectTables& tables, bool& isForeign) {
   if (!readFileHeader(tables) || !checkFileHeader(tables)) return false;
   const uint16_t machine = tables.fileHeader.machine;
+  // Objects of other processors are members like any other, for a handler that wants them.
   isForeign = !isMachineSupported(machine);
   if (isForeign) return goOn(tables.reporter, &ErrorHandler::unsupportedMachine, machine);
   return checkSectionHeaders(tables) && checkProgramHeaders(tables);
 }
 
 bool checkTables(ObjectTables& tables) {
+  // Each step relies on those before it: shapes make row counts whole, contents make every
+  // section's bytes known to be there, links say which tables belong together, symbols come before
+  // the relocations that name them, and placement before what only concerns laid-out files.
   return checkTableShapes(tables) && checkContents(tables) && checkSectionNames(tables) &&
          checkLinks(tables) && checkSymbols(tables) && checkRelocations(tables) &&
          checkGroups(tables) && checkPlacement(tables) && checkDynamicSections(tables) &&
@@ -69,6 +77,7 @@ void ObjectTables::takeMemory(ObjectTables& former) {
     array = std::move(formerArray);
     array.clear();
   };
+  // Cleared, not freed: an object like the one before it fits without a new page.
   take(sectionHeaders, former.sectionHeaders);
   take(programHeaders, former.programHeaders);
   take(links, former.links);
@@ -99,6 +108,7 @@ const char* ObjectTables::nameOf(uint32_t section) const {
   return offset == 0 || sectionNames == nullptr ? nullptr : sectionNames + offset;
 }
 
+// Linked files and core dumps; in objects still to be linked, st_value is an offset.
 bool ObjectTables::hasLaidOutAddresses() const {
   return fileHeader.type == ET_EXEC || fileHeader.type == ET_DYN || fileHeader.type == ET_CORE;
 }
@@ -122,6 +132,7 @@ bool ObjectTables::failRead() const {
     return mapLowLevelResult(reporter, LowLevelResult::OutsideImage);
   case ImageFailure::NoMemory:
     return mapLowLevelResult(reporter, LowLevelResult::NoMemory);
+  // A failure that the image did not note is one of the host with number 0.
   case ImageFailure::None:
   case ImageFailure::Unreadable:
     break;

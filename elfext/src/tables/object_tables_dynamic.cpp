@@ -2,6 +2,12 @@
 //
 // Dynamic sections, the version sections that they count and the preemption maps that they point
 // to. Only bytes that can't be had are reported here: what makes no sense is passed over.
+//
+// Elf32_Dyn and Elf64_Dyn are pairs of d_tag and d_val. Everything in them is a claim of the file
+// about other sections: counts of version records, addresses of maps. None is a reason to reject a
+// file, so what can't be followed is dropped, and each string table is only asked to be there. A
+// thousand dynamic sections that claim the same map, or overlap it, cost one look each: values are
+// kept once, and places are searched for together.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/extents.h"
 #include "elfext/src/tables/object_tables.h"
@@ -15,7 +21,9 @@ namespace {
 std::vector<DynamicTag> getTags(const ObjectTables& tables, const uint8_t* bytes, uint64_t size) {
   const uint32_t fieldSize = tables.format.isWide ? 8 : 4;
   std::vector<DynamicTag> tags;
+  // By subtraction: a section may end in the middle of a pair.
   for (uint64_t pos = 0; size - pos >= 2 * fieldSize; pos += 2 * fieldSize) {
+    // In class 2 each is the first word of its 8-byte field, in either byte order.
     const DynamicTag tag = {tables.get<uint32_t>(bytes + pos),
                             tables.get<uint32_t>(bytes + pos + fieldSize)};
     if (tag.tag == DT_NULL) break;
@@ -31,6 +39,7 @@ bool checkStrings(ObjectTables& tables, uint32_t section) {
 }
 
 std::optional<uint32_t> findLast(const ObjectTables& tables, uint32_t type) {
+  // The last one counts where there are several.
   for (uint32_t i = tables.getSectionCount(); i > 0; --i) {
     if (tables.typeOf(i - 1) == type) return i - 1;
   }
@@ -55,6 +64,7 @@ std::optional<VersionTables> findVersions(const ObjectTables& tables, const Vers
   if (counts.definitions.has_value() != versions.definitions.has_value()) return std::nullopt;
   if (counts.requirements.has_value() != versions.requirements.has_value()) return std::nullopt;
   if (versions.symbolVersions && versions.dynamicSymbols &&
+      // Two bytes a symbol. With another count there is no telling which word is whose.
       tables.sectionHeaders[*versions.symbolVersions].size / 2 !=
           tables.rowCount(*versions.dynamicSymbols))
     return std::nullopt;
@@ -97,6 +107,7 @@ public:
       places.push_back({value.value, value.value + 1, 0});
     const std::vector<uint32_t> sections = findFirstHolders(getExtents(), places);
     for (size_t i = 0; i < values.size(); ++i) {
+      // No section at that place means no map.
       if (sections[i] != NoExtent && !addMap(sections[i], values[i])) return false;
     }
     return true;
@@ -124,6 +135,7 @@ private:
     if (m_Tables.viewSection(section) == nullptr) return false;
     if (!checkStrings(m_Tables, value.dynamicSection)) return false;
     m_Tables.preemptionMaps.push_back(
+        // The section holds the value, so this lies within it.
         {section, value.value - startOf(header), value.dynamicSection});
     return true;
   }

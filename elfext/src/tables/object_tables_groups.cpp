@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Section groups: a word of flags, then the indexes of the members.
+//
+// A section is in one group at most; the owners, by section, find a second one at once. Group
+// sections have been checked to consist of whole words and to lie in the image. A hostile file
+// repeats members, or lays a thousand group sections over the same zeros, each of which would be
+// walked through.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/row_maximum.h"
 #include "elfext/src/tables/object_tables.h"
@@ -19,6 +24,7 @@ bool checkMember(ObjectTables& tables, uint32_t group, uint32_t member,
   if (member >= tables.getSectionCount())
     return goOn(tables.reporter, &ErrorHandler::groupMemberOutOfRange, group, member,
                 tables.getLastSection());
+  // Zeros name the null section, which is nobody's member.
   if (member == 0 && tables.typeOf(0) == SHT_NULL) return true;
   if (owners[member] != NoGroup)
     return goOn(tables.reporter, &ErrorHandler::sectionInTwoGroups, member, owners[member], group);
@@ -31,6 +37,8 @@ bool checkGroup(ObjectTables& tables, uint32_t index, std::vector<uint32_t>& own
   const SectionHeader& header = tables.sectionHeaders[index];
   const uint8_t* words = header.size == 0 ? nullptr : tables.view(header.offset, header.size);
   if (header.size != 0 && words == nullptr) return false;
+  // All groups' members are in one array: a list for each group would cost more than its one or two
+  // members.
   const size_t firstMember = tables.groupMembers.size();
   const uint64_t count = tables.rowCount(index);
   for (uint64_t i = 1; i < count; ++i) {
@@ -71,6 +79,7 @@ bool checkGroups(ObjectTables& tables) {
   }
   if (groups.empty()) return true;
   std::vector<uint32_t> owners(tables.getSectionCount(), NoGroup);
+  // The read will end at the check of placement; what is reported before that must still be.
   if (tables.overlap) return checkOverlappingGroups(tables, groups, owners);
   tables.groups.reserve(groups.size());
   for (const uint32_t index : groups) {

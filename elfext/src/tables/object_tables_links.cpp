@@ -2,6 +2,11 @@
 //
 // What the section headers' link and info fields name. Bad links of relocation, group and index
 // sections only cost the section; the others end the read.
+//
+// sh_link and sh_info are indexes that the file chose. Behind this step, hasLink says that an index
+// may be followed and leads to a section of a type that its user may name: rows, strings and
+// symbols are looked for there without another question. Sections are told in their order, those
+// with a rule of their own type before all others.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/tables/object_tables.h"
 
@@ -13,6 +18,8 @@ using LinkReport = Report<uint32_t, uint32_t, uint32_t>;
 
 // The reports for a link that names no section, or one of another type than the two wanted.
 struct LinkRule {
+  // The handler's operations themselves: the row of a type says what is told, and one function
+  // tells it.
   LinkReport outOfRange;
   LinkReport ofWrongType;
   uint32_t wantedType;
@@ -45,6 +52,7 @@ bool checkLink(ObjectTables& tables, uint32_t index, const LinkRule& rule) {
   const bool goesOn =
       isInRange ? goOn(tables.reporter, rule.ofWrongType, index, link, type)
                 : goOn(tables.reporter, rule.outOfRange, index, link, tables.getLastSection());
+  // Also where the handler lets it pass: hasLink then keeps everybody from following it.
   tables.links[index] = LinkState::Broken;
   return goesOn && rule.isSkippable;
 }
@@ -63,6 +71,8 @@ bool checkGroupLinks(ObjectTables& tables, uint32_t index) {
   if (tables.isBroken(index)) return true;
   const SectionHeader& header = tables.sectionHeaders[index];
   const uint64_t rowCount = tables.rowCount(header.link);
+  // A signature that there is not leaves the group without a name to be compared by, so nothing
+  // goes on.
   return header.info < rowCount || stop(tables.reporter, &ErrorHandler::groupSignatureOutOfRange,
                                         index, header.info, header.link, rowCount);
 }
@@ -71,11 +81,13 @@ bool checkIndexSectionLink(ObjectTables& tables, uint32_t index) {
   if (!checkLink(tables, index, ShndxRule)) return false;
   if (tables.isBroken(index)) return true;
   const uint32_t table = tables.sectionHeaders[index].link;
+  // Two index sections for one table would say two things of each symbol.
   const auto [first, isFirst] = tables.indexSections.emplace(table, index);
   if (!isFirst)
     return stop(tables.reporter, &ErrorHandler::secondShndxSection, first->second, index, table);
   const uint64_t wordCount = tables.rowCount(index);
   const uint64_t rowCount = tables.rowCount(table);
+  // One word for each row: from here on a row's word is known to be there.
   return wordCount == rowCount ||
          stop(tables.reporter, &ErrorHandler::shndxCountDiffers, index, wordCount, table, rowCount);
 }

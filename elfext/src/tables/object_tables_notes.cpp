@@ -2,6 +2,11 @@
 //
 // Two tables of this system's own: the records of debug overlay sections, and the note that maps
 // sections to segments.
+//
+// A note is namesz, descsz and type as words, then the owner's name and the descriptor, both padded
+// to words (Elf_Nhdr). Sizes are 32 bits and the sums 64, so a note that claims 4 GiB ends the walk
+// and wraps nothing. Rows of an overlay section have the size that sh_entsize says: rows too small
+// for their record, with which they would reach beyond the section, are passed over as a whole.
 #include "elfext/interface/debug_section_name.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/tables/object_tables.h"
@@ -33,6 +38,7 @@ bool checkOverlayRecord(ObjectTables& tables, uint32_t index, uint64_t number,
   if (record.debugSection >= tables.getSectionCount())
     return goOn(tables.reporter, &ErrorHandler::overlayOfNoSection, number, index,
                 record.debugSection);
+  // Names have been checked, so a section's name ends in its table.
   if (!isDebugSectionName(tables.nameOf(record.debugSection)))
     return goOn(tables.reporter, &ErrorHandler::overlayOfOtherSection, number, index,
                 record.debugSection);
@@ -44,6 +50,7 @@ bool checkOverlayRecord(ObjectTables& tables, uint32_t index, uint64_t number,
 
 bool checkDebugOverlay(ObjectTables& tables, uint32_t index) {
   const SectionHeader& header = tables.sectionHeaders[index];
+  // The word and two half words. Also keeps the division below from one by 0.
   const uint64_t smallestRow = tables.format.isWide ? 12 : 8;
   if (header.entsize < smallestRow || header.size < header.entsize) return true;
   const uint8_t* bytes = tables.viewSection(index);
@@ -57,6 +64,7 @@ bool checkDebugOverlay(ObjectTables& tables, uint32_t index) {
   return true;
 }
 
+// A header and one word of name or descriptor: what is smaller at a section's end is padding.
 constexpr uint64_t SmallestNote = 16;
 constexpr uint64_t NoteHeaderSize = 12;
 constexpr uint32_t SegmentMapNote = 0x40000000;
@@ -81,6 +89,7 @@ std::vector<uint32_t> findAllocatedSections(const ObjectTables& tables) {
 bool checkSegmentMap(ObjectTables& tables, uint32_t noteSection,
                      std::span<const uint32_t> allocated, const uint8_t* words, uint64_t count) {
   const auto sectionCount = static_cast<uint32_t>(allocated.size());
+  // Of several notes the last one counts, section by section.
   tables.notedSegments.resize(tables.getSectionCount(), NoSegment);
   for (uint32_t i = 0; i < sectionCount; ++i) {
     const uint32_t segment = i < count ? tables.get<uint32_t>(words + uint64_t{i} * 4) : 0;
@@ -105,6 +114,7 @@ bool checkNotes(ObjectTables& tables, uint32_t index, std::span<const uint32_t> 
     const auto type = tables.get<uint32_t>(bytes + pos + 8);
     const uint8_t* name = bytes + pos + NoteHeaderSize;
     const uint64_t descriptor = pos + NoteHeaderSize + roundUpToWord(nameSize);
+    // What follows a note that leaves its section can't be found, and is not missed.
     if (descriptor > size) return true;
     const uint64_t length = std::min<uint64_t>(descriptorSize, size - descriptor);
     const bool isSegmentMap = nameSize == sizeof SegmentMapOwner && type == SegmentMapNote &&
@@ -128,6 +138,7 @@ bool checkDebugOverlays(ObjectTables& tables) {
 }
 
 bool checkSegmentMaps(ObjectTables& tables) {
+  // Made for the first section that may have notes: most objects have none.
   std::optional<std::vector<uint32_t>> allocated;
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (tables.typeOf(i) != SHT_NOTE || tables.sectionHeaders[i].size < SmallestNote) continue;

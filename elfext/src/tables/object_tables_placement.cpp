@@ -2,6 +2,12 @@
 //
 // Where everything lies in the file: sections must not overlap, and the bytes of segments that
 // belong to nothing else must be there.
+//
+// Overlaps have been found from the headers already; here is their place in the order of reports.
+// Gaps become blocks of raw data in a model, and padding or data in the sizes. A hostile file has
+// ten thousand segments over the same bytes, or ones that end beyond all numbers: the sweep sorts
+// the ends once and asks at each which segments are open, and what it answers with has been
+// compared with the image.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/sort.h"
 #include "elfext/src/bytes/extents.h"
@@ -26,6 +32,7 @@ std::vector<Extent> getOccupiedExtents(const ObjectTables& tables) {
   const FileHeader& header = tables.fileHeader;
   add(0, header.ehsize);
   add(header.shoff, uint64_t{header.shentsize} * tables.getSectionCount());
+  // In an object still to be linked this table has no place.
   if (header.type != ET_REL)
     add(header.phoff, uint64_t{header.phentsize} * tables.getSegmentCount());
   return extents;
@@ -49,12 +56,14 @@ public:
   }
 
   bool find() {
+    // First, as its end would be cut to the largest number, and look as if it were there.
     if (hasEndlessSegment())
       return mapLowLevelResult(m_Tables.reporter, LowLevelResult::OutsideImage);
     for (size_t i = 0; i < m_Events.size();) {
       const uint64_t start = m_Events[i].offset;
       for (; i < m_Events.size() && m_Events[i].offset == start; ++i)
         take(m_Events[i]);
+      // Behind the last event everything is closed, so there is a next one.
       const bool isGap = hasOpenSegment() && m_OpenOthers == 0;
       if (isGap && !addGap(start, m_Events[i].offset)) return false;
     }
@@ -80,7 +89,8 @@ private:
     m_Events.push_back({extent.end, extent.id, true});
   }
 
-  // Open segments by how welcome their bytes are; within each set the first one counts.
+  // Open segments by how welcome their bytes are; within each set the first one counts. Sets, as
+  // ten thousand segments may be open at once and close in any order.
   [[nodiscard]] std::set<uint32_t>& setOf(uint32_t segment) {
     if (m_Tables.isSegmentThere[segment]) return m_OpenThere;
     return m_Tables.programHeaders[segment].type == PT_LOAD ? m_OpenLoads : m_OpenOtherSegments;
@@ -109,6 +119,7 @@ private:
     if (m_Tables.isSegmentThere[segment]) return true;
     if (!m_Tables.image.contains(header.offset, header.filesz))
       return mapLowLevelResult(m_Tables.reporter, LowLevelResult::OutsideImage);
+    // It changes sets when it becomes one of those that are there.
     setOf(segment).erase(segment);
     m_Tables.isSegmentThere[segment] = true;
     setOf(segment).insert(segment);
@@ -119,6 +130,7 @@ private:
     const uint32_t index = chooseSegment();
     if (!requireSegment(index)) return false;
     const ProgramHeader& header = m_Tables.programHeaders[index];
+    // Its own close event is at its end, and no gap goes beyond the next event.
     QUARN_ASSERT(1, end - header.offset <= header.filesz);
     m_Tables.gaps.push_back({index, start, end});
     return true;

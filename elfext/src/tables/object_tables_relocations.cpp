@@ -2,6 +2,11 @@
 //
 // Relocation tables. Their rows are checked in one tight loop, for the only thing that can be wrong
 // with them: a symbol that the symbol table does not have.
+//
+// Elf32_Rel(a) and Elf64_Rel(a): r_offset, r_info with symbol and type, and with the `a` form
+// r_addend. Relocations are most of an object's rows, so the loop only takes a maximum over one
+// word of each row, and only a table that fails is looked through for the row to name. r_offset is
+// not looked at here: no read follows it.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/row_maximum.h"
 #include "elfext/src/tables/object_tables.h"
@@ -22,6 +27,7 @@ uint32_t symbolWordPlace(RecordFormat format) {
 
 // The symbol index that the word is, or has above the type.
 uint32_t symbolOf(RecordFormat format, uint32_t word) {
+  // In class 1 the type is below the symbol, so the greatest word has the greatest symbol.
   return format.isWide ? word : word >> 8;
 }
 
@@ -82,6 +88,7 @@ private:
 bool openTable(ObjectTables& tables, uint32_t index, RelocationTable& table) {
   const SectionHeader& header = tables.sectionHeaders[index];
   const uint64_t rowCount = tables.rowCount(index);
+  // Models count rows in 32 bits.
   if (rowCount > std::numeric_limits<uint32_t>::max())
     return mapLowLevelResult(tables.reporter, LowLevelResult::NoMemory);
   table = {.section = index,
@@ -110,6 +117,7 @@ bool checkRelocations(ObjectTables& tables) {
   std::optional<OverlappingTables> overlappingTables;
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!isRelocationTable(tables.typeOf(i)) || tables.isBroken(i)) continue;
+    // Nothing to view, and nothing to check.
     if (tables.sectionHeaders[i].size == 0) continue;
     RelocationTable table;
     if (!openTable(tables, i, table)) return false;

@@ -1,6 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The header tables, and what the section headers say of sizes, contents and names.
+//
+// The fields are those of Elf32_Shdr and Elf64_Shdr, Elf32_Phdr and Elf64_Phdr. Counts are compared
+// with the bytes of the image before anything is reserved; extents are held against the image by
+// subtraction. After these steps each section that has bytes has all of them in the image, every
+// string table in use ends with a zero byte, each name lies in its table, and tables of fixed rows
+// have whole rows. Section 0 of a good file is all zeros, and with extended numbering holds the
+// section count (sh_size) and the index of the name table (sh_link).
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/extents.h"
 #include "elfext/src/tables/object_tables.h"
@@ -31,6 +38,8 @@ template <class Record>
 bool readTable(ObjectTables& tables, uint64_t offset, uint64_t count, uint32_t rowSize,
                std::vector<Record>& records) {
   constexpr uint64_t MostRows = std::numeric_limits<uint32_t>::max();
+  // The count may be 2^64 - 1, from the first section's sh_size; the product is made only behind
+  // this.
   const bool fits = count <= tables.image.getSize() / rowSize && count < MostRows;
   if (!fits) return mapLowLevelResult(tables.reporter, LowLevelResult::OutsideImage);
   const uint8_t* bytes = tables.view(offset, count * rowSize);
@@ -49,11 +58,13 @@ bool checkTableShape(ObjectTables& tables, uint32_t index) {
   if (header.entsize != 0 && header.entsize != expected) {
     if (!goOn(tables.reporter, &ErrorHandler::wrongEntrySize, index, header.entsize, expected))
       return false;
+    // Mended as the handler's contract says: the row size is ours in any case.
     header.entsize = expected;
   }
   if (header.size % expected == 0) return true;
   if (!goOn(tables.reporter, &ErrorHandler::sizeNotMultiple, index, header.size, expected))
     return false;
+  // Rows that are whole are still good; what is left of them is nobody's.
   header.size -= header.size % expected;
   return true;
 }
@@ -65,6 +76,8 @@ void findOverlap(ObjectTables& tables) {
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     const SectionHeader& header = tables.sectionHeaders[i];
     const uint64_t end = endOf(header.offset, header.size);
+    // From the headers alone and before anything is viewed: tables that share bytes are then
+    // checked by other means, which don't take the product of all of them.
     if (hasFileBytes(header) && end > header.offset) extents.push_back({header.offset, end, i});
   }
   tables.overlap = findFirstOverlap(extents);
@@ -106,8 +119,10 @@ bool checkStringTable(ObjectTables& tables, uint32_t index) {
   if (!goOn(tables.reporter, &ErrorHandler::stringTableNotZeroEnded, index, isBadAtStart,
             isBadAtEnd))
     return false;
+  // Nobody will look into it.
   if (tables.overlap) return true;
   std::vector<uint8_t>& mended = tables.mendedStrings[index];
+  // The whole table has been viewed above, so its bytes follow the first one.
   mended.assign(first, first + header.size);
   mended.front() = 0;
   mended.back() = 0;
@@ -119,6 +134,7 @@ bool checkSectionBytes(ObjectTables& tables, uint32_t index) {
   const uint32_t loadSegment = tables.loadSegments.empty() ? NoExtent : tables.loadSegments[index];
   if (loadSegment != NoExtent) {
     const ProgramHeader& segment = tables.programHeaders[loadSegment];
+    // A section in a segment needs all of the segment, even where its own bytes are there.
     if (!tables.image.contains(segment.offset, segment.filesz))
       return mapLowLevelResult(tables.reporter, LowLevelResult::OutsideImage);
     tables.isSegmentThere[loadSegment] = true;
@@ -130,6 +146,7 @@ bool checkSectionBytes(ObjectTables& tables, uint32_t index) {
 // Finds the table of section names; 0 for none.
 bool findNameTable(ObjectTables& tables) {
   uint32_t table = tables.fileHeader.shoff == 0 ? 0 : tables.fileHeader.shstrndx;
+  // The index did not fit e_shstrndx.
   if (table == SHN_XINDEX) {
     if (tables.sectionHeaders.empty())
       return stop(tables.reporter, &ErrorHandler::emptySectionHeaderTable);
@@ -165,6 +182,7 @@ bool checkSectionHeaders(ObjectTables& tables) {
   if (!readTable(tables, offset, count, sectionHeaderSize(tables.format.isWide),
                  tables.sectionHeaders))
     return false;
+  // Not before the table was read: the count has been compared with the bytes by then.
   tables.links.resize(count);
   return true;
 }
@@ -184,6 +202,7 @@ bool checkTableShapes(ObjectTables& tables) {
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!checkTableShape(tables, i)) return false;
   }
+  // Behind the loop, which may cut sizes.
   findOverlap(tables);
   return true;
 }

@@ -1,6 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The rows of the symbol tables. Each is checked in the order name, section, kind.
+//
+// Elf32_Sym and Elf64_Sym. Behind this step a name's offset lies in its string table, a hosted
+// symbol's section is there, and each row that says SHN_XINDEX has its word in an index section;
+// homeOf and nameOf rely on it. Symbol rows are the most that the tool looks at, one object after
+// the other, so the loop over them asks and a second function reports.
+//
+// Where sections overlap, a thousand tables may share their rows: each is then judged as a whole,
+// by the greatest name offset among its rows, with rows that are wrong in any table counting as the
+// greatest number, and by the places where a row wants an index and the index is bad.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/bytes/row_marks.h"
 #include "elfext/src/bytes/row_maximum.h"
@@ -23,11 +32,13 @@ enum class RowFault : uint8_t { None, Name, NoIndexes, NotHosted, Section };
 // stands apart.
 RowFault findFault(const ObjectTables& tables, const SymbolTable& table, uint32_t index,
                    const SymbolRow& row) {
+  // Offset 0 is no name in any table, even in one without a byte.
   if (row.name != 0 && row.name >= table.stringSize) return RowFault::Name;
   if (row.shndx == SHN_XINDEX && table.indexes == nullptr) return RowFault::NoIndexes;
   const SymbolHome home = tables.homeOf(table, index, row);
   if (home.category != Symbol::Category_Hosted)
     return row.getType() == STT_SECTION ? RowFault::NotHosted : RowFault::None;
+  // Also of the reserved indexes that have no meaning of their own here.
   return home.section >= tables.getSectionCount() ? RowFault::Section : RowFault::None;
 }
 
@@ -74,15 +85,18 @@ public:
         m_IsBadIndex(image, 4, [this](const uint8_t* bytes) {
           return m_Tables.get<uint32_t>(bytes) >= m_Tables.getSectionCount();
         }) {}
+  // The functions above hold its address.
   OverlappingTables(const OverlappingTables&) = delete;
   OverlappingTables& operator=(const OverlappingTables&) = delete;
 
   [[nodiscard]] bool isSuspicious(const SymbolTable& table, uint64_t indexOffset) {
     if (table.rowCount < 2) return false;
     const uint32_t rowSize = symbolRowSize(m_Tables.format.isWide);
+    // The null symbol is never judged.
     const uint64_t first = m_Tables.sectionHeaders[table.section].offset + rowSize;
     RowMaximum& rows = table.indexes == nullptr ? m_RowsWithoutIndexes : m_Rows;
     const uint32_t greatest = rows.find(first, table.rowCount - 1);
+    // A suspicion only: the rows are then looked at one by one, and they decide.
     if (greatest != 0 && greatest >= table.stringSize) return true;
     return table.indexes != nullptr &&
            haveCommon(m_UsesIndex, first, m_IsBadIndex, indexOffset + 4, table.rowCount - 1);
@@ -165,6 +179,7 @@ bool checkSymbols(ObjectTables& tables) {
       continue;
     }
     if (!checkRows(tables, table)) return false;
+    // Row 0 is the null symbol in every table that is kept.
     if (table.rowCount != 0) tables.symbolTables.push_back(table);
   }
   return true;

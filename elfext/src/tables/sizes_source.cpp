@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides what counts as code, literal pool, read-only, read-write or zero-initialised data, debug
+// information and padding (the totals of SizesStatistics). Both roads bring their sections, mapping
+// symbols and segments in the same form, so the figures are the same. What a file may try is a
+// mapping symbol behind its section, a million of them at one place, or segments over one another:
+// symbols are sorted once and each is passed over once, and gaps are found by one sweep.
 #include "elfext/src/tables/sizes_source.h"
 
 #include "checking/interface/checking.h"
@@ -25,6 +31,7 @@ bool hasFlag(const SectionSize& section, uint32_t flag) {
 // The total that a mapping symbol chooses.
 uint64_t* destinationOf(const char* name, bool isWritable, SizesStatistics& statistics,
                         uint64_t& writable) {
+  // "$a", "$t" and "$x" start code of one kind or another.
   if (name[1] != 'd') return &statistics.m_Code;
   if (std::strcmp(name, "$d.realdata") != 0) return &statistics.m_LiteralPools;
   return isWritable ? &writable : &statistics.m_RoData;
@@ -37,6 +44,8 @@ void countExecutable(const SectionSize& section, std::span<const MappingSymbol> 
   uint64_t writable = 0;
   uint64_t* destination = &statistics.m_LiteralPools;
   auto symbol = symbols.begin();
+  // Symbols at or behind the section's end are never reached; offsets that wrapped below its start
+  // are large numbers and are not either.
   for (uint64_t cursor = 0; cursor < section.size;) {
     for (; symbol != symbols.end() && symbol->offset == cursor; ++symbol)
       destination = destinationOf(symbol->name, hasFlag(section, SHF_WRITE), statistics, writable);
@@ -45,6 +54,7 @@ void countExecutable(const SectionSize& section, std::span<const MappingSymbol> 
     *destination += next - cursor;
     cursor = next;
   }
+  // Both totals, as what lies between code is not compressed.
   statistics.m_RwDataUncompressed += writable;
   statistics.m_RwDataCompressed += writable;
 }
@@ -81,6 +91,7 @@ struct Range {
   explicit Range(const SizesSource::FileRange& range)
       : start(range.offset),
         end(range.size > UINT64_MAX - range.offset ? UINT64_MAX : range.offset + range.size) {
+    // Cut to the largest number above.
     QUARN_ASSERT(1, start <= end);
   }
 
@@ -151,6 +162,8 @@ void countSegment(const SegmentSize& segment, SizesStatistics& statistics) {
   } else {
     return;
   }
+  // A segment larger in the file than in memory makes this wrap, and the total with it: such a file
+  // has no sizes that make sense.
   statistics.m_ZiData += segment.memorySize - fileSize;
 }
 
@@ -166,6 +179,7 @@ SizesStatistics countSegments(const SizesSource& source) {
 
 std::optional<bool> isAllZero(uint64_t size,
                               const std::function<const uint8_t*(uint64_t, uint64_t)>& view) {
+  // Gaps may be as large as the file; the first byte that is not zero ends the look.
   constexpr uint64_t PieceSize = 4096;
   for (uint64_t offset = 0; offset < size; offset += PieceSize) {
     const uint64_t count = std::min(PieceSize, size - offset);
@@ -177,6 +191,7 @@ std::optional<bool> isAllZero(uint64_t size,
 }
 
 SizesStatistics computeSizesStatistics(SizesSource source) {
+  // A stripped image has nothing but segments to tell code from data by.
   const bool hasOnlySegments = source.sections.empty() && !source.segments.empty();
   return hasOnlySegments ? countSegments(source) : countSections(source);
 }

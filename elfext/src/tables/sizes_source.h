@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What the size statistics look at, be it taken from a model or from an object's tables.
+//
+// Sizes and offsets are bytes and may be any number that a header can hold.
 #pragma once
 
 #include "elfext/interface/sizes_statistics.h"
