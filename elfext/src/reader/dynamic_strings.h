@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The string table of a section with dynamic data.
+//
+// Offsets come from dynamic tags, version records and preemption maps, which nobody has checked,
+// since a bad one is no reason to reject a file. Each is compared with the table's size here; a
+// table that is named ends with a zero byte, so the text at a good offset ends in it.
 #pragma once
 
 #include "elfext/src/reader/object_module_reader.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The order in which a model is made.
+// The order in which a model is made, and the fields of Elf32_Ehdr and Elf64_Ehdr that it keeps.
+// All checks of the tables come first and all making after them: a file that is rejected has cost
+// no objects, and what is made needs no way back. Whoever asked for a read that fails clears the
+// module.
 #include "elfext/src/reader/object_module_reader.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -16,7 +19,10 @@ namespace {
 void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
   const FileHeader& header = context.fileHeader;
   ObjectModule& module = context.module;
+  // Only now, as the checks of the header may leave the module as it was: for a file that is none
+  // of ours nothing has changed.
   module.clear();
+  // Behind the clearing, which lets go of the former image.
   ModuleBuilder::adoptImageSource(module, std::move(image));
   ModuleBuilder::setReadBuffer(module, context.lentBytes);
   module.setMachine(header.machine);
@@ -40,6 +46,8 @@ void beginModule(ReadContext& context, std::unique_ptr<ImageSource> image) {
 }
 
 void makeObjects(ReadContext& context) {
+  // Each step uses what the ones before it have made: names and links want all sections, symbols
+  // their sections, relocations their symbols, groups both, notes the segments.
   createSections(context);
   nameSections(context);
   linkSections(context);
@@ -74,6 +82,8 @@ bool readObjectModule(ReadContext& context, std::unique_ptr<ImageSource> image) 
   ModuleBuilder::setNamesInBuffer(module, false);
   if (!isRead) return false;
   ModuleBuilder::setReadConditions(module, computeReadConditions(context));
+  // The auxiliary sections hold the file's words, and not those that a writer of the model would
+  // choose.
   ModuleBuilder::setAuxiliarySectionsUpToDate(module, false);
   return true;
 }

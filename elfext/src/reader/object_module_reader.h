@@ -3,6 +3,10 @@
 // The second half of a read: from checked tables the model, each kind of object in a file of its
 // own. Nothing is checked here and nothing reported; only build attributes, which hang on what was
 // made, are checked while they are given.
+//
+// It is the road that readElfFile takes; the tool itself finds names in the tables and makes no
+// model. The context is the tables with what grows beside them, so each step here reads the tables'
+// fields as its own.
 #pragma once
 
 #include "elfext/interface/object_module.h"
@@ -42,6 +46,7 @@ struct ReadContext : ObjectTables {
   DeferralFile* deferral;
   // By section: the symbols of a symbol table, element 0 being null, in the object region.
   std::vector<std::span<Symbol*>> symbols = {};
+  // A tag without a place of its own in the model; it becomes a read condition.
   bool hasSymbolTableSizeTag = false;
 
   // The text of a string table, which lives as long as the module.

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A module as what build attributes hang on.
+//
+// The steps, their order and what hostile attributes run into are those of
+// tables/build_attributes_reader; this is only where a model keeps what it gets: blocks and sets in
+// its own cache, one for equal contents.
 #include "elfext/interface/build_attributes_cache.h"
 #include "elfext/src/model/module_builder.h"
 #include "elfext/src/reader/object_module_reader.h"
@@ -53,6 +57,7 @@ public:
 
 private:
   [[nodiscard]] ObjectWithBuildAttributes& get(AttributeHolder holder) const {
+    // Indexes have been compared with the counts that this store answers.
     switch (holder.kind) {
     case AttributeHolder::Kind::Section:
       return *m_Module.getSection(holder.index);

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What the read has seen, as the writer and the validation want to know it.
+//
+// They are the bits of ReadCondition: which headers the first PT_LOAD segment overlaps, whether
+// attributes come as symbols or as a section, and what in the file is unusual. They are computed
+// once, at the end of a read, and never change with the model.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/bytes/extents.h"
@@ -17,6 +21,8 @@ namespace elfext {
 namespace {
 
 bool overlaps(const ProgramHeader& segment, uint64_t offset, uint64_t size) {
+  // Two extents share a byte when each starts before the other ends; ends beyond all numbers are
+  // cut.
   return size != 0 && segment.filesz != 0 && offset < endOf(segment.offset, segment.filesz) &&
          segment.offset < endOf(offset, size);
 }
@@ -41,12 +47,16 @@ uint32_t headersInFirstLoad(const ReadContext& context) {
 }
 
 bool isIncongruent(const ProgramHeader& header) {
+  // p_align of 0 means no alignment, by which nobody should divide. The difference may wrap:
+  // alignments that are powers of two divide 2^64.
   return header.align != 0 && (header.vaddr - header.offset) % header.align != 0;
 }
 
 // Absolute symbols are searched for it all over their names, of which there may be thousands that
 // are ends of one long text. Only the longest of these is searched.
 bool hasAbsoluteBuildAttributesSymbol(std::vector<const Symbol*> symbols) {
+  // By address of the text: names that share their end then follow one another. The order decides
+  // nothing but the cost.
   std::sort(symbols.begin(), symbols.end(), [](const Symbol* left, const Symbol* right) {
     return std::less<>()(left->getName(), right->getName());
   });
@@ -54,6 +64,8 @@ bool hasAbsoluteBuildAttributesSymbol(std::vector<const Symbol*> symbols) {
   for (const Symbol* symbol : symbols) {
     const char* name = symbol->getName();
     if (name == nullptr) continue;
+    // A name that starts before the end of the text searched last is an end of that text, in which
+    // there was none.
     const bool isSearched = searchedEnd != nullptr && !std::less<>()(searchedEnd, name);
     if (isSearched ? symbol->startsAsBuildAttributes() : symbol->isBuildAttributesSymbol())
       return true;

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // From dynamic sections needed libraries, search paths, plain values, and the preemption maps.
+//
+// The tags have been taken apart with the tables, where the maps' places were found too; what a tag
+// says is believed only where it leads to a text that there is. A preemption map is records of
+// words: the number of preempted libraries, the offset of a symbol's name, that of the preempting
+// library, and those of the preempted ones; a number of 0 ends it. Hostile maps claim more names
+// than the section has bytes, or lie a thousandfold over one another.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/preemption.h"
@@ -12,6 +18,7 @@ namespace elfext {
 namespace {
 
 void takeText(ObjectModule& module, const DynamicTag& tag, const DynamicStrings& strings) {
+  // Offset 0 is the empty text, which names no library.
   if (tag.value == 0) return;
   const char* text = strings.find(tag.value);
   if (text == nullptr) return;
@@ -32,6 +39,7 @@ void takeTag(ReadContext& context, const DynamicTag& tag, const DynamicStrings& 
   case DT_RUNPATH:
     return takeText(module, tag, strings);
   case DT_INIT:
+    // The last tag of a kind counts; flags add up.
     return module.setDynamicValue(DynamicValue_Init, tag.value);
   case DT_FINI:
     return module.setDynamicValue(DynamicValue_Fini, tag.value);
@@ -69,6 +77,8 @@ public:
       : m_Context(context), m_BytesLeft(context.image.getSize()) {}
 
   void read(const PreemptionMapPlace& place) {
+    // The strings are those of the dynamic section that points to the map, and not of the section
+    // that the map is in.
     m_Strings = DynamicStrings(m_Context, place.dynamicSection);
     readMap(m_Context.viewSection(place.section) + place.start,
             m_Context.sectionHeaders[place.section].size - place.start);
@@ -82,6 +92,7 @@ private:
     uint64_t pos = 0;
     while (size - pos >= 4) {
       const auto count = m_Context.get<uint32_t>(bytes + pos);
+      // In 64 bits, so a count of 2^32 - 1 is too large and not small.
       const uint64_t recordSize = 12 + uint64_t{count} * 4;
       if (count == 0 || size - pos < recordSize || m_BytesLeft < recordSize) return;
       if (!readRecord(bytes + pos + 4, count)) return;
@@ -94,6 +105,8 @@ private:
     const char* symbolName = textAt(words);
     const char* preemptingName = textAt(words + 4);
     if (symbolName == nullptr || preemptingName == nullptr) return false;
+    // Made before the names behind it are looked at: what a map says up to its first bad name
+    // stays.
     Preemption* preemption = m_Context.module.createPreemption(symbolName, preemptingName);
     for (uint32_t i = 0; i < count; ++i) {
       const char* name = textAt(words + 8 + uint64_t{i} * 4);
@@ -121,6 +134,7 @@ void takeDynamicTables(ReadContext& context) {
     for (const DynamicTag& tag : table.tags)
       takeTag(context, tag, strings);
   }
+  // After all tags, once for the file.
   if (context.versions) takeVersions(context, *context.versions);
   PreemptionMapReader maps(context);
   for (const PreemptionMapPlace& place : context.preemptionMaps)

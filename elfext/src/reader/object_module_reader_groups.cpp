@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // From checked group sections the groups.
+//
+// Flags, members and the signature symbol's index were checked with the tables: each member is in
+// one group only. So what addMember asserts holds for every file.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/group.h"
 #include "elfext/src/model/module_builder.h"
@@ -12,6 +15,7 @@ namespace {
 
 const char* signatureOf(const ReadContext& context, uint32_t index) {
   const SectionHeader& header = context.sectionHeaders[index];
+  // Null for symbol 0, which a group may name.
   const Symbol* symbol = context.symbols[header.link][header.info];
   return symbol == nullptr || symbol->getName() == nullptr ? "" : symbol->getName();
 }

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // From checked link and info fields to sections that know one another.
+//
+// hasLink has the answer of the checks: where it says yes, sh_link names a section of a type that
+// its user may name, so that the casts below are right. Sections with a rule of their own come
+// first, as in the checks.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/src/model/module_builder.h"
@@ -21,6 +25,7 @@ void markLinked(StringTableSection& strings, uint32_t userType) {
 
 void linkRelocations(ReadContext& context, RelocationSection& section, const Section& symbols) {
   const uint32_t index = section.getIndex();
+  // The handler let a bad sh_info pass: the section keeps its link and relocates nothing.
   if (context.links[index] == LinkState::WithoutTarget) return;
   ModuleBuilder::setTarget(section, context.module.getSection(context.sectionHeaders[index].info),
                            symbols.getType() == SHT_DYNSYM);

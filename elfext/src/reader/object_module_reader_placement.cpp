@@ -4,6 +4,10 @@
 // their distances, sections without bytes are tied to a segment, and the bytes of segments that
 // belong to nothing else become blocks of raw data, so that none of them is lost when the file is
 // written again.
+//
+// The placement forest says which regions must keep their distances when a file is laid out again.
+// A hostile file has ten thousands of regions that all touch: each is tied once, to one other, and
+// not to all that it touches.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
@@ -94,6 +98,8 @@ void tieOverlappingRegions(std::vector<Region> regions) {
   for (const Region& region : regions) {
     if (farthest != nullptr && region.extent.start < farthest->extent.end) {
       [[maybe_unused]] const bool ret = FileRegion::link(
+          // Neither refused nor too far: a region joins once, at a distance that is the difference
+          // of two offsets of one file.
           *farthest->region, *region.region, region.extent.start - farthest->extent.start);
       QUARN_ASSERT(1, ret);
     }
@@ -102,6 +108,7 @@ void tieOverlappingRegions(std::vector<Region> regions) {
 }
 
 void tieSectionsWithoutBytes(ReadContext& context) {
+  // Objects that are still to be linked, which are nearly all.
   if (context.programHeaders.empty()) return;
   const std::vector<uint32_t> segments =
       findSegments(context.sectionHeaders, context.programHeaders, context.module.getOsAbi());
@@ -120,6 +127,7 @@ void createRawDataBlocks(ReadContext& context) {
     Segment* segment = context.module.getSegment(gap.segment);
     RawDataBlock* block = context.module.createRawDataBlock(segment, gap.end - gap.start);
     block->setFileOffset(gap.start);
+    // The bytes stay in the image: a gap may be as large as the file.
     ModuleBuilder::getBuffer(*block).defer(context.image, gap.start, gap.end - gap.start);
     const uint64_t distance = gap.start - context.programHeaders[gap.segment].offset;
     [[maybe_unused]] const bool ret = FileRegion::link(*segment, *block, distance);

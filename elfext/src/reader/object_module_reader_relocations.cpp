@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Relocations stay rows, which have been checked, until somebody asks for one.
+//
+// A large object has far more relocations than anybody asks for, so a section gets its rows, their
+// symbols and their count. That is safe because each row's symbol index has been checked against
+// the table that m_Symbols is of, and because the model makes objects of all rows before symbols or
+// sections change their places.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/relocation_rows.h"
@@ -27,6 +32,7 @@ public:
       Relocation* relocation = m_HasAddend
                                    ? target.addRelocation(row.offset, row.type, symbol, row.addend)
                                    : target.addRelocation(row.offset, row.type, symbol);
+      // With a symbol, the symbol says whether it is.
       if (symbol == nullptr && m_IsDynamic) relocation->setDynamic();
     }
   }

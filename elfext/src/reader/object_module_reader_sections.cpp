@@ -2,6 +2,11 @@
 //
 // From checked section headers the sections: their contents, which stay where they are until
 // somebody looks, and their names.
+//
+// A section gets a view of the image at its sh_offset, which nobody reads before it is looked at,
+// or, where the caller's selector says so, stays in the file that the module then keeps open.
+// Extents were compared with the image by the tables. sh_size is taken as it stands for SHT_NOBITS,
+// where no byte of the file answers for it, and a read reserves nothing for it.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/deferred_contents.h"
 #include "elfext/interface/deferred_contents_selector.h"
@@ -32,6 +37,8 @@ bool mayBeDeferred(uint32_t type) {
   case SHT_ZEV_PREEMPTMAP:
   case SHT_ZEV_ATTRIBUTES:
   case SHT_ZEV_DEBUGOVERLAY:
+    // What the read itself looks into, or what later steps make objects of: it is loaded in any
+    // case.
     return false;
   default:
     return true;
@@ -44,6 +51,7 @@ void deferSection(ReadContext& context, Section& section, const SectionHeader& h
   if (deferral.shared == nullptr) {
     deferral.shared = alloclib::create<ReferenceCountedFile>(region, deferral.host, deferral.file);
     deferral.shared->addReference();
+    // From here on the record closes the file, and two owners would close it twice.
     context.image.leaveFileOpen();
   }
   ModuleBuilder::deferContents(
@@ -61,6 +69,7 @@ void giveContents(ReadContext& context, Section& section, const SectionHeader& h
 
 // The section of a string table gets what differs in the table of the read: its ends.
 void takeMendedStrings(Section& section, std::span<const uint8_t> mended) {
+  // Auxiliary sections are closed to changes; mending is the one change that a read makes.
   ModuleBuilder::setAuxiliary(section, false);
   while (section.getSize() < mended.size())
     section.appendByte(mended[section.getSize()]);
@@ -72,6 +81,8 @@ void takeMendedStrings(Section& section, std::span<const uint8_t> mended) {
 } // namespace
 
 const char* ReadContext::stringsOf(uint32_t section) {
+  // Names are views that live as long as the module, so they must not point into the read's own
+  // mended copy.
   const uint8_t* bytes = mendedStrings.contains(section)
                              ? ModuleBuilder::getBuffer(*module.getSection(section)).getContents()
                              : viewSection(section);
@@ -89,6 +100,7 @@ void createSections(ReadContext& context) {
   for (uint32_t i = 0; i < context.getSectionCount(); ++i) {
     const SectionHeader& header = context.sectionHeaders[i];
     if (header.type == SHT_NOBITS) ModuleBuilder::adoptSize(*module.getSection(i), header.size);
+    // In a second loop: a selector is asked about a module that has all its sections.
     if (hasFileBytes(header)) giveContents(context, *module.getSection(i), header);
   }
   for (const auto& [section, bytes] : context.mendedStrings)
@@ -97,6 +109,7 @@ void createSections(ReadContext& context) {
 
 void nameSections(ReadContext& context) {
   const uint32_t table = context.sectionNameTable;
+  // No section has a name then, whatever its sh_name says: the handler has let that pass.
   if (table == 0) return;
   QUARN_ASSERT(1, context.module.getSection(table)->getType() == SHT_STRTAB);
   ModuleBuilder::markSectionNameTable(

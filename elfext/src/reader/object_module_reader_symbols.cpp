@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // From checked rows of symbol tables the symbols.
+//
+// Elf32_Sym and Elf64_Sym. The rows' names, sections and kinds have been checked, so st_name and
+// st_shndx are followed without a question. The values st_value and st_size are taken as they
+// stand.
 #include "elfext/src/reader/object_module_reader.h"
 
 namespace elfext {
@@ -25,11 +29,13 @@ void createSymbolsOf(ReadContext& context, const SymbolTable& table) {
   ObjectModule& module = context.module;
   auto* symbols = static_cast<Symbol**>(module.getObjectRegion().allocate(
       uint64_t{table.rowCount} * sizeof(Symbol*), alignof(Symbol*)));
+  // Row 0, the null symbol: relocations and signatures that name it find nobody.
   symbols[0] = nullptr;
   context.symbols[table.section] = {symbols, table.rowCount};
   if (table.isDynamic)
     module.reserveDynamicSymbols(table.rowCount);
   else
+    // The rows are there in the image, so this is no claim of the file.
     module.reserveSymbols(table.rowCount);
   const char* strings = context.stringsOf(table.stringSection);
   for (uint32_t i = 1; i < table.rowCount; ++i) {
@@ -42,6 +48,7 @@ void createSymbolsOf(ReadContext& context, const SymbolTable& table) {
 } // namespace
 
 void createSymbols(ReadContext& context) {
+  // Empty for what is no symbol table.
   context.symbols.resize(context.getSectionCount());
   for (const SymbolTable& table : context.symbolTables)
     createSymbolsOf(context, table);

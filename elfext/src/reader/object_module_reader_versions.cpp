@@ -4,6 +4,11 @@
 // the distance to the next one; the version symbol section has a word for each dynamic symbol. The
 // chains end at the section's end, at a distance of 0, or when the told count is used up; what is
 // wrong in them is never reported.
+//
+// The records are Elf_Verdef and Elf_Verdaux, Elf_Verneed and Elf_Vernaux, of equal layout in both
+// classes. Counts, distances and names are claims: each record is held against the section before
+// it is looked at, and the number of records that all walks take together is bounded by the
+// section's size, as chains may run into one another.
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/file_version_definition.h"
@@ -56,6 +61,7 @@ public:
     uint64_t pos = 0;
     for (uint64_t i = 0; i < most && records.contains(pos, VerdefSize); ++i) {
       readDefinition(records, pos);
+      // vd_next counts from this record, so a chain only goes forward.
       const uint32_t next = word(records, pos + 16);
       if (next == 0) break;
       pos += next;
@@ -80,6 +86,7 @@ public:
   void apply(uint32_t symbolVersions, std::span<Symbol* const> symbols) {
     const uint8_t* words = symbols.empty() ? nullptr : m_Context.viewSection(symbolVersions);
     for (size_t i = 1; i < symbols.size(); ++i)
+      // The checks have compared the words' count with that of the symbols.
       applyTo(*symbols[i], m_Context.get<uint16_t>(words + 2 * i));
   }
 
@@ -93,6 +100,7 @@ private:
 
   // The first name is the version's own; the others are those of its predecessors.
   void readDefinition(const RecordSection& records, uint64_t pos) {
+    // vd_aux, by which the name may be anywhere behind.
     const uint64_t names = pos + word(records, pos + 12);
     const bool hasName = half(records, pos + 6) != 0 && records.contains(names, VerdauxSize);
     const char* name = hasName ? records.strings.get(word(records, names)) : "";
@@ -103,6 +111,8 @@ private:
     if ((flags & VER_FLG_BASE) != 0)
       m_Context.module.setFileVersionDefinition(definition);
     else
+      // Of several definitions of one index the first one counts; a map, as indexes are any numbers
+      // of the file's.
       m_Definitions.emplace(index, definition);
   }
 
@@ -111,6 +121,7 @@ private:
     const char* fileName = records.strings.get(word(records, pos + 4));
     uint64_t entry = pos + word(records, pos + 8);
     for (uint32_t i = 0; i < count && records.contains(entry, VernauxSize); ++i) {
+      // As many records as the section has room for: enough for every chain that shares none.
       if (m_RecordsLeft == 0) return;
       --m_RecordsLeft;
       const uint32_t version = half(records, entry + 6) & ~VERSYM_HIDDEN;
@@ -125,9 +136,11 @@ private:
   void applyTo(Symbol& symbol, uint32_t versionWord) {
     const bool isHidden = (versionWord & VERSYM_HIDDEN) != 0;
     const uint32_t version = versionWord & ~VERSYM_HIDDEN;
+    // 0 is local and 1 is global without a version.
     if (version <= VER_NDX_GLOBAL) return;
     const auto definition = m_Definitions.find(version);
     const auto requirement = m_Requirements.find(version);
+    // A definition is only for a symbol that is defined here.
     if (definition != m_Definitions.end() && symbol.getCategory() != Symbol::Category_Undefined)
       symbol.setVersionDefinition(definition->second, isHidden);
     else if (requirement != m_Requirements.end())

@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // From files and ranges of files to one image, which the steps of the read then work on.
+//
+// Here it is decided who owns the file and when it is closed, which the six forms differ in: a file
+// of the read's own, one lent for the call, one lent for good, bytes in memory. All failures of the
+// host, and ranges that the file does not have, end here as one report, with the module empty.
+// Ranges are held against the size of the open file.
 #include "elfext/interface/read_elf_file.h"
 
 #include "elfext/interface/raw_data_block.h"
@@ -42,6 +47,7 @@ bool readImage(ObjectModule& module, std::unique_ptr<ImageBytes> image, Deferral
                const uint8_t* lentBytes = nullptr) {
   const ReadReporter reporter(module);
   ReadContext context(reporter, *image, module, lentBytes, deferral);
+  // The context refers to the image by reference, so the pointer may go on.
   const bool isRead =
       image->prepare() ? readObjectModule(context, std::move(image)) : context.failRead();
   if (isRead) return true;
@@ -61,12 +67,14 @@ bool readShared(const std::shared_ptr<support::SourceFile>& file, uint64_t offse
 // is not needed any more.
 bool readOwnFile(support::SourceFiles& files, const std::shared_ptr<support::SourceFile>& file,
                  uint64_t offset, uint64_t size, ObjectModule& module) {
+  // Larger ones are read where somebody looks, which keeps the file open with the image.
   if (size > ImageBytes::WholeReadLimit || !file->getStatus().holds(offset, size))
     return readShared(file, offset, size, module);
   auto image = std::make_unique<ImageBytes>(file, offset, size);
   if (image->prepare()) {
     file->close();
     std::string name;
+    // A close that fails makes the read fail: the file was the read's own.
     if (const support::HostError error = files.takeCloseError(name); error != 0)
       return reportReadError(module, error);
   }
@@ -79,6 +87,8 @@ bool readLentFile(support::Host& host, support::FileHandle file, const support::
   if (!status.holds(offset, size)) return reportReadError(module, 0);
   auto image = std::make_unique<ImageBytes>(host, file, offset, size, false);
   if (image->prepare() && !image->loadAll()) return reportReadError(module, image->getHostError());
+  // All bytes are here now; a look at the handle after the call would be one at somebody else's
+  // file.
   image->forgetFile();
   return readImage(module, std::move(image), nullptr);
 }
@@ -100,7 +110,8 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   auto image = std::make_unique<ImageBytes>(deferral.host, deferral.file, 0, size, isOwnFile);
   ImageBytes& bytes = *image;
   bool isRead = readImage(module, std::move(image), &deferral);
-  // A handler that lets a foreign machine pass leaves the module as it was, and the image is gone.
+  // A handler that lets a foreign machine pass leaves the module as it was, and the image is gone;
+  // so its address is only compared.
   if (isRead && ModuleBuilder::getImageSource(module) != &bytes) return true;
   const bool isAnyDeferred = deferral.shared != nullptr;
   // Of a file of its own the image may load the rest when somebody wants it.
@@ -112,6 +123,7 @@ bool readDeferring(DeferralFile& deferral, uint64_t size, bool isOwnFile, Object
   if (isRead) bytes.forgetFile();
   if (!isAnyDeferred) return isRead;
   if (!isRead && !isOwnFile) deferral.shared->leaveFileOpen();
+  // The read's own reference; the sections that stay deferred keep theirs.
   const support::HostError error = deferral.shared->release();
   return error == 0 || !isRead ? isRead : reportReadError(module, error);
 }

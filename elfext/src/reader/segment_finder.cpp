@@ -4,6 +4,9 @@
 // order comes to is three questions, each for the sections that still have no segment: for the
 // first one that ends there, the first one that has offset and addresses, and the first one that
 // has the offset.
+//
+// Offsets, addresses and sizes are the file's and may wrap; ends are cut, or compared as start and
+// size.
 #include "elfext/src/reader/segment_finder.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -71,6 +74,8 @@ private:
                            .start = test == Test::HasAddresses ? segment.vaddr : 0,
                            .size = segment.memsz,
                            .id = i});
+      // Not cut, so that it does end there; and not larger in the file than in memory, which would
+      // leave no room but a wrapped one.
       else if (end - segment.offset == segment.filesz && segment.memsz >= segment.filesz)
         holders.push_back({.firstPlace = end,
                            .lastPlace = end,
@@ -87,6 +92,8 @@ private:
     for (const uint32_t i : m_Open) {
       const SectionHeader& section = m_Sections[i];
       const uint64_t start = test == Test::HasAddresses ? section.addr : 0;
+      // Without addresses all numbers start at 0, and the question is only whether there is room
+      // for the size.
       guests.push_back({.place = section.offset, .start = start, .size = section.size});
     }
     return guests;
@@ -104,6 +111,7 @@ private:
 std::vector<uint32_t> findSegments(std::span<const SectionHeader> sections,
                                    std::span<const ProgramHeader> segments, uint32_t osAbi) {
   SegmentFinder finder(sections, segments, osAbi);
+  // In the order in which the answers win: an end is taken at once, addresses beat a mere offset.
   finder.ask(Test::EndsThere);
   finder.ask(Test::HasAddresses);
   finder.ask(Test::HasOffset);
