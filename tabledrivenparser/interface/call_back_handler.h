@@ -1,5 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// The value of an option of type CALL_BACK: it takes the words itself, in whatever form.
+//
+// The value of an option of type CALL_BACK: it takes the words itself, in whatever form. A client
+// hangs a handler into the option's value; the parser calls it in the place where it would store,
+// and asks it again for the report and at the end. No constraint, validator or listener comes
+// before it: what it is given is the text as the user wrote it, and any check is its own.
+
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What an option accepts beyond its type: the names of an enumeration, ranges of numbers, or
-// patterns of texts. All are constants of the client.
+// patterns of texts. All are constants of the client, without a count: lists end by a mark of their
+// own, so that a row holds one pointer. The check is made by constraint_check, before validator and
+// listener see the value.
+
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The scanner of via files over a text that is already in memory. The text is taken as it stands:
-// comments are removed when a file is read, so here "#" and ";" are plain characters.
+// comments are removed when a file is read, so here "#" and ";" are plain characters. Nothing is
+// refilled, so words of any length pass: the limit on a file's words comes from its buffer.
+
 #pragma once
 
 #include "tabledrivenparser/interface/via_file.h"

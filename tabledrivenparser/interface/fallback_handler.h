@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The last resort of an option table: it is offered each word that no row accepts.
+//
+// The last resort of an option table: it is offered each word that no row accepts, before that word
+// becomes a fatal report. It serves clients with options that no table can list; the tool has none.
+
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// The list behind every vector value. Most lists hold one element, so that one lies inside the
-// list object; the others are nodes from a region and die with it.
+//
+// The list behind every vector value. Most lists hold one element, so that one lies inside the list
+// object; the others are nodes from a region and die with it. A list and not an array: elements
+// come one at a time for as long as the user goes on, and nothing ever asks for the n-th.
+//
+// Words of a command line are up to the user, also their number: appending is at the tail and costs
+// the same for the first and the hundred thousandth.
+
 #pragma once
 
 #include "alloclib/interface/region.h"

@@ -1,5 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// Who listens sees every option at its place in the command line, before it is stored.
+//
+// Who listens sees every option at its place in the command line, before it is stored. That is for
+// options that must act on what comes after them: severities, style and language of messages hold
+// for the complaints about the rest of the same command line. All other options only fill the
+// table.
+
 #pragma once
 
 #include "tabledrivenparser/interface/value.h"

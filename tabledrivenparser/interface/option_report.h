@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The two texts about a parsed command line: the command line itself, written again from the
-// values, and the dump of all tables for whoever debugs them.
+// values, and the dump of all tables for whoever debugs them. Both are made when the parsing is
+// over, from the tables and values alone, and go into a sink of the caller; neither changes
+// anything.
+
 #pragma once
 
 #include <cstddef>

@@ -1,8 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The tables from which a command line is parsed. They are constants of the client: rows say how
 // options are written, definitions say what each option id holds, and one writable record for each
 // id holds its value. The constexpr functions below check tables at compile time and work out what
 // would otherwise be kept by hand.
+//
+// The order of the rows is part of the format: sorted without regard to case, the positional row
+// first, words that start with no letter before the others. The look-up starts at a letter's first
+// row and stops behind its last one; a row in another place would never be found, which is why
+// areWellFormed belongs in a static_assert beside every table.
+
 #pragma once
 
 #include "support/interface/letters.h"
@@ -56,6 +63,7 @@ struct MatchString {
 /// Any other number accepts silently.
 enum SyntaxPolicy : uint32_t { Policy_Accept = 0, Policy_Warn = 1, Policy_Reject = 2 };
 
+/// In a FirstLetterIndex: no row starts with the letter.
 constexpr uint32_t NoRow = 0xFFFFFFFF;
 /// For each letter the first row that starts with it in either case, or NoRow.
 using FirstLetterIndex = std::array<uint32_t, 26>;
@@ -103,6 +111,8 @@ struct ValueRecord {
   DefaultCallBack defaultCallBack = nullptr;
 };
 
+/// Goes through the rows from the last to the first, so that the first one of a letter is what
+/// stays.
 [[nodiscard]] constexpr FirstLetterIndex indexByFirstLetter(std::span<const MatchString> rows) {
   FirstLetterIndex index{};
   index.fill(NoRow);

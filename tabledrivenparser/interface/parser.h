@@ -1,12 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The parser of command lines. It is fed one word after the other, resolves each to a row, checks
 // and converts the argument, offers the value to the listener, stores it, and reports misuse:
 //
 //   Parser parser(tables, nullptr, reporter, files, region);
 //   while (*words != nullptr) words += parser.parseWord(words[0], words[1]);
 //
+// Its words come from argv and from via files, and may be anything: empty, or long without an end,
+// or via files that name each other. Nesting has a bound, letters are gone through in a loop, and
+// no word is ever a format.
+//
 // Nothing is thrown and nothing recovers: a fatal report normally ends the process. If it returns,
 // the parser has failed.
+
 #pragma once
 
 #include "alloclib/interface/region.h"
@@ -36,6 +42,8 @@ struct ParserTables {
 
 class Parser {
 public:
+  /// A via file at this depth is refused: nine nest. It stops a file that names itself, directly or
+  /// through others, before the process runs out of open files.
   static constexpr uint32_t ViaFileDepthLimit = 10;
 
   /// Sets every value to its default. listener may be null. Everything that the parser copies or

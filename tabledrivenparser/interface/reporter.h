@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What the parser tells its client about a command line. The parser knows neither wording nor
-// catalogue: it names a message by its number and hands over what the text inserts, in the order
-// of the text's conversions.
+// catalogue: it names a message by its number and hands over what the text inserts, in the order of
+// the text's conversions. So the parser stands below messages, whose locale listener is in turn a
+// listener of the parser; the tool's side of this is quarn/option_reporter.
+
 #pragma once
 
 #include <cstdint>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Via files from the C library's streams.
+//
+// Via files from the C library's streams. The name is the one that the user wrote, relative to the
+// working folder also inside another via file.
+
 #pragma once
 
 #include "tabledrivenparser/interface/via_file_reader.h"

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A bounded text that goes on counting when it is full, so that the caller learns the size that
-// would have been enough and can try again.
+// would have been enough and can try again. Reports on a parsed command line are written through
+// it; their length is the user's choice, and the buffer's end is the one bound that a write here
+// knows.
+
 #pragma once
 
 #include <cstddef>

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // One option's value: 64 bits that carry no tag, since the option's definition knows the type.
-// Rows, definitions, value records and listeners all pass values in this form.
+// Rows, definitions, value records and listeners all pass values in this form, and so a table of
+// constants needs no constructors. Asking a parser for a value of another type than the
+// definition's is an assertion.
+
 #pragma once
 
 #include "tabledrivenparser/interface/linked_list.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // How the parser gets at the bytes of via files. The client supplies it, since the parser stands
-// below all that knows files.
+// below all that knows files; tests put texts, short reads and failures in its place.
+
 #pragma once
 
 #include <cstddef>

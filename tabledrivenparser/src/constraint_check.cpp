@@ -1,10 +1,20 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The checks of a value against the constraint of its option. Nodes that are not usable under the
+// table's mask don't count; of the others one must accept. Where none is usable everything passes:
+// a restriction that leaves no rule leaves no rule to break.
+//
+// Texts are compared with patterns of the client, which are short and hold one "*" at most: nothing
+// that a user writes can make a comparison long.
+
 #include "tabledrivenparser/src/constraint_check.h"
 
 namespace tabledrivenparser {
 
 namespace {
 
+// Compares in the type of the option: a range of addresses reaches to the largest unsigned number,
+// which is -1 in the table's signed one.
 template <class Number>
 bool liesInRanges(Number number, const IntegerRange* range) {
   for (; static_cast<Number>(range->low) <= static_cast<Number>(range->high); ++range) {

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Whether a value may be stored, as far as tables can tell.
+//
+// Whether a value may be stored, as far as tables can tell: the first of the three gates of
+// value_store, before the client's validator and the listener.
+
 #pragma once
 
 #include "tabledrivenparser/interface/option_table.h"

@@ -1,4 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From a word to its row, in two steps. searchRows compares the word with each row that starts with
+// its first letter, drops those that this way of writing (one dash or two, an argument behind the
+// name, a "." for the rest of it) doesn't allow, and weighs what is left by the length of the
+// match. findRow then says what is to be said about the result.
+//
+// A longer match wins over a shorter, and of two equally long ones that which suits an argument, if
+// there is one, and else that which needs none. What still stands side by side is ambiguous, and
+// then nothing is meant: a guess would run another action than the one that was wanted.
+//
+// Words may have any length and any bytes; a comparison never goes beyond the end of either text.
+
 #include "tabledrivenparser/src/find_row.h"
 
 #include "tabledrivenparser/interface/parser.h"
@@ -45,12 +57,14 @@ Match compareWord(std::string_view word, const MatchString& row) {
 }
 
 bool fitsLongName(const Match& match) {
+  // "--create." abbreviates nothing.
   if (match.complete && match.dotted) return false;
   return match.hasSeparator || match.rest.empty();
 }
 
 // A letter that takes an argument may be parted from it by "=", though not by its separator.
 bool fitsShortName(const Match& match, uint32_t dashes) {
+  // Two dashes belong to long names: "--d" is no way to write "-d".
   if (dashes >= 2) return false;
   if (!match.hasSeparator) return true;
   return match.row->kind != Kind_Implied && match.rest.front() == '=';
@@ -59,6 +73,7 @@ bool fitsShortName(const Match& match, uint32_t dashes) {
 bool fitsSingleDash(const Match& match, SyntaxPolicy oldSyntaxPolicy) {
   if (match.dotted) return false;
   if (match.oldSyntaxRow && oldSyntaxPolicy != Policy_Reject) return true;
+  // Without the old syntax "-create" is no option, and "-T" is not "-t".
   return !match.longName && match.firstCharExact;
 }
 
@@ -109,6 +124,7 @@ std::span<const MatchString> candidateRows(const OptionTable& table, std::string
     const std::string_view name = table.rows[end].name;
     const char letter =
         !name.empty() && support::isLetter(name.front()) ? support::lowered(name.front()) : '\0';
+    // The rows are sorted, so the first of another letter ends them.
     if (letter != (support::isLetter(first) ? first : '\0')) break;
   }
   return table.rows.subspan(start, end - start);
@@ -134,6 +150,7 @@ RowSearch searchRows(const OptionTable& table, std::string_view word, uint32_t d
     Match match = compareWord(word, row);
     if (!match.matched) continue;
     if (!restrictionsMet(row.restrictions, table.restrictionMask)) {
+      // Kept for the caller, who refuses it like an unknown word.
       restricted = match;
       restricted.restricted = true;
       continue;

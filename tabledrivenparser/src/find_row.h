@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// From a word to the row that it means.
+//
+// From a word to the row that it means. The parser calls findRow for each word and each letter of a
+// word; the report asks searchRows how a word that it is about to write would be read.
+
 #pragma once
 
 #include "tabledrivenparser/interface/option_table.h"

@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Numbers as a user writes them: white space, a sign, then decimal digits, or hexadecimal ones
+// behind "0x". The prefix stands in front of white space and sign. What is given to the C library's
+// conversion begins with a digit, as that would by itself take a second sign.
+//
+// What doesn't fit the type is told as an overflow and never cut: an address or a count that has
+// lost its upper digits would be a good number for the wrong thing.
+
 #include "tabledrivenparser/src/number.h"
 
 #include "support/interface/letters.h"
@@ -41,6 +49,7 @@ NumberText readNumber(const char* text, ValueType type) {
     ++text;
   const bool isNegative = *text == '-';
   if (isNegative || *text == '+') ++text;
+  // strtoull would skip more white space here, and take a second sign.
   if (!isDigit(*text, base)) return number;
 
   char* end = nullptr;
@@ -49,6 +58,7 @@ NumberText readNumber(const char* text, ValueType type) {
   const bool isTooLarge = errno == ERANGE || magnitude > largestMagnitude(type, isNegative);
   number.end = end;
   number.result = isTooLarge ? NumberResult::Overflow : NumberResult::Good;
+  // Negated in unsigned arithmetic, where the smallest number has its counterpart.
   number.value = static_cast<int64_t>(isNegative ? 0 - magnitude : magnitude);
   if (type == Type_Address) number.value = static_cast<uint32_t>(number.value);
   return number;

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Numbers in arguments: decimal, or hexadecimal behind "0x".
+//
+// Numbers in arguments: decimal, or hexadecimal behind "0x". value_store reads with it both single
+// numbers and the elements of a list, and looks itself at what stands behind the digits.
+
 #pragma once
 
 #include "tabledrivenparser/interface/value.h"

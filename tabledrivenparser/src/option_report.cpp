@@ -1,6 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The command line, written again from the values. Fed back to the parser it means the same, as far
-// as values go: the order between options is lost.
+// as values go: the order between options is lost. Options at their defaults are left out. The
+// shape of an entry: "-x" and its value directly behind, "--name=value", or the name alone where
+// the row implies the value; positional words come last, behind "--" if the user had written one.
+//
+// Values are the user's. One with blanks is quoted, and a text that would be read as something
+// else behind a single letter is parted from it by "="; see readsBack.
+
 #include "tabledrivenparser/interface/option_report.h"
 
 #include "tabledrivenparser/interface/call_back_handler.h"
@@ -62,6 +69,8 @@ const MatchString* rowToShow(const Parser& parser, const ValueDefinition& defini
 }
 
 // Whether the parser would find the letter, and the whole text as its argument, in "-xtext".
+// The two could come together to the name of another row, or the text begin with a separator, which
+// would be taken off.
 bool readsBack(const OptionTable& table, const MatchString& row, std::string_view text) {
   const std::string word = std::string(row.name).append(text);
   const RowSearch search = searchRows(table, word, 1);
@@ -113,6 +122,7 @@ void printPositional(const Parser& parser, TextSink& sink, uint32_t id) {
     sink.startEntry();
     sink.putValue("", argumentText(definition, element, parser.getOptions().restrictionMask));
   };
+  // An empty word is a word here, and would be lost without quotes.
   sink.setQuoteEmpty(true);
   if (isVector(definition.type)) {
     forEachElement(definition.type, value, print);
@@ -127,6 +137,7 @@ void printPositional(const Parser& parser, TextSink& sink, uint32_t id) {
 size_t printCommandLine(const Parser& parser, TextSink& sink) {
   const OptionTable& table = parser.getOptions();
   const bool hasPositional = !table.rows.empty() && table.rows.front().name.empty();
+  // The positional words' id may stand anywhere among the others.
   for (uint32_t id = 0; id < parser.getValueCount(); ++id) {
     if (!hasPositional || id != table.rows.front().id) printOption(parser, sink, id);
   }

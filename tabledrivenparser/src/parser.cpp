@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The road of one word: find its row, find its argument, check the letters run together, store.
+// Each step may report and end it. What is stored and how is value_store's; here is decided how
+// many words an option takes and what an unknown word becomes.
+//
+// The order of the checks is that of the reports: a word that no row accepts is told as unknown
+// before anything is said about its argument, and an argument is looked for before the
+// concatenation is judged, since that forbids arguments. A filtered parse passes over unknown words
+// in silence: somebody else will parse them.
+
 #include "tabledrivenparser/interface/parser.h"
 
 #include "checking/interface/checking.h"
@@ -48,6 +58,7 @@ Parser::Parser(const ParserTables& tables, Listener* listener, Reporter& reporte
   QUARN_ASSERT(1, tables.definitions.size() == tables.values.size());
   for (uint32_t id = 0; id < getValueCount(); ++id) {
     ValueRecord& target = m_Tables.values[id];
+    // The client's call backs in the record stay; defaults may be asked of them right away.
     target.firstSet = 0;
     target.lastSet = 0;
     target.value = getDefaultValue(id);
@@ -56,6 +67,7 @@ Parser::Parser(const ParserTables& tables, Listener* listener, Reporter& reporte
 
 uint32_t Parser::parseWord(const char* word, const char* next, std::span<const uint32_t> filter) {
   const std::string_view text = word;
+  // A single dash is a word: by custom the name of a standard stream.
   if (m_EndOfOptions || text == "-") return parseArgument(word, next, 0, filter);
   if (text == "--") {
     if (!m_Failed) m_EndOfOptions = true;
@@ -85,6 +97,7 @@ std::optional<uint32_t> Parser::parseOneOf(WordInHand& hand) {
   ValueStore store(*this, hand.getRow(), hand.argument, hand.filter, hand.wordsUsed);
   const bool isStored = store.store();
   if (m_Failed) return 1;
+  // A handler that has set the number to 0 says that the word is none of its options.
   if (!isStored && hand.wordsUsed != 0) {
     report(ReportLevel::Fatal, OptionMessage::ArgumentNotPermitted,
            {hand.argument != nullptr ? hand.argument : "", hand.getRow().name});
@@ -108,6 +121,7 @@ bool Parser::takeArgument(WordInHand& hand) {
     report(ReportLevel::Fatal, OptionMessage::MissingArgument, {hand.word});
     return false;
   }
+  // The rest ends where the word does, with its NUL: no copy is needed.
   hand.argument = rest.data() + (match.hasSeparator ? 1 : 0);
   if (match.hasSeparator && rest.front() != '=') {
     report(ReportLevel::Warning, OptionMessage::OldSyntax,

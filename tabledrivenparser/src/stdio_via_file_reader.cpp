@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Via files through fopen, fread and fclose, in binary: the scanner knows both line ends itself,
+// and must see a NUL byte. A stream remembers an error and would give its good bytes first, so the
+// error mark is looked at before each read.
+
 #include "tabledrivenparser/interface/stdio_via_file_reader.h"
 
 #include <cstdio>

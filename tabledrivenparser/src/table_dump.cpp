@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The dump of the tables: a line for each id, then a line for each of its rows.
+//
+// The dump of the tables: a line for each id, then a line for each of its rows. It is for whoever
+// writes tables, so it must get past bad ones too: an unknown type and a null text have words of
+// their own, and a definition may lack its list of rows.
+
 #include "tabledrivenparser/interface/option_report.h"
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/text_sink.h"

@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Puts characters while there is room, and counts them all. Each character is compared with the end
+// of the buffer by itself: reports are short and made once a run, and there is one place to be
+// right.
+//
+// Quotes go round the value, not round the entry, and are not escaped inside it: a value that holds
+// both blanks and quotes is shown for the eye, and not for a shell.
+
 #include "tabledrivenparser/interface/text_sink.h"
 
 namespace tabledrivenparser {

@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From an argument to a value. Each type has its way to read text; all but handlers and via files
+// end at the same three gates (constraint, validator, listener) and at the same place where the
+// value is kept. A list passes element by element, so that the listener hears each of them.
+//
+// Arguments come from argv, which lives as long as the process, or from a via file, whose words are
+// gone two words later: the latter are copied into the parser's region before they are kept. A via
+// file is read here too, as the value of its option: its words go back to the parser, one level
+// deeper.
+
 #include "tabledrivenparser/src/value_store.h"
 
 #include "checking/interface/checking.h"
@@ -88,6 +98,7 @@ void ValueStore::keep(const Value& value) {
 
 void ValueStore::append(const Value& value) {
   Value& list = m_Parser.m_Tables.values[m_Row.id].value;
+  // Asked each time: the list in the record may still be the client's constant.
   const Value base = m_Parser.getDefaultValue(m_Row.id);
   alloclib::RegionGeneral& region = m_Parser.getRegion();
   if (m_Definition.type == Type_IntVector) {
@@ -121,6 +132,7 @@ bool ValueStore::storeNumber() {
 }
 
 bool ValueStore::storeNumbers() {
+  // A separator at the end is followed by no digits, and so refused like one between two.
   for (const char* text = m_Argument;; ++text) {
     const NumberText number = readNumberAt(text);
     if (number.result != NumberResult::Good) return false;
@@ -152,6 +164,7 @@ bool ValueStore::storeNamedEnumerator() {
     m_Parser.report(ReportLevel::Warning, OptionMessage::DeprecatedArgument,
                     {m_Argument, m_Row.name});
   }
+  // By custom the enumerator 0 is the one with which a user asks for the list of names.
   if (entry->id == 0 && m_Filter.empty()) showChoices();
   keep(value);
   return true;
@@ -212,12 +225,14 @@ bool ValueStore::readViaFiles() {
 
 bool ValueStore::readViaFile(const char* fileName, bool copy) {
   if (copy) fileName = m_Parser.copyText(fileName);
+  // Before the file is opened: one that names itself holds an open file at each level.
   if (m_Parser.m_ViaFileDepth + 1 >= Parser::ViaFileDepthLimit) {
     m_Parser.report(ReportLevel::Fatal, OptionMessage::RecursiveViaFile,
                     {static_cast<int>(Parser::ViaFileDepthLimit), fileName});
     return false;
   }
   ++m_Parser.m_ViaFileDepth;
+  // The name first, then its words: the list shows files in the order in which they were begun.
   append(Value{.text = fileName});
   ViaFile file(m_Parser, m_Parser.m_Files, fileName);
   parseWordsOf(file);

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The last step of an option: its argument becomes a value of the option's type. The order is
-// always constraint, validator, listener, store.
+// always constraint, validator, listener, store: a listener acts at once and can't take it back, so
+// it hears only what has passed the checks. The parser makes one of these for each option that it
+// meets.
+
 #pragma once
 
 #include "tabledrivenparser/interface/parser.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Values as such: what an empty one is, when two are equal, and how one is written so that the
+// parser would read it again. The union carries no tag; each function here goes by the definition's
+// type and touches the one member that it names.
+
 #include "tabledrivenparser/src/value_text.h"
 
 #include <algorithm>
@@ -42,6 +47,7 @@ std::string enumeratorText(const Enumeration& enumeration, int64_t number, uint3
   const MatchString* best = nullptr;
   for (const MatchString& entry : enumeration.entries) {
     if (entry.id != number || !restrictionsMet(entry.restrictions, tableMask)) continue;
+    // In an enumeration this marks a deprecated name, which is shown only where there is no other.
     if (entry.separator == 0) return std::string(entry.name);
     if (best == nullptr) best = &entry;
   }

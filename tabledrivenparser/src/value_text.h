@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Values as such: the empty one, equality, and how one is written.
+//
+// Values as such: the empty one, equality, and how one is written. The parser asks for defaults,
+// the two reports for the rest.
+
 #pragma once
 
 #include "tabledrivenparser/interface/option_table.h"

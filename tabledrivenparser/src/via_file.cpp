@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The scanner of via files, in two layers. refill reads a piece, refuses one with a NUL byte and
+// drops comments, which may begin in one piece and end in another; nextToken takes words from what
+// is left, character by character, with the state of quotes, parentheses and a pending backslash.
+//
+// A via file may be anything: a binary that was named by mistake, a file without an end, one line
+// of many megabytes. A NUL ends the run before a word of its piece is taken, a word that outgrows
+// the buffer ends it too, and only one piece is in memory at a time. After such a report m_LastChar
+// is 0 and nothing is handed out any more.
+
 #include "tabledrivenparser/interface/via_file.h"
 
 #include "support/interface/letters.h"
@@ -78,6 +88,7 @@ char ViaFile::peek() {
 }
 
 void ViaFile::startWord() {
+  // The other of the two: the caller still holds the word before.
   m_Current = 1 - m_Current;
   m_Words[m_Current].clear();
   m_PreviousLength = m_Length;
@@ -85,6 +96,7 @@ void ViaFile::startWord() {
 }
 
 // False if the word and its neighbour have grown too long.
+// Counted as it stands in the file, with its quotes, against both words together.
 bool ViaFile::countCharacter() {
   ++m_Length;
   return m_Reader == nullptr || m_Length + m_PreviousLength <= BufferSize;
@@ -118,6 +130,7 @@ void ViaFile::scanEscaped(char character, const ScanState& state) {
 
 const char* ViaFile::finishWord(char end, const ScanState& state) {
   if (state.isEnclosed()) return fail(OptionMessage::MalformedViaFile);
+  // A backslash at the end protects nothing and is a character.
   if (state.isEscapePending) m_Words[m_Current] += '\\';
   m_LastChar = end;
   return m_Words[m_Current].c_str();
@@ -127,12 +140,14 @@ bool ViaFile::refill() {
   if (!isOpen() || m_LastChar == '\0') return false;
   m_Position = 0;
   m_Text = {};
+  // Comments leave room, and a reader may give less than it was asked for.
   while (m_Text.size() < BufferSize) {
     char* free = m_Buffer.data() + m_Text.size();
     const ptrdiff_t count = m_Reader->read(m_File, free, BufferSize - m_Text.size());
     if (count == ViaFileReader::ReadError) fail(OptionMessage::ViaFileReadError);
     if (count <= 0) break;
     const size_t size = static_cast<size_t>(count);
+    // Looked for in comments too: what holds a NUL is no text.
     if (std::find(free, free + size, '\0') != free + size) {
       fail(OptionMessage::NulInViaFile);
       break;

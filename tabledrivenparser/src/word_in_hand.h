@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The word that the parser is at, and how far it has got with it. A word of concatenated letters
-// is handled in a loop, one letter and the rest at a time, as its length is up to the user.
+//
+// The word that the parser is at, and how far it has got with it. A word of concatenated letters is
+// handled in a loop, one letter and the rest at a time, as its length is up to the user: a call for
+// each letter would end a run of a hundred thousand of them by the end of its stack.
+
 #pragma once
 
 #include "tabledrivenparser/interface/option_table.h"
