@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// One argument of a message. It knows its own type, so that a conversion that does not fit is
-// found instead of read wrongly, and so that the length letters of a format say nothing new.
+//
+// One argument of a message. It knows its own type, so that a conversion that does not fit is found
+// instead of read wrongly, and so that the length letters of a format say nothing new. It is made
+// by the reporting templates of messages.h at the call and gone after it.
+//
+// Texts in arguments are where the outside comes in: names of members and symbols, words of the
+// command line, reasons of the host. They are bytes here, and never looked at as a format.
+
 #pragma once
 
 #include <concepts>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The texts of all messages, by key, in the chosen language. A new language is one more file with
-// a table and one more row in the list of catalogues.
+//
+// The texts of all messages, by key, in the chosen language. A new language is one more file with a
+// table and one more row in the list of catalogues. Looking up never fails: a key without a text
+// gives a text that says so, since a report that is itself missing must not hide what it was about.
+
 #pragma once
 
 #include "messages/interface/message_key.h"

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What the user may say about diagnostics: --diag_error, --diag_warning, --diag_remark,
-// --diag_suppress and --diag_style. All of it acts at once, on the messages still to come.
+// --diag_suppress and --diag_style. All of it acts at once, on the messages still to come; the
+// driver's listener calls in here while the command line is parsed. Nothing here can turn an error
+// into less: whether a message moves at all is in the word of its reporter.
+
 #pragma once
 
 #include "messages/interface/severity.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Hears --message_locale while the command line is parsed, so that the language holds for all
-// later messages.
+//
+// Hears --message_locale while the command line is parsed, so that the language holds for all later
+// messages. The driver's own listener passes that option on to this one.
+
 #pragma once
 
 #include "messages/interface/message_key.h"

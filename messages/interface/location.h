@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The place that a diagnostic speaks of.
+//
+// The place that a diagnostic speaks of. The styles show it as compilers do, so that an editor can
+// jump there; with no file known, style 1 shows the tool's name instead.
+
 #pragma once
 
 #include <cstdint>

@@ -1,8 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
-// The 32-bit name of a message. Bits 18 to 24 hold a letter (L for the tool, X for its
-// libraries), bits 4 to 17 the number, bits 1 to 3 the place of the severity letter in
-// "?IWE?U??", bit 0 nothing. Keys sort by letter, then number, then severity letter, which is the
-// order of the catalogues.
+//
+// The 32-bit name of a message. Bits 18 to 24 hold a letter (L for the tool, X for its libraries),
+// bits 4 to 17 the number, bits 1 to 3 the place of the severity letter in "?IWE?U??", bit 0
+// nothing. Keys sort by letter, then number, then severity letter, which is the order of the
+// catalogues.
+//
+// The number is what users meet: they look it up, and name it in --diag_suppress. So a number stays
+// with its message, and those of messages that were given up stay unused.
+
 #pragma once
 
 #include <cstddef>
@@ -34,7 +39,7 @@ inline constexpr uint32_t LargestNumber = 16383;
   return SeverityLetters[valueOf(key) >> 1 & 7];
 }
 
-/// "?" where the key holds no letter.
+/// "?" where the key holds no letter: a key made of anything can be printed.
 [[nodiscard]] constexpr char letterOf(Key key) {
   const char letter = static_cast<char>(valueOf(key) >> 18 & 0x7F);
   const bool isLetter = (letter >= 'A' && letter <= 'Z') || (letter >= 'a' && letter <= 'z');

@@ -1,13 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The name of every message in the catalogue, in the order of the keys. The severity letter is a
-// label: what a message does is said by the severity word that its reporter passes.
+// label: what a message does is said by the severity word that its reporter passes. 68xx and 69xx
+// are the tool's own, 39xx the option parser's, 97xx and 99xx this library's.
+
 #pragma once
 
 #include "messages/interface/message_key.h"
 
 namespace messages {
 
-/// clang-format off
+// clang-format off
 inline constexpr Key OutOfMemory = makeKey('L', 6800, 'U');
 inline constexpr Key NotInArchiveFormat = makeKey('L', 6826, 'E');
 inline constexpr Key MalformedArchive = makeKey('L', 6829, 'E');
@@ -37,7 +40,7 @@ inline constexpr Key HelpEditOptions = makeKey('L', 6883, 'I');
 inline constexpr Key HelpOtherOptions = makeKey('L', 6884, 'I');
 inline constexpr Key HelpExamples = makeKey('L', 6885, 'I');
 
-/// Lines of listings and reports; they are printed without a code.
+// Lines of listings and reports; they are printed without a code.
 inline constexpr Key ListedMember = makeKey('L', 6901, 'I');
 inline constexpr Key ListedMemberLong = makeKey('L', 6902, 'I');
 inline constexpr Key AddedMember = makeKey('L', 6903, 'I');

@@ -1,8 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The message library: it words, prints and counts every diagnostic of the tool, and prints the
 // lines of its listings. A diagnostic has a key; its text lies in the catalogue; what the user said
 // about severities and style decides how it looks. Only keys and the tool's own literals are ever
 // formats: whatever comes from outside is an argument. The state is process-wide and unlocked.
+//
+// A report runs through: effective severity, counting (and the end of the run at one error too
+// many), location and prefix in the current style, code, text, newline. Bytes that could steer a
+// terminal are escaped on the way out. The counters decide the exit status; libraries never call in
+// here, but the driver's bridges do it for them.
+
 #pragma once
 
 #include "messages/interface/argument.h"

@@ -1,8 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The two streams of the process. All text and all raw bytes for stdout pass through one buffer,
 // so that they come out in the order in which they were written; stderr has no buffer, and stdout
 // is flushed before each write to it. In the tool both are private duplicates of the descriptors:
 // a file that is opened later can never get the number of a closed stdout and be written into.
+//
+// Names in archives come out here, and somebody may have chosen them to do harm: as text no control
+// byte passes but tab and line feed. The contents of a member that is printed go out raw.
+
 #pragma once
 
 #include "messages/interface/output_sink.h"

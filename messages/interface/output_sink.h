@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Where the bytes of one stream go: a descriptor in the tool, a string in a test.
+//
+// Where the bytes of one stream go: a descriptor in the tool, a string in a test, a sink that fails
+// in a test of what happens then. What arrives here is final: escaped, in order, and not to be
+// changed.
+
 #pragma once
 
 #include <string_view>

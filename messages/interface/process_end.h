@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// How the process ends when a message decides so. The driver owns the ordered shut-down and hangs
-// it in here.
+//
+// How the process ends when a message decides so: one error too many, a fatal report, a fault. The
+// driver owns the ordered shut-down and hangs it in here, since this library stands below it.
+
 #pragma once
 
 namespace messages {

@@ -1,12 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
-// How bad a message is. A reporter passes a severity word: the severity in bits 16 and up, with
-// two bits that say whether the user may lower or raise it on the command line.
+//
+// How bad a message is. A reporter passes a severity word: the severity in bits 16 and up, with two
+// bits that say whether the user may lower or raise it on the command line. WarningWord may move
+// both ways and none of the others at all: an error that could be lowered would let a run replace
+// an archive that it had found wrong.
+
 #pragma once
 
 #include <cstdint>
 
 namespace messages {
 
+/// Ascending: "lower" and "higher" compare the numbers.
 enum Severity : uint32_t {
   Severity_Suppressed = 1,
   Severity_Remark = 2,

@@ -1,5 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// The list of catalogues, the look-up of a text, and the choice of a language.
+//
+// The list of catalogues, the look-up of a text, and the choice of a language. The look-up is a
+// binary search: first in the external catalogue, if a client has set one, then in the built-in one
+// of the language. The name of a language comes from the command line; one that is not known
+// changes nothing, not even half of it.
+
 #include "messages/interface/catalogue.h"
 
 #include "messages/src/catalogues.h"
@@ -55,6 +60,7 @@ MessageFormat formatAt(const BuiltInCatalogue& catalogue, size_t index) {
 }
 
 std::string_view notFoundText(Key key) {
+  // In a buffer of the process: a look-up needs no memory, as "Out of memory" is looked up too.
   static char text[64];
   const KeyText keyText(key);
   const int length = std::snprintf(text, sizeof text, "<NotFound Code=%.*s key=0x%.8x>",
@@ -77,6 +83,7 @@ std::span<const CatalogueRow> getCatalogueRows(uint32_t index) {
 }
 
 // A listing says the same thing thousands of times.
+// So the row of the last look-up is tried first.
 MessageFormat getMessageFormat(Key key) {
   if (const CatalogueRow* row = findRow(externalCatalogue, key)) return {row->text, {}};
   const BuiltInCatalogue& catalogue = Catalogues[catalogueIndex].catalogue();
@@ -105,6 +112,7 @@ bool setLocale(std::string_view name) {
       findByName(std::span<const CodePage>(CodePages), hasDot ? name.substr(dot + 1) : name);
   const bool isValid = hasDot ? catalogue && codePage : catalogue || codePage;
   if (!isValid) return false;
+  // Only now, when all of the name has been found good.
   if (catalogue) catalogueIndex = static_cast<uint32_t>(catalogue - Catalogues);
   if (codePage) codePageNumber = codePage->number;
   return true;

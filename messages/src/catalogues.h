@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The built-in catalogues. All have the same keys and, for each, the same arguments, which a text
 // may name in another order ("%2$s"). The compiler reads their formats, so that a run only fills
-// them.
+// them: a listing of a large archive fills the same format once for each member.
+
 #pragma once
 
 #include "messages/interface/catalogue.h"

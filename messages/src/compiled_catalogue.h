@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the compiler makes of the rows of a built-in catalogue, and what it checks of them.
+//
+// What the compiler makes of the rows of a built-in catalogue, and what it checks of them. Rows
+// come in, and one array of the pieces of all their formats comes out, with the place where each
+// row's pieces end; a row out of order, or a format with a fault, doesn't compile.
+
 #pragma once
 
 #include "messages/src/catalogues.h"
@@ -42,6 +46,7 @@ struct CompiledRows {
 
 template <const auto& Rows>
 consteval auto compileRows() {
+  // Counted in a first pass, as an array of constants needs its size before its contents.
   constexpr size_t PieceCount = countPieces(Rows);
   static_assert(PieceCount <= std::numeric_limits<uint16_t>::max());
   CompiledRows<std::size(Rows), PieceCount> compiled{};

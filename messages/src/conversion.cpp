@@ -1,5 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// Rendering of values as printf does it in the C locale.
+//
+// Rendering of values as printf does it in the C locale: sign or base, zeros, digits, and blanks on
+// one side. It is done here and not by the host's printf, since that goes by the locale, and takes
+// a format with its arguments unread.
+//
+// Width and precision may be as large as 2147483647, by the tool's own formats and star arguments
+// only; a text then grows to that.
+
 #include "messages/src/conversion.h"
 
 #include <algorithm>
@@ -92,6 +99,7 @@ void appendSigned(std::string& text, const Conversion& conversion, int64_t value
 void appendUnsigned(std::string& text, const Conversion& conversion, uint64_t value) {
   DigitBuffer buffer;
   NumberParts parts = makeParts(buffer, conversion, value);
+  // "#" asks octal for a leading zero, unless the precision has given one.
   if (conversion.isAlternate && conversion.letter == 'o' && parts.zeroCount == 0 &&
       !parts.digits.starts_with('0')) {
     parts.zeroCount = 1;

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// One printf conversion with its flags, and the rendering of each kind of value under it.
+//
+// One printf conversion with its flags, and the rendering of each kind of value under it. The
+// reader of formats fills it, in the compiler or at run time; format.cpp puts in what the arguments
+// say.
+
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Writing to a descriptor until all is out: interrupted calls, short writes and a full pipe that
-// doesn't block are no failures.
+// doesn't block are no failures. A reader who is slow only costs time; one who has gone is a
+// failure, as is a full disk. The number of the first failure goes up, and nobody writes on.
+
 #include "messages/src/descriptor_sink.h"
 
 #include <cerrno>

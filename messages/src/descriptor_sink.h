@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// A private duplicate of a descriptor as the end of a stream.
+//
+// A private duplicate of a descriptor as the end of a stream. Why a duplicate: a tool may be
+// started with stdout or stderr closed, and the first file that it opens would get that number, an
+// archive perhaps, and be written into by the next message.
+
 #pragma once
 
 #include "messages/interface/output_sink.h"

@@ -1,5 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// The user's say in severities, and the rule by which a message's own word meets it.
+//
+// The user's say in severities, and the rule by which a message's own word meets it. An element
+// names a number ("L6875W", "6875") or a whole severity; the number's own override comes before the
+// map of severities, whatever their order on the command line. A letter of another tool is passed
+// over, since one via file may serve several tools.
+
 #include "messages/interface/diagnostic_control.h"
 
 #include "messages/src/message_state.h"
@@ -72,6 +77,7 @@ void applyDiagnosticStyle(uint32_t enumerator) {
 uint32_t computeEffectiveSeverity(uint32_t severityWord, Key key) {
   const MessageState& state = messageState;
   const uint32_t asked = severityOf(severityWord);
+  // The word is the program's own: a bad one is no matter of input.
   if (asked >= SeverityCount) internalFault("Messages: Bad severity number %d\n", asked);
   const uint32_t number = numberOf(key);
   uint32_t base = asked;
@@ -79,6 +85,7 @@ uint32_t computeEffectiveSeverity(uint32_t severityWord, Key key) {
     base = static_cast<uint32_t>(state.numberOverride[number]);
   }
   const uint32_t mapped = state.severityMap[base];
+  // Lowering wants one permission, raising the other; equal severities need none.
   const bool isAllowed = (mapped < asked && (severityWord & MayBeLowered) != 0) ||
                          (mapped > asked && (severityWord & MayBeRaised) != 0);
   return isAllowed ? mapped : asked;

@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The English texts, in the order of the keys. A text that is a format gets its arguments in the
-// order in which it names them.
+// order in which it names them. Users' scripts read these lines: a text changes for a reason only.
+//
+// Sorting, uniqueness and the formats themselves are checked by the compiler at the end of the
+// file.
+
 #include "messages/src/catalogues.h"
 
 #include "messages/interface/message_keys.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the libraries on the ground say when they give up, said as messages. They include no one,
-// so they call through handlers.
+//
+// What the libraries on the ground say when they give up, said as messages. They include no one, so
+// they call through handlers. When memory has run out the report must need none: lines are composed
+// in a buffer that is kept, and catalogue texts are constants.
+
 #include "alloclib/interface/handlers.h"
 #include "checking/interface/checking.h"
 #include "messages/interface/process_end.h"
@@ -41,6 +44,7 @@ void installFaultHandlers() {
   checking::setTextSink(onCheckingText);
   alloclib::setInternalErrorHandler(onRegionError);
   alloclib::setOutOfMemoryHandler(onRegionOutOfMemory);
+  // The standard containers have no other way to say it, and exceptions end at no one's catch.
   std::set_new_handler(onOutOfMemory);
 }
 

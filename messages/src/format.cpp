@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Filling of formats. They are the tool's own, so a fault in one is a fault of the program; it is
-// found here or by the reader, and told by the caller.
+// found here or by the reader, and told by the caller. Each argument is compared with the
+// conversion that asks for it, and each index with the number of arguments: no format reads what
+// was not passed.
+
 #include "messages/interface/format.h"
 
 #include "messages/src/format_reader.h"
@@ -43,6 +47,7 @@ bool readStar(Arguments arguments, uint8_t index, int32_t& value) {
   const Argument& argument = arguments[index];
   if (argument.getKind() != Argument::Kind::Integer) return false;
   value = static_cast<int32_t>(argument.getSigned());
+  // A star takes an int, as in C; more would be a length that nobody meant.
   return value == argument.getSigned();
 }
 
@@ -70,6 +75,8 @@ FormatStatus appendConversion(std::string& text, const FormatPiece& piece, Argum
   const bool hasStarPrecision = piece.precisionArgument != FormatPiece::NoArgument;
   if (hasStarPrecision && !setPrecision(conversion, arguments, piece.precisionArgument))
     return FormatStatus::BadFormat;
+  // Behind the stars: a fault in one of these comes first, as when the format is read piece by
+  // piece.
   if (piece.fault != FormatStatus::Done) return piece.fault;
   if (piece.argument >= arguments.size()) return FormatStatus::BadFormat;
   return appendArgument(text, conversion, arguments[piece.argument]) ? FormatStatus::Done

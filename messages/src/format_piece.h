@@ -1,7 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What a format says, read once: texts and conversions, one behind the other. A format of the
 // catalogue is read by the compiler, any other one as it is filled; what its pieces then come to is
 // the same.
+//
+// Pieces are plain constants of a catalogue: indexes and not pointers, views of the text and no
+// copies.
+
 #pragma once
 
 #include "messages/interface/format.h"

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The reader of formats, which also runs in the compiler. It finds what is wrong with a format
-// whatever its arguments are.
+// whatever its arguments are: an unfinished conversion, a width beyond an int, a position of 0 or
+// beyond the bound, positions mixed with plain order. A letter that is no conversion shows when it
+// is filled, with the kind of the argument.
+//
+// The form: "%" [position "$"] flags [width] ["." precision] length-letters letter.
+
 #pragma once
 
 #include "messages/src/format_piece.h"
@@ -57,6 +63,7 @@ private:
   // Reads "2$", if a position stands here.
   constexpr std::optional<uint32_t> readPosition() {
     const std::string_view start = m_Rest;
+    // A number without "$" is the width, or its "0" a flag, and is read again as that.
     const uint32_t position = readNumber();
     if (m_Rest.size() < start.size() && skip('$')) return position;
     m_Rest = start;
@@ -90,6 +97,7 @@ private:
   // Positions count from 1; without one it is the next argument in turn.
   constexpr FormatStatus nameArgument(std::optional<uint32_t> position, uint8_t& argument) {
     const Order order = position ? Order::Positional : Order::Sequential;
+    // In C a mixture is undefined: nobody could say which argument is the next in turn.
     if (m_Order != Order::Unknown && m_Order != order) return FormatStatus::BadFormat;
     m_Order = order;
     if (position == 0u) return FormatStatus::BadFormat;

@@ -1,6 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Faults of the program itself. Each is printed with a number made from its text, by which one
-// report can be compared with another whatever the arguments and wherever the tool was built.
+// report can be compared with another whatever the arguments and wherever the tool was built. The
+// number: hash times 31 plus the character, modulo 2 to the 24th, over the text before its
+// arguments are put in, up to the first newline.
+//
+// A fault is counted, told on the stream of diagnostics, and ends the process through the driver's
+// shut-down: no archive is put in place any more.
+
 #include "messages/interface/format.h"
 #include "messages/interface/messages.h"
 #include "messages/interface/process_end.h"
@@ -35,6 +42,7 @@ size_t findWorkComponent(std::string_view text, size_t start) {
 uint32_t extendHash(uint32_t hash, std::string_view text) {
   constexpr uint32_t HashMask = 0xFFFFFF;
   for (const char character : text) {
+    // A host with the other separator gives the same number.
     const char counted = character == '\\' ? '/' : character;
     hash = (hash * 31 + static_cast<unsigned char>(counted)) & HashMask;
   }
@@ -76,6 +84,7 @@ void plainFault(const char* text) {
 void assertionFault(const char* path, unsigned line, const char* expression) {
   std::string message(AssertionLead);
   message.append(path).append(" line ").append(std::to_string(line)).append(" (");
+  // The expression is an argument: in its place the number sees "%s".
   const uint32_t hash = computeFaultHash(message + "%s)");
   endWithFault(hash, message.append(expression).append(")"));
 }

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The Japanese texts, in the order of the keys. Columns count a Japanese character as two.
+//
+// The Japanese texts, in the order of the keys. Columns count a Japanese character as two. Each
+// text has the conversions of its English one, in another order where the sentence wants it
+// ("%2$s"); a test compares the two, and the compiler checks the rest.
+
 #include "messages/src/catalogues.h"
 
 #include "messages/interface/message_keys.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A run in the wrong language would go on to the end with words that nobody asked for, so a bad
-// locale is fatal.
+// locale is fatal. Without a reporter the words go to stderr as they are, from no catalogue. The
+// name is the user's text, and only ever an argument.
+
 #include "messages/interface/locale_listener.h"
 
 #include "messages/interface/catalogue.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The text form of a key: "%c%.4d%c".
+//
+// The text form of a key: "%c%.4d%c", a letter, at least four digits and the severity letter.
+// Styles show parts of it: style 1 leaves the severity letter out, and each puts the tool's own
+// letter in front.
+
 #include "messages/interface/message_key.h"
 
 #include <cstdio>

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The process-wide state of the message library, but for the streams and the language.
+//
+// The process-wide state of the message library, but for the streams and the language, and the
+// steps of a report that its sources share. It is set back to that of a fresh process by
+// initialise. There is one thread, and so no lock.
+
 #pragma once
 
 #include "messages/interface/messages.h"

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// Composing, counting and printing of messages. A line is composed whole and written with one
-// call, so that lines of several processes on one terminal don't mix.
+//
+// Composing, counting and printing of messages. A line is composed whole and written with one call,
+// so that lines of several processes on one terminal don't mix.
+//
+// The order matters: a message is counted before it is composed, so that the one too many ends the
+// run unprinted; and the style is checked before a line is begun, since the report of a bad one
+// uses that line itself.
+
 #include "messages/interface/messages.h"
 
 #include "messages/interface/format.h"
@@ -125,6 +131,7 @@ bool countMessage(uint32_t severity) {
   ++state.counts[severity];
   const uint32_t errorSum = state.counts[Severity_Error] + state.counts[Severity_Fatal] +
                             state.counts[Severity_InternalFault];
+  // Equal, not above: a handler of a test that comes back is called once.
   if (severity >= Severity_Error && errorSum == state.limit + 1) {
     if (!state.limitHandler) endProcess(1);
     state.limitHandler();
@@ -134,6 +141,7 @@ bool countMessage(uint32_t severity) {
 
 void initialise() {
   MessageState& state = messageState;
+  // 40,000 bytes, which nearly no run has touched.
   if (state.hasNumberOverrides) state.numberOverride.fill(0);
   state.hasNumberOverrides = false;
   state.severityMap = {0, 1, 2, 3, 4, 5, 6};
@@ -156,6 +164,7 @@ bool reportArguments(uint32_t severityWord, const Location* location, Key key,
   checkStyle();
   std::string& line = startLine();
   appendLead(line, location, severity);
+  // A remark is for reading along, and nothing to be looked up or suppressed by its number.
   if (severity != Severity_Remark) appendCode(line, key);
   appendBody(line, getMessageFormat(key), arguments);
   writeText(messageState.diagnosticStream, line);

@@ -1,5 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
-// The two streams, and the one routine that every text passes.
+//
+// The two streams, and the one routine that every text passes. The way of a text: control bytes
+// escaped, held back while a run may yet be dropped, then into the buffer of stdout or straight to
+// stderr. stdout is flushed before each write to stderr, so that on a terminal a complaint comes
+// behind the lines that were listed before it.
+//
+// A failure of stdout is remembered and told by the driver as an error of the run; one of stderr
+// can't be told to anybody.
+
 #include "messages/interface/output.h"
 
 #include "messages/src/descriptor_sink.h"
@@ -26,6 +34,7 @@ struct HeldPiece {
   std::string bytes;
 };
 
+// A run that prints a whole library must not keep all of it in memory to be able to take it back.
 constexpr size_t MostHeld = 0x100000; // bytes
 
 struct Hold {
@@ -90,6 +99,7 @@ void releaseHeld() {
 void writeBytes(Stream stream, std::string_view bytes) {
   Hold& hold = currentHold;
   if (hold.isOn) hold.size += bytes.size();
+  // What is out can't be taken back: from here on `drop` answers false.
   if (hold.isOn && hold.size > MostHeld) releaseHeld();
   if (!hold.isOn) {
     passOn(stream, bytes);

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The buffer of stdout. It remembers the first failure of its sink and drops what comes after,
-// since output with a hole in it is worse than output that ends.
+// since output with a hole in it is worse than output that ends. It is static data of the process
+// and needs no memory of the heap, so that it can be flushed when that has run out.
+
 #pragma once
 
 #include "messages/interface/output_sink.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The one door out of the process for this library.
+//
+// The one door out of the process for this library. The shut-down behind it may itself report and
+// come back to the door: the second time there is no ordered way any more, and the process ends
+// with only its streams flushed. Else a fault in the shut-down would go round for ever.
+
 #include "messages/interface/process_end.h"
 
 #include "messages/interface/output.h"
