@@ -43,6 +43,7 @@ void run(const Words& words) {
   arguments.push_back(nullptr);
   posix_spawn_file_actions_t actions;
   posix_spawn_file_actions_init(&actions);
+  // A terminal or a pipe would be measured with the listing.
   posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, "/dev/null", O_WRONLY, 0);
   pid_t child = 0;
   const int error =
@@ -87,6 +88,7 @@ void addCases(const Archiver& archiver, const bench::SampleFolder& folder, const
   const std::string copy = folder.path(what + "." + archiver.name + ".copy.a");
   const auto nothing = [] {};
   const auto removeCopy = [copy] { std::filesystem::remove(copy); };
+  // Each time works on a fresh copy: an edited library would be another one the next time.
   const auto makeCopy = [master, copy] {
     std::filesystem::copy_file(master, copy, std::filesystem::copy_options::overwrite_existing);
   };

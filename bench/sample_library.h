@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The folders of files that the benchmarks work on, made in a temporary place and removed again.
+// They are of any bytes and no objects: what is measured with them is reading, copying and writing,
+// and not the symbol table.
+
 #pragma once
 
 #include <cstdint>

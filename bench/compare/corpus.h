@@ -6,6 +6,10 @@
 //
 // The objects are little-endian, as compilers lay them out: of class 32 with relocations without
 // addends, or of class 64 with addends. The plain archivers index both.
+//
+// Who asks: make_corpus, which writes them for compare.py, and the test of the corpora. Figures of
+// different machines can be compared because nothing here depends on one.
+
 #pragma once
 
 #include <cstdint>

@@ -3,6 +3,12 @@
 // One object of a corpus, laid out as compilers do: code, data, notes, debug information, the
 // symbol table with the local symbols in front, the string tables, and last, whatever their
 // indices, the relocations.
+//
+// The numbers that shape an object come from one stream for all builds of its module, those that
+// fill its bytes from another for each build: builds of a module define the same symbols at the
+// same places, and differ in their code. The object builder of the tests puts it together, so what
+// a good object is stands in one place.
+
 #include "bench/compare/corpus.h"
 #include "bench/compare/numbers.h"
 
@@ -21,6 +27,8 @@ namespace {
 using namespace elfext;
 using namespace testsupport;
 
+// Names share beginnings and words, as those of real libraries do: sorting and comparing them then
+// costs what it does there.
 constexpr std::array<const char*, 16> Words = {
     "buffer", "clock", "device", "entry",  "filter", "graph", "handle", "index",
     "lexer",  "merge", "node",   "option", "parser", "queue", "record", "stream"};
@@ -57,6 +65,7 @@ uint32_t spread(uint32_t number) {
 // A few objects are far larger than most: the place raised to the eighth power.
 uint32_t functionCount(const Corpus& corpus, uint32_t module) {
   uint64_t place = spread(module);
+  // Three squares are the eighth power; the upper half of each product keeps it a part of 2^32.
   for (int i = 0; i < 3; ++i)
     place = place * place >> 32;
   return corpus.fewestFunctions +
@@ -138,6 +147,7 @@ private:
   uint32_t addSectionSymbol(uint32_t section) {
     return addLocal({.section = static_cast<uint16_t>(section), .type = STT_SECTION});
   }
+  // The machines' numbers of a relocation by the whole address.
   [[nodiscard]] uint32_t getAbsoluteType() const { return m_Corpus.isWide ? 257 : 2; }
 
   const Corpus& m_Corpus;
@@ -186,6 +196,7 @@ void ObjectMaker::addAllCode() {
 // Two of three come from headers, and stand in groups of which a linker keeps one.
 void ObjectMaker::addSeparateFunction(uint32_t function) {
   const bool isFromHeader = function % 3 != 0;
+  // 577 is prime to the number of functions: modules begin at different places and still share.
   const uint32_t number = (m_Module * 577 + function) % HeaderFunctions;
   const std::string name =
       isFromHeader ? nestedName(number / 64, number) : nestedName(1000 + m_Module, function);
@@ -199,6 +210,7 @@ void ObjectMaker::addSeparateFunction(uint32_t function) {
 void ObjectMaker::addGroup() {
   SectionBuilder& group = addSection(".group", SHT_GROUP, 0, 4);
   group.word(GRP_COMDAT).word(m_LastSection + 1).word(m_LastSection + 2);
+  // The symbol table is behind all others, so that its index is not known yet.
   m_NeedingSymbolTable.push_back(&group);
   m_Groups.push_back({&group, m_Globals.size()});
 }

@@ -73,6 +73,7 @@ private:
 
   const InputFile* m_Library;
   std::optional<Window> m_Window; // on the library
+  // A small file is read for its names and written from memory later, as the tool does it.
   std::vector<std::unique_ptr<char[]>> m_Files;
   uint64_t m_Kept = 0;
   ObjectBuffers m_Buffers;
@@ -146,7 +147,8 @@ std::string modeText(uint32_t mode) {
   return text;
 }
 
-// Broken down once for each date that differs from the one before.
+// Broken down once for each date that differs from the one before: members of a library mostly have
+// one date, and breaking it down costs more than the rest of the line.
 class DateText {
 public:
   std::string_view of(uint32_t date) {
@@ -188,6 +190,7 @@ void extract(const std::string& path, const Words&) {
   Window window(library.file);
   for (const Member& member : library.members) {
     const bool isSmall = window.holds(member.getSize());
+    // A small member goes out as it lies in the window.
     OutputFile output(member.name, isSmall ? 0 : BufferSize);
     if (isSmall)
       output.put(window.at(member.getContentsOffset(), member.getSize()));
@@ -243,6 +246,7 @@ void symbols(const std::string& path, const Words&) {
   OutputFile output("-");
   for (uint32_t i = 0; i < count; ++i) {
     const uint32_t offset = arlib::getBigEndian32(table += 4);
+    // Members ascend by their offsets, so the one that a symbol names is found by halves.
     const auto member = std::ranges::lower_bound(library.members, offset, {}, &Member::offset);
     putPadded(output, name, 20);
     output.put(" from ");

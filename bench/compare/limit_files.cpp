@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Plain reads and writes, and nothing kept that nobody needs. A file that ends too soon, or a disk
+// that is full, ends the program with the host's reason: it works on libraries that the comparison
+// has made itself, and a figure of a run that failed is none.
+
 #include "bench/compare/limit_files.h"
 
 #include <algorithm>
@@ -42,6 +47,7 @@ void InputFile::read(char* place, uint64_t offset, size_t count) const {
 }
 
 std::string_view Window::at(uint64_t offset, size_t count) {
+  // Filled from the place that is asked for: who reads on in order finds what follows in it.
   if (offset < m_Start || offset + count > m_Start + m_Filled) {
     m_Start = offset;
     m_Filled = std::min<uint64_t>(m_Size, m_File.getSize() - offset);
@@ -78,6 +84,7 @@ void OutputFile::putNumber(uint64_t number, size_t width) {
 }
 
 void OutputFile::copy(const InputFile& from, uint64_t offset, uint64_t count) {
+  // As large writes as the buffer allows, without a copy of what lies in it already.
   while (count > 0) {
     if (m_Filled == m_Size || (m_Filled > 0 && count > m_Size)) flush();
     const size_t part = std::min<uint64_t>(count, m_Size - m_Filled);

@@ -1,4 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Reading: from header to header, through a small window, with the long names at hand by the time a
+// member needs one, since their table stands in front. Writing: the two tables are computed whole
+// from the members' sizes, and then everything goes out in order, once.
+//
+// Members of the old library that lie side by side and keep their headers are one range, which is
+// copied as one: in a library of which one member changes that is nearly all of it. Only good
+// libraries come here; what is checked is what a reader has to look at anyway.
+
 #include "bench/compare/limit_library.h"
 
 #include <algorithm>
@@ -67,6 +76,7 @@ std::string symbolTable(const std::vector<Member>& members, const PublishedNames
   std::string table(4 + 4 * size_t{count}, '\0');
   auto* place = reinterpret_cast<uint8_t*>(table.data());
   putBigEndian32(place, count);
+  // The symbol table comes first, so its own size is part of every offset in it.
   uint64_t offset = ArchiveMagic.size() + spaceOf(table.size() + names.texts.size());
   if (longNames != 0) offset += spaceOf(longNames);
   for (size_t i = 0; i < members.size(); ++i) {
@@ -119,6 +129,7 @@ void LibraryWriter::putMember(Member& member, std::string_view nameField) {
 void LibraryWriter::putOldMember(const Member& member, std::string_view nameField) {
   MemberHeader header = member.header;
   setNameField(header, nameField);
+  // The header stays and the member follows the range: the range grows by it.
   if (header == member.header && member.offset == m_RangeEnd) {
     m_RangeEnd = member.getEnd();
     return;
@@ -230,6 +241,7 @@ void describe(Member& member, const InputFile& file) {
 
 void writeLibrary(const std::string& path, std::vector<Member>& members,
                   const PublishedNames* names, const InputFile* old) {
+  // As the tool does it: a temporary and a rename are part of what a job costs at least.
   const std::string temporary = path + ".new";
   const NameFields nameFields(members);
   LibraryWriter writer(temporary, old);

@@ -2,6 +2,10 @@
 //
 // Libraries as the limit program reads and writes them: the members are found by their headers
 // alone, and what stays as it is goes over in as few pieces as it lies in.
+//
+// It shares the archive format's get and put with the tool (archive_format.h), and nothing else of
+// the archive library: what that costs beyond the format is what is measured.
+
 #pragma once
 
 #include "bench/compare/limit_files.h"

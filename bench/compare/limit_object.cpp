@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From an object's bytes to its published names, or to its sizes, by the host's own ELF structures.
+// Class is a template argument, as in the tool, so that the inner loops test nothing; the corpora
+// are little-endian, as the machines that measure.
+//
+// An object that is in memory as a whole is viewed there. Of a larger one only the tables are read,
+// each with one call, and its relocations pass by in pieces that stay in the cache.
+
 #include "bench/compare/limit_object.h"
 
 #include <algorithm>
@@ -85,6 +93,7 @@ struct SymbolTable {
 template <class Elf>
 SymbolTable<Elf> symbolTableOf(const ObjectPlace& object, Rows<typename Elf::Section> sections,
                                ObjectBuffers& buffers) {
+  // From the end, where compilers put it.
   size_t index = sections.count() - 1;
   while (sections[index].sh_type != SHT_SYMTAB)
     --index;
@@ -153,10 +162,12 @@ uint64_t& destination(ObjectSizes& sizes, bool isData) {
 template <class Elf>
 void addExecutable(const SymbolTable<Elf>& table, Rows<typename Elf::Section> sections,
                    ObjectBuffers& buffers, ObjectSizes& sizes) {
+  // The markers of a section ascend, so one open stretch for each is enough.
   buffers.stretches.assign(sections.count(), {});
   for (size_t i = 1; i < table.rows.count(); ++i) {
     const auto row = table.rows[i];
     const char* name = table.names.data() + row.st_name;
+    // Absolute symbols mark nothing.
     if (name[0] != '$' || row.st_shndx >= sections.count()) continue;
     ObjectBuffers::Stretch& stretch = buffers.stretches[row.st_shndx];
     destination(sizes, stretch.isData) += row.st_value - stretch.start;

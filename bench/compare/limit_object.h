@@ -38,7 +38,7 @@ struct ObjectSizes {
   uint64_t debug = 0;
 };
 
-// Room that is used again for each object.
+// Room that is used again for each object: what is measured is not the heap.
 struct ObjectBuffers {
   std::string header;
   std::string sections;

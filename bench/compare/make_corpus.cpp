@@ -4,6 +4,10 @@
 //   make_corpus CORPUS SEED SCALE FOLDER   writes the first objects of one in an existing folder
 //
 // The second form prints the objects' names, in order.
+//
+// compare.py calls it, as a gigabyte of objects is not made by a script. A write that fails ends
+// it: half a corpus would be measured as a fast one.
+
 #include "bench/compare/corpus.h"
 
 #include <cstdio>

@@ -56,11 +56,13 @@ int main(int argc, char** argv) {
   if (child < 0) return 1;
   int status = 0;
   rusage usage;
+  // wait4 and not getrusage: what is counted is this child, and no other.
   while (wait4(child, &status, 0, &usage) < 0 && errno == EINTR) {
   }
   const long long wall = now() - begin;
   std::printf("%lld %lld %ld %d\n", wall,
               microseconds(usage.ru_utime) + microseconds(usage.ru_stime), usage.ru_maxrss,
+              // As a shell tells of a signal.
               WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status));
   return 0;
 }
