@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Reports name a relocation by the section and row that it stands in, which the model no longer
+// says: objects only know the section that they came from, and may have changed their kind since.
+// So rows are counted anew, in one walk over the target's list, as a writer of the module would
+// deal them out.
 #include "elfext/src/validation/relocation_places.h"
 
 #include "elfext/interface/auxiliary_sections.h"
@@ -20,6 +25,8 @@ public:
 
   RelocationPlace take(const Relocation& relocation, uint32_t index) {
     const RelocationSection* section = findSection(relocation);
+    // A row count for each section that comes up; never walked through, so the order of addresses
+    // shows nowhere.
     return {section, section == nullptr ? index : m_RowCounts[section]++};
   }
 
@@ -33,6 +40,7 @@ private:
 
   void noteFirst(std::span<RelocationSection* const> sections) {
     for (const RelocationSection* section : sections) {
+      // A section holds rows of one kind: static or dynamic, with addends or without.
       const RelocationSection*& first = m_FirstOfKind[kindOf(*section)];
       if (first == nullptr) first = section;
     }

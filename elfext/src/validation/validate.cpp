@@ -1,7 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The checks that go beyond reading, in their order. A problem that the handler wants to live with
-// is mended where the report says so.
+// The checks that go beyond reading, in the order of their reports; ObjectModule::validate is
+// called by who is about to use a module as a whole, after a read or after edits. A problem that
+// the handler wants to live with is mended where the report says so, so later checks see it mended.
+//
+// What is tried by files here is cost: relocations all at one offset, thousands of groups, symbols
+// by the ten thousand. Each check walks once or sorts.
 #include "elfext/src/validation/validate.h"
 
 #include "elfext/interface/auxiliary_sections.h"
@@ -23,6 +27,8 @@ namespace elfext {
 
 namespace {
 
+// What an index table needs: it is loaded, and laid out in the order of the code that sh_link
+// names.
 constexpr uint32_t IndexTableFlags = SHF_ALLOC | SHF_LINK_ORDER;
 constexpr uint32_t CodeFlags = SHF_ALLOC | SHF_EXECINSTR;
 
@@ -43,6 +49,7 @@ bool isBlank(const Section& section) {
 }
 
 void blank(Section& section) {
+  // The null section is auxiliary, and closed to its users.
   ModuleBuilder::setAuxiliary(section, false);
   section.setName(nullptr);
   section.setFlags(0);
@@ -67,11 +74,13 @@ bool validateFirstSection(ObjectModule& module) {
   const uint32_t type = module.getSection(0)->getType();
   if (type == SHT_NULL) return true;
   if (!goOn(module, &ErrorHandler::firstSectionNotNull, type)) return false;
+  // Indexes count from it: sh_link 0 and st_shndx 0 mean none.
   module.setSectionIndex(module.createNullSection(nullptr, 0), 0);
   return true;
 }
 
 bool validateSymbolsOfAuxiliarySections(const ObjectModule& module) {
+  // What the file itself had is not told as a fault of edits.
   if ((module.getReadConditions() & ReadCondition_HasSymbolInAuxiliarySection) != 0) return true;
   for (const Section* section : module.getSections()) {
     const bool hosts =
@@ -126,6 +135,7 @@ bool validateRelocationOffsets(Section& section, alloclib::RegionGeneral& region
   for (uint32_t i = 0; i < repeats.size(); ++i) {
     if (!repeats[i]) continue;
     const Relocation* relocation = section.getRelocation(i);
+    // In the order of the list, though they were found in that of the offsets.
     const auto report = relocation->isDynamic() ? &ErrorHandler::repeatedDynamicRelocation
                                                 : &ErrorHandler::repeatedStaticRelocation;
     if (!goOn(*section.getObjectModule(), report, relocation->getOffset(), section.getIndex()))
@@ -166,6 +176,7 @@ bool validateGroupFlag(const ObjectModule& module, Section& section) {
   if (hasFlag == (group != nullptr)) return true;
   if (hasFlag) {
     if (!goOn(module, &ErrorHandler::groupFlagWithoutGroup, section.getIndex())) return false;
+    // Membership is the truth, and the flag follows it.
     section.setFlags(section.getFlags() & ~SHF_GROUP);
     return true;
   }
@@ -187,6 +198,7 @@ bool validateGroupFlags(const ObjectModule& module) {
 // A group may be dropped as a whole, and with it the local symbols that only it can refer to.
 bool leavesGroup(const Relocation& relocation) {
   const Symbol* symbol = relocation.getTarget();
+  // Global symbols may be found in another object's copy of the group.
   if (symbol == nullptr || symbol->isDynamic() || symbol->getBinding() != STB_LOCAL) return false;
   if (symbol->getCategory() != Symbol::Category_Hosted) return false;
   const Group* group = symbol->getHostedSymbolSection()->getGroup();
@@ -235,6 +247,7 @@ bool validateRelocationTargets(const ObjectModule& module) {
     if (target == nullptr || target->isRelocatable()) continue;
     // Row 0 of a section without rows stands for the section.
     const uint32_t rowCount = std::max(rowCounts[relocations], 1U);
+
     for (uint32_t row = 0; row < rowCount; ++row) {
       if (!goOn(module, &ErrorHandler::relocationNotAllowed, row, section->getIndex(),
                 target->getIndex()))
@@ -252,6 +265,8 @@ bool validateSectionSymbol(const ObjectModule& module, const Symbol& symbol) {
                 {symbol.getIndex(), table, symbol.isDynamic()});
   const Section& section = *symbol.getHostedSymbolSection();
   const uint64_t size = symbol.getSize();
+  // Before linking, a section symbol is the section; afterwards the section may have grown round
+  // it.
   if (module.getFileType() == ET_REL) {
     return size == 0 || size == section.getSize() ||
            goOn(module, &ErrorHandler::sectionSymbolSizeDiffers, symbol.getIndex(),
@@ -283,7 +298,9 @@ bool validateLocalSymbols(const ObjectModule& module, std::span<Symbol* const> s
 } // namespace
 
 bool ObjectModule::validate() {
+  // The arrays of the checks go with it, and not with the module.
   const alloclib::RegionOwner region(alloclib::RegionGeneral::Create(0x100000, "Validate region"));
+  // Each check counts on those before it having mended or refused; the first "no" ends all.
   return validateJumpSlots(*this) && validateNullSections(*this) && validateFirstSection(*this) &&
          validateSymbolsOfAuxiliarySections(*this) &&
          validateRelocationsOfAuxiliarySections(*this) &&

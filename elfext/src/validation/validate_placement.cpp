@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The checks of how sections and segments lie in the file and in memory.
+//
+// They are those that a loader counts on: p_offset, p_vaddr, p_filesz, p_memsz and p_align of
+// loadable segments, sh_offset, sh_addr and sh_addralign of sections. All may be any 64-bit number,
+// so ends are never computed: distances are compared with sizes. Segments and sections by the ten
+// thousand are sorted and gone through once; of those gone through only the one that reaches
+// farthest is kept.
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/hash_table.h"
 #include "elfext/interface/object_module.h"
@@ -49,6 +55,7 @@ bool validateLoadableSections(const ObjectModule& module, const Segments& holder
 
 bool validateOtherSections(const ObjectModule& module, const Segments& holders) {
   for (const Section* section : module.getSections()) {
+    // Without a byte in the file it takes nothing from the segment.
     if (isLoadable(*section) || section->getFileSize() == 0) continue;
     const Segment* holder = holders[section->getIndex()];
     if (holder != nullptr && !goOn(module, &ErrorHandler::otherSectionInLoadableSegment,
@@ -84,6 +91,7 @@ bool validateMemoryOverlap(const ObjectModule& module, Segments loads) {
   for (const Segment* load : loads) {
     if (farthest == nullptr) farthest = load;
     const uint64_t distance = load->getVirtualAddress() - farthest->getVirtualAddress();
+    // Reports name the lower index first, whatever the addresses.
     const auto [first, second] = std::minmax({farthest->getIndex(), load->getIndex()});
     if (load != farthest && distance < farthest->getMemorySize() &&
         !goOn(module, &ErrorHandler::loadableSegmentsOverlap, first, second))
@@ -108,6 +116,8 @@ std::vector<PlacedSection> getPlacedSections(const ObjectModule& module) {
   }
   smoothSort(std::span(placed), [](const PlacedSection& left, const PlacedSection& right) {
     if (left.offset != right.offset) return left.offset < right.offset;
+    // A full key, as this sort is not stable: which of two sections at one place is told must not
+    // depend on it.
     if (left.size != right.size) return left.size < right.size;
     return left.section->getIndex() < right.section->getIndex();
   });
@@ -124,6 +134,7 @@ bool validateApart(const ObjectModule& module, Section& left, Section& right) {
 // at the section of each tree that reaches farthest.
 bool validateSectionOverlap(const ObjectModule& module) {
   const std::vector<PlacedSection> placed = getPlacedSections(module);
+  // Looked up only, so the order of addresses shows nowhere.
   HashTable<PlacementNode*, const PlacedSection*> farthestOfTree;
   for (const PlacedSection& record : placed) {
     uint64_t offsetInTree = 0;
@@ -152,6 +163,7 @@ bool validateBeforeLoads(const ObjectModule& module, const Segments& segments,
   if (segments.empty() || loads.empty()) return true;
   const uint32_t segment = segments.front()->getIndex();
   const uint32_t load = loads.front()->getIndex();
+  // By index: this is an order of the program headers.
   return load > segment || goOn(module, report, load, segment);
 }
 
@@ -172,6 +184,7 @@ bool validateCongruence(const ObjectModule& module, const Segments& loads) {
     const uint64_t address = load->getVirtualAddress();
     const uint64_t offset = offsetOf(*load);
     const uint64_t alignment = load->getSegmentAlignment();
+    // The loader maps pages: the same remainder in file and memory lets it.
     if (alignment != 0 && (address - offset) % alignment != 0 &&
         !goOn(module, &ErrorHandler::segmentNotCongruent, load->getIndex(), address, offset,
               alignment))
@@ -205,6 +218,7 @@ bool validateRoomForHeaders(ObjectModule& module, Segment& load) {
   uint64_t unmapped = load.getFileSize();
   for (Section* section : module.getSections()) {
     if (section->getFileSize() != 0 && section->isWithin(load))
+      // A section within the segment starts no earlier than it.
       unmapped = std::min(unmapped, offsetOf(*section) - start);
   }
   const uint64_t needed = headersEnd - start;
@@ -216,6 +230,7 @@ bool validateLinkedFile(ObjectModule& module) {
   const Segments loads = getSegments(module, PT_LOAD);
   const Segments interpreters = getSegments(module, PT_INTERP);
   const Segments headerTables = getSegments(module, PT_PHDR);
+  // For all sections at once.
   const Segments holders = module.findHolders(loads);
   Segments loadsByOffset = loads;
   std::stable_sort(
