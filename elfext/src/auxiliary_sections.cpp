@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The sections whose contents the model makes itself, of which symbol tables and relocation
+// sections do something. This is where a file's relocation rows wait: between setRows and takeRows
+// they are counted at their target, and nobody else has them.
 #include "elfext/interface/auxiliary_sections.h"
 
 #include "elfext/interface/object_module.h"
@@ -45,6 +49,7 @@ RelocationSection::RelocationSection(ObjectModule* objectModule, const char* nam
 void RelocationSection::setTarget(Section* target, bool isDynamic) {
   QUARN_ASSERT(1, target != NULL);
   if (m_Target != nullptr) {
+    // Rows that wait belong to the old target.
     m_Target->materializeRelocations();
     m_Target->getRelocationSections(m_IsDynamic).removeValue(this);
   }
@@ -58,6 +63,7 @@ void RelocationSection::setRows(RelocationRows* rows, uint32_t rowCount) {
   QUARN_ASSERT(1, rows != NULL);
   QUARN_ASSERT(1, m_Target != NULL);
   QUARN_ASSERT(1, m_Rows == NULL);
+  // Without rows there is nothing to wait, and nothing for anybody to take.
   if (rowCount == 0) return;
   m_Rows = rows;
   m_RowCount = rowCount;

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides from two symbols whether an image has a region table. Only the sizes of a model ask. The
+// look-up sorts the module's symbols by name, so what rules the table out is asked first.
 #include "elfext/src/compressed_section_extractor.h"
 
 #include "elfext/interface/elf_constants.h"

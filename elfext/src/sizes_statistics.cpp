@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The sizes of a model: what it takes from sections, blocks and segments, which
+// tables/sizes_source.cpp then counts by the same rules as for objects without a model; and the
+// table in which they are printed. Offsets and sizes go over as the file had them.
 #include "elfext/interface/sizes_statistics.h"
 
 #include "checking/interface/checking.h"
@@ -40,6 +44,7 @@ void addSections(ObjectModule& module, SizesSource& source) {
   for (const Section* section : module.getSections()) {
     const uint64_t size = section->getSize();
     uint64_t expanded = size;
+    // What the extractor has put there counts only if it says so.
     if (extractor.isActive() && !extractor.isCompressed(*section, &expanded)) expanded = size;
     source.sections.push_back(
         {section->getName(), section->getType(), section->getFlags(), size, expanded});
@@ -90,6 +95,7 @@ void printSizesStatistics(const SizesStatistics& statistics, std::FILE* f) {
   QUARN_ASSERT(1, f != NULL);
   const char* rule = "==========================================\n";
   const auto print = [f](const char* label, uint64_t total) {
+    // Only the low 32 bits have a place in the table.
     std::fprintf(f, "%-24s: %10u bytes\n", label, static_cast<uint32_t>(total));
   };
   std::fputs(rule, f);
