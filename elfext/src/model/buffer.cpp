@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Each check comes in an order in which no sum can wrap before it is looked at.
+// Access to contents in words of the object's byte order, and the check of each access. Misuse is a
+// fault of the program and an assertion: whoever goes where a file points compares first. Each
+// check comes in an order in which no sum can wrap before it is looked at.
+//
+// Bytes of a file may still be missing when they are wanted: the file was there when the extents
+// were checked, and has been cut since. That is told once for each buffer, and what is wanted then
+// is null, or 0 as a word.
 #include "elfext/interface/buffer.h"
 
 #include "checking/interface/checking.h"
@@ -16,6 +22,7 @@ namespace {
 template <class Word>
 Word assemble(const uint8_t* bytes, bool isLittleEndian) {
   uint64_t value = 0;
+  // Byte by byte: the place may be odd, and the host of either order.
   for (size_t index = 0; index < sizeof(Word); ++index)
     value = value << 8 | bytes[isLittleEndian ? sizeof(Word) - 1 - index : index];
   return static_cast<Word>(value);
@@ -42,6 +49,7 @@ void Buffer::setExternalData(ExternalDataFunction function, void* handle, uint64
 
 void Buffer::tellLoss() const {
   if (!m_Contents.isLost() || m_IsLossTold) return;
+  // Before the telling, as the handler may look into the section again.
   m_IsLossTold = true;
   m_ObjectModule->reportLostContents(m_Contents.getHostError());
 }
@@ -92,6 +100,7 @@ void Buffer::reserve(uint64_t size) {
 template <class Word>
 Word Buffer::loadWord(uint64_t offset) const {
   std::array<uint8_t, sizeof(Word)> bytes;
+  // External data is never viewed: its owner delivers copies.
   if (isExternal()) readExternal(offset, bytes.data(), bytes.size());
   const uint8_t* word = isExternal() ? bytes.data() : viewAt(offset);
   return word == nullptr ? Word{0} : assemble<Word>(word, m_ObjectModule->isLittleEndian());
@@ -106,6 +115,7 @@ void Buffer::storeWord(uint64_t offset, Word value) {
 template <class Word>
 uint64_t Buffer::appendWord(Word value) {
   const uint64_t oldSize = m_Contents.getSize();
+  // Growing by steps costs no square: the array behind it grows by half each time.
   setSize(oldSize + sizeof(Word));
   storeWord(oldSize, value);
   return oldSize;
@@ -132,6 +142,7 @@ uint64_t Buffer::get64(uint64_t offset) const {
   return getUnaligned64(offset);
 }
 
+// The first of the two assertions keeps the sum in the second from wrapping.
 uint16_t Buffer::getUnaligned16(uint64_t offset) const {
   if (isExternal()) return loadWord<uint16_t>(offset);
   QUARN_ASSERT(1, offset <= m_Contents.getSize());
@@ -190,6 +201,7 @@ void Buffer::readExternal(uint64_t offset, void* buffer, uint64_t count) const {
   auto* destination = static_cast<uint8_t*>(buffer);
   while (count != 0) {
     const uint64_t ret = m_ExternalDataFunction(m_ExternalDataHandle, offset, destination, count);
+    // A source that delivers nothing would be asked for ever.
     QUARN_ASSERT(1, ret > 0);
     QUARN_ASSERT(1, ret <= count);
     offset += ret;

@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Writes what the objects of a module say of how they were built: first blocks, for each object
+// what it has beyond what it inherits; then the section's bytes from all blocks. The format is that
+// of build_attributes_parsers.h, and what is written here is read there. For those who write
+// modules; the tool does not.
+//
+// Thousands of sections may share a few blocks, or each have its own: equal blocks are one object,
+// so they are gathered by address in one walk, and their order is that in which they are met.
 #include "elfext/interface/build_attributes_writer.h"
 
 #include "elfext/interface/auxiliary_sections.h"
@@ -40,12 +48,15 @@ void updateBlocks(ObjectWithBuildAttributes& object) {
     BuildAttributes effective;
     object.getInheritedBuildAttributes(inherited);
     object.getEffectiveBuildAttributes(effective);
+    // The effective set of such an object starts from nothing; the tag itself must still be in the
+    // bytes.
     if (own->hasTag(Tag_nodefaults)) {
       const BuildAttributes* ofModule = object.getObjectModule()->getOwnBuildAttributes();
       effective.setNumericTag(Tag_nodefaults,
                               ofModule == nullptr ? 0 : ofModule->getNumericTag(Tag_nodefaults));
     }
     if (own->hasTag(Tag_nodefaults) || !(inherited == effective)) {
+      // A reader puts the difference on top of what is inherited, and has the effective set again.
       const BuildAttributes difference = BuildAttributes::getDifference(inherited, effective);
       difference.encodeQobix(qobix);
       difference.encodeZev(zev);
@@ -139,6 +150,7 @@ private:
     m_Bytes += '\0';
     if (subsection.ofFile != nullptr) {
       appendUleb(m_Bytes, Tag_File);
+      // Counts itself and the byte of the kind.
       appendWord(static_cast<uint32_t>(subsection.ofFile->getData().size() + 5));
       appendData(*subsection.ofFile);
     }
@@ -157,6 +169,7 @@ private:
         appendUleb(m_Bytes, index);
       m_Bytes += '\0';
       appendData(*run.block);
+      // The kind is one byte: scopes are small numbers.
       patchSize(start + 1, start);
     }
   }
@@ -219,6 +232,7 @@ void updateBuildAttributesSection(ObjectModule& module) {
   if (module.isBuildAttributesSectionUpToDate()) return;
   BuildAttributesSection& section = onlySection(module);
   const std::string bytes = SectionImage(module).make();
+  // The section is auxiliary, so its users can't write to it.
   ModuleBuilder::adoptSize(section, bytes.size());
   ModuleBuilder::getBuffer(section).setSize(bytes.size());
   ModuleBuilder::getBuffer(section).write(0, bytes.data(), bytes.size());

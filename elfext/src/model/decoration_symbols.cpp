@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Makes a module's decoration symbols say what its attributes do: what is right stays where it is.
+//
+// The names are those that tables/build_attributes_reader takes apart: "BuildAttributes$" and a
+// text, for the module as an absolute symbol or in the section that it is for; or a symbol's name,
+// "$$" and the same. What should be there is put into a set first, so that thousands of symbols are
+// each looked up once.
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/build_attributes_writer.h"
@@ -29,6 +34,7 @@ struct WantedDecoration {
 
 struct WantedHash {
   size_t operator()(const WantedDecoration& wanted) const {
+    // An address in a hash is harmless here: the set is never walked through.
     return std::hash<std::string>{}(wanted.name) ^ std::hash<const void*>{}(wanted.section);
   }
 };
@@ -53,6 +59,7 @@ public:
   bool cancel(const Symbol& symbol) {
     Section* section =
         symbol.getCategory() == Symbol::Category_Hosted ? symbol.getHostedSymbolSection() : nullptr;
+    // So a second symbol of the same name goes.
     return m_Wanted.erase({symbol.getName(), section}) != 0;
   }
 
@@ -114,8 +121,10 @@ void updateDecorationSymbols(ObjectModule& module) {
     if (symbol->isBuildAttributesSymbol() && !wanted.cancel(*symbol)) doomed.symbols.insert(symbol);
   }
   for (const Symbol* symbol : module.getDynamicSymbols()) {
+    // Attributes are stated in the static table only.
     if (symbol->isBuildAttributesSymbol()) doomed.symbols.insert(symbol);
   }
+  // All at once: taking each out by itself would renumber the table each time.
   if (!doomed.symbols.empty()) module.prune(doomed);
   wanted.makeAll(module);
 }

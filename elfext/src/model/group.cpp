@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A group and its members know each other, and a section is in no more than one group. The reader
+// has made sure of that for files; everybody else who adds a section twice is at fault.
 #include "elfext/interface/group.h"
 
 #include "checking/interface/checking.h"

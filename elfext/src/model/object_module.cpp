@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The module as a whole: its birth and end, its names, and what its headers say.
+//
+// A module owns two regions, in which everything that it contains is made and dies; only what holds
+// something outside them is destroyed one by one. Each change marks the auxiliary sections as out
+// of date. Clearing is pruning with a criterion that takes everything, so that there is one way in
+// which objects go.
 #include "elfext/interface/object_module.h"
 
 #include "elfext/interface/auxiliary_sections.h"
@@ -83,6 +88,7 @@ void ObjectModule::forgetPlacement() {
 // ---- Names
 
 const char* ObjectModule::keepText(const char* text) const {
+  // During a read: names are views of the image, which the module owns.
   return m_AreNamesInBuffer ? text : copyText(text);
 }
 
@@ -92,6 +98,7 @@ const char* ObjectModule::copyText(const char* text) const {
 
 void ObjectModule::setFileName(const char* name) {
   if (isSameText(name, m_FileName)) return;
+  // Their bytes are still in the file of the old name.
   QUARN_ASSERT(1, !hasDeferredContents());
   m_FileName = copyText(name);
 }
@@ -121,6 +128,7 @@ void ObjectModule::setElfClass(uint32_t elfClass) {
   setSectionHeaderEntrySize(isNarrow ? SectionHeaderSize32 : SectionHeaderSize64);
   m_SectionHeaderTable.setAlignment(isNarrow ? 4 : 8);
   m_ProgramHeaderEntrySize = isNarrow ? ProgramHeaderSize32 : ProgramHeaderSize64;
+  // Objects that are still to be linked have no program headers to place.
   if (m_FileType == ET_REL) return;
   m_ProgramHeaderTable.setEntrySize(m_ProgramHeaderEntrySize);
   m_ProgramHeaderTable.setAlignment(isNarrow ? 4 : 8);
@@ -212,6 +220,7 @@ void ObjectModule::materializeAllRelocations() {
 
 BuildAttributesCache& ObjectModule::getBuildAttributesCache() {
   if (m_BuildAttributesCache == nullptr)
+    // Most modules never ask.
     m_BuildAttributesCache = std::make_unique<BuildAttributesCache>();
   return *m_BuildAttributesCache;
 }
@@ -256,10 +265,12 @@ void ObjectModule::clear() {
   m_ReadConditions = 0;
   m_ReadBuffer = nullptr;
   m_AreNamesInBuffer = false;
+  // Last: the names and contents of all that went were views of it.
   m_ImageSource.reset();
 }
 
 void ObjectModule::reportLostContents(support::HostError error) {
+  // Noted whatever the handler answers: who needs all contents asks afterwards.
   m_HasLostContents = true;
   static_cast<void>(goOn(*this, &ErrorHandler::ioErrorReading, error));
 }

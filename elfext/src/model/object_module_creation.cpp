@@ -2,6 +2,11 @@
 //
 // How the objects of a module come to be: each is made in the module's region and joins the lists
 // that it belongs to.
+//
+// Which list an object joins is decided here and nowhere else: the table of its kind, and for
+// sections the list of their type, for symbols that of their category. Names are copied, except
+// while a read says that they last. The reader calls these for what a file says, and has checked
+// that; for everybody else what must not be is an assertion.
 #include "checking/interface/checking.h"
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/elf_constants.h"
@@ -35,6 +40,7 @@ SectionClass* ObjectModule::makeSection(const char* name, Arguments... arguments
 }
 
 Section* ObjectModule::createSection(const char* name, uint32_t type, uint32_t flags) {
+  // These have classes of their own, with which other parts of the model count.
   QUARN_ASSERT(1, type != SHT_NULL && type != SHT_STRTAB && type != SHT_SYMTAB &&
                       type != SHT_DYNSYM && type != SHT_REL && type != SHT_RELA &&
                       type != SHT_GROUP && type != SHT_SYMTAB_SHNDX && type != SHT_HASH &&
@@ -160,6 +166,7 @@ Section* ObjectModule::createCommentSection(const char* first, const char* secon
   const size_t secondSize = std::strlen(second);
   const size_t thirdSize = std::strlen(third) + 1;
   section->setSize(firstSize + secondSize + 1 + thirdSize);
+  // Three texts, of which the second ends with the byte in place of a zero.
   section->write(0, first, firstSize);
   section->write(firstSize, second, secondSize);
   section->setByte(firstSize + secondSize, byte);
@@ -184,6 +191,7 @@ FastArray<Symbol*>& ObjectModule::getCategoryList(Symbol::Category category, boo
   case Symbol::Category_Common:
     return isDynamic ? m_CommonDynamicSymbols : m_CommonSymbols;
   case Symbol::Category_Hosted:
+    // Hosted symbols are in lists of their sections.
     QUARN_ASSERT(1, false);
     [[fallthrough]];
   case Symbol::Category_Undefined:
@@ -228,6 +236,7 @@ Object* ObjectModule::makeListed(FastArray<Object*>& list, Arguments... argument
 Group* ObjectModule::createGroup(const char* signature, const char* name, uint32_t flags) {
   QUARN_ASSERT(1, signature != NULL);
   Group* group = makeListed(m_Groups, keepText(signature), keepText(name), flags);
+  // Its signature is hashed when somebody first looks for one.
   m_UnnotedGroups.append(group);
   return group;
 }

@@ -2,6 +2,11 @@
 //
 // Where the objects of a module stand in its lists, and moving them about. Most objects know their
 // index; a category list is searched.
+//
+// An index is a field of the object, so asking costs nothing and moving renumbers what lies
+// between. Symbols count from 1, as in their tables, where row 0 is the null symbol; all else from
+// 0. Moving a section or a symbol first makes objects of all relocations that are still rows, since
+// a row says its symbol as a number, and rows come in the order of their sections.
 #include "checking/interface/checking.h"
 #include "elfext/interface/group.h"
 #include "elfext/interface/library_search_path.h"

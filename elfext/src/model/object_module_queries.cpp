@@ -2,6 +2,9 @@
 //
 // Look-ups in a module: those of symbols over views that are made anew at the first look-up after
 // a change.
+//
+// A look-up costs a logarithm after the first, which sorts. The sorts are stable, so among equal
+// names and addresses the order of the tables shows. Nothing is sorted before somebody asks.
 #include "checking/interface/checking.h"
 #include "elfext/interface/group.h"
 #include "elfext/interface/object_module.h"
@@ -22,6 +25,7 @@ uint64_t getAddress(const Symbol& symbol) {
 // Where a region lies: the place is its tree, told by the root, and the start counts from there.
 Guest placeOf(FileRegion& region) {
   uint64_t start = 0;
+  // An address as a number only tells trees apart; no answer depends on its order.
   const PlacementNode* tree = region.getPlacement().find(&start);
   return {.place = reinterpret_cast<uintptr_t>(tree), .start = start, .size = region.getFileSize()};
 }
@@ -56,6 +60,7 @@ bool ObjectModule::getSectionsByName(const char* name, SectionList* sections) co
   const auto isWanted = [name](const Section* section) {
     return section->getName() != nullptr && std::strcmp(section->getName(), name) == 0;
   };
+  // Counted first, so the list is sized once.
   sections->setSize(
       static_cast<uint32_t>(std::count_if(m_Sections.begin(), m_Sections.end(), isWanted)));
   uint32_t listIndex = 0;

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What an object has of its own, what it inherits (a section from its module, a hosted symbol from
+// its section), and what comes to hold of it: its own on top of the inherited, unless
+// Tag_nodefaults cuts it off. Blocks are the bytes behind the attributes, one a vendor; both are
+// the module cache's.
 #include "elfext/interface/object_with_build_attributes.h"
 
 #include "elfext/interface/build_attributes_cache.h"
@@ -61,6 +66,7 @@ const BuildAttributesBlock* ObjectWithBuildAttributes::setBlock(std::string_view
 
 void ObjectWithBuildAttributes::setBlock(const BuildAttributesBlock* block) {
   alloclib::RegionGeneral& region = m_ObjectModule->getContainerRegion();
+  // Most objects never have any.
   if (m_Blocks == nullptr)
     m_Blocks = alloclib::create<FastArray<const BuildAttributesBlock*>>(region, &region);
   const uint32_t index = findBlockIndex(block->getVendor());

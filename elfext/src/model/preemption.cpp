@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A record of a preemption map: the symbol, the library that preempts it in others, and those
+// others. The reader makes one for each record.
 #include "elfext/interface/preemption.h"
 
 #include "checking/interface/checking.h"

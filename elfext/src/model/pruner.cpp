@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What goes with what: a group takes its section along, a section its symbols and the relocation
+// sections for it, a symbol the relocations that name it, a segment its blocks of raw data. All
+// marks are set first, so each list is swept once and every mark is there when another list asks
+// for it. Memory is given back with the regions; only deferred contents and the blocks' buffers end
+// here.
 #include "elfext/src/model/pruner.h"
 
 #include "elfext/interface/auxiliary_sections.h"
@@ -19,7 +25,8 @@ namespace elfext {
 
 void Pruner::run() {
   markAll();
-  // Some sweeps look at marks of objects that later ones take out of their lists.
+  // Some sweeps look at marks of objects that later ones take out of their lists. Relocations come
+  // first: rows that become objects count on all symbols and sections being there.
   if (m_SymbolsGo || m_SectionsGo) sweepRelocations();
   if (m_SectionsGo || m_SegmentsGo) sweepPlacement();
   if (m_SymbolsGo) sweepSymbols();
@@ -64,6 +71,7 @@ void Pruner::markDependentSections() {
   for (Section* section : m_ObjectModule.m_Sections)
     if (section->m_Goes) going.push_back(section);
   const auto take = [&going](Section* section) {
+    // A relocation section may be for itself, or two of them for one another: each is taken once.
     if (std::exchange(section->m_Goes, true)) return;
     going.push_back(section);
   };
@@ -80,6 +88,7 @@ bool Pruner::markSymbols(FastArray<Symbol*>& table) {
   bool anyGoes = false;
   for (Symbol* symbol : table) {
     const bool isHosted = symbol->m_Category == Symbol::Category_Hosted;
+    // What a section hosts goes whatever the criterion says of it.
     symbol->m_Goes = (isHosted && symbol->m_Section->m_Goes) || m_Criterion.goes(*symbol);
     anyGoes |= symbol->m_Goes;
   }
@@ -110,6 +119,7 @@ void Pruner::sweepRelocations() {
     section->materializeRelocations();
     for (Relocation* relocation : section->m_Relocations.getSpan())
       if (relocation->m_Origin != nullptr && relocation->m_Origin->m_Goes)
+        // It stays, but there is no row that it stands in any more.
         relocation->m_Origin = nullptr;
     if (!m_SymbolsGo || section->m_Relocations.isEmpty()) continue;
     section->m_Relocations.removeIf([](const Relocation* relocation) {
@@ -145,6 +155,7 @@ void Pruner::sweepSymbols() {
     if (section->m_Goes) continue;
     for (bool isDynamic : {false, true})
       section->getHostedList(isDynamic).removeIf([](const Symbol* s) { return s->m_Goes; });
+    // The sorted views still hold what went.
     section->markHostedChanged();
   }
   for (FastArray<Symbol*>* table : {&m_ObjectModule.m_Symbols, &m_ObjectModule.m_DynamicSymbols})
@@ -165,6 +176,7 @@ void Pruner::sweepGroups() {
     if (!group->m_Goes) continue;
     for (Section* section : group->m_Members.getSpan())
       section->m_Group = nullptr;
+    // Nothing is noted in modules in which nobody has looked for a group.
     if (areAnyNoted) noted.remove(Stringlett(group->m_Signature));
   }
   sweepAndNumber(m_ObjectModule.m_Groups, 0);
@@ -195,6 +207,7 @@ void Pruner::sweepSections() {
     }
   for (Section* section : m_ObjectModule.m_Sections) {
     if (section->m_Goes)
+      // Lets go of the file, which may close it.
       section->dropDeferredContents();
     else
       sweepSection(*section);
@@ -230,6 +243,7 @@ void Pruner::sweepSegments() {
   RawDataBlock** kept =
       std::stable_partition(blocks.begin(), blocks.end(),
                             [](const RawDataBlock* block) { return !block->getSegment()->m_Goes; });
+  // Behind the placement's sweep, which needed the blocks' nodes.
   std::for_each(kept, blocks.end(), [](RawDataBlock* block) { std::destroy_at(block); });
   blocks.setSize(static_cast<uint32_t>(kept - blocks.begin()));
   sweepAndNumber(m_ObjectModule.m_Segments, 0);

@@ -3,6 +3,9 @@
 // Takes objects out of a module, with what hangs on them, and leaves all lists and indexes dense.
 // Everything is marked first and then swept, list by list: the time does not depend on how much
 // goes, only on what there is.
+//
+// The module's own deletions and its clearing are prunings too. The criterion is asked at most once
+// for each object.
 #pragma once
 
 #include "elfext/interface/object_module.h"

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Bytes of a segment that no section covers. Its size is that of the gap and never changes; the
+// reader leaves the bytes in the image.
 #include "elfext/interface/raw_data_block.h"
 
 #include "checking/interface/checking.h"
@@ -14,6 +17,7 @@ void RawDataBlock::getAlignment(uint64_t* remainder, uint64_t* alignment) const 
 }
 
 DataStructure* RawDataBlock::createDataStructure(alloclib::RegionGeneral&, uint64_t) {
+  // A layout places sections and segments; a block goes where its segment does.
   QUARN_ASSERT(1, !"We shouldn't be here");
   return nullptr;
 }

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One relocation: r_offset, type and addend, and its target as a symbol. It belongs to the section
+// that it changes, whose views it marks. The type is kept in 16 bits, which class 2 rows may
+// exceed: the rest of r_info's low word says nothing here.
 #include "elfext/interface/relocation.h"
 
 #include "checking/interface/checking.h"
@@ -15,6 +19,7 @@ Relocation::Relocation(Section* section, uint64_t offset, uint32_t type, Symbol*
       m_Type(static_cast<uint16_t>(type & 0xFFFF)) {
   QUARN_ASSERT(1, section != NULL);
   QUARN_ASSERT(1, (target == NULL) || (section->m_ObjectModule == target->m_ObjectModule));
+  // A relocation of no symbol is static until its table says otherwise.
   m_IsDynamic = target != nullptr && target->isDynamic();
 }
 

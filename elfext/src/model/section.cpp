@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What a section is; its contents, relocations and symbols have files of their own.
+//
+// Fields that a file fills are the ELF standard's: sh_name, sh_type, sh_flags (of which 32 bits are
+// kept), sh_addr, sh_size, sh_link, sh_info, sh_addralign, sh_entsize. Auxiliary sections are those
+// that the model makes the contents of (tables, strings): their users change the objects instead,
+// and changing the section is a fault.
 #include "elfext/interface/section.h"
 
 #include "alloclib/interface/region_objects.h"
@@ -91,6 +96,7 @@ void Section::adoptHeader(const SectionHeader& header) {
 void Section::setSize(uint64_t size) {
   QUARN_ASSERT(1, !m_IsAuxiliary);
   m_Size = size;
+  // A section without bytes may have any size, for which nothing is reserved.
   if (m_Type != SHT_NOBITS) m_Contents.setSize(size);
   markChanged();
 }
@@ -122,6 +128,7 @@ void Section::makeProgBits() {
 
 bool Section::isInSegment(uint32_t* segmentIndex) {
   for (Segment* segment : m_ObjectModule->getSegments()) {
+    // The first one in the order of the program headers.
     if (!isWithin(*segment)) continue;
     if (segmentIndex != nullptr) *segmentIndex = segment->getIndex();
     return true;
@@ -150,6 +157,7 @@ void Section::getAlignment(uint64_t* remainder, uint64_t* alignment) const {
     *alignment = 4;
     return;
   default:
+    // In the file a word's alignment is enough; 0 means none. What memory wants is sh_addralign.
     *alignment = std::clamp<uint64_t>(m_Alignment, 1, 4);
   }
 }

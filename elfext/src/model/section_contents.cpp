@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The bytes of a section: here, still in the file, or outside of the model.
+//
+// Which of the three it is decides who may look and who may write: contents still in the file must
+// be loaded first, and auxiliary or external contents are closed to writing. The extent was checked
+// when the file was read, but the file may have been cut since; loading is told like any failed
+// read and leaves the section without bytes.
 #include "checking/interface/checking.h"
 #include "elfext/interface/deferred_contents.h"
 #include "elfext/interface/error_handler.h"
@@ -88,6 +93,7 @@ bool Section::readDeferredContents() {
   if (header.size > UINT32_MAX) return false;
   m_Contents.setSize(header.size);
   const std::span bytes(m_Contents.getModifiableContents(), header.size);
+  // From the header as it was read: the section's own fields may have changed since.
   if (m_DeferredContents->getFile().read(bytes, header.offset)) return true;
   m_Contents.setSize(0);
   return false;
@@ -107,6 +113,7 @@ bool Section::loadDeferredContents() {
   const bool err_response =
       errorHandler != nullptr && errorHandler->ioErrorWriting(*m_ObjectModule, -1);
   QUARN_ASSERT(1, !err_response);
+  // For all sections that share it: a file that has failed once is not asked again.
   m_DeferredContents->getFile().close();
   return false;
 }

@@ -3,6 +3,10 @@
 // The relocations of a section. What a file says of them stays in its relocation sections as rows
 // until somebody wants a relocation: then all rows for this section become objects, in the order of
 // their sections, and nobody can tell when.
+//
+// Rows were checked by the reader, so making objects of them can't fail; an object with a million
+// relocations costs nothing for them until somebody looks. The list's order is the file's; a sorted
+// view by offset is made at the first query after a change.
 #include "alloclib/interface/region_objects.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/auxiliary_sections.h"
@@ -51,6 +55,7 @@ void Section::materializeRelocations() {
   for (bool isDynamic : {false, true})
     for (RelocationSection* section : getRelocationSections(isDynamic).getSpan())
       if (section->getPendingRowCount() != 0) sections.push_back(section);
+  // Static and dynamic ones are in two lists; their indexes make one order of them.
   std::sort(sections.begin(), sections.end(), [](const Section* left, const Section* right) {
     return left->getIndex() < right->getIndex();
   });
@@ -153,6 +158,7 @@ bool Section::hasDynamicRelocationsWithoutAddend() const {
 uint32_t Section::countDynamicRelocations(bool isJumpSlot, bool hasAddend) {
   materializeRelocations();
   const uint32_t jumpSlot =
+      // Relocation types are numbered by the machine.
       m_ObjectModule->getMachine() == EM_ZEV ? R_ZEV_JUMP_SLOT : R_ZEV64_JUMP_SLOT;
   const auto isWanted = [=](const Relocation* relocation) {
     return relocation->isDynamic() && relocation->hasAddend() == hasAddend &&
@@ -183,6 +189,7 @@ void Section::sortRelocations() {
   m_RelocationsSortedByOffset.clear();
   for (Relocation* relocation : m_Relocations.getSpan())
     m_RelocationsSortedByOffset.append(m_ObjectModule->getContainerRegion(), relocation);
+  // Stable: relocations of one place stay in the list's order.
   mergeSort(m_RelocationsSortedByOffset.getSpan(),
             [](const Relocation* left, const Relocation* right) {
               return static_cast<int>(left->getOffset() > right->getOffset()) -

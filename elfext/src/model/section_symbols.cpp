@@ -2,6 +2,10 @@
 //
 // The symbols of a section, and the sorted views of them, which are made anew at the first query
 // after a change.
+//
+// Most sections are never asked, so the views come with the first question, and apart from the
+// section. A hostile object has all its symbols in one section, at one offset or of one name:
+// sorting is stable and n log n whatever they are.
 #include "alloclib/interface/region_objects.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/object_module.h"

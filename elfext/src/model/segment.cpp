@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A row of the program header table: p_type, p_offset, p_vaddr, p_paddr, p_filesz, p_memsz,
+// p_flags, p_align, kept as the file has them. Whether the bytes are there was checked only where
+// they are needed.
 #include "elfext/interface/segment.h"
 
 #include "alloclib/interface/region_objects.h"

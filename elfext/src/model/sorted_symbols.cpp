@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Searches for the ends of runs of equal keys. Among symbols of one key the answer must be the
+// first or the last, which the usual bounds, written out for 32-bit indexes, give in a logarithm;
+// only who asks for a class of symbols may have to pass over others.
 #include "elfext/src/model/sorted_symbols.h"
 
 #include "elfext/interface/sort.h"
@@ -15,6 +19,7 @@ bool passes(const Symbol& symbol, uint32_t mask) {
 } // namespace
 
 int compareNames(const char* left, const char* right) {
+  // Also where both are null.
   if (left == right) return 0;
   if (left == nullptr) return -1;
   if (right == nullptr) return 1;
@@ -71,6 +76,7 @@ uint32_t upperBound(SymbolView symbols, SymbolKey key, uint64_t value) {
 SymbolRun findRange(SymbolView symbols, SymbolKey key, uint64_t from, uint64_t to) {
   const uint32_t fromIndex = lowerBound(symbols, key, from);
   const uint32_t toIndex = upperBound(symbols, key, to);
+  // Where no key lies between the values, the bounds pass each other.
   if (fromIndex == NotFound || toIndex == NotFound || fromIndex > toIndex) return {};
   return {true, fromIndex, toIndex};
 }
@@ -106,6 +112,7 @@ SymbolRun findName(SymbolView symbols, const char* name) {
     const size_t mid = low + (high - low) / 2;
     const int order = compareNames(symbols[mid]->getName(), name);
     if (order == 0) {
+      // Outwards from any one that is equal: the run is what is answered, so its length is no loss.
       auto from = static_cast<uint32_t>(mid);
       uint32_t to = from;
       while (from > 0 && compareNames(symbols[from - 1]->getName(), name) == 0)

@@ -2,6 +2,8 @@
 //
 // Searches in the sorted views of symbols, which the module keeps by address and its sections by
 // offset, and both by name.
+//
+// Whoever keeps a view knows whether it is up to date; nothing of that is checked here.
 #pragma once
 
 #include "elfext/interface/fast_array.h"

@@ -2,6 +2,10 @@
 //
 // A hosted symbol is in a list of its section, any other in a list of its module: wherever the
 // category changes, the symbol leaves one list and joins the other.
+//
+// The fields are st_name, st_info (type and binding), st_other (visibility) and st_size; st_shndx
+// and st_value have become a category with a section and one word. Ten thousands of symbols are
+// made for an object, so a symbol is small and has nothing to destroy.
 #include "elfext/interface/symbol.h"
 
 #include "alloclib/interface/region_objects.h"
@@ -31,6 +35,8 @@ uint64_t Symbol::getAddress() const {
 
 uint64_t Symbol::getAbiValue() const {
   if (m_Category == Category_Undefined) return 0;
+  // The lowest bit of a function's address says which instruction set it is in, and is no part of
+  // the place.
   const uint64_t word = m_Type == STT_FUNC ? m_Word & ~uint64_t{1} : m_Word;
   if (m_Category != Category_Hosted || !m_ObjectModule->hasLaidOutAddresses()) return word;
   return m_Section->getAddress() + word;
@@ -95,10 +101,12 @@ void Symbol::joinList() {
 
 void Symbol::place(Category category, Section* section, uint64_t word) {
   QUARN_ASSERT(1, !m_ObjectModule->indexesAreFrozen());
+  // Leaving searches a list: only where it must.
   if (category != m_Category || section != m_Section) {
     leaveList();
     m_Category = category;
     m_Section = section;
+    // A definition's version is nothing that a reference has, and the other way round.
     if (m_IsDynamic && category == Category_Undefined) m_VersionDefinition = nullptr;
     if (m_IsDynamic && category != Category_Undefined) m_VersionRequirement = nullptr;
     joinList();
