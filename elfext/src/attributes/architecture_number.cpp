@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides which number Tag_CPU_arch has for a set of features, and the profile and floating-point
+// level that go with it. It is the way back from feature_set.h to the public ABI's numbers, for
+// tags_from_record.cpp; the way there is the target table. The highest level that a set holds whole
+// decides, and single features choose among the numbers of that level; what no number stands for is
+// told by other tags.
 #include "elfext/src/attributes/architecture_number.h"
 
 #include "elfext/src/attributes/feature_chains.h"
@@ -13,6 +19,7 @@ using namespace features;
 
 // The number of the highest level that the features hold whole; the lowest has number `first`.
 uint32_t highestLevel(FeatureSet features, std::span<const FeatureSet> levels, uint32_t first) {
+  // From the top, as each level contains those below it.
   for (size_t i = levels.size(); i > 0; --i) {
     if (features.contains(levels[i - 1])) return first + static_cast<uint32_t>(i) - 1;
   }
@@ -75,6 +82,7 @@ IsaLevels getIsaLevels(FeatureSet features) {
 }
 
 uint32_t getArchitectureNumber(FeatureSet features) {
+  // The number of the architecture that brought it.
   if (features.contains(Z64_ISA)) return 14;
   const IsaLevels levels = getIsaLevels(features);
   switch (levels.zev) {
@@ -109,6 +117,7 @@ uint32_t getFloatingPointLevel(FeatureSet features) {
   if (features.intersects(FP_ISA_ZEVv8) && features.contains(KCP_ISA)) return 7;
   if (features.contains(FP_ISA_ZEVv8)) return 6;
   if (features.contains(HFU_ISAv5)) return 5;
+  // Level 4 is level 3 with both extensions.
   if (features.contains(HFU_ISAv3)) return features.contains(FP16 | VFMA_EXTENSION) ? 4 : 3;
   if (features.contains(HFU_ISAv2)) return 2;
   return features.contains(HFU_ISAv1) ? 1 : 0;

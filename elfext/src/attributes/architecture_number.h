@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Which architecture a set of features is that of, in the numbers of tags.
+//
+// A record from a text or from tags may have features that no architecture has together; the answer
+// is then that of a level, or 0, and never a failure.
 #pragma once
 
 #include "elfext/interface/feature_set.h"

@@ -1,4 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Decides what two records are to each other: which one fits under the other, what they come to
+// together, and what can't be together at all. The archive groups members into variants by it, and
+// the union of tags asks whether two sets can be combined. All of it is arithmetic on the fields of
+// the record: sets are compared as bits, and each relation is asked of features, access words and
+// flags alike.
+//
+// A record may come from any text that a file has: bits that nobody has defined are left out of
+// comparisons.
 #include "elfext/interface/attribute_relations.h"
 
 #include <algorithm>
@@ -14,6 +23,7 @@ struct FeaturesClash {
   Clash names;
 };
 
+// Looked through in this order; each row is told and taken out by itself.
 constexpr FeaturesClash FeaturesClashes[] = {
     {KCP_ISA | HFU_ISAv1, {"KCP", "HFU"}},
     {PURE_DOUBLES | MIXED_DOUBLES, {"pure-endian double", "mixed-endian double"}},
@@ -34,7 +44,7 @@ constexpr FlagsClash FlagsClashes[] = {
 };
 
 constexpr Clash AccessClash = {"L/S", "UL/US"};
-// The ordinary accesses among the bits of a word.
+// The ordinary accesses among the bits of a word, L88 to L11; those above may be unaligned.
 constexpr uint16_t AlignedAccesses = 0x3FF;
 
 const FeaturesClash* findFeaturesClash(const FullAttr& record) {
@@ -61,6 +71,8 @@ uint32_t relate(bool areEqual, bool isContained, bool contains, uint32_t mode) {
   return wanted;
 }
 
+// What a difference leaves of a level is its highest bit alone, which has no token: the level's
+// lower bits come back, so that the text names it.
 uint64_t completeFlags(uint64_t flags) {
   if ((flags & 0x20000) != 0) flags |= Flag_OptimizeTime;
   if ((flags & 0x400000) != 0)
@@ -91,6 +103,7 @@ uint32_t relateFeatures(const FullAttr& a, uint32_t mode, const FullAttr& b) {
 }
 
 uint32_t relateAccess(const FullAttr& a, uint32_t mode, const FullAttr& b) {
+  // True of the record only where it is true of each word.
   return relateWord(a.m_Access.code, mode, b.m_Access.code) &
          relateWord(a.m_Access.readOnlyData, mode, b.m_Access.readOnlyData) &
          relateWord(a.m_Access.data, mode, b.m_Access.data) &
@@ -114,6 +127,8 @@ bool isSameBuild(const FullAttr& a, const FullAttr& b) {
 }
 
 bool mergeFullAttr(FullAttr& result, const FullAttr& a, const FullAttr& b) {
+  // One part that needs the alignment makes the whole need it; one that does not keep it spoils it
+  // for the whole.
   const uint64_t requires8 = (a.m_Stack8 | b.m_Stack8) & Stack8_Requires;
   const uint64_t preserves8 = a.m_Stack8 & b.m_Stack8 & Stack8_Preserves;
   result = {.m_Features = a.m_Features | b.m_Features,
@@ -123,6 +138,7 @@ bool mergeFullAttr(FullAttr& result, const FullAttr& a, const FullAttr& b) {
             .m_Flags = a.m_Flags | b.m_Flags,
             .m_Stack8 = requires8 | preserves8,
             .m_AbiLevel = std::min(a.m_AbiLevel, b.m_AbiLevel)};
+  // Behind the merge: the result is whole either way, for who wants to name the clash.
   return !hasClash(result) && !accessClash(result) && !flagsClash(result);
 }
 
@@ -159,6 +175,7 @@ bool flagsClash(const FullAttr& record) {
 }
 
 bool accessClash(const FullAttr& record) {
+  // Two access words side by side: data in the upper half, all three or-ed in the lower.
   constexpr uint32_t UnalignedBits = ~uint32_t{0x03FF03FF};
   constexpr uint32_t WideBits = 0x016E016E;
   const AccessWords& access = record.m_Access;
@@ -171,6 +188,7 @@ bool takeFeaturesClash(FullAttr& record, Clash& clash) {
   const FeaturesClash* row = findFeaturesClash(record);
   if (row == nullptr) return false;
   clash = row->names;
+  // Both sides go, so a caller that takes clash after clash comes to an end.
   record.m_Features = record.m_Features.without(row->mask);
   return true;
 }

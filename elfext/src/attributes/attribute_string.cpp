@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The way from attribute texts to records and back. Texts come from symbol names, archive symbol
+// tables and maps: anybody may have written them, and they never fail. A token says what it says by
+// itself, whatever stands before it, but that features are completed at the end; so reading is one
+// walk and its time is that of the text. The words are in attribute_tokens.h and found by
+// attribute_words.h.
 #include "elfext/interface/attribute_string.h"
 
 #include "elfext/src/attributes/attribute_tokens.h"
@@ -21,6 +27,7 @@ void forEachToken(std::string_view text, Function function) {
   while (text.starts_with('$')) {
     text.remove_prefix(1);
     const std::string_view token = text.substr(0, text.find('$'));
+    // Each byte is stepped over once, however many "$" there are.
     text.remove_prefix(token.size());
     if (!token.empty()) function(token);
   }
@@ -54,6 +61,7 @@ void addAccess(AccessWords& access, const Scope& scope, uint32_t bits) {
   if (scope.code) access.code |= loads;
   if (scope.readOnlyData) access.readOnlyData |= loads;
   if (scope.data) access.data |= loads;
+  // Names of stores are the upper half of the bits.
   access.stores |= static_cast<uint16_t>(bits >> LoadNameCount);
 }
 
@@ -86,6 +94,7 @@ void printFeatures(std::string& text, FeatureSet features) {
   for (const FeatureToken& row : FeatureTokens) {
     if (row.use == TokenUse::Read || !features.contains(row.set)) continue;
     printToken(text, row.token);
+    // So a level hides the levels that it contains.
     features = features.without(row.set);
   }
 }
@@ -129,6 +138,7 @@ void printFlags(std::string& text, std::span<const FlagToken> rows, uint64_t fla
 } // namespace
 
 FullAttr parseAttributeString(std::string_view text) {
+  // Tokens add to the accesses that stand in no text.
   FullAttr record = {.m_Access = LibraryFullAttr.m_Access};
   bool areFlagsTakenBack = false;
   forEachToken(text, [&](std::string_view token) {
@@ -142,6 +152,7 @@ FullAttr parseAttributeString(std::string_view text) {
     areFlagsTakenBack = areFlagsTakenBack || word->takesFlagsBack;
   });
   record.m_Features = closeFeatures(record.m_Features);
+  // Last, as the token may stand anywhere in the text.
   if (!areFlagsTakenBack) record.m_Flags |= ComplementToken.bits;
   return record;
 }
@@ -169,6 +180,7 @@ std::string printAttributeString(const FullAttr& record) {
 size_t printAttributeString(const FullAttr& record, char* buffer, size_t size) {
   const std::string text = printAttributeString(record);
   if (buffer == nullptr || size == 0) return text.size();
+  // A byte is kept for the zero.
   const size_t fitting = std::min(text.size(), size - 1);
   std::memcpy(buffer, text.data(), fitting);
   buffer[fitting] = '\0';

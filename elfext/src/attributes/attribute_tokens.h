@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The vocabulary of attribute texts, in the order in which it is printed.
+//
+// The tables are the format: archives that were written with them are read for ever, so a row's
+// token and bits never change, and the order of rows decides which of several tokens is printed.
+// Compile-time checks below hold the order.
 #pragma once
 
 #include "elfext/interface/full_attr.h"

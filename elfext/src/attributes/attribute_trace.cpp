@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A second, independent walk over the format of build_attributes_parsers.h: it shows each step in
+// words and so tells of a corrupted part where a read only gives up. Lengths are compared with what
+// is left before anything is stepped over; what lies within a part is read by a reader of that part
+// alone.
+//
+// Its table keeps runs, and for each owner their numbers, so it grows with the section and not with
+// owners times attributes.
 #include "elfext/interface/attribute_trace.h"
 
 #include "elfext/interface/build_attributes_names.h"
@@ -66,6 +74,7 @@ void showAttribute(std::string& trace, std::string_view vendor, const TracedAttr
 void showTable(std::string& trace, const AttributeTable& table) {
   const char* shownVendor = nullptr;
   for (const TracedRun& run : table.runs) {
+    // By address: vendors are views of the section, so runs of one subsection have the same one.
     if (shownVendor != run.vendor.data())
       trace.append("  Vendor \"").append(run.vendor).append("\":\n");
     shownVendor = run.vendor.data();
@@ -145,6 +154,7 @@ private:
       while (!rest.isAtEnd() && takeSubsection(rest)) {
       }
       consumed = section.getRemaining() - rest.getRemaining();
+      // Kinds are numbered in the order in which they are read: file, section, symbol.
     } while (m_HasLaterScope && m_Pass < Tag_Symbol);
     return consumed;
   }
@@ -175,6 +185,7 @@ private:
 
   // False where no further one can be found in the subsection.
   bool takeSubSubsection(CheckedReader& subsection, std::string_view vendor) {
+    // A copy: the size counts from the kind on, and must be known before the part is taken.
     CheckedReader ahead = subsection;
     const uint32_t scope = ahead.readUleb();
     say("    ", qobixName(scope), " subsubsection");
@@ -220,6 +231,7 @@ private:
 
   // Gives those for whom the next run holds its number.
   void enter(const TracedRun& run) {
+    // The number that the run will have: it is appended when its attributes have been read.
     const size_t number = m_Table.runs.size();
     if (run.scope == Tag_File) m_Table.global.push_back(number);
     auto& sets = run.scope == Tag_Section ? m_Table.sections : m_Table.symbols;
@@ -233,6 +245,7 @@ private:
   void readAttributes(CheckedReader& part, Read readOne, std::vector<TracedAttribute>& attributes) {
     while (!part.isAtEnd()) {
       const TracedAttribute attribute = readOne(part);
+      // Smaller numbers are kinds of parts; behind one, nothing can be told apart any more.
       if (attribute.tag < FirstAttributeTag) {
         m_IsWellFormed = false;
         return;

@@ -2,6 +2,9 @@
 //
 // The words in an order in which they are soon found. A word is compared as two numbers, not byte
 // by byte: texts come by the thousand, one for each member or symbol.
+//
+// The tables are sorted by the compiler and looked through by halving. A key holds a whole word, so
+// equal keys are equal words.
 #include "elfext/src/attributes/attribute_words.h"
 
 #include "elfext/src/attributes/attribute_tokens.h"
@@ -28,6 +31,7 @@ struct WordKey {
   constexpr explicit WordKey(std::string_view word) : rest(word.size()) {
     for (size_t at = 0; at < word.size(); ++at) {
       const uint64_t byte = static_cast<uint8_t>(support::lowered(word[at]));
+      // The first byte on top, so that keys compare as words do.
       (at < 8 ? beginning : rest) |= byte << (56 - 8 * (at % 8));
     }
   }
@@ -115,6 +119,7 @@ static_assert(std::ranges::none_of(AccessNames, [](std::string_view name) {
 } // namespace
 
 const AttributeWord* findAttributeWord(std::string_view word) {
+  // Its last bytes would run into the length.
   if (word.size() > LongestWord) return nullptr;
   const WordKey key(word);
   const auto row = std::ranges::lower_bound(Words, key, {}, &WordRow::key);

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A set of tags: setting and asking, what one tag does to others, equality, and the set operations.
+// The tags are the truth; the record follows when it is asked for. Values are the file's: numbers
+// are cut to a byte and texts to 31 bytes as they come in, and lists (Tag_compatibility,
+// Tag_also_compatible_with) may be as long as an attribute section, so one list is held against
+// another by sets and not entry by entry.
 #include "elfext/interface/build_attributes.h"
 
 #include "checking/interface/checking.h"
@@ -80,6 +86,7 @@ uint32_t countOf(const OwnedValue<List>& list) {
 }
 
 void addToHash(size_t& hash, size_t value) {
+  // The multiplier of FNV-1a.
   hash = (hash ^ value) * 0x100000001B3;
 }
 
@@ -105,6 +112,7 @@ void BuildAttributes::setFullAttr(const FullAttr& record) {
 
 uint32_t BuildAttributes::getNumber(uint32_t place) const {
   if (!hasNumber(place)) return 0;
+  // This one is kept whole; the others are bytes.
   return place == placeOf(Tag_CPU_arch) ? m_CpuArch : m_Numbers[place];
 }
 
@@ -117,6 +125,7 @@ void BuildAttributes::putNumber(uint32_t place, uint32_t value) {
 }
 
 void BuildAttributes::markFed(uint32_t place) {
+  // The record is made anew at the next look and not at each of forty tags.
   if (NumericTagRows[place].feedsRecord) m_FlagsStale = true;
 }
 
@@ -166,6 +175,7 @@ void BuildAttributes::setStringTag(uint32_t tag, std::string_view text) {
   QUARN_ASSERT(1, BuildAttributesTagClassifier::isQobixStringTag(tag));
   QUARN_ASSERT(1, tag != Tag_also_compatible_with);
   const uint8_t place = textPlaceOf(tag);
+  // A set states a conformance or a compatibility; see setConformance.
   if (tag == Tag_conformance)
     setConformance(text);
   else if (place == NoPlace)
@@ -221,6 +231,7 @@ void BuildAttributes::followZevTag(ZevTag tag) {
   }
 }
 
+// Code that relies on the maker's interworking or division says so in the public ABI's way too.
 void BuildAttributes::followInterworking() {
   if (getNumericTag(ZevTag::Tag_ZV_interworking) != 0 ||
       getNumericTag(ZevTag::Tag_ZV_mdivide) != 0) {
@@ -240,6 +251,7 @@ void BuildAttributes::followStackAlignment() {
     needed = 2;
   else if (eba == 0 && getNumericTag(ZevTag::Tag_ZV_require8) == 0)
     needed = 1;
+  // The public ABI's tag for the same thing.
   setNumericTag(Tag_ABI_align_needed, needed);
 }
 
@@ -321,6 +333,7 @@ bool BuildAttributes::operator==(const BuildAttributes& other) const {
   if (m_Valid != other.m_Valid) return false;
   if (!m_Valid) return true;
   constexpr uint64_t NotCompared = uint64_t{1} << placeOf(Tag_Z64_ISA_use);
+  // One comparison for the presence of all numbers.
   if (((m_Present ^ other.m_Present) & ~NotCompared) != 0) return false;
   for (uint32_t place = 0; place < NumberCount; ++place) {
     if (place != placeOf(Tag_Z64_ISA_use) && getNumber(place) != other.getNumber(place))
@@ -339,6 +352,7 @@ bool BuildAttributes::hasEqualRecordToo(const BuildAttributes& other) const {
 size_t BuildAttributes::getHash() const {
   size_t hash = 0;
   for (uint32_t place = 0; place < NumberCount; ++place) {
+    // What equality leaves out the hash leaves out too.
     if (place != placeOf(Tag_Z64_ISA_use) && hasNumber(place))
       addToHash(hash, size_t{place} << 32 | getNumber(place));
   }
@@ -387,6 +401,7 @@ void BuildAttributes::copyMissingOthers(const BuildAttributes& other) {
 // Tags of vendor "ZEV" come last, as they have consequences for others.
 BuildAttributes BuildAttributes::getUnion(const BuildAttributes& a, const BuildAttributes& b) {
   if (!a.m_Valid || !b.m_Valid) return makeInvalid();
+  // What `b` has stays, and `a` fills the gaps.
   BuildAttributes result = b;
   for (uint32_t place = 0; place < TextCount; ++place) {
     if (!a.m_Texts[place] || result.m_Texts[place]) continue;
@@ -420,6 +435,7 @@ BuildAttributes BuildAttributes::getDifference(const BuildAttributes& a, const B
   BuildAttributes result;
   differenceFullAttr(result.m_FullAttr, b.getFullAttr(), a.getFullAttr());
   for (uint32_t place = 0; place < NumberCount; ++place) {
+    // It is there or not; its value says nothing.
     const bool differs = place == placeOf(Tag_nodefaults)
                              ? !a.hasNumber(place) && b.hasNumber(place)
                              : a.getNumber(place) != b.getNumber(place);
@@ -457,6 +473,7 @@ BuildAttributes BuildAttributes::getCheckedCombination(const BuildAttributes& a,
   if (!a.m_Valid || !b.m_Valid || !mergeFullAttr(merged, a.getFullAttr(), b.getFullAttr()))
     return makeInvalid();
   BuildAttributes result = getUnion(a, b);
+  // Together they need the higher one.
   if (result.hasTag(Tag_CPU_arch))
     result.m_CpuArch = std::max(a.getNumericTag(Tag_CPU_arch), b.getNumericTag(Tag_CPU_arch));
   result.setFullAttr(merged);

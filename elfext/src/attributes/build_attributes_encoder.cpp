@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The order of the tags is fixed: equal sets must give equal bytes, as blocks are compared by them.
+//
+// Each attribute is its tag as a LEB128 number and then a number, a text with its zero, or both, as
+// build_attributes_parsers.cpp takes them apart.
 #include "elfext/interface/build_attributes.h"
 #include "elfext/src/attributes/standard_tags.h"
 #include "elfext/src/bytes/leb128.h"
@@ -98,6 +101,7 @@ void BuildAttributes::encodeQobix(std::string& bytes) const {
 
 // In rising order of the tags; numbers have even ones, texts odd ones.
 void BuildAttributes::encodeOtherTags(std::string& bytes) const {
+  // In the place of maps that most sets never make.
   static const std::map<uint32_t, uint32_t> NoNumbers;
   static const std::map<uint32_t, std::string> NoTexts;
   const auto& numbers = m_OtherNumericTags ? *m_OtherNumericTags : NoNumbers;

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The names of tags and the sentences for their values, for dumps. Rows are in rising order,
+// checked by the compiler, so that nothing stands twice; a tag or value without a row is shown by
+// its number and never an error.
 #include "elfext/interface/build_attributes_names.h"
 
 #include "elfext/interface/build_attributes_tags.h"

@@ -1,4 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The one walk by which attributes of objects are read: section, subsections by vendor,
+// sub-subsections by scope, runs. Every length is held against the bytes that are left, in size_t,
+// before a view is made of them, and counts itself, so each step goes forward. What is wrong within
+// a part costs that part; a length that can't be right costs all behind it, as nobody knows where
+// the next part starts.
+//
+// Lists of indices are handed over as one array that serves again for each list. Nothing is
+// reserved for what a section claims, as it claims nothing but lengths of bytes that are there.
 #include "elfext/interface/build_attributes_parsers.h"
 
 #include "elfext/src/attributes/standard_tags.h"
@@ -19,6 +28,7 @@ constexpr uint8_t FormatVersion = 'A';
 bool readText(AttributeBytes bytes, size_t& position, std::string_view& text) {
   const AttributeBytes rest = bytes.subspan(position);
   const auto end = std::find(rest.begin(), rest.end(), uint8_t{0});
+  // A text without its zero would be read on into what follows.
   if (end == rest.end()) return false;
   text = {reinterpret_cast<const char*>(rest.data()), static_cast<size_t>(end - rest.begin())};
   position += text.size() + 1;
@@ -53,6 +63,7 @@ private:
     if (bytes.size() - position < LengthSize) return false;
     size = getWord<uint32_t>(bytes.data() + position, m_IsLittleEndian);
     position += LengthSize;
+    // The size counts the kind and itself: a smaller one would lead back into them.
     if (size < position || size > bytes.size()) return false;
     if (!handOver(kind, bytes.subspan(position, size - position))) m_IsWell = false;
     return true;
@@ -60,6 +71,8 @@ private:
 
   bool handOver(uint32_t kind, AttributeBytes payload) {
     if (kind == Tag_File) return m_Parser.parseFileSubSubsection(m_Vendor, payload);
+    // An index with a zero byte in it has more bytes than it needs, and ends the list early:
+    // readIndices tells that.
     const auto end = std::find(payload.begin(), payload.end(), uint8_t{0});
     if (end == payload.end()) return false;
     const auto listSize = static_cast<size_t>(end - payload.begin());
@@ -94,6 +107,7 @@ private:
 bool BuildAttributesSectionParser::parse(AttributeBytes section, bool isLittleEndian) {
   if (section.empty() || section[0] != FormatVersion) return false;
   std::vector<uint32_t> indices;
+  // More than most lists have.
   indices.reserve(256);
   bool isWell = true;
   for (size_t position = 1; position < section.size();) {
@@ -128,6 +142,7 @@ bool QobixBuildAttributesSubSubsectionParser::parse(AttributeBytes run) {
       isTaken = numericAndStringTag(tag, value, text);
     else
       isTaken = hasNumber ? numericTag(tag, value) : stringTag(tag, text);
+    // What is refused ends nothing: the next attribute is found all the same.
     isWell = isWell && isTaken;
   }
   return isWell;
@@ -136,6 +151,7 @@ bool QobixBuildAttributesSubSubsectionParser::parse(AttributeBytes run) {
 // The text holds an attribute, whose own end is that of the text too: a number of 0 and a text
 // need no further zero.
 bool QobixBuildAttributesSubSubsectionParser::parseNested(std::string_view text) {
+  // The text's own zero counts, which readText has found.
   const AttributeBytes bytes(reinterpret_cast<const uint8_t*>(text.data()), text.size() + 1);
   size_t position = 0;
   uint32_t tag = 0;
@@ -169,6 +185,7 @@ QobixBuildAttributesDecodingParser::QobixBuildAttributesDecodingParser(BuildAttr
 }
 
 bool QobixBuildAttributesDecodingParser::numericTag(uint32_t tag, uint32_t value) {
+  // Tags that are not known stay in the block's bytes, and are no fault.
   if (placeOf(tag) == NoPlace) return true;
   m_Attributes.setNumericTag(tag, value);
   return true;
@@ -182,6 +199,7 @@ bool QobixBuildAttributesDecodingParser::stringTag(uint32_t tag, std::string_vie
 bool QobixBuildAttributesDecodingParser::numericAndStringTag(uint32_t, uint32_t value,
                                                              std::string_view text) {
   CompatibilityTag entry = {value, std::string(text)};
+  // The set spares a look through the list for each of thousands of entries.
   if (m_Compatible.insert(entry).second) m_Attributes.appendCompatibilityTag(std::move(entry));
   return true;
 }

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The chains of features, each from its lowest level to its highest.
+//
+// Both ways between tags and features, the completion of a set and the architecture's number walk
+// along them; feature_set.cpp checks that each level contains the one below.
 #pragma once
 
 #include "elfext/interface/feature_set.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What features bring with them. A set that was put together from tokens or tags is completed here
+// before anybody compares it: comparisons look at bits alone and must find a level's lower levels
+// set. The rules are taken in one order and once each; a later one may count on what an earlier one
+// has brought.
 #include "elfext/interface/feature_set.h"
 
 #include "elfext/src/attributes/feature_chains.h"
@@ -22,6 +27,7 @@ constexpr bool isCumulative(std::span<const FeatureSet> chain) {
   return true;
 }
 
+// The functions below count on it.
 static_assert(isCumulative(KrellChain));
 static_assert(isCumulative(ZevChain));
 static_assert(isCumulative(WmmxChain));
@@ -33,6 +39,7 @@ static_assert(isCumulative(std::array{EXTREGS_D16, EXTREGS_D32}));
 FeatureSet closeChain(FeatureSet features, std::span<const FeatureSet> chain) {
   FeatureSet below;
   for (const FeatureSet level : chain) {
+    // A bit of the level alone: such sets are what differences leave.
     if (features.intersects(level.without(below))) features |= level;
     below = level;
   }
@@ -52,6 +59,7 @@ FeatureSet closeFeatures(FeatureSet features) {
   };
   bring(features.contains(HFU_HALF), FP_ISA_ZEVv8);
   bring(features.contains(EXTREGS_D32.without(EXTREGS_D16)), EXTREGS_D32);
+  // Division without the other instruction sets is that of the M profile.
   bring(features.contains(KRELL_DIVIDE) &&
             !features.intersects(ZEV_DIVIDE | ZEV_ISAv3 | JAVA_STATE),
         M_PROFILE);

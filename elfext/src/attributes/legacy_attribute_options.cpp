@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The options of older compilers, in which tags still say how flags and accesses change.
+//
+// An option string is clauses of "-" or "/", perhaps "no", and a name; an access string is scopes
+// joined by "+", ":" and names with signs. Both end at the first thing that they don't know, and
+// change nothing from there on. The strings in use are constants of this room, so no file can
+// choose them.
 #include "elfext/interface/attribute_string.h"
 
 #include "elfext/src/attributes/attribute_tokens.h"
@@ -153,7 +158,9 @@ void applyAccessString(AccessWords& access, std::string_view options) {
     if (isAdded) take(options, "+");
     const uint32_t name = takeAccessName(options);
     if (name == std::size(AccessNames)) return;
+    // Stores have the bits of the loads of the same kind.
     const auto bit = static_cast<uint16_t>(1u << name % LoadNameCount);
+    // Scopes are of loads: there is one word for all stores.
     if (name >= LoadNameCount) {
       putBits(access.stores, bit, isAdded);
     } else {
@@ -166,6 +173,7 @@ void applyAccessString(AccessWords& access, std::string_view options) {
 }
 
 AccessWords defaultAccessWords(uint32_t architecture, std::string_view targetName) {
+  // Values of Tag_CPU_arch: from here on hardware loads from any address.
   constexpr uint32_t FirstUnaligned = 6;
   constexpr uint32_t LastUnaligned = 17;
   if (architecture >= FirstUnaligned && architecture <= LastUnaligned)

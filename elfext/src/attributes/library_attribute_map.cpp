@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Reads a map, and asks it what a library's name says. The file is a user's: it is read in pieces,
+// a line without an end counts as several, and what is no line of the format says nothing. A map
+// that can't be read is replaced by the built-in one, and the caller is told.
 #include "elfext/interface/library_attribute_map.h"
 
 #include "elfext/interface/attribute_relations.h"
@@ -87,6 +91,7 @@ private:
 
 // False if the host fails.
 bool readRows(support::Host& host, support::FileHandle file, LibraryAttributeMap& map) {
+  // The file is never in memory as a whole.
   std::vector<uint8_t> buffer(0x10000);
   LineGatherer lines(map);
   uint64_t offset = 0;
@@ -96,6 +101,7 @@ bool readRows(support::Host& host, support::FileHandle file, LibraryAttributeMap
     lines.take({reinterpret_cast<const char*>(buffer.data()), done});
     offset += done;
   } while (done == buffer.size());
+  // The last line may have no end.
   lines.finishLine();
   return true;
 }
@@ -135,6 +141,7 @@ void getLibraryAttributes(FullAttr& result, std::string_view name, const Library
   record.m_TargetClass = result.m_TargetClass;
   const std::string_view part = matchedPart(name);
   for (const LibraryAttributeMap::Row& row : map.rows) {
+    // Also where rows clash: the record then says both.
     if (matches(row, part)) mergeFullAttr(record, record, row.attributes);
   }
   result = record;

@@ -2,6 +2,11 @@
 //
 // The record that says what tags say. A tag that is not there counts as 0 where a rule covers every
 // value; where a rule knows only some values it does nothing.
+//
+// It is run by BuildAttributes when somebody asks for a record whose tags have changed. Values are
+// a file's and may be any: tables are indexed only behind a comparison, and a number that stands
+// for nothing is the target of the empty name. The same knowledge the other way round is in
+// tags_from_record.cpp.
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/target_table.h"
@@ -18,6 +23,7 @@ public:
   explicit RecordFromTags(const BuildAttributes& tags) : m_Tags(tags) {}
 
   [[nodiscard]] FullAttr make() {
+    // First the architecture with all that it has; then what single tags add to it or take away.
     addTarget();
     narrowTarget();
     addExtensions();
@@ -83,6 +89,7 @@ void RecordFromTags::addTarget() {
   m_Record.m_Access = has(Tag_CPU_arch) ? defaultAccessWords(get(Tag_CPU_arch), "")
                                         : AccessWords::all(AccessWord_Halves);
   FeatureSet unused;
+  // The processor may have it, but the code does not use it.
   if (get(Tag_KRELL_ISA_use) == 0) unused |= KRELL_ISAv5;
   if (get(Tag_ZEV_ISA_use) == 0) unused |= ZEV_ISAv8;
   if (get(Tag_Z64_ISA_use) == 0) unused |= Z64_ISA;
@@ -134,6 +141,7 @@ void RecordFromTags::addFloatingPoint() {
   features = features.without(FP_ISA_ZEVv8 | HFU_SINGLE | HFU_DOUBLE | EXTREGS_D32 | Fused |
                               HFU_HALF | V81_SIMD);
   const uint32_t unit = get(Tag_FP_arch);
+  // Values that are not known add nothing to the clean slate above.
   if (unit == 0 || unit >= std::size(Units)) return;
   features |= Units[unit];
   if (get(Tag_ABI_HardFP_use) != 2) features |= HFU_SINGLE;
@@ -211,6 +219,7 @@ void RecordFromTags::addMakersFlags() {
   applyEither(ZevTag::Tag_ZV_microlib, "/nomicrolib", "/microlib");
   if (has(ZevTag::Tag_ZV_require8) && get(ZevTag::Tag_ZV_require8) <= 1)
     putStack8(Stack8_Requires, get(ZevTag::Tag_ZV_require8) == 0);
+  // The maker's tag overrules what the public one has said above.
   if (!has(ZevTag::Tag_ZV_eba) || get(ZevTag::Tag_ZV_eba) > 2) return;
   apply(get(ZevTag::Tag_ZV_eba) == 0 ? "/8byte" : "/no8byte");
   if (get(ZevTag::Tag_ZV_eba) == 2) m_Record.m_Flags |= Flag_Align4;

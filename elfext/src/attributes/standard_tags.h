@@ -2,6 +2,10 @@
 //
 // The vocabulary of tags: where a set of attributes keeps each, and what depends on it. The order
 // is that of the sets' fields.
+//
+// Tag numbers have gaps and two vendors; places have none, so a set is an array of bytes with a bit
+// for the presence of each. The row of a tag also says whether it feeds the record: one that does
+// makes the record stale.
 #pragma once
 
 #include "elfext/interface/build_attributes_tags.h"
@@ -96,9 +100,11 @@ constexpr uint8_t placeOf(uint32_t tag) {
     for (size_t i = 0; i < std::size(NumericTagRows); ++i) {
       if (!NumericTagRows[i].isZev) places[NumericTagRows[i].number] = static_cast<uint8_t>(i);
     }
+    // Two numbers, one tag: objects may use either.
     places[Tag_MPextension_use_r207] = places[Tag_MPextension_use];
     return places;
   }();
+  // Tags are the file's, and any 32-bit number.
   return tag <= LastQobixTag ? Places[tag] : NoPlace;
 }
 

@@ -2,6 +2,11 @@
 //
 // The tags that say what a record says. They have to stay in step with record_from_tags.cpp and
 // with the compilers that write both.
+//
+// It is run where an object states its attributes as text, so that the tags can be compared and
+// written. Order counts where a tag is derived from another (the architecture's number comes first,
+// the alignment last); setters with consequences are not used, as each would change the record that
+// is being read.
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/target_table.h"
 #include "elfext/src/attributes/architecture_number.h"
@@ -97,6 +102,7 @@ void TagsFromRecord::addAlsoFor(uint32_t architecture) {
 
 void TagsFromRecord::deriveArchitecture() {
   const IsaLevels levels = getIsaLevels(m_Features);
+  // Nothing is known of the target: tags that are not there say that, and zeros would not.
   if (levels.zev == 0 && levels.krell == 0 && levels.z64 == 0) return;
   set(Tag_CPU_arch, getArchitectureNumber(m_Features));
   set(Tag_CPU_arch_profile, getArchitectureProfile(m_Features));
@@ -133,6 +139,7 @@ void TagsFromRecord::deriveFloatingPoint() {
 void TagsFromRecord::deriveDivisionAndDsp() {
   set(Tag_MPextension_use, has(MP_EXTENSIONS) ? 1 : 0);
   set(Tag_DIV_use, get(Tag_CPU_arch) == 10 && has(DIVIDE_EXTENSION) ? 2 : 0);
+  // Only said where the architecture does not say it already.
   const bool isImplied =
       hasFullFeatures(get(Tag_CPU_arch), get(Tag_CPU_arch_profile), V7EM_EXTENSION);
   set(Tag_DSP_extension, !isImplied && has(V7EM_EXTENSION) ? 1 : 0);
@@ -170,6 +177,7 @@ void TagsFromRecord::deriveFloatingPointModel() {
   set(Tag_ABI_FP_optimization_goals, 0);
   if (!has(PURE_DOUBLES)) return setModel(0, 0, 0, 0, 0);
   if (hasFlags(Flag_IeeeFull)) {
+    // This one tag stays as it was, present or not.
     const bool hadExceptions = m_Attributes.hasTag(Tag_ABI_FP_exceptions);
     setModel(1, 1, get(Tag_ABI_FP_exceptions), 1, 3);
     if (!hadExceptions) m_Attributes.dropNumber(placeOf(Tag_ABI_FP_exceptions));

@@ -2,6 +2,9 @@
 //
 // The rows of the target table. Processors build on architectures, and units on the levels of the
 // floating-point instructions. Rows that aren't shown are there for look-ups only.
+//
+// Sets are built up from smaller ones, as architectures were. target_table.cpp checks at compile
+// time that each row contains its base's features and that rows of one kind stand together.
 #pragma once
 
 #include "elfext/interface/target_table.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Look-ups in the target table, by name and by the numbers of Tag_CPU_arch and
+// Tag_CPU_arch_profile. Names and numbers may be a file's: one that is not known gets nothing, or
+// the row of the empty name. The table is three hundred constants, looked through row by row.
 #include "elfext/interface/target_table.h"
 
 #include "checking/interface/checking.h"
@@ -15,6 +19,7 @@ namespace {
 
 using targets::Rows;
 
+// A row that gets lost in an edit is noticed.
 static_assert(std::size(Rows) == 296);
 
 constexpr const TargetEntry* findRow(std::string_view name) {
@@ -70,6 +75,7 @@ constexpr std::string_view nameOf8(uint32_t profile) {
 constexpr std::string_view architectureName(uint32_t number, uint32_t profile) {
   if (number == NumberOf7) return nameOf7(profile);
   if (number == NumberOf8) return nameOf8(profile);
+  // The empty name is the first row, which has no features.
   return number < std::size(NamesByNumber) ? NamesByNumber[number] : "";
 }
 
