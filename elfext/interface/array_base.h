@@ -3,6 +3,10 @@
 // The growing array behind FastArray and Array. Capacities are 1, 2, 4, 7, 11, 17, 26 and so on;
 // counts have 32 bits; misuse is a failed assertion. Elements are copied about and never
 // destroyed, so they own nothing.
+//
+// Counts in files have 32 bits, and so do these. A count that a file claims has been compared with
+// the bytes present before anybody reserves for it here: growing only asserts that its numbers
+// don't wrap.
 
 #pragma once
 
@@ -28,6 +32,7 @@ public:
   ArrayBase(const ArrayBase&) = delete;
   ArrayBase& operator=(const ArrayBase&) = delete;
 
+  /// Elements in use.
   [[nodiscard]] uint32_t getSize() const { return m_Used; }
   [[nodiscard]] uint32_t getCapacity() const { return m_Allocated; }
   [[nodiscard]] bool isEmpty() const { return m_Used == 0; }
@@ -146,6 +151,8 @@ private:
   void grow(uint32_t requiredAllocation) {
     QUARN_ASSERT(1, requiredAllocation > m_Allocated);
     this->mustBeUsable();
+    // By half, so that n appends copy no more than a few n elements; a product that wraps is caught
+    // below.
     const uint32_t newAllocated = (m_Allocated * 3) / 2 + 1;
     QUARN_ASSERT(1, newAllocated > m_Allocated);
     const uint32_t capacity = std::max(newAllocated, requiredAllocation);

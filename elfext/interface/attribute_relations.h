@@ -2,6 +2,10 @@
 //
 // How two records of build attributes stand to each other: whether one fits under the other,
 // whether they can be used together, and what one has beyond the other.
+//
+// The archive groups the variants of a module by these and orders them; sets of tags are merged by
+// them too. Records that come from hostile texts may clash in every way: nothing here fails, it
+// only answers.
 #pragma once
 
 #include "elfext/interface/full_attr.h"

@@ -21,11 +21,14 @@ constexpr std::string_view DecorationPrefix = "BuildAttributes$";
 /// What stands between a symbol's name and the text of its attributes.
 constexpr std::string_view DecorationMarker = "$$BuildAttributes$";
 
+/// The record of a text alone, its features completed; the text is not kept. Time goes with its
+/// length.
 [[nodiscard]] FullAttr parseAttributeString(std::string_view text);
 
 /// ORs in what the text says, and completes the features.
 void addAttributeString(FullAttr& record, std::string_view text);
 
+/// What parseAttributeString reads; features that have no token are left out.
 [[nodiscard]] std::string printAttributeString(const FullAttr& record);
 /// Writes as much as fits into `size` bytes, with a final zero if there is room for any. A null
 /// buffer is as good as none. The length of the whole text.

@@ -2,6 +2,9 @@
 //
 // The sections whose bytes are bookkeeping: one class for each type, all made by the creators of
 // ObjectModule. What they know beside a plain section is how they hang together.
+//
+// The numbers in their constructors are whether the section is auxiliary, whether relocations may
+// apply to it, and the size of its rows in bytes, 0 for none of fixed size.
 #pragma once
 
 #include "elfext/interface/elf_constants.h"

@@ -50,8 +50,10 @@ public:
   [[nodiscard]] uint64_t getSize() const;
   /// New bytes are as they are in memory: the caller fills them.
   void setSize(uint64_t size);
+  /// Room for so many bytes in all; nothing for external data.
   void reserve(uint64_t size);
 
+  /// Aligned words: the offset is a multiple of the word's size.
   [[nodiscard]] uint8_t getByte(uint64_t offset) const;
   void setByte(uint64_t offset, uint8_t value);
 
@@ -62,6 +64,7 @@ public:
   void set32(uint64_t offset, uint32_t value);
   void set64(uint64_t offset, uint64_t value);
 
+  /// Words at any offset.
   [[nodiscard]] uint16_t getUnaligned16(uint64_t offset) const;
   [[nodiscard]] uint32_t getUnaligned32(uint64_t offset) const;
   [[nodiscard]] uint64_t getUnaligned64(uint64_t offset) const;

@@ -3,6 +3,8 @@
 // The attributes of one vendor as they stand in the file, without the list of what they hold for.
 // Blocks never change, and within a module there is one for equal vendor and bytes: its address is
 // its identity.
+//
+// The bytes are tags and values in the order of the file, also those that nobody here knows.
 #pragma once
 
 #include <cstdint>

@@ -2,6 +2,9 @@
 //
 // What the objects of one module share of their build attributes: blocks, and sets of attributes.
 // All of it lives as long as the cache, and never changes.
+//
+// Objects hold its pointers and compare by them. A hostile object can make as many sets as it has
+// bytes for, and no more: the reader's budget ends that.
 #pragma once
 
 #include "elfext/interface/build_attributes.h"

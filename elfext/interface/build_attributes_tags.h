@@ -2,6 +2,9 @@
 //
 // The tags of build attributes. Those of vendor "qobix" are the public ABI's, those of vendor "ZEV"
 // the maker's own; the two count separately. The form of a tag's value follows from its number.
+//
+// Numbers are those of the public ABI and of the maker, and stand in files: none ever changes. Any
+// number from 4 on may come from a file, so the classifier answers for all of them.
 #pragma once
 
 #include <cstdint>

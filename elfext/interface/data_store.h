@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The role of something with bytes.
+// The role of something with bytes: sections and raw data blocks. Whoever lays out or copies a file
+// region asks it for its store and then needs to know no more of what it is.
 #pragma once
 
 #include <cstdint>

@@ -2,6 +2,9 @@
 //
 // The small records that say what is placed where in an output file. They are made in the region
 // of who computes a layout, and read their sizes from the file regions that they stand for.
+//
+// Kinds are numbered in the order of the classes; what has no record of its own (a raw data block)
+// goes where its segment does.
 #pragma once
 
 #include "elfext/interface/file_region.h"

@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What counts as debug information, by the name of its section: one rule for sizes, for debug
+// overlays and for the archive's symbol table.
 #pragma once
 
 namespace elfext {

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What a section holds instead of its bytes while they are still in the file.
+//
+// It is made for sections that a caller's selector chose, in files above 0x100000 bytes. The bytes
+// come in when somebody asks the section to load them; until then the file stays open for them.
 #pragma once
 
 #include "elfext/interface/reference_counted_file.h"

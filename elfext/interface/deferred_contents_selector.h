@@ -2,6 +2,8 @@
 //
 // Which sections of a large file keep their contents in the file until somebody asks for them.
 // Tables that the reader consumes are never asked about.
+//
+// Without a selector nothing is deferred: contents are then views of the image.
 #pragma once
 
 #include <cstdint>

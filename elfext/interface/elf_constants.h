@@ -2,6 +2,10 @@
 //
 // The numbers of the ELF standard, under the standard's own names, as far as this library knows
 // them, and those of the ZEV processor supplement.
+//
+// Each group begins with the field that its values stand in. They are 32 bits wide whatever the
+// field is; what a file says may be any number and is compared with these,
+// never taken for one of them.
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The ELF header as a region of the file: always at its start.
+//
+// It is placed like all others when a file is laid out, and segments may hold it. What the header
+// says is in ObjectModule.
 #pragma once
 
 #include "elfext/interface/file_region.h"

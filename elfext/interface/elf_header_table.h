@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A table of headers as a region of the file: what the section and program header tables share.
+//
+// Entry sizes are what e_shentsize and e_phentsize say; the rows themselves always have the size of
+// the class.
 #pragma once
 
 #include "elfext/interface/file_region.h"
@@ -12,6 +15,7 @@ public:
   [[nodiscard]] uint64_t getFileSize() const override {
     return uint64_t{m_EntrySize} * m_EntryCount;
   }
+  /// Bytes.
   [[nodiscard]] uint32_t getEntrySize() const { return m_EntrySize; }
   void setEntrySize(uint32_t size) { m_EntrySize = size; }
   void setEntryCount(uint64_t count) { m_EntryCount = count; }

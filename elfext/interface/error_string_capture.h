@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Keeps the text of a report for a client that words its own message round it, and ends the read.
+//
+// The archive uses one for each object that it reads: the first thing wrong is what the user is
+// told, and nothing is read behind it.
 #pragma once
 
 #include "elfext/interface/error_handler.h"

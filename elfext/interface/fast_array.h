@@ -2,6 +2,9 @@
 //
 // The array of the object model, in a region. Destroying it hands its block back to the region;
 // destroying the region without it is as good.
+//
+// A block that an array has outgrown goes back to the region at once; elements themselves are never
+// destroyed, so they own nothing.
 
 #pragma once
 

@@ -2,6 +2,9 @@
 //
 // What code needs of its target, as a set of 128 bits: instruction sets, extensions, register
 // files. A level of a chain contains the levels below it.
+//
+// Texts and tags name features; the bits are this library's own. `Defined` has all that comparisons
+// look at.
 #pragma once
 
 #include <cstdint>
@@ -42,7 +45,7 @@ struct FeatureSet {
 
 namespace features {
 
-/// clang-format off
+// clang-format off
 /// The chains, each from its lowest level to its highest.
 constexpr FeatureSet ZEV_ISAv3{0x1};
 constexpr FeatureSet ZEV_ISAv4{0x3};

@@ -2,6 +2,10 @@
 //
 // The role of something with a place in the file: the header, the two header tables, segments,
 // sections, and the pieces of segments that no section covers.
+//
+// Regions are placed by offsets in the file, or relative to each other by the placement forest,
+// from which a layout finds offsets that keep all distances. Offsets and sizes are the file's, up
+// to 64 bits: questions about two regions compare distances and never ends.
 #pragma once
 
 #include "alloclib/interface/region_general.h"

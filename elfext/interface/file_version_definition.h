@@ -2,6 +2,8 @@
 //
 // A version that a shared library defines: one row of its SHT_GNU_verdef section. The row for the
 // library itself, its base version, is known to the module; the others to their symbols.
+//
+// From Elf_Verdef: vd_ndx, vd_flags, and the name of the first Elf_Verdaux.
 #pragma once
 
 #include <cstdint>

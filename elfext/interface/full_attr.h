@@ -2,6 +2,10 @@
 //
 // Build attributes in their packed form, on which all comparisons work: what code needs of its
 // target, which memory accesses it makes, and how it was compiled.
+//
+// It comes from an attribute text, from a set of tags, from a library's name or from a known
+// target, and all of these meet here: four words of accesses, three of flags, and a set of
+// features.
 #pragma once
 
 #include "elfext/interface/feature_set.h"

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A section group: sections that are kept or dropped together, under the name of a signature.
+//
+// In a file it is a section of type SHT_GROUP: a word of flags and the members' indexes, with the
+// signature in a symbol that sh_link and sh_info name. The reader has made sure that no section is
+// in two.
 #pragma once
 
 #include "elfext/interface/lazy_array.h"

@@ -29,6 +29,7 @@ public:
   HashBase(const HashBase&) = delete;
   HashBase& operator=(const HashBase&) = delete;
 
+  /// Entries.
   [[nodiscard]] uint32_t getSize() const { return m_Entries; }
   [[nodiscard]] uint32_t getBucketCount() const { return m_HashTableSize; }
 
@@ -94,6 +95,7 @@ protected:
 private:
   [[nodiscard]] Node*& getBucket(const Key& key) const {
     uint32_t hash = m_HashFunction(&key);
+// Another seed, for the builds that look for output that depends on the order.
 #ifdef QUARN_SHAKE_ORDER
     hash ^= 0x9E3779B9;
 #endif

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A map on the general heap, for what outlives any region.
+//
+// What both hash tables can do is in hash_base.h. Its order is that of the hashes and must not
+// show.
 
 #pragma once
 

@@ -2,6 +2,10 @@
 //
 // The bytes of an object file, wherever they are. A buffer that nobody looks into never asks for
 // its bytes, so that code and debug information need not even be read.
+//
+// The reader's image is the one source of the product; buffers know it by this role alone. Ranges
+// that are asked for have been compared with the image, but the file behind it may have been cut
+// since.
 #pragma once
 
 #include "support/interface/host.h"

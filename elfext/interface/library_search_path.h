@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A list of directories in which the needed libraries are looked for.
+//
+// From a dynamic section: the text that a DT_RPATH or DT_RUNPATH tag names, as it stands. Nobody
+// here takes it apart or looks into the directories.
 #pragma once
 
 #include <cstdint>

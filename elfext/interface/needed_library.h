@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A library that the module needs at run time.
+//
+// From a dynamic section: the text that a DT_NEEDED tag names. Libraries are in the order of their
+// tags.
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The memory of an object module: all that it contains is in two regions, which go with it.
+//
+// A base class, so that the regions are there before the first list and go after the last one.
 #pragma once
 
 #include "alloclib/interface/region_objects.h"

@@ -4,6 +4,10 @@
 // its parts or its build attributes: found in its tables, where they lie, and no model is made. The
 // checks, and so the reports, are those of readElfFile. A program that uses it has an
 // alloclib::Session for as long as it does.
+//
+// This is the road that the tool takes, once for each member. Whatever a hostile object tries is
+// stopped in `read`, by the checks of the tables; what the outline answers afterwards has been
+// checked.
 #pragma once
 
 #include "elfext/interface/full_attr.h"

@@ -2,6 +2,10 @@
 //
 // What can have build attributes: the module as a whole, each section and each symbol. Those
 // without attributes of their own have what holds around them.
+//
+// A section lies in its module, a symbol in its section, or in the module if it has none.
+// Attributes and blocks are two forms of the same statement, of which the reader fills both and a
+// writer makes the second from the first.
 #pragma once
 
 #include "elfext/interface/build_attributes_block.h"

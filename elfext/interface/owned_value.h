@@ -2,6 +2,9 @@
 //
 // A value that may not be there, in the room of a pointer: for what few of many objects have. A
 // copy is a copy of the value. No value and an empty one are different states.
+//
+// Sets of build attributes have four lists that most of them never fill, and that cost a pointer
+// each then.
 #pragma once
 
 #include <cstddef>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A record of the preemption map: a symbol of one library takes the place of those of others.
+//
+// Its names are texts of the dynamic section's string table; the format of a map is in
+// src/reader/object_module_reader_dynamic.cpp.
 #pragma once
 
 #include "elfext/interface/lazy_array.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The program header table as a region of the file.
+//
+// Its rows are Segments. An object that is still to be linked has none, and the table then no
+// place.
 #pragma once
 
 #include "elfext/interface/elf_header_table.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A piece of a segment that no section and no header covers, so that no byte of a segment is lost.
+//
+// The reader makes one for each gap that it finds; the bytes are a view of the image until somebody
+// writes. Sizes count them as padding where they are zero, and as data where not.
 #pragma once
 
 #include "elfext/interface/buffer.h"

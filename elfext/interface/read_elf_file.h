@@ -15,6 +15,10 @@
 //
 // The selector may be null. It is asked only in the first and the fourth form, for files larger
 // than 0x100000 bytes.
+//
+// These are the ways to a model. The tool finds names in an object's tables without one
+// (object_outline.h), by the same checks. Reads share no state, so any number of modules may be
+// read one after the other, or be alive at once.
 #pragma once
 
 #include "support/interface/source_file.h"

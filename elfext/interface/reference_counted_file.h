@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // An open file that several deferred sections share. It is closed when the last of them lets go.
+//
+// It belongs to a module's region, but what it holds is the host's: only counting down to 0, or
+// closing, gives that back.
 #pragma once
 
 #include "support/interface/host.h"

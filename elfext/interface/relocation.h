@@ -2,6 +2,9 @@
 //
 // One entry of a relocation table. It points at its symbol, so that reordering symbol tables never
 // disturbs it.
+//
+// r_offset, r_info and r_addend. Relocations that were read are rows until somebody asks for one;
+// see Section.
 #pragma once
 
 #include <cstdint>

@@ -2,6 +2,8 @@
 //
 // The rows of a relocation section that was read and checked but whose relocations nobody has
 // asked for. An object may have a hundred thousand of them, and most questions need none.
+//
+// The reader supplies them; the section that the rows are for asks for them once.
 #pragma once
 
 namespace elfext {

@@ -2,6 +2,8 @@
 //
 // Lists that a search fills for its caller: some slots inline, since most searches find few, and
 // one heap array for what goes beyond.
+//
+// The caller keeps one list for many searches; it never owns what it points to.
 #pragma once
 
 #include "checking/interface/checking.h"

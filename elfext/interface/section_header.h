@@ -2,6 +2,9 @@
 //
 // A row of the section header table in the wide form that both classes are read into; the fields
 // are those of the ELF standard, without their sh_.
+//
+// Elf32_Shdr and Elf64_Shdr. Values are as the file has them until the tables have checked them,
+// and mended where the handler let something pass.
 #pragma once
 
 #include <cstdint>

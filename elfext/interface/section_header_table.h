@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The section header table as a region of the file.
+//
+// Its rows are Sections. Row sizes are those of the classes, in bytes.
 #pragma once
 
 #include "elfext/interface/elf_header_table.h"

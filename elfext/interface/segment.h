@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A segment: one row of the program header table.
+//
+// The fields are those of Elf32_Phdr and Elf64_Phdr, kept as they were read: p_offset, p_filesz and
+// p_memsz may be any number, and only segments whose bytes were needed have been held against the
+// file.
 #pragma once
 
 #include "elfext/interface/file_region.h"

@@ -2,6 +2,9 @@
 //
 // What the bytes of an object are for. Sections tell where a file has some, program headers where
 // it has none.
+//
+// Both roads count by the same rules, which are in src/tables/sizes_source.cpp. Totals are sums of
+// what the headers say: a file that lies gets figures that lie, and nothing else.
 #pragma once
 
 #include <cstdint>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // One heap copy of each text that was ever looked up, so that cached texts compare by address.
+//
+// For texts of the program's own that outlive all regions. Nothing is ever dropped, so texts of
+// files don't belong here.
 
 #pragma once
 

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A text as a key: a pointer with the text's hash, which is computed once.
+//
+// It is the key of tables by text: the bytes are compared only where the hashes are equal. Whoever
+// owns the text keeps it as long as the key.
 
 #pragma once
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The symbols that a search has found, in a list of its caller's.
+//
+// Most searches find a few, which need no memory of their own; see ResultList.
 #pragma once
 
 #include "elfext/interface/result_list.h"

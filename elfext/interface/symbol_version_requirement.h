@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The version that a reference by a dynamic symbol wants: one row of the SHT_GNU_verneed section.
+//
+// From Elf_Vernaux, and from its Elf_Verneed the name of the file.
 #pragma once
 
 #include <cstdint>

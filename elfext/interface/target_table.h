@@ -2,6 +2,9 @@
 //
 // The known targets: architectures, processors, floating-point units. A target stands for a set of
 // features.
+//
+// Tags name an architecture by number, texts and users a target by name; both come to a set of
+// features here. The rows are in src/attributes/target_rows.h.
 #pragma once
 
 #include "elfext/interface/full_attr.h"
