@@ -7,6 +7,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <regex>
 
 namespace testsupport {
@@ -37,6 +38,12 @@ void expectReports(const ToolRun& run) {
   }
   EXPECT_TRUE(run.status == 0 || run.status == 1) << run.status;
   EXPECT_EQ(run.status == 1, run.errors.find("Error: ") != std::string::npos);
+}
+
+// The library is tried with every changed byte. What the tool makes of its answers shows with one
+// in seven as well; the long form of the tests tries all of them here, too.
+size_t getStep() {
+  return std::getenv("QUARN_LONG_TESTS") != nullptr ? 1 : 7;
 }
 
 class DamagedArchiveInTheTool : public testing::Test {
@@ -115,16 +122,16 @@ TEST_F(DamagedArchiveInTheTool, IsEditedAtEveryPrefix) {
   forEachPrefix(each(&DamagedArchiveInTheTool::insert));
 }
 
-TEST_F(DamagedArchiveInTheTool, IsListedForEveryChangedByte) {
-  forEachChangedByte(each(&DamagedArchiveInTheTool::list));
+TEST_F(DamagedArchiveInTheTool, IsListedForChangedBytes) {
+  forEachChangedByte(each(&DamagedArchiveInTheTool::list), getStep());
 }
 
-TEST_F(DamagedArchiveInTheTool, IsExtractedForEveryChangedByte) {
-  forEachChangedByte(each(&DamagedArchiveInTheTool::extract));
+TEST_F(DamagedArchiveInTheTool, IsExtractedForChangedBytes) {
+  forEachChangedByte(each(&DamagedArchiveInTheTool::extract), getStep());
 }
 
-TEST_F(DamagedArchiveInTheTool, IsEditedForEveryChangedByte) {
-  forEachChangedByte(each(&DamagedArchiveInTheTool::insert));
+TEST_F(DamagedArchiveInTheTool, IsEditedForChangedBytes) {
+  forEachChangedByte(each(&DamagedArchiveInTheTool::insert), getStep());
 }
 
 } // namespace testsupport
