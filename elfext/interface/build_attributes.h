@@ -59,6 +59,7 @@ public:
   /// With the record of a text, and the tags that follow from it.
   explicit BuildAttributes(std::string_view attributeText);
 
+  /// False only of what a set operation made of an invalid set, or of two that can't be combined.
   [[nodiscard]] bool isValid() const { return m_Valid; }
 
   /// Brought up to date with the tags.

@@ -16,6 +16,7 @@ public:
   /// Holds one reference to the file, which must outlive this object.
   DeferredContents(ReferenceCountedFile* referenceCountedFile, bool usesFile,
                    const SectionHeader& header);
+  /// Lets go of the file. A close that fails has nobody to tell.
   ~DeferredContents() { m_ReferenceCountedFile->release(); }
   DeferredContents(const DeferredContents&) = delete;
   DeferredContents& operator=(const DeferredContents&) = delete;

@@ -148,18 +148,23 @@ public:
   virtual bool nullSectionNotNull(const ObjectModule& module, uint32_t section);
   /// True: a null section is put in front of it.
   virtual bool firstSectionNotNull(const ObjectModule& module, uint32_t type);
+  /// Left out for a file in which it was so from the start.
   virtual bool auxiliarySectionHostsSymbol(const ObjectModule& module, uint32_t section);
   virtual bool auxiliarySectionRelocated(const ObjectModule& module, uint32_t section);
+  /// Told for each relocation at whose offset the section has an earlier one of its kind.
   virtual bool repeatedDynamicRelocation(const ObjectModule& module, uint64_t offset,
                                          uint32_t section);
   virtual bool repeatedStaticRelocation(const ObjectModule& module, uint64_t offset,
                                         uint32_t section);
+  /// Of a file that is not laid out. The checks of places are left out for it.
   virtual bool unexpectedSegments(const ObjectModule& module);
   virtual bool loadableSectionOutsideSegments(const ObjectModule& module, uint32_t section);
   virtual bool otherSectionInLoadableSegment(const ObjectModule& module, uint32_t section,
                                              uint32_t segment);
+  /// The two are neighbours in the order of their file offsets.
   virtual bool loadableSegmentsOutOfOrder(const ObjectModule& module, uint32_t segment,
                                           uint32_t laterSegment);
+  /// In memory. The lower index comes first.
   virtual bool loadableSegmentsOverlap(const ObjectModule& module, uint32_t segment,
                                        uint32_t otherSegment);
   /// Final in a read.
@@ -168,19 +173,26 @@ public:
                                         uint32_t otherSegment);
   virtual bool secondHeaderTableSegment(const ObjectModule& module, uint32_t segment,
                                         uint32_t otherSegment);
+  /// The first segments of both kinds, by their places in the program header table.
   virtual bool loadableBeforeInterpreter(const ObjectModule& module, uint32_t loadable,
                                          uint32_t segment);
   virtual bool loadableBeforeHeaderTable(const ObjectModule& module, uint32_t loadable,
                                          uint32_t segment);
+  /// Both sizes in bytes: p_filesz, and what the rows of the program header table come to.
   virtual bool headerTableSegmentTooSmall(const ObjectModule& module, uint32_t segment,
                                           uint64_t size, uint64_t tableSize);
+  /// p_vaddr, p_offset and p_align.
   virtual bool segmentNotCongruent(const ObjectModule& module, uint32_t segment, uint64_t address,
                                    uint64_t offset, uint64_t alignment);
+  /// sh_addr and sh_addralign.
   virtual bool sectionMisaligned(const ObjectModule& module, uint32_t section, uint64_t address,
                                  uint64_t alignment);
   virtual bool noLoadableSegments(const ObjectModule& module);
+  /// Bytes of the first loadable segment in front of its first section, and how many of them the
+  /// headers that it holds take.
   virtual bool noRoomForHeaders(const ObjectModule& module, uint32_t segment, uint64_t unmapped,
                                 uint64_t needed);
+  /// The SHF_... bits that the section should have and has not.
   virtual bool indexTableFlagsMissing(const ObjectModule& module, uint32_t section,
                                       uint32_t missingFlags);
   virtual bool indexTableLinkUnsuitable(const ObjectModule& module, uint32_t section);
@@ -188,9 +200,13 @@ public:
   virtual bool groupFlagWithoutGroup(const ObjectModule& module, uint32_t section);
   virtual bool memberWithoutGroupFlag(const ObjectModule& module, uint32_t section,
                                       uint32_t groupSection);
+  /// A row of a relocation section, from 0, against a local symbol of a group that the target
+  /// section is not in. Relocations in no section are told with section 0 and their place in the
+  /// target's list.
   virtual bool relocationLeavesGroup(const ObjectModule& module, uint64_t relocation,
                                      uint32_t section, uint32_t symbolSection,
                                      uint32_t targetSection);
+  /// Once for each row, and with row 0 for a section without rows.
   virtual bool relocationNotAllowed(const ObjectModule& module, uint64_t relocation,
                                     uint32_t section, uint32_t targetSection);
   virtual bool localSymbolUndefined(const ObjectModule& module, uint32_t symbol, bool isDynamic);

@@ -41,6 +41,7 @@ public:
   [[nodiscard]] Section* getMember(uint32_t index) const { return m_Members[index]; }
   /// A section of this module that is in no group yet.
   void addMember(Section* section);
+  /// A member of this group.
   void removeMember(Section* section);
 
 private:

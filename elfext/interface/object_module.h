@@ -147,6 +147,8 @@ public:
   [[nodiscard]] uint32_t getLittleEndian() const { return m_LittleEndian; }
   [[nodiscard]] bool isLittleEndian() const { return m_LittleEndian == 1; }
 
+  /// e_machine, e_type, e_entry, e_flags, e_ident[EI_OSABI], e_ident[EI_ABIVERSION],
+  /// e_ident[EI_VERSION] and e_version, as the file has them.
   [[nodiscard]] uint32_t getMachine() const { return m_Machine; }
   [[nodiscard]] uint32_t getFileType() const { return m_FileType; }
   [[nodiscard]] uint64_t getEntry() const { return m_Entry; }
@@ -155,6 +157,7 @@ public:
   [[nodiscard]] uint32_t getAbiVersion() const { return m_AbiVersion; }
   [[nodiscard]] uint32_t getIdentVersion() const { return m_IdentVersion; }
   [[nodiscard]] uint32_t getElfVersion() const { return m_ElfVersion; }
+  /// Any value is taken; what readers accept is for them to say.
   void setMachine(uint32_t machine) { change(m_Machine, machine); }
   void setFileType(uint32_t type) { change(m_FileType, type); }
   void setEntry(uint64_t entry) { change(m_Entry, entry); }
@@ -195,6 +198,7 @@ public:
   [[nodiscard]] uint64_t getDynamicValue(DynamicValue value) const {
     return m_DynamicValues[value].value;
   }
+  /// Makes it exist. The last value of a kind stays.
   void setDynamicValue(DynamicValue which, uint64_t value);
   /// DF_... bits.
   [[nodiscard]] bool hasDynamicFlags() const { return m_DynamicFlagsExists; }
@@ -214,6 +218,7 @@ public:
   [[nodiscard]] std::span<const DebugOverlayRecord> getDebugOverlayRecords() const {
     return m_DebugOverlayRecords.getSpan();
   }
+  /// Both sections are of this module. The record goes when one of them does.
   void addDebugOverlayRecord(const DebugOverlayRecord& record);
 
   // ---- State
@@ -232,6 +237,7 @@ public:
 
   /// No sections, groups, symbols, needed libraries, search paths, preemptions, nor a version.
   [[nodiscard]] bool isEmpty() const;
+  /// Whether any section's are. Looks through the sections.
   [[nodiscard]] bool hasDeferredContents() const;
   /// Loads all that are deferred, in index order; false at the first failure.
   [[nodiscard]] bool loadDeferredContents();
@@ -242,6 +248,7 @@ public:
 
   // ---- Build attributes
 
+  /// Made when first asked for; it goes with the module, or when that is cleared.
   [[nodiscard]] BuildAttributesCache& getBuildAttributesCache();
   /// The highest Tag_ZV_version of all objects' attributes; 0 for none.
   [[nodiscard]] uint32_t getHighestTagsVersion() const { return m_HighestTagsVersion; }
@@ -251,6 +258,7 @@ public:
   [[nodiscard]] uint32_t getSectionCount() const { return m_Sections.getSize(); }
   [[nodiscard]] Section* getSection(uint32_t index) const { return m_Sections[index]; }
   [[nodiscard]] uint32_t getSectionIndex(const Section* section) const;
+  /// Linear in the sections: all others keep their order.
   void setSectionIndex(Section* section, uint32_t index);
   [[nodiscard]] std::span<Section* const> getSections() const { return m_Sections.getSpan(); }
   /// Room for so many more in all lists of that kind.
@@ -258,6 +266,8 @@ public:
 
   /// For a type without a class of its own.
   Section* createSection(const char* name, uint32_t type, uint32_t flags);
+  /// One creator for each class of auxiliary sections. The section goes to the end of the table,
+  /// and belongs to the module; the name may be null, and flags are those of sh_flags.
   NullSection* createNullSection(const char* name, uint32_t flags);
   StringTableSection* createStringTableSection(const char* name, uint32_t flags);
   /// SHT_SYMTAB or SHT_DYNSYM.
@@ -384,6 +394,7 @@ public:
   [[nodiscard]] uint32_t getSymbolCount() const;
   [[nodiscard]] Symbol* getSymbol(uint32_t index) const;
   [[nodiscard]] uint32_t getSymbolIndex(const Symbol* symbol) const;
+  /// From 1. Linear in the distance of the move.
   void setSymbolIndex(Symbol* symbol, uint32_t index);
   /// Without the null symbol.
   [[nodiscard]] std::span<Symbol* const> getSymbols() const { return m_Symbols.getSpan(); }
@@ -396,6 +407,9 @@ public:
     return m_DynamicSymbols.getSpan();
   }
 
+  /// The static symbols of one category each, in the order in which they came to it; those that are
+  /// hosted are in lists of their sections. Asking for an index here is a search through the list,
+  /// and NoIndex says that the symbol is not in it.
   [[nodiscard]] uint32_t getAbsoluteSymbolCount() const { return m_AbsoluteSymbols.getSize(); }
   [[nodiscard]] Symbol* getAbsoluteSymbol(uint32_t index) const { return m_AbsoluteSymbols[index]; }
   [[nodiscard]] uint32_t getAbsoluteSymbolIndex(const Symbol* symbol) const;
@@ -411,6 +425,7 @@ public:
   [[nodiscard]] uint32_t getUndefinedSymbolIndex(const Symbol* symbol) const;
   void setUndefinedSymbolIndex(Symbol* symbol, uint32_t index);
 
+  /// The same of the dynamic symbols.
   [[nodiscard]] uint32_t getAbsoluteDynamicSymbolCount() const {
     return m_AbsoluteDynamicSymbols.getSize();
   }
@@ -448,6 +463,7 @@ public:
   [[nodiscard]] Group* findComdatGroup(const char* signature);
 
   [[nodiscard]] uint32_t getSegmentCount() const { return m_Segments.getSize(); }
+  /// In the order of the program header table.
   [[nodiscard]] Segment* getSegment(uint32_t index) const { return m_Segments[index]; }
   [[nodiscard]] uint32_t getSegmentIndex(const Segment* segment) const;
   void setSegmentIndex(Segment* segment, uint32_t index);
@@ -474,14 +490,17 @@ public:
   }
   [[nodiscard]] uint32_t getLibrarySearchPathIndex(const LibrarySearchPath* path) const;
   void setLibrarySearchPathIndex(LibrarySearchPath* librarySearchPath, uint32_t index);
+  /// The tag is DT_RPATH or DT_RUNPATH.
   LibrarySearchPath* createLibrarySearchPath(const char* path, uint32_t tag);
 
   [[nodiscard]] uint32_t getPreemptionCount() const { return m_Preemptions.getSize(); }
   [[nodiscard]] Preemption* getPreemption(uint32_t index) const { return m_Preemptions[index]; }
   [[nodiscard]] uint32_t getPreemptionIndex(const Preemption* preemption) const;
   void setPreemptionIndex(Preemption* preemption, uint32_t index);
+  /// Neither may be null; the libraries that are preempted are added to what is returned.
   Preemption* createPreemption(const char* symbolName, const char* preemptingDllName);
 
+  /// In the order in which they were made.
   [[nodiscard]] std::span<RawDataBlock* const> getRawDataBlocks() const {
     return m_RawDataBlocks.getSpan();
   }
@@ -595,6 +614,7 @@ private:
                         SymbolList* symbols) const;
 
   const uint8_t* m_ReadBuffer = nullptr;
+  /// During a read: names are views of the image, and not copied.
   bool m_AreNamesInBuffer = false;
   std::unique_ptr<ImageSource> m_ImageSource;
   bool m_HasLostContents = false;
@@ -629,6 +649,8 @@ private:
   uint32_t m_ProgramHeaderEntrySize = ProgramHeaderSize32;
 
   bool m_IndexesFrozen = false;
+  /// What is derived from the objects, and whether it still says what they do. Changes clear these;
+  /// whoever makes the derived things anew sets them.
   bool m_AreAuxiliarySectionsUpToDate = false;
   bool m_AreSortedViewsUpToDate = true;
   bool m_IsBuildAttributesSectionUpToDate = false;
@@ -640,6 +662,7 @@ private:
   SectionHeaderTable m_SectionHeaderTable;
   ProgramHeaderTable m_ProgramHeaderTable;
 
+  /// The lists of objects, each in the order of its indexes.
   FastArray<Section*> m_Sections;
   FastArray<Group*> m_Groups;
   FastArray<Segment*> m_Segments;
@@ -652,6 +675,7 @@ private:
   const FileVersionDefinition* m_FileVersionDefinition = nullptr;
   FastArray<DebugOverlayRecord> m_DebugOverlayRecords;
 
+  /// The same symbols by category. The hosted ones are in their sections.
   FastArray<Symbol*> m_AbsoluteSymbols;
   FastArray<Symbol*> m_CommonSymbols;
   FastArray<Symbol*> m_UndefinedSymbols;
@@ -659,6 +683,7 @@ private:
   FastArray<Symbol*> m_CommonDynamicSymbols;
   FastArray<Symbol*> m_UndefinedDynamicSymbols;
 
+  /// The same sections by type, for who looks for one of them.
   FastArray<StringTableSection*> m_StringTableSections;
   FastArray<SymbolTableSection*> m_SymtabSections;
   FastArray<SymbolTableSection*> m_DynsymSections;
@@ -673,6 +698,7 @@ private:
   FastArray<DebugOverlaySection*> m_DebugOverlaySections;
   FastArray<BuildAttributesSection*> m_BuildAttributesSections;
 
+  /// Views for look-ups: pointers in another order, made when m_AreSortedViewsUpToDate is not set.
   FastArray<Symbol*> m_SymbolsSortedByAddress;
   FastArray<Symbol*> m_DynamicSymbolsSortedByAddress;
   FastArray<Symbol*> m_SymbolsSortedByName;

@@ -60,6 +60,7 @@ public:
   [[nodiscard]] std::vector<OutlinedSection> getSections() const;
   /// The static ones, in their order, without the null symbol; good until the next read.
   [[nodiscard]] std::span<const OutlinedSymbol> getSymbols();
+  /// e_entry; 0 of an empty outline.
   [[nodiscard]] uint64_t getEntry() const;
   /// The attributes of the object as a whole; null if it has none, or if they were not wanted.
   [[nodiscard]] const FullAttr* getOwnAttributes() const;

@@ -137,6 +137,8 @@ public:
 
   /// Contents that stay outside of the model.
   [[nodiscard]] bool hasExternalContents() const { return m_HasExternalContents; }
+  /// `size` bytes that the function delivers; the handle is its first argument and stays its
+  /// owner's.
   void setExternalContents(ExternalDataFunction function, void* handle, uint64_t size);
 
   /// Relocations that apply to this section, static and dynamic together. What a file said becomes
@@ -147,8 +149,10 @@ public:
   [[nodiscard]] Relocation* getRelocation(uint32_t index);
   /// NoIndex for one that is not in the list.
   [[nodiscard]] uint32_t getRelocationIndex(const Relocation* relocation);
+  /// The others keep their order. Linear in the list, as is removing.
   void setRelocationIndex(Relocation* relocation, uint32_t index);
   void removeRelocation(Relocation* relocation);
+  /// Also those that are still rows, which never become objects then.
   void removeAllRelocations();
   [[nodiscard]] uint32_t getRelocationCount() const;
   [[nodiscard]] bool hasStaticRelocationsWithAddend() const;
@@ -176,6 +180,7 @@ public:
   [[nodiscard]] uint32_t getHostedSymbolCount() const { return m_HostedSymbols.getSize(); }
   [[nodiscard]] Symbol* getHostedSymbol(uint32_t index) const { return m_HostedSymbols[index]; }
   [[nodiscard]] uint32_t getHostedSymbolIndex(const Symbol* symbol) const;
+  /// Moves the symbol among those of this section; its place in the symbol table stays.
   void setHostedSymbolIndex(Symbol* symbol, uint32_t index);
   [[nodiscard]] uint32_t getHostedDynamicSymbolCount() const {
     return m_HostedDynamicSymbols.getSize();
@@ -256,6 +261,7 @@ private:
   const HostedViews& getHostedViewsByName();
 
   const char* m_Name = nullptr;
+  /// The fields of Elf64_Shdr, but for what has become a pointer.
   uint64_t m_Address = 0;
   uint64_t m_Size = 0;
   uint64_t m_Alignment = 0;
@@ -268,6 +274,7 @@ private:
   bool m_IsAuxiliary;
   bool m_IsRelocatable;
   bool m_HasExternalContents = false;
+  /// Whether the sorted views say what the lists do.
   bool m_AreHostedByOffsetUpToDate = false;
   bool m_AreHostedByNameUpToDate = false;
   bool m_AreRelocationsSorted = true;
@@ -278,6 +285,7 @@ private:
   DeferredContents* m_DeferredContents = nullptr;
   Group* m_Group = nullptr;
   Segment* m_Segment = nullptr;
+  /// Lists that most sections never fill, see LazyArray.
   LazyArray<Relocation*> m_Relocations;
   LazyArray<Relocation*> m_RelocationsSortedByOffset;
   LazyArray<RelocationSection*> m_StaticRelocationSections;
@@ -285,6 +293,7 @@ private:
   LazyArray<Section*> m_LinkingSections;
   LazyArray<Symbol*, 4> m_HostedSymbols;
   LazyArray<Symbol*, 4> m_HostedDynamicSymbols;
+  /// Made at the first query.
   HostedViews* m_HostedViews = nullptr;
 };
 

@@ -21,8 +21,10 @@ public:
   Segment(ObjectModule* objectModule, uint32_t type, uint64_t offset, uint64_t vaddr,
           uint64_t paddr, uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align);
 
+  /// PT_... and PF_...
   [[nodiscard]] uint32_t getType() const { return m_Type; }
   [[nodiscard]] uint32_t getFlags() const { return m_Flags; }
+  /// p_vaddr and p_paddr.
   [[nodiscard]] uint64_t getVirtualAddress() const { return m_VirtualAddress; }
   [[nodiscard]] uint64_t getPhysicalAddress() const { return m_PhysicalAddress; }
   /// p_memsz, in bytes.

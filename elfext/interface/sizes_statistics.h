@@ -14,7 +14,9 @@ namespace elfext {
 
 class ObjectModule;
 
-/// Bytes.
+/// Bytes. Code, literal pools and data in executable sections are told apart by mapping symbols; of
+/// read-write data there are two totals, as the file has it and as it is after loading; ZI data has
+/// no bytes in the file.
 struct SizesStatistics {
   uint64_t m_Code = 0;
   uint64_t m_LiteralPools = 0;

@@ -51,6 +51,7 @@ public:
   [[nodiscard]] Class getClass() const;
   /// st_size, in bytes.
   [[nodiscard]] uint64_t getSize() const { return m_Size; }
+  /// STT_..., STB_... and STV_...; values that have no name stay as the file has them.
   [[nodiscard]] uint32_t getType() const { return m_Type; }
   [[nodiscard]] uint32_t getBinding() const { return m_Binding; }
   [[nodiscard]] uint32_t getVisibility() const { return m_Visibility; }
@@ -95,6 +96,7 @@ public:
   /// Whether it does so from its start on, as that of any symbol but an absolute one must.
   [[nodiscard]] bool startsAsBuildAttributes() const;
 
+  /// The text is copied; null for none.
   void setName(const char* name);
   void setSize(uint64_t size);
   void setType(uint32_t type);
@@ -114,12 +116,16 @@ public:
   [[nodiscard]] const SymbolVersionRequirement* getVersionRequirement() const {
     return m_VersionRequirement;
   }
+  /// A version of the same module, for a symbol that is defined.
   void setVersionDefinition(const FileVersionDefinition* version, bool hidden);
+  /// The number that the symbol's word has, the version's name, and that of the file that should
+  /// have it; texts are kept as the module keeps names.
   void setVersionRequirement(uint32_t version, const char* versionName, const char* fileName,
                              bool hidden);
   void clearVersionDefinition();
   void clearVersionRequirement();
 
+  /// For the module's user, who says what it means; null at first, and again when that symbol goes.
   [[nodiscard]] Symbol* getAssociatedSymbol() const { return m_AssociatedSymbol; }
   /// One of the same module, or null.
   void setAssociatedSymbol(Symbol* symbol);

@@ -23,6 +23,7 @@ enum TargetKind : uint32_t {
   TargetKind_Further = 0x80000000,
 };
 
+/// A row of the table; texts are constants of the program.
 struct TargetEntry {
   const char* name;
   const char* base; ///< of the row that this one extends; null for none
