@@ -2,12 +2,12 @@
 //
 // Decides what two records are to each other: which one fits under the other, what they come to
 // together, and what can't be together at all. The archive groups members into variants by it, and
-// the union of tags asks whether two sets can be combined. All of it is arithmetic on the fields of
-// the record: sets are compared as bits, and each relation is asked of features, access words and
-// flags alike.
+// sets of tags ask whether they can be combined. All of it is arithmetic on the fields of the
+// record: sets are compared as bits, and each relation is asked of features, access words and flags
+// alike.
 //
-// A record may come from any text that a file has: bits that nobody has defined are left out of
-// comparisons.
+// A record may come from any text that a file has: feature bits that nobody has defined are left
+// out of comparisons.
 #include "elfext/interface/attribute_relations.h"
 
 #include <algorithm>

@@ -138,7 +138,7 @@ void printFlags(std::string& text, std::span<const FlagToken> rows, uint64_t fla
 } // namespace
 
 FullAttr parseAttributeString(std::string_view text) {
-  // Tokens add to the accesses that stand in no text.
+  // The accesses that printing leaves out are there from the start.
   FullAttr record = {.m_Access = LibraryFullAttr.m_Access};
   bool areFlagsTakenBack = false;
   forEachToken(text, [&](std::string_view token) {

@@ -2,8 +2,8 @@
 //
 // The chains of features, each from its lowest level to its highest.
 //
-// Both ways between tags and features, the completion of a set and the architecture's number walk
-// along them; feature_set.cpp checks that each level contains the one below.
+// Both ways between tags and features, the completion of a set and the architecture's number use
+// them; feature_set.cpp checks that each level contains the one below.
 #pragma once
 
 #include "elfext/interface/feature_set.h"

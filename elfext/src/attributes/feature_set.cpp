@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What features bring with them. A set that was put together from tokens or tags is completed here
-// before anybody compares it: comparisons look at bits alone and must find a level's lower levels
-// set. The rules are taken in one order and once each; a later one may count on what an earlier one
-// has brought.
+// What features bring with them. A set that was put together from tokens, or is left of a larger
+// one, is completed here before anybody compares or prints it: both look at bits alone and must
+// find a level's lower levels set. The rules are taken in one order and once each; a later one may
+// count on what an earlier one has brought.
 #include "elfext/interface/feature_set.h"
 
 #include "elfext/src/attributes/feature_chains.h"

@@ -81,8 +81,8 @@ bool PlacementNode::link(PlacementNode& first, PlacementNode& second, uint64_t d
 
 void PlacementNode::promoteLowestChild() {
   PlacementNode* lowest = m_FirstChild;
+  // The first of equally low ones, in the order of the list.
   for (PlacementNode* child = m_FirstChild; child != nullptr; child = child->m_NextSibling)
-    // The first of equally low ones, in the order of the list.
     if (child->m_Offset < lowest->m_Offset) lowest = child;
   const uint64_t distance = lowest->m_Offset;
   lowest->unhang();

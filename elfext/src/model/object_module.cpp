@@ -219,8 +219,8 @@ void ObjectModule::materializeAllRelocations() {
 // ---- Build attributes
 
 BuildAttributesCache& ObjectModule::getBuildAttributesCache() {
+  // Most modules never ask.
   if (m_BuildAttributesCache == nullptr)
-    // Most modules never ask.
     m_BuildAttributesCache = std::make_unique<BuildAttributesCache>();
   return *m_BuildAttributesCache;
 }

@@ -117,9 +117,9 @@ void Pruner::sweepRelocations() {
   for (Section* section : m_ObjectModule.m_Sections) {
     if (section->m_Goes) continue;
     section->materializeRelocations();
+    // One whose relocation section goes stays, but stands in no row any more.
     for (Relocation* relocation : section->m_Relocations.getSpan())
       if (relocation->m_Origin != nullptr && relocation->m_Origin->m_Goes)
-        // It stays, but there is no row that it stands in any more.
         relocation->m_Origin = nullptr;
     if (!m_SymbolsGo || section->m_Relocations.isEmpty()) continue;
     section->m_Relocations.removeIf([](const Relocation* relocation) {
@@ -206,8 +206,8 @@ void Pruner::sweepSections() {
         table->m_HashSection = nullptr;
     }
   for (Section* section : m_ObjectModule.m_Sections) {
+    // What goes lets go of the file that its contents are in, which may close it.
     if (section->m_Goes)
-      // Lets go of the file, which may close it.
       section->dropDeferredContents();
     else
       sweepSection(*section);

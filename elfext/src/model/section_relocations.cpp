@@ -157,8 +157,8 @@ bool Section::hasDynamicRelocationsWithoutAddend() const {
 
 uint32_t Section::countDynamicRelocations(bool isJumpSlot, bool hasAddend) {
   materializeRelocations();
+  // Relocation types are numbered by the machine.
   const uint32_t jumpSlot =
-      // Relocation types are numbered by the machine.
       m_ObjectModule->getMachine() == EM_ZEV ? R_ZEV_JUMP_SLOT : R_ZEV64_JUMP_SLOT;
   const auto isWanted = [=](const Relocation* relocation) {
     return relocation->isDynamic() && relocation->hasAddend() == hasAddend &&

@@ -85,8 +85,8 @@ public:
   // Gives each dynamic symbol the version that its word means.
   void apply(uint32_t symbolVersions, std::span<Symbol* const> symbols) {
     const uint8_t* words = symbols.empty() ? nullptr : m_Context.viewSection(symbolVersions);
+    // The checks have compared the words' count with that of the symbols.
     for (size_t i = 1; i < symbols.size(); ++i)
-      // The checks have compared the words' count with that of the symbols.
       applyTo(*symbols[i], m_Context.get<uint16_t>(words + 2 * i));
   }
 

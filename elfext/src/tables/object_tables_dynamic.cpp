@@ -63,8 +63,8 @@ std::optional<VersionTables> findVersions(const ObjectTables& tables, const Vers
                             .requirementCount = counts.requirements.value_or(0)};
   if (counts.definitions.has_value() != versions.definitions.has_value()) return std::nullopt;
   if (counts.requirements.has_value() != versions.requirements.has_value()) return std::nullopt;
+  // Two bytes a symbol. With another count there is no telling which word is whose.
   if (versions.symbolVersions && versions.dynamicSymbols &&
-      // Two bytes a symbol. With another count there is no telling which word is whose.
       tables.sectionHeaders[*versions.symbolVersions].size / 2 !=
           tables.rowCount(*versions.dynamicSymbols))
     return std::nullopt;

@@ -216,9 +216,9 @@ bool validateRoomForHeaders(ObjectModule& module, Segment& load) {
                                           uint64_t{module.getProgramHeaderEntrySize()} *
                                               module.getSegmentCount());
   uint64_t unmapped = load.getFileSize();
+  // A section within the segment starts no earlier than it.
   for (Section* section : module.getSections()) {
     if (section->getFileSize() != 0 && section->isWithin(load))
-      // A section within the segment starts no earlier than it.
       unmapped = std::min(unmapped, offsetOf(*section) - start);
   }
   const uint64_t needed = headersEnd - start;
