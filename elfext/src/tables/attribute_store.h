@@ -4,7 +4,7 @@
 // static symbols. They are those of a model, or of an object's tables, of which none is made.
 //
 // The reader of attributes works on this interface alone, so that both roads take the same steps
-// and give up at the same places. Its two halves are a module
+// and give up at the same places. There are two of them: a module
 // (reader/object_module_reader_attributes.cpp) and LooseAttributeStore.
 #pragma once
 
