@@ -2,6 +2,10 @@
 //
 // The objects that the comparison measures with: the same on every machine, good, and in the
 // shapes that they are said to have.
+//
+// Figures of different days and machines are compared by them, so an object that changes by one
+// byte must fail here, where it is a decision, and not show there, as a trend.
+
 #include "bench/compare/corpus.h"
 
 #include "tests/support/reader_fixture.h"

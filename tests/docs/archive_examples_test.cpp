@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The archives of docs/formats.md, as the archive library reads them.
+// The archives of docs/formats.md, as the archive library reads them: the bytes of each dump are
+// read without a report, told of field by field in the document's own words, and written back as
+// they were. A digit or word of the document that the code doesn't agree with fails here.
+
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"

@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The attribute sections and decoration symbols of docs/formats.md, as the object library reads
-// them.
+// them: byte for byte in both byte orders, the table of tags, and what a whole object comes to
+// whose sections or symbols say it. The test writes the document's text from what was found, and
+// compares.
+
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes_names.h"
 #include "elfext/interface/build_attributes_parsers.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The attribute texts and the maps of docs/formats.md, as the object library reads them.
+// The attribute texts and the maps of docs/formats.md, as the object library reads them: the lists
+// of tokens, what texts are read as and written as, and what maps say of names, the built-in one
+// included.
+
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/library_attribute_map.h"
 #include "elfext/src/attributes/attribute_tokens.h"

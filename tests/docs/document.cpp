@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Finding examples in the document and writing them anew. An example is a fenced block under a name
+// of its own, and there must be exactly one: a block that was renamed or doubled fails the test, so
+// that none silently goes unread. A dump has the offset in four columns, up to 16 bytes in
+// hexadecimal, and beside a field's first line what it means.
+
 #include "tests/docs/document.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A reader of via files for which every name is the same file, which comes in pieces.
+//
+// Pieces may have any size, so that the scanner meets each border between two reads; and a file
+// that names itself is met by any name.
+
 #pragma once
 
 #include "tabledrivenparser/interface/via_file_reader.h"

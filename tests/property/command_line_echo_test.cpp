@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What --show_cmdline says is a command line that does the same. Both are run by the tool, in
 // folders that are alike. The seeds are fixed: a failure comes back.
+//
+// Words have blanks, tabs, wildcards, separators and bytes above 127 in them, which is what an echo
+// could get wrong.
+
 #include "tests/support/object_builder.h"
 #include "tests/support/tool_folder.h"
 

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Random editing sequences against a plain list of names and bytes. The seeds are fixed: a failure
 // comes back.
+//
+// Each written file is taken apart by the strict parser of the archive builder, which knows nothing
+// of the library, and compared with the list; and a second write, or a rewrite with nothing to do,
+// gives the same bytes.
+
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"

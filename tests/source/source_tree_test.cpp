@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Rules of the house that no compiler checks.
+// Rules of the house that no compiler checks: who may include from whom, that the map leads to what
+// there is, licences, names of tests, that each message of the catalogue is reported by somebody,
+// and that the help knows each option. The rules are tables here; a new room is a row.
+
 #include "quarn/option_table.h"
 
 #include "messages/interface/catalogue.h"

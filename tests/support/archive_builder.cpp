@@ -1,4 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The archive format once more, from its description and not from the product: 60 bytes of header
+// in fields of 16, 12, 6, 6, 8, 10 and 2, contents, and a newline behind an odd size. Symbol tables
+// are filled in when the bytes are asked for, as the offsets of all members are known only then.
+// The parser is strict where the product's reader is patient: what the product writes must be plain
+// to any archiver.
+
 #include "tests/support/archive_builder.h"
 
 #include <cstdlib>
@@ -38,6 +45,7 @@ std::string lookUpName(std::string_view field, std::string_view longNames, std::
   if (field.size() > 1 && field.front() == '/') {
     const size_t start = std::strtoul(std::string(field.substr(1)).c_str(), nullptr, 10);
     const size_t end = longNames.find("/\n", start);
+    // An offset into the middle of a name would read as a shorter name, and pass.
     if (start > 0 && (start > longNames.size() || longNames.substr(start - 2, 2) != "/\n")) {
       error = "a long name's offset is not the start of an entry";
     }

@@ -5,6 +5,10 @@
 //   archive().symbolTable({{"alpha", "a.o"}}).member("a.o", "bytes").badDate("12x").bytes()
 //
 // It knows the format on its own account, and shares no line with the writer that it tests.
+//
+// Each fault is one call behind a good member, so that a test shows what is wrong in the place
+// where it says so. The unit tests of archives and driver and the systematic tests build with it.
+
 #pragma once
 
 #include "tests/support/bytes.h"

@@ -4,6 +4,11 @@
 //
 //   attributeSection({vendorPart("qobix", {filePart(tag(6, 10)), sectionPart({1, 4}, tag(30,
 //   2))})})
+//
+// The format: "A", then subsections of a length, a vendor's name and parts; a part is a kind (file,
+// sections, symbols), a size, indices ended by 0 where the kind has them, and attributes as tag and
+// value. Lengths count themselves. Whoever wants a wrong one writes the bytes around it himself.
+
 #pragma once
 
 #include "elfext/interface/build_attributes_tags.h"

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Texts as bytes and bytes as texts, for tests that write their inputs as strings, and the numbers
-// in these.
+// in these. Byte orders are spelled out, so that no test asks the code it tests for them.
+
 #pragma once
 
 #include <cstdint>

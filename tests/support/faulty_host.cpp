@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Every operation counts itself, and asks whether it is the one. What fails has done a part of its
+// work where a real one may have: half of the bytes of a read or a write, and a close that has
+// closed all the same. So a caller that believes the first half, or closes twice, is found out.
+
 #include "tests/support/faulty_host.h"
 
 #include <csignal>

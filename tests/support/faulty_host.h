@@ -3,6 +3,10 @@
 // A host on which one call goes wrong: the k-th, counted over all operations that can fail. Or a
 // signal comes in front of it, or somebody else does something to the files. All others go to the
 // host behind it.
+//
+// By going through k until a run makes fewer calls, a test sees the failure of every call that
+// there is, also of those that are added later.
+
 #pragma once
 
 #include "support/interface/host.h"

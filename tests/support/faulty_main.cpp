@@ -4,6 +4,10 @@
 // number of the call from 1 (0 or unset: none), QUARN_FAIL_ERROR the error number it fails with, or
 // QUARN_FAIL_SIGNAL the signal that comes with it instead.
 // At exit the number of calls that were made is written to the file QUARN_CALL_COUNT.
+//
+// It is a program of its own, so that signals end a real process and the temporaries of the real
+// host are looked for on a real disk.
+
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
 #include "tests/support/faulty_host.h"

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Files are shared by the map and by whoever has them open, so that a file that is replaced or
+// removed lives on for its readers, as on a real disk. A name is any text; folders are known by
+// what names begin with, and are listed backwards, so that a caller who relies on the host's order
+// is found out.
+
 #include "tests/support/memory_host.h"
 
 #include <algorithm>
@@ -133,6 +139,7 @@ HostError MemoryHost::readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t
 
 HostError MemoryHost::write(FileHandle file, std::span<const uint8_t> bytes) {
   File& target = *m_Open.at(static_cast<size_t>(file.number));
+  // What fits is written, as a disk does that fills up in the middle of a write.
   const uint64_t fitting = std::min<uint64_t>(bytes.size(), m_Room.value_or(bytes.size()));
   target.bytes.append(reinterpret_cast<const char*>(bytes.data()), static_cast<size_t>(fitting));
   if (m_Room) *m_Room -= fitting;

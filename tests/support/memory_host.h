@@ -2,6 +2,10 @@
 //
 // A host whose files are a map in memory. Tests look at every byte of it, give it a disk that fills
 // up, and make it tell of files that no real disk should have to hold.
+//
+// Inodes count up, so a file put in another's place is another file even with the same bytes; times
+// and sizes can be told wrongly, as they are when somebody else is at work.
+
 #pragma once
 
 #include "support/interface/host.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A fresh message library for each test, with strings for its streams and an exception for the end
-// of the process.
+// of the process. Each write is kept by itself, so that a test can count them; a sink can be made
+// to fail from any moment on.
+
 #pragma once
 
 #include "messages/interface/messages.h"

@@ -1,4 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From the description of an object to its bytes, in both classes and byte orders. First all
+// contents are put together, since putting a name may make a string table grow; then they are
+// placed, each at a multiple of the class's word; then headers are written, in which every told
+// value stands in place of the right one. The records are written from their description (field,
+// width, order), and share nothing with the product's but the constants' names.
+//
+// The layout is made anew by each question about it: tests ask little, and what was told in between
+// counts.
+
 #include "tests/support/object_builder.h"
 
 #include "elfext/interface/elf_constants.h"
@@ -123,6 +133,7 @@ struct ObjectBuilder::Layout {
   uint32_t textPlace(uint32_t table, const std::string& text) {
     if (text.empty() || table >= contents.size()) return 0;
     std::string& bytes = contents[table];
+    // A table whose bytes the test has given itself stays as it is.
     if (!mayGrow[table]) {
       const size_t found = findText(bytes, text);
       return found == std::string::npos ? 0 : static_cast<uint32_t>(found);
@@ -337,6 +348,7 @@ std::string ObjectBuilder::bytes() const {
     putSectionHeader(text, i, layout);
   text += m_Tail;
   for (const auto& [position, value] : m_Overwritten)
+    // Last of all, and within the file: a position outside is a fault of the test.
     text.at(position) = static_cast<char>(value);
   return text;
 }

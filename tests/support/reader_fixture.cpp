@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The object is read as a member from the middle of a file, between other bytes, so that a read
+// beyond its ends gives rubbish and not an error. Each failed read must leave an empty module; the
+// tests of one fault read twice, with a handler that refuses and one that goes on, since both
+// answers are part of the promise.
+
 #include "tests/support/reader_fixture.h"
 
 namespace elfext {

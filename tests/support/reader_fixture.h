@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Reads objects that a builder describes, and keeps what is reported of them.
+// Reads objects that a builder describes, and keeps what is reported of them: one fault in an
+// otherwise good object, and the exact text that it costs. A fault is final, and reported alone
+// whatever the handler answers, or mended, and then the object is there for who wants to go on.
+// EachFormTest runs in both classes and byte orders.
+
 #pragma once
 
 #include "elfext/interface/auxiliary_sections.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// An archive's error handler that keeps what it was told, and answers as it was told to.
+// An archive's error handler that keeps what it was told, and answers as it was told to. Three
+// answers cover the contract of the handler: always no, yes where the tool says yes, and yes
+// wherever there is any way on.
+
 #pragma once
 
 #include "arlib/interface/error_handler.h"

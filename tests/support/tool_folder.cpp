@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Runs are processes of their own, so that what the tool does to itself at its end (and it always
+// ends by an exit) leaves the test alone. A forked run starts with the test's own memory: fast, and
+// good for thousands of runs, but no measure of memory; the real program is started by execv. Every
+// run has an alarm, since a hang must fail and not stop the suite.
+
 #include "tests/support/tool_folder.h"
 
 #include "quarn/start_up.h"

@@ -3,6 +3,10 @@
 // A folder on disk in which the tool is run. `run` runs the driver in a process of its own, made by
 // fork alone, so that thousands of runs take seconds; `runProgram` starts the real program, and
 // `runOnFaultyHost` the one with the faulty host.
+//
+// What the runs print goes to a second folder, so that the first one holds nothing but what the
+// tool has made: a temporary that is left behind shows.
+
 #pragma once
 
 #include <cstdint>

@@ -3,6 +3,10 @@
 // Many runs of the tool at once on one library, as a parallel build starts them. Each puts one file
 // in; all succeed, and the library has all of them, whoever made it. QUARN_CONCURRENT_ROUNDS says
 // how often, for a longer look than the suite takes.
+//
+// What it looks for: an update that is lost because two have read the same library, a reader that
+// finds half a library, and a run that waits for ever.
+
 #include "tests/support/archive_builder.h"
 #include "tests/support/tool_folder.h"
 

@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The library on every damaged form of a good archive: what can be read can be written, and what
 // was written can be read again.
+//
+// Damaged forms: every prefix, and every byte of headers and tables set to 0x00, 0xFF and its
+// complement (damaged_archives.h). It never matters here which report comes, but that nothing
+// beyond the bytes is looked at, and that what passes for an archive is one.
+
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"

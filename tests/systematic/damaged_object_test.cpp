@@ -1,8 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Every prefix of three small objects that have everything, and each of their bytes set to 0x00,
 // 0xFF and its complement: the tool never crashes or hangs on them, says of each one thing that it
 // knows to say or nothing, and keeps it byte for byte. Many damaged objects are members of one
 // archive, so that one run meets them all.
+//
+// A damage stands for what becomes of files: a download that was cut, a disk that lies, a linker
+// that was killed, somebody who tries what happens.
+
 #include "elfext/interface/elf_constants.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"

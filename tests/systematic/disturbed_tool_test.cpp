@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The tool while somebody else is at work on the archive: in front of each of its host calls in
 // turn he writes to it, cuts it short, or makes it.
+//
+// Whatever the moment, the run tells of one state of the archive, or ends with an error; a writing
+// run never replaces what it has not read. The moment is the k-th host call, for every k, by the
+// faulty host's disturbance.
+
 #include "tests/support/archive_builder.h"
 #include "tests/support/faulty_host.h"
 #include "tests/support/object_builder.h"

@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The library with each host call failing in turn, and with the disk full after any number of
 // bytes: the old archive whole or the new one complete, nothing left behind, and a report.
+//
+// The call is the k-th, for every k until a run needs no more; the disk takes n bytes, for n up to
+// all that are needed. The product's own promise that the old archive survives is nothing but this.
+
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"

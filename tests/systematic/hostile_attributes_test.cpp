@@ -1,8 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Objects of about a megabyte whose build attributes were made to keep the tool busy: runs that
 // are for thousands of sections, lists that are copied for each of them, texts that share their
 // bytes. Whether attributes are asked for or not, each is read or refused in little time and
 // memory.
+//
+// A section of attributes may name thousands of owners in a few bytes each, and each owner gets a
+// set: what is copied for each of them, or joined pair by pair, shows here as seconds.
+
 #include "tests/support/attribute_bytes.h"
 #include "tests/systematic/hostile_object.h"
 

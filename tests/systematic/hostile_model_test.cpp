@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Objects of a few megabytes that were made to keep busy who has a model of them: what is asked of
 // all sections, segments or relocations of one, or of long lists, takes little time.
+//
+// The tool makes no model; these are for other users of the library, who ask it the questions that
+// are not met while reading.
+
 #include "alloclib/interface/session.h"
 #include "elfext/interface/auxiliary_sections.h"
 #include "elfext/interface/build_attributes.h"

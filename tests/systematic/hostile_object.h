@@ -2,6 +2,11 @@
 //
 // What the tests with hostile objects share: the object is inserted by the real program, which must
 // not take long nor much memory.
+//
+// Each object is good enough to be read far, and multiplies something: rows that share bytes, lists
+// that name each other, counts that promise more. One second, and 64 MiB beyond its size, are far
+// above what the tool needs, and far below what anything quadratic would take.
+
 #pragma once
 
 #include "elfext/interface/elf_constants.h"

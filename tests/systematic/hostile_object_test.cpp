@@ -1,7 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Objects of about a megabyte that were made to keep the tool busy: tables that lie over one
 // another, lists of lists, names that all are the same half megabyte, counts beyond all numbers.
 // Each is read or refused in little time and memory, and is a member like any other.
+//
+// Each object has a name for what it multiplies, and the report that it costs, if any. It is
+// inserted and reported on by the real program, with a bound on time and memory (hostile_object.h),
+// and compared on both roads.
+
 #include "elfext/interface/elf_constants.h"
 #include "tests/systematic/hostile_object.h"
 

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The tool on every damaged form of a good archive: it never crashes or hangs, every line it prints
 // is one of its reports, and the file is as it was when the run failed.
+//
+// The forms are those of damaged_archives.h; for each of them the tool lists, extracts and edits.
+
 #include "tests/support/tool_folder.h"
 #include "tests/systematic/damaged_archives.h"
 

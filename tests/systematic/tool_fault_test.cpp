@@ -1,7 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The tool with each of its host calls failing in turn, or interrupted by a signal: the old archive
 // whole or the new one complete, extracted files whole or absent, no temporary left, and an error
 // told whenever what was asked for was not done.
+//
+// It is the fault test of the library once more, from the command line down: the real program on
+// the faulty host, its exit status, what it says and what is on disk afterwards.
+
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
 #include "tests/support/tool_folder.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Objects as compilers write them come to the same in their tables and as a model.
+//
+// Objects as compilers write them come to the same in their tables and as a model. They lie in
+// tests/objects; hostile and damaged ones are compared by the tests of those.
+
 #include "tests/systematic/two_roads.h"
 
 #include <gtest/gtest.h>
