@@ -2,8 +2,9 @@
 //
 // The bytes of attribute sections, piece by piece:
 //
-//   attributeSection({vendorPart("qobix", {filePart(tag(6, 10)), sectionPart({1, 4}, tag(30,
-//   2))})})
+//   const AttributePart file = filePart(tag(6, 10));
+//   const AttributePart sections = sectionPart({1, 4}, tag(30, 2));
+//   attributeSection({vendorPart("qobix", {file, sections})})
 //
 // The format: "A", then subsections of a length, a vendor's name and parts; a part is a kind (file,
 // sections, symbols), a size, indices ended by 0 where the kind has them, and attributes as tag and

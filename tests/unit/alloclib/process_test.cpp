@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The life of the region system, its default parents and its handlers.
+// The life of the region system, its default parents and its handlers. The two orders that go wrong
+// in practice are held first: work before the start, and an end while a region lives. Faults end
+// the process, so they are looked for in one of its own, by status and by what it says.
 
 #include "region_fixture.h"
 

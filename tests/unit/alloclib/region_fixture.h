@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What the region tests share: the region system's life around each test, a parent that writes
-// down what is asked of it, and a look inside the regions.
+// What the region tests share: the region system's life around each test, a parent that writes down
+// what is asked of it, and a look inside the regions. Sizes of blocks and the state behind the
+// inline path are promises too, which no client can see from outside.
 
 #pragma once
 

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The general region: its thresholds, its reuse of discarded memory, and its states.
+// The general region: its thresholds, its reuse of discarded memory, and its states. The thresholds
+// are tested on both sides (10239 and 10240 bytes, 120 and 128), and blocks of many generated
+// sequences must never overlap. Sizes near the end of the type must be out of memory and never
+// wrap.
 
 #include "region_fixture.h"
 

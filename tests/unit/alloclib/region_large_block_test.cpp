@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The page allocator: its map, its search, its chunks and its overflow.
+// The page allocator: its map, its search, its chunks and its overflow. Runs are asked for across
+// every border that there is: words, half words, chunks, the end of the map; and pages that a
+// client gives back wrongly must be named, not taken.
 
 #include "region_fixture.h"
 

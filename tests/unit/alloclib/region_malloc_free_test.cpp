@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The root region.
+// The root region: what it counts, how it aligns, and how it refuses what the host cannot have. Its
+// balance is how a forgotten block is found at all.
 
 #include "region_fixture.h"
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Objects and texts in regions.
+// Objects and texts in regions: made from their arguments, aligned for their type, and with a NUL
+// behind a text whatever it holds.
 
 #include "alloclib/interface/region_objects.h"
 

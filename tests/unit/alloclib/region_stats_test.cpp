@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The records: counts, trace lines, the two lists and the report.
+// The records: counts, trace lines, the two lists and the report. The report is compared to the
+// letter, as its columns are its format; lists that were written over must be a fault and not a
+// crash.
 
 #include "region_fixture.h"
 

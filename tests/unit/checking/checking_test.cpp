@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The levels, their text form, and what an assertion does.
+// The levels, their text form, and what an assertion does: which texts of --db_check are taken and
+// which leave the level alone, that an expression above the level is never evaluated, and that
+// nothing runs on behind a failed one, whatever its handler does.
 
 #include "checking/interface/checking.h"
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The count of evaluated assertions; this program is built with the counting macro.
+// The count of evaluated assertions; this program is built with the counting macro. The order of
+// the report is part of the promise: by falling count, and then by place.
 
 #include "checking/interface/checking.h"
 

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Keys, texts and the choice of a language.
+//
+// Keys, texts and the choice of a language. Both catalogues are held against each other, row by
+// row: the same keys, the same arguments, the same lines and options in the help. Texts that
+// scripts read are compared to the letter.
+
 #include "messages/interface/catalogue.h"
 
 #include "messages/interface/format.h"

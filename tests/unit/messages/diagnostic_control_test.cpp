@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the user's severities do to messages, and what they cannot do.
+//
+// What the user's severities do to messages, and what they cannot do: no error becomes less, no
+// remark more, and no number leads out of the table. Elements come from command lines, so the bad
+// ones are tested as well as the good.
+
 #include "messages/interface/diagnostic_control.h"
 
 #include "tests/support/messages_fixture.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The formatter, against the C library's own where that can be asked.
+//
+// The formatter, against the C library's own where that can be asked; and what that leaves open:
+// arguments that don't fit, positions mixed with turns, widths beyond all numbers. Whatever a
+// format says, only arguments that were passed are read.
+
 #include "messages/interface/format.h"
 
 #include "messages/src/format_reader.h"

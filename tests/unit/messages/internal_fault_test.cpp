@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Faults of the program: their line, their number, and that they end the run.
+//
+// Faults of the program: their line, their number, and that they end the run. Those of the checking
+// and region libraries must come this way too, and a fault in reporting a fault must not go round
+// in circles.
+
 #include "alloclib/interface/handlers.h"
 #include "checking/interface/checking.h"
 #include "tests/support/messages_fixture.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// --message_locale on a real command line.
+//
+// --message_locale on a real command line: it holds from its place on, and a name that is no
+// language ends the run with that name in the message.
+
 #include "messages/interface/locale_listener.h"
 
 #include "alloclib/interface/process.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The order of the two streams, their failures, and the way out.
+//
+// The order of the two streams, their failures, and the way out. On pipes and files of its own it
+// meets what tools are started with: streams that are closed from the start, a reader that is gone
+// or slow, a disk that is full, an interruption. Control bytes in names come out as numbers.
+
 #include "messages/interface/output.h"
 
 #include "messages/src/descriptor_sink.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// How diagnostics look, are counted, and end the run.
+//
+// How diagnostics look, are counted, and end the run: each prefix of each style, locations as far
+// as they are known, texts from outside that hold conversions or control bytes, and the error that
+// is one too many.
+
 #include "tests/support/messages_fixture.h"
 
 namespace messages {

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What the archive library's failures read like to the user, as far as no command leads to them.
+// With the user's leave each clash is listed; without it the warnings stand alone.
+
 #include "quarn/arlib_error_handler.h"
 
 #include "arlib/interface/archive.h"

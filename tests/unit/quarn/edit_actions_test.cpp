@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Moving and deleting members, and the tables that an edit leaves.
+// Moving and deleting members, and the tables that an edit leaves: where each word's members go,
+// what happens if one is not there, and in which runs a symbol table is made.
+
 #include "tests/unit/quarn/driver_fixture.h"
 
 namespace quarn {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Which files on disk a word stands for.
+// Which files on disk a word stands for: patterns and plain words, in which order their files come,
+// and when a pattern is left as it is.
+
 #include "quarn/file_list.h"
 
 #include "tests/unit/quarn/driver_fixture.h"

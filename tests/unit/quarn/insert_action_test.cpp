@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What goes into an archive: where it stands, what it replaces, and what its header says.
+// What goes into an archive: where it stands, what it replaces, and what its header says. Dates of
+// members and files decide in the update modes; a file that is not there must leave the old archive
+// as it was.
+
 #include "tests/unit/quarn/driver_fixture.h"
 
 namespace quarn {

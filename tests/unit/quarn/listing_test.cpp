@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The lines of a table of contents.
+// The lines of a table of contents, to the letter, in the short form and the long one: order,
+// columns, permissions, and dates in local time.
+
 #include "tests/unit/quarn/driver_fixture.h"
 
 #include <cstdlib>

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Dates in local time, as a listing shows them. A date is broken down once for all members that
+// have it, so many dates in any order, most of them twice, are held against the host's own answers,
+// in several time zones and around the change of an offset; and numbers that are no date have no
+// text.
+
 #include "quarn/local_dates.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Members looked up by name, some of which this run has replaced.
+// Members looked up by name, some of which this run has replaced: the sorted view must give what a
+// walk through the archive would, also after it has grown.
+
 #include "quarn/member_names.h"
 
 #include "arlib/interface/archive_file_reader.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Which members a word means.
+// Which members a word means: names and patterns in any letter case, folders in front that don't
+// count, words that mean nothing, and that the archive's own tables are never meant by a name.
+
 #include "quarn/member_selection.h"
 
 #include "arlib/interface/archive_file_reader.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What a command line comes to, as settings.
+// What a command line comes to, as settings: one action, how much of the archive it touches, where
+// things go, and what holds of two options that contradict each other, in whichever order they
+// stand.
+
 #include "quarn/process_options.h"
 
 #include "quarn/option_listeners.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What keeps a run from working, and in which order it is told.
+// What keeps a run from working, and in which order it is told: help, missing words, bad options,
+// an archive that is not there or not to be written. In each of these the archive must be as it
+// was, with nothing open and no temporary left.
+
 #include "tests/unit/quarn/driver_fixture.h"
 
 namespace quarn {

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Questions about files.
+//
+// Questions about files, on a host in memory that lists its folders backwards: answers must not
+// depend on the host's order, and a host that can't tell must count as nothing there.
+
 #include "support/interface/host_files.h"
 
 #include "tests/support/faulty_host.h"

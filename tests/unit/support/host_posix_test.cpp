@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The host that the process runs on, in a folder of its own.
+//
+// The host that the process runs on, in a folder of its own: real files, links, FIFOs, signals and
+// limits. What it promises is what the rest builds on: no call waits for a FIFO's other end, a
+// temporary is made only where nothing is, and none outlives a signal.
+
 #include "support/interface/host.h"
 
 #include "tests/support/bytes.h"

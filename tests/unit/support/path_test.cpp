@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Taking file names apart and putting them together again.
+//
+// Taking file names apart and putting them together again, in both styles: a POSIX name comes back
+// byte for byte, and a leaf is cut where it is longer than a component may be.
+
 #include "support/interface/path.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Patterns with "*" and "?".
+//
+// Patterns with "*" and "?": by cases, against the definition on all short words of a small
+// alphabet, and with many stars, which must not take longer than anyone waits.
+
 #include "support/interface/pattern.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Reading ahead: what is asked of the file, and how often.
+//
+// Reading ahead: what is asked of the file, and how often. The file is on a host in memory that
+// counts its reads; bytes must be the same in whatever order they are looked at, and an error must
+// leave nothing behind that looks like bytes.
+
 #include "support/interface/read_window.h"
 
 #include "tests/support/faulty_host.h"

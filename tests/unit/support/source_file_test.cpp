@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Files that are opened once, whatever their names lead to later.
+//
+// Files that are opened once, whatever their names lead to later: replaced, removed, written to, or
+// closed in between because others wanted room. Each must stay the file that it was, or fail with
+// ESTALE; the host in memory plays who is at work on them.
+
 #include "support/interface/source_file.h"
 
 #include "tests/support/faulty_host.h"

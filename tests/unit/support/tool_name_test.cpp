@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The tool's name from the name of its program file.
+//
+// The tool's name from the name of its program file: extensions, separators, the letters in front
+// that don't count, and arguments that are missing, empty or too long.
+
 #include "support/interface/tool_name.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The banner and the version number, also in the forms that this build doesn't have.
+//
+// The banner and the version number, also in the forms that this build doesn't have: the data are
+// an argument, so that an engineering release and missing or odd parts can be shown.
+
 #include "support/interface/version_banner.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Options whose handler takes the words itself.
+//
+// Options whose handler takes the words itself: all it may answer, and what the parser makes of
+// each answer.
+
 #include "type_table.h"
 
 #include "tabledrivenparser/interface/call_back_handler.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Words that come close to more than one row, or to another way of writing one.
+//
+// Words that come close to more than one row, or to another way of writing one: a longer match
+// wins, and what stays ambiguous means nothing.
+
 #include "tool_table.h"
 
 namespace tabledrivenparser::tool {

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The command line as it is written again.
+//
+// The command line as it is written again. At the end, 4000 generated command lines must mean the
+// same when their echo is parsed: words with blanks, letters with arguments behind them, lists,
+// names that only look like options.
+
 #include "tool_table.h"
 #include "type_table.h"
 

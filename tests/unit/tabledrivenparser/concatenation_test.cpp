@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Letters that share a dash.
+//
+// Letters that share a dash: which options they set, what is said of a letter that comes twice, and
+// words of any length, in time that grows with it.
+
 #include "tool_table.h"
 
 namespace tabledrivenparser::tool {

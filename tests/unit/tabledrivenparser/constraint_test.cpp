@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// What an option accepts beyond its type.
+//
+// What an option accepts beyond its type: ranges and patterns, restricted or not, for single
+// values, elements of lists and implied values; and that the order is constraint, validator,
+// listener.
+
 #include "type_table.h"
 
 namespace tabledrivenparser::types {

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Options that take a name from a list.
+//
+// Options that take a name from a list: in any letter case, whole names only, restricted and
+// deprecated ones, and the list that enumerator 0 shows.
+
 #include "type_table.h"
 
 namespace tabledrivenparser::types {

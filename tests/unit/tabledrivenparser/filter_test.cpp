@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Parsing for some options only.
+//
+// Parsing for some options only, as a client does that looks at a command line twice: the others
+// are passed over without a word, and bad arguments of the listed ones are still told.
+
 #include "tool_table.h"
 
 namespace tabledrivenparser::tool {

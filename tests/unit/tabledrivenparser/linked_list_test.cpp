@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The list behind vector values: its order, its search, and removal, after which the first element
+// must lie in the list object again, also when nothing is left.
+
 #include "parser_session.h"
 
 #include "tabledrivenparser/interface/linked_list.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Numbers in arguments.
+//
+// Numbers in arguments: which texts are numbers, decimal and hexadecimal, with signs and white
+// space; which are none; and that what doesn't fit its type is an overflow and never cut.
+
 #include "type_table.h"
 
 namespace tabledrivenparser::types {

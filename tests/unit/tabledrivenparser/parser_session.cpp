@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The session behind the parser tests. Every word lies in a block of its own on the heap, so that a
+// sanitizer sees a step beyond its end; what was reported is kept as a user would read it.
+
 #include "parser_session.h"
 
 #include "tabledrivenparser/interface/option_report.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A parser with everything round it: files in memory, a reporter that keeps each message as the
-// line that a user would read, and a listener that writes down what it hears.
+// line that a user would read, and a listener that writes down what it hears. Tests compare those
+// lines, so that each text and each argument's place in it is part of what they hold.
+
 #pragma once
 
 #include "alloclib/interface/region.h"

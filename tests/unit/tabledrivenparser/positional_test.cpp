@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Words without dashes, and the mark that ends the options.
+//
+// Words without dashes, and the mark that ends the options: their order, empty ones, a single dash,
+// and words behind "--" that look like options.
+
 #include "tool_table.h"
 
 namespace tabledrivenparser::tool {

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Which row a word means.
+//
+// Which row a word means: letter case, "-" for "_", abbreviation by a dot, one dash or two, old
+// syntax under each policy, arguments behind a name or in the next word, and words that mean
+// nothing, with bytes of any kind in them.
+
 #include "tool_table.h"
 
 #include "tabledrivenparser/interface/fallback_handler.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The checks that clients make at compile time.
+//
+// The checks that clients make at compile time, mostly as static assertions: good tables pass, and
+// each of the bad ones is bad in one way, by which some row would never be found.
+
 #include "tool_table.h"
 #include "type_table.h"
 

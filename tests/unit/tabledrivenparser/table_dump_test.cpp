@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// The dump of the tables.
+//
+// The dump of the tables, to the letter, with values of every type, set and unset, and a type that
+// there is not.
+
 #include "type_table.h"
 
 #include "tabledrivenparser/interface/call_back_handler.h"

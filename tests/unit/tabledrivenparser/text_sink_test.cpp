@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The bounded text: that it counts on when it is full and writes nothing behind its end, where
+// separators stand, and which values get quotes.
+
 #include "tabledrivenparser/interface/text_sink.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// A table like that of an archive tool: letters and long names, twins in both cases, old syntax.
+//
+// A table like that of an archive tool: letters and long names, twins in both cases, old syntax. It
+// is the tests' own, so that a new option of the tool changes nothing here.
+
 #pragma once
 
 #include "parser_session.h"

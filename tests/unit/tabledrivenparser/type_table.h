@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A table with an option of every type: each with a flag form, where its type has one, and a form
-// that takes an argument.
+// that takes an argument. It is for what a table may hold and the tool's has not.
+
 #pragma once
 
 #include "parser_session.h"

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Values: their defaults, their counters, who else may take them, and how they end.
+//
+// Values: their defaults, their counters, who else may take them, and how they end. Each kind of
+// default is tested, with restrictions and without.
+
 #include "type_table.h"
 
 namespace tabledrivenparser::types {

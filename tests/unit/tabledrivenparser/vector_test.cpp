@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// Options that collect values.
+//
+// Options that collect values: where arguments are split and where not, empty pieces, pieces that
+// are none, and that neither the argument nor the default list is changed by it.
+
 #include "type_table.h"
 
 namespace tabledrivenparser::types {

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Via files as a part of the command line.
+//
+// Via files as a part of the command line: nesting and its bound, what an option at a file's end
+// gets, every failure of a file and what was done before it, and a file of a hundred thousand
+// words. Files are in memory, and on disk where the C library's streams are tested.
+
 #include "tool_table.h"
 
 #include "tabledrivenparser/interface/stdio_via_file_reader.h"

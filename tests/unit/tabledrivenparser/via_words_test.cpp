@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// How the text of a via file falls into words.
+//
+// How the text of a via file falls into words: quotes, parentheses, backslashes, comments, line
+// ends, and words as long as the buffer. The reader gives pieces of any size, so that each border
+// between two reads is met; a NUL is found before any word of its piece.
+
 #include "tool_table.h"
 
 #include "tabledrivenparser/interface/dummy_via_file.h"
