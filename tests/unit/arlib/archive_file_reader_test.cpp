@@ -1,6 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Reading an archive's headers, and what each fault in them comes to: with a handler that goes on
 // where it can, with one that gives up, and with none.
+//
+// Archives come from the archive builder, with one fault each in a good one, on a host in memory
+// that counts what is read: getting past a member must cost its header and not its body. A name, a
+// number or a table may be anything; what is taken is what a strict look at the bytes would find.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>

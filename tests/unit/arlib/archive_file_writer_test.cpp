@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Writing an archive: the bytes of the file, and every step that can go wrong.
+//
+// Writing an archive: the bytes of the file, and every step that can go wrong. The result is taken
+// apart by the builder's own parser; a target that must not be replaced (a folder, a device, a
+// read-only file) and a layout that has no room in 32 bits must be refused, and leave the old file.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>

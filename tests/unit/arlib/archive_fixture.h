@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// An archive on a host in memory, with a handler that remembers what it was told.
+// An archive on a host in memory, with a handler that remembers what it was told. Each read is done
+// once more with the symbols not wanted, and must come to the same; each test ends with no file
+// left open.
+
 #pragma once
 
 #include "arlib/interface/archive.h"

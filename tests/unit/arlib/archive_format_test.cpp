@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Numbers and headers of the file format.
+//
+// Numbers and headers of the file format, both ways. Fields are texts that anybody may have
+// written: blanks, missing digits, digits beyond the base and numbers beyond 32 bits must come to
+// the stated answer and never to a wrapped number.
+
 #include "arlib/interface/archive_format.h"
 
 #include <gtest/gtest.h>

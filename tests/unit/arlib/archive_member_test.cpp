@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// One member: its contents, wherever they are, and what edits of it make stale.
+//
+// One member: its contents, wherever they are (the archive, a file, memory, a temporary), and what
+// edits of it make stale. Files go, shrink and fail under it: contents are whole, or reported as
+// lost, and no temporary stays behind.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-// What a member is, and what its type can tell.
+//
+// What a member is, and what its type can tell: the kinds are one object each, compared by
+// identity, and decided by the bytes, wherever these are.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 namespace arlib {

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The list of members and the list of symbols: adding, removing, moving, finding.
+//
+// The list of members and the list of symbols: adding, removing, moving, finding. What can't be a
+// member (no regular file, numbers that don't fit, a piece outside its file) must leave the list as
+// it was.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The two tables that are derived from the members: when they are rebuilt, what they hold, where
-// they stand.
+// they stand. An edit that makes one stale and a rebuild that forgets it would lead a linker to
+// wrong members.
+
 #include "elfext/interface/elf_constants.h"
 #include "tests/unit/arlib/archive_fixture.h"
 

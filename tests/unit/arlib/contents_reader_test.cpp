@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Reading contents in pieces.
+//
+// Reading contents in pieces, of members in files and in memory, small and large. A file that
+// fails, ends too early or was written to meanwhile must be reported; half a member must never pass
+// for a whole one.
+
 #include "arlib/interface/contents_reader.h"
 
 #include "tests/unit/arlib/archive_fixture.h"

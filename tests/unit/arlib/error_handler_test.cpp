@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The words and the severity of every failure, for clients that only override `report`.
+//
+// The words and the severity of every failure, for clients that only override `report`. Users and
+// scripts know these texts, so each is compared to the letter, with and without the parts that may
+// be unknown.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>

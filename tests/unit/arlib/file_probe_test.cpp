@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The one look at a file that decides whether and as what it is taken.
+//
+// The one look at a file that decides whether and as what it is taken: an archive by its magic, an
+// object by its first bytes, and nothing that is no regular file. The file that was looked at is
+// the one that is used.
+
 #include "arlib/interface/file_probe.h"
 
 #include "tests/unit/arlib/archive_fixture.h"

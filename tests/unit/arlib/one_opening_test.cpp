@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // Somebody else is at work on the same files: what comes out is of one state of them, or an error.
+// The host in memory replaces, removes, writes to, cuts and extends files between the steps of a
+// run.
+
 #include "alloclib/interface/process.h"
 #include "arlib/interface/contents_reader.h"
 #include "tests/unit/arlib/archive_fixture.h"

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // What the rebuild of the symbol table makes of objects: builds of one module, members that can't
-// be read, attributes, and which of the symbols then fit best.
+// be read, attributes, and which of the symbols then fit best. Objects come from the object
+// builder; groups of builds are held against comparing each member with each, and a library made to
+// be slow must not be.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include "arlib/src/minor_variants.h"

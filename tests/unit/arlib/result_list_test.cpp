@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The small lists: search results, and the names that an object publishes.
+//
+// The small lists: search results, and the names that an object publishes. A few elements lie
+// inside the list and the rest in its overflow; the border between the two is where they could get
+// lost.
+
 #include "arlib/interface/result_list.h"
 
 #include "arlib/interface/name_order.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Decoding the symbol table.
+//
+// Decoding the symbol table: a count, as many offsets, as many names. The count may be any number,
+// offsets may lead to no member or into a table, and names may be cut off: what can be told is
+// told, and what is left is right.
+
 #include "tests/unit/arlib/archive_fixture.h"
 
 namespace arlib {

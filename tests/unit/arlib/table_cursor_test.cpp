@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // The way through a symbol table, in memory and in a file, and archives whose symbols nobody wants.
+// Names longer than what is read at a time, names without an end and files that fail at any read
+// must come to the same in both.
+
 #include "arlib/src/table_cursor.h"
 
 #include "tests/support/faulty_host.h"

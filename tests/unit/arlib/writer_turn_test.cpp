@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Writers of one archive take turns, and none replaces what it has not read.
+//
+// Writers of one archive take turns, and none replaces what it has not read. The host's answer to a
+// lock is the moment in which somebody else has replaced, removed or written to the archive; what
+// is there when the turn has come is what the run reads.
+
 #include "arlib/interface/writer_turn.h"
 
 #include "tests/unit/arlib/archive_fixture.h"
