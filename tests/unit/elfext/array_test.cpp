@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What both families' arrays promise.
+// What both families' arrays promise: growth, insertion of an element of their own while they grow,
+// removal, sorting; and against a plain list under random editing with a fixed seed. A position
+// outside is an assertion.
 
 #include "elfext/interface/array.h"
 

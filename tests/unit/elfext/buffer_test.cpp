@@ -2,6 +2,10 @@
 //
 // Buffers in each of their modes: own bytes, a view of somebody else's, an image not yet looked
 // at, and data outside of the model.
+//
+// Offsets and sizes near the end of their types must be refused and never wrap; borrowed bytes must
+// stay as they are until the first change, which copies them.
+
 #include "elfext/interface/buffer.h"
 
 #include "module_fixture.h"

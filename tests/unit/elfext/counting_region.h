@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What the container tests share: a region that knows each of its blocks, and the way to expect a
-// failed assertion.
+// failed assertion. Fresh memory is full of rubbish, so that a container that relies on zeros
+// fails; a block that comes back with another size than it was asked for fails, too.
 
 #pragma once
 

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Contents that stay in a file until they are asked for, and the file that stays open for them.
+// Contents that stay in a file until they are asked for, and the file that stays open for them: who
+// opens it, who is the last to let it go, and what is reported when the bytes are no longer to be
+// had.
+
 #include "elfext/interface/deferred_contents.h"
 
 #include "elfext/interface/error_string_capture.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Objects that own something outside of their region: each is destructed once, in the reverse order
+// of registration, and given back to the region that it came from, also when the manager itself
+// goes.
 
 #include "elfext/interface/destruction_manager.h"
 

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The names of section types, as reports show them: each type has that of its constant, and a
+// number that is none has no name.
+
 #include "elfext/interface/elf_constants.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What an array and its region owe each other.
+// What an array and its region owe each other: when memory is asked for, what stands at the end of
+// a block, and what goes back when the array or the region goes first.
 
 #include "elfext/interface/fast_array.h"
 

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The list in a region: it grows at both ends, is edited under its iterator, and behaves as a plain
+// list under random editing with a fixed seed. Its nodes come from the region and go back to it; a
+// step beyond the end is an assertion.
 
 #include "elfext/interface/fast_linked_list.h"
 

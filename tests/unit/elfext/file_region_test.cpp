@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What each kind of file region says of its size, its alignment and its record in a layout.
+// What each kind of file region says of its size, its alignment and its record in a layout; and
+// what two regions have in common, at borders, for empty ones, and at the end of 64 bits, where a
+// sum would wrap.
+
 #include "elfext/interface/data_structure.h"
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Which bytes are an ELF image.
+//
+// Which bytes are an ELF image: class, byte order, magic and a whole header, in memory and in
+// files. The answer decides what a member is, so the odd forms that count as images are held as
+// well as those that don't.
+
 #include "elfext/interface/format_recognizer.h"
 
 #include "tests/support/bytes.h"

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The hashes, which decide the order of an export, and the text key with its stored hash.
+// The hashes, which decide the order of an export, and the text key with its stored hash. Exact
+// values are held: they must be the same on every machine.
 
 #include "elfext/interface/hash_functions.h"
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What both families' sets promise beyond what they share with the tables.
+// What both families' sets promise beyond what they share with the tables: one node a key, growth,
+// the order of an export, and behaviour as a set under random editing with a fixed seed.
 
 #include "elfext/interface/hash_set.h"
 

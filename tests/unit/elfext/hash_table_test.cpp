@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What both families' tables promise. The order of an export is checked against a plain model of
-// buckets and chains.
+// What both families' tables promise: growth above a load of three quarters, replacing, removing,
+// and text and pointer keys. The order of an export is checked against a plain model of buckets and
+// chains, and the whole against a map under random editing. Keys that all share one hash must still
+// be told apart.
 
 #include "elfext/interface/hash_table.h"
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What the tests of the object model share: a module in regions that come and go with each test.
+// What the tests of the object model share: a module in regions that come and go with each test,
+// short ways to make sections and symbols in it, and the way to expect a failed assertion.
+
 #pragma once
 
 #include "alloclib/interface/session.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Where objects stand in the lists of a module, and how they move there.
+// Where objects stand in the lists of a module, and how they move there. An index is what other
+// objects and the file's tables refer to, so after each move all lists are looked at, not only the
+// one that was told to change.
+
 #include "elfext/interface/group.h"
 #include "elfext/interface/library_search_path.h"
 #include "elfext/interface/needed_library.h"

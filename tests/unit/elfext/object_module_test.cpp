@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The module as a whole: what a fresh one says, its names, its header, its dynamic data.
+// The module as a whole: what a fresh one says, its names, its header, its dynamic data; and which
+// setters make the auxiliary sections stale.
+
 #include "elfext/interface/object_module.h"
 
 #include "elfext/interface/file_version_definition.h"

@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The placement forest: whatever is linked and removed, in whatever order, the distances that are
-// left are those that were told.
+// left are those that were told. Distances come from files: sums beyond 64 bits must be refused,
+// and a long chain must cost no more than its length.
+
 #include "elfext/interface/placement_node.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Deleting: what goes along, what is let go of, and that everything that stays is as it was.
+// Deleting: what goes along, what is let go of, and that everything that stays is as it was. Each
+// kind of reference between objects has its test, since one that is forgotten would lead to what is
+// no longer there.
+
 #include "elfext/interface/group.h"
 #include "elfext/interface/library_search_path.h"
 #include "elfext/interface/needed_library.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One relocation as an object: what its row says, when it is dynamic, and that it follows its
+// target. It may refer to symbols of its own module only, and every setter makes the auxiliary
+// sections stale.
+
 #include "elfext/interface/relocation.h"
 
 #include "module_fixture.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The relocations of a section, those that are objects and those that are still rows of a file.
+// Rows become objects when somebody asks or when what they refer to changes; whoever counts or
+// searches must see the same either way.
+
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/relocation_rows.h"
 #include "module_fixture.h"

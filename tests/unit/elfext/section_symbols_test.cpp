@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The symbols of a section and the queries over them.
+// The symbols of a section and the queries over them, by offset and by name, held against a plain
+// search through the list.
+
 #include "module_fixture.h"
 
 namespace elfext {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Sections: their attributes, their contents, and the classes of the auxiliary ones.
+// Sections: their attributes, their contents, and the classes of the auxiliary ones; which links
+// they may have, and which setters make the auxiliary sections stale.
+
 #include "elfext/interface/group.h"
 #include "elfext/interface/segment.h"
 #include "elfext/src/bytes/elf_records.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Both sorts, against the standard ones over permutations and random inputs.
+// Both sorts, against the standard ones over permutations and random inputs. They must never be
+// quadratic, and must stay within their items whatever a comparison says, even one that contradicts
+// itself.
 
 #include "elfext/interface/sort.h"
 

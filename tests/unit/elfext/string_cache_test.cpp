@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Interned texts: equal texts have one pointer, which stays where it is while the cache grows, and
+// texts that only share a hash are told apart.
 
 #include "elfext/interface/string_cache.h"
 

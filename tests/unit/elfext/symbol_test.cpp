@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Symbols: what defines them, what their values are, and the lists that they move between.
+// Symbols: what defines them, what their values are, and the lists that they move between. A change
+// of category must leave them in exactly one list of the module or of a section.
+
 #include "elfext/interface/symbol.h"
 
 #include "elfext/interface/file_version_definition.h"

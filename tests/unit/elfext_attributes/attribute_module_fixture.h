@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A module whose objects are given attributes as they stand in a section.
+// A module whose objects are given attributes as they stand in a section: a test writes tags as
+// bytes, makes them an object's own, and looks at what follows for the objects around it.
+
 #pragma once
 
 #include "elfext/interface/build_attributes_cache.h"

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What two attribute records are to each other, and what they come to together: relations, merging,
+// intersection, difference and clashes. The cases are held rule by rule, and the laws (a merge is
+// commutative and associative, a difference on top of the other gives the record back) on many
+// generated records. A linker's choice of a build, and a report of a clash, follow from these.
+
 #include "elfext/interface/attribute_relations.h"
 
 #include "elfext/interface/attribute_string.h"

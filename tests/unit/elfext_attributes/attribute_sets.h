@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Sets of attributes as tests need them: of one tag, of a list, of a record.
+// Sets of attributes as tests need them: of one tag, of a list, of a record. The tables of tags are
+// the tests' own, and say of each number whether the record follows from it.
+
 #pragma once
 
 #include "elfext/interface/build_attributes.h"

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The text of an attribute record, both ways: each token, the order in which they are printed, the
+// form of a text with empty and unknown tokens in it, and accesses in each scope. Reading never
+// fails, as these texts stand in symbol names that anybody may write; on generated records, what is
+// printed and read again soon stays the same.
+
 #include "elfext/interface/attribute_string.h"
 
 #include "alloclib/interface/region.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The cache that spares reading the same text again: each text is computed once, nothing is kept of
+// texts that are too long, and it starts again when there are too many, so that a library of
+// different texts costs no more memory than its bound. What it says must be what the text says.
+
 #include "elfext/interface/attribute_text_cache.h"
 
 #include "elfext/interface/attribute_string.h"

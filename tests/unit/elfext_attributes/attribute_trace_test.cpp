@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What is told of an attribute section step by step, and the table that it fills; sections are
+// written with attribute_bytes.h. Every prefix of a good one and every wrong byte are gone through,
+// and owners by the hundred thousand that share their attributes must not be given a copy each. The
+// checked reader below it ends the program at a step beyond its bytes.
+
 #include "elfext/interface/attribute_trace.h"
 
 #include "checking/interface/checking.h"

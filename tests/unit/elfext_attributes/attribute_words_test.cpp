@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The look-up of words, against the plain search through their tables.
+// The look-up of words, against the plain search through their tables: each word in either letter
+// case, and what is nearly a word, longer than any, or begins with one.
+
 #include "elfext/src/attributes/attribute_words.h"
 
 #include "elfext/src/attributes/attribute_tokens.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What holds for all sets of attributes, on many generated ones.
+// What holds for all sets of attributes, on many generated ones, the same in each run: what is
+// encoded can be decoded, equal sets have equal hashes and bytes, unions, differences and
+// intersections keep their laws, and tags come back from the record that follows from them.
+
 #include "elfext/interface/attribute_relations.h"
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The pool of a module in which equal attribute sets, blocks and texts are one shared object, so
+// that thousands of sections with the same attributes cost one set.
+
 #include "elfext/interface/build_attributes_cache.h"
 
 #include "tests/unit/elfext_attributes/attribute_sets.h"

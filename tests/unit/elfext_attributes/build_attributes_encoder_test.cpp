@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From a set of tags to its bytes: numbers in groups of seven bits, texts with their ends, and the
+// order of tags, lists and unknown tags. Bytes are compared as they are, since other tools read
+// them.
+
 #include "elfext/interface/build_attributes.h"
 
 #include "tests/unit/elfext_attributes/attribute_sets.h"

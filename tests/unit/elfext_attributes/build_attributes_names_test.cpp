@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The names of tags and the sentences for their values, as a dump shows them: exactly the known
+// tags have names, each value has words of its own, and what is unknown shows its number.
+
 #include "elfext/interface/build_attributes_names.h"
 
 #include "elfext/interface/build_attributes_tags.h"

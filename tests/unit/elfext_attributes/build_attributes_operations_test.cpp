@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Two sets of tags together: union, difference, intersection and the checked combination, for
+// numbers, texts, lists, unknown tags and the record. Operations on lists are held against
+// comparing each entry with each, over generated lists.
+
 #include "elfext/interface/attribute_relations.h"
 
 #include "elfext/interface/build_attributes.h"

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The bytes of attribute sections, from the whole section down to one attribute, and what decoding
+// makes of them. Bytes lie in a block of their own, so that a sanitizer sees a step beyond them;
+// every prefix is tried, and lengths, kinds, numbers and lists that are wrong or have no end must
+// be told, with what stands in front of them kept.
+
 #include "elfext/interface/build_attributes_parsers.h"
 
 #include "tests/support/attribute_bytes.h"

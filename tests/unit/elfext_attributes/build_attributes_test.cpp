@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One set of tags: what is kept of each tag, which tags feed the record, the interlocks between
+// them, lists, equality and hashes. Tags of another form than asked for are a programming fault,
+// and their values are cut to their width wherever they come from.
+
 #include "elfext/interface/build_attributes.h"
 
 #include "elfext/interface/attribute_string.h"

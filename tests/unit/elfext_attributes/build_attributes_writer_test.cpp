@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// From the attributes of a module's objects to the bytes of its attribute section: which blocks
+// each object has, what it inherits from around, and in which lists equal blocks are written. The
+// result is held against a plain writer that goes through all objects for each vendor, over
+// generated modules.
+
 #include "elfext/interface/build_attributes_writer.h"
 
 #include "elfext/interface/auxiliary_sections.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The symbols that say by their names how a module, a section or a symbol was built: when they are
+// made, when they stay, and when they go since what they say holds anyway or no longer.
+
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes_writer.h"
 #include "tests/unit/elfext_attributes/attribute_module_fixture.h"

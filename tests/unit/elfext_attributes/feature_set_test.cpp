@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Sets of processor features over two words, and their closure: what each feature brings with it,
+// in the order of the rules. On generated sets a closure only adds, and adds everything at once.
+
 #include "elfext/interface/feature_set.h"
 
 #include "tests/unit/elfext_attributes/generated_records.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Records for what must hold for all of them: random, but the same ones in each run.
+// Records for what must hold for all of them: random, but the same ones in each run, with few bits
+// as well as many, so that both nearly empty and nearly full records come.
+
 #pragma once
 
 #include "elfext/interface/full_attr.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Options of older compilers, which stand in objects as texts: flags and accesses, switched on and
+// off, alone and in clauses of one text. What is no option ends the reading, and nothing is said of
+// it.
+
 #include "elfext/interface/attribute_string.h"
 
 #include <gtest/gtest.h>

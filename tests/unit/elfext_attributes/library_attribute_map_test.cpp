@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// What a library's name says of its members: the built-in rows, and a map file in their place.
+// Where the file is missing or fails the built-in rows hold; an empty one has no rows, and a line
+// without an end is cut into more of them, in time that grows with the file. Files are on the
+// memory host and on the faulty one.
+
 #include "elfext/interface/library_attribute_map.h"
 
 #include "elfext/interface/attribute_string.h"

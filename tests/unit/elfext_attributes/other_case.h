@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Words whose case doesn't matter, in the other one.
+// Words whose letter case doesn't matter, in the other one: what is read in one case must be read
+// in the other.
+
 #pragma once
 
 #include <cctype>

@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What objects say of how they were built, in attribute sections and in the names of symbols, and
-// which of the two holds.
+// which of the two holds. Objects come from the object builder; each corruption of a section is
+// reported once, and what was said before it is kept or dropped as stated.
+
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/build_attributes_cache.h"
 #include "elfext/interface/build_attributes_writer.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The record that follows from tags, rule by rule.
+// The record that follows from tags, rule by rule: architecture, instruction sets in use,
+// extensions, floating point, accesses. Rules come in an order, and later ones take back what
+// earlier ones gave; each is tested where it makes the difference.
+
 #include "elfext/interface/build_attributes.h"
 #include "elfext/interface/target_table.h"
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The tags that follow from a record, rule by rule.
+// The tags that follow from a record, rule by rule. Not all of a record can be said in tags: what
+// is lost on the way is held here too, since the way back can't bring it.
+
 #include "elfext/interface/build_attributes.h"
 #include "elfext/src/attributes/architecture_number.h"
 #include "tests/unit/elfext_attributes/attribute_sets.h"

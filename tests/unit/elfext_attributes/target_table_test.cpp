@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The table of processors, architectures and units, as rules for all of its rows: names are unique,
+// rows of a kind stand together, a row has all that its base has, sets are complete and free of
+// clashes. A row that is typed wrongly fails one of these; and look-ups find what they should in
+// any letter case.
+
 #include "elfext/interface/target_table.h"
 
 #include "elfext/interface/attribute_relations.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The fixed records of the format, got from bytes and put back: file header, section header,
+// program header, symbol and relocation, in both classes and byte orders. Bytes are written field
+// by field from the format's description, so that a field that is read from another's place shows.
+
 #include "elfext/src/bytes/elf_records.h"
 
 #include <gtest/gtest.h>

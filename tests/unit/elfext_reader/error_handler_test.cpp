@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The texts of all reports, in the order of their operations. Users and other tools know them.
+// The texts of all reports, in the order of their operations. Users and other tools know them, so
+// each is compared to the letter; and what a handler may answer is held for each failure.
+
 #include "elfext/interface/error_handler.h"
 
 #include "elfext/interface/elf_constants.h"

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What sorting finds is what looking at all pairs finds.
+// Overlaps among many extents, and who holds a place: what sorting finds is what looking at all
+// pairs finds, the first pair included, since that is the one that is reported. Extents may reach
+// the largest number.
+
 #include "elfext/src/bytes/extents.h"
 
 #include <gtest/gtest.h>

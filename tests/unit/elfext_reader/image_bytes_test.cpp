@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The bytes of an image, in memory or in a file: what is read for a look, and when. A small image
+// takes one call, of a large one only what is looked at is read, and addresses stay. Bytes outside,
+// files that shrink, a host that fails and memory that is not to be had are failures that stay
+// failures.
+
 #include "elfext/src/bytes/image_bytes.h"
 
 #include "tests/support/faulty_host.h"

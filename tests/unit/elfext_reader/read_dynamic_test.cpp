@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Dynamic sections, preemption maps and symbol versions.
+// Dynamic sections, preemption maps and symbol versions: places in tables that are told by
+// addresses, counts and texts, any of which may be wrong. Some faults are reported, others leave
+// out what they spoil.
+
 #include "elfext/interface/file_version_definition.h"
 #include "elfext/interface/library_search_path.h"
 #include "elfext/interface/needed_library.h"

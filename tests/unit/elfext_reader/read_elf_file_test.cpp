@@ -2,6 +2,9 @@
 //
 // The five ways to an object's bytes: what each reads, when, who closes the file, and what is
 // reported when the host fails.
+//
+// Hosts in memory count what is open and read; a faulty one fails each call in turn.
+
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/preemption.h"
 #include "elfext/interface/raw_data_block.h"

@@ -1,4 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Group sections: flags word, members and signature. A group may be empty, list the null section, a
+// section twice or one of another group, or sections that there are not; each has its one answer.
+
 #include "elfext/interface/group.h"
 #include "tests/support/reader_fixture.h"
 

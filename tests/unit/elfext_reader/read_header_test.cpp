@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The ELF header and the two header tables.
+// The ELF header and the two header tables: every shorter file is truncated, fields are checked in
+// one order, and counts that are told elsewhere (extended numbering) are compared with the file
+// before they are believed.
+
 #include "tests/support/reader_fixture.h"
 
 namespace elfext {

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What the link and info fields of section headers name.
+// What the link and info fields of section headers name: sections, symbols and counts, by section
+// type. Any of these may be any number; a link with a meaning is checked before one without, and
+// each is reported once.
+
 #include "tests/support/reader_fixture.h"
 
 namespace elfext {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Debug overlay sections, and the note that maps sections to segments.
+// Debug overlay sections, and the note that maps sections to segments: rows and descriptors that
+// are too small, cut off by their section, or name what there is not.
+
 #include "elfext/interface/segment.h"
 #include "tests/support/reader_fixture.h"
 

@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // A file in which everything is wrong: what is reported is what the earliest step finds, wherever
-// in the file it is.
+// in the file it is. One fault after the other is mended, so that the whole order of the checks is
+// held.
+
 #include "tests/support/reader_fixture.h"
 
 #include <iterator>

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Segments, what is tied to what, and the bytes that only segments have.
+// Segments, what is tied to what, and the bytes that only segments have. Overlaps are reported by
+// the first pair; regions that share bytes keep their distances; and which segment a section
+// without bytes goes to is held rule by rule.
+
 #include "elfext/interface/raw_data_block.h"
 #include "elfext/interface/segment.h"
 #include "tests/support/reader_fixture.h"

@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Relocations as rows of an object: fields in each class and byte order, the symbol table that a
+// row's symbol is of, and rows that name a symbol that there is not. They become objects only when
+// somebody asks.
+
 #include "elfext/interface/relocation.h"
 #include "tests/support/reader_fixture.h"
 

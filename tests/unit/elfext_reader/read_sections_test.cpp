@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Sections as the section header table tells them: their classes, contents and names.
+// Sections as the section header table tells them: their classes, contents and names. Row sizes,
+// lengths and extents may be any number; string tables must begin and end with a zero byte before a
+// name is looked up in them.
+
 #include "tests/support/reader_fixture.h"
 
 #include <cstring>

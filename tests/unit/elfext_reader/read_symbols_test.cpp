@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Symbols as the rows of their tables tell them, in each class and byte order: name, section and
+// kind are checked in this order, extended section indexes need their table, and of many bad rows
+// the first is the one that is reported.
+
 #include "tests/support/reader_fixture.h"
 
 namespace elfext {

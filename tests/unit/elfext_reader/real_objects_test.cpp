@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Objects that compilers made. The numbers are what `readelf -hsrg` says of the same files.
+// Objects that compilers made. The numbers are what `readelf -hsrg` says of the same files: a
+// second opinion on what the builder and the reader might have misunderstood alike.
+
 #include "elfext/interface/relocation.h"
 #include "support/interface/host.h"
 #include "tests/support/reader_fixture.h"

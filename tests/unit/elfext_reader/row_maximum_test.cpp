@@ -1,4 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// The greatest of any run of rows, for tables that lie over one another: held against a plain walk
+// for every run of a random image, and with a count of the looks, since a row that many tables
+// share is to be looked at once.
+
 #include "elfext/src/bytes/row_maximum.h"
 
 #include <gtest/gtest.h>

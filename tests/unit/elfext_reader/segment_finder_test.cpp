@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// What sorting finds is what going through the segments in their order finds, for each section.
+// What sorting finds is what going through the segments in their order finds, for each section: on
+// small tables of all kinds and on large ones, where the plain way would take long.
+
 #include "elfext/src/reader/segment_finder.h"
 
 #include "elfext/interface/elf_constants.h"

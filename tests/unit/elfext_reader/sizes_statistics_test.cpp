@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Which of the eight totals each byte of an object goes to.
+// Which of the eight totals each byte of an object goes to, by section flags, mapping symbols and
+// segments. Mapping symbols may stand anywhere, also outside of their section, and totals have more
+// than 32 bits.
+
 #include "elfext/interface/sizes_statistics.h"
 
 #include "elfext/interface/raw_data_block.h"

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The checks that go beyond reading: what each finds, says and mends.
+// The checks that go beyond reading: what each finds, says and mends. A good module has no report;
+// then each module is wrong in one way, told in the library's words.
+
 #include "elfext/interface/group.h"
 #include "elfext/interface/relocation.h"
 #include "elfext/interface/segment.h"
