@@ -23,9 +23,11 @@
 namespace alloclib {
 
 #ifdef ASAN_POISON_MEMORY_REGION
+/// From now on nobody may read or write these bytes.
 inline void poison(const void* start, size_t bytes) {
   ASAN_POISON_MEMORY_REGION(start, bytes);
 }
+/// Somebody owns them again.
 inline void unpoison(const void* start, size_t bytes) {
   ASAN_UNPOISON_MEMORY_REGION(start, bytes);
 }

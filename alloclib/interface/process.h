@@ -39,6 +39,7 @@ void shutDown(bool freeMemory = true);
 void pushDefaultParent(Region* parent);
 /// Returns the region that was popped.
 Region* popDefaultParent();
+/// The region that was pushed last, or the root region. An internal error before initialise.
 [[nodiscard]] Region* getDefaultParent();
 
 /// The page allocator under all general regions, made on the default parent at its first use.
@@ -48,6 +49,8 @@ Region* popDefaultParent();
 /// Bytes that the root region holds from the host; 0 before initialise.
 [[nodiscard]] size_t getSystemSize();
 
+/// A DebugMode. An int, so that one that there is not shows as an internal error where a region is
+/// made with it.
 [[nodiscard]] int getDebugMode();
 void setDebugMode(int mode);
 

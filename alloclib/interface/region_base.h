@@ -13,6 +13,8 @@
 
 namespace alloclib {
 
+/// An allocator whose memory goes back as a whole. Clients keep a pointer to one that somebody else
+/// has made and will end.
 class Region {
 public:
   Region(const Region&) = delete;

@@ -23,6 +23,8 @@ namespace alloclib {
 
 class RegionStats;
 
+/// Made by Create and ended by Destroy, mostly through a RegionOwner. The object lies in its own
+/// first block.
 class RegionGeneral final : public Region {
 public:
   /// A region of one page, which grows on the process's RegionLargeBlock. The initial size, in

@@ -18,6 +18,8 @@ namespace alloclib {
 
 class RegionStats;
 
+/// Made by RegionFastOld::Create. Its chunks stay with it until Destroy, however many of their
+/// pages come back.
 class RegionLargeBlock final : public Region {
 public:
   /// Sizes are multiples of a page; anything else is an internal error.

@@ -12,6 +12,7 @@ namespace alloclib {
 
 class RegionStats;
 
+/// One for the process, made by initialise, and one for each transparent page allocator.
 class RegionMallocFree final : public Region {
 public:
   /// The name is kept, not copied. The caller ends the region with Destroy.

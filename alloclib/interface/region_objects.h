@@ -30,6 +30,7 @@ template <class T, class... Arguments>
   return copy;
 }
 
+/// For RegionOwner; the region must be one that may be destroyed with its memory given back.
 struct RegionDeleter {
   void operator()(RegionGeneral* region) const { region->Destroy(true); }
 };

@@ -16,6 +16,8 @@
 
 namespace alloclib {
 
+/// The record of one region. The region holds a pointer to it until `finish`; then the lists own
+/// it.
 class RegionStats {
 public:
   /// Makes the record of a new region at the end of the live list. The name is kept, not copied.
@@ -30,8 +32,10 @@ public:
   /// `bytes` is what the client asked for, the padding what lay beside it.
   void discarded(const void* pointer, size_t bytes, size_t padding);
   void extended();
+  /// What the region needs for itself: headers, maps, arrays of buckets. Bytes.
   void overheadIncreased(size_t bytes);
   void overheadDecreased(size_t bytes);
+  /// What lies between its blocks and serves nobody at the moment. Bytes.
   void fragmentationIncreased(size_t bytes);
   void fragmentationDecreased(size_t bytes);
 
