@@ -19,6 +19,7 @@
 
 namespace checking {
 
+/// The numbers are compared with each other, and index the words of --db_check.
 enum Level : uint32_t {
   Level_None = 0,
   Level_Low = 1,
