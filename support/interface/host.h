@@ -25,6 +25,7 @@ namespace support {
 /// The host's error number; 0 means success.
 using HostError = int;
 
+/// What a name or an open file stands for, links followed.
 enum class FileKind : uint8_t {
   Nothing,     ///< no such name, or the host refuses to say
   RegularFile, ///< an ordinary file
@@ -44,6 +45,7 @@ struct FileStatus {
   uint64_t device = 0;
   uint64_t inode = 0;
 
+  /// The same file under whatever name. Two that are nothing are never the same.
   [[nodiscard]] bool isSameFile(const FileStatus& other) const {
     return kind != FileKind::Nothing && kind == other.kind && device == other.device &&
            inode == other.inode;
@@ -62,6 +64,8 @@ struct FileHandle {
   [[nodiscard]] bool isOpen() const { return number >= 0; }
 };
 
+/// All file operations of a process. Objects that are given one keep a reference: it outlives them.
+/// Texts are views for the call.
 class Host {
 public:
   virtual ~Host() = default;
@@ -108,6 +112,7 @@ public:
   /// The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
   [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
 
+  /// Removes a name, and with the last one the file; those who have it open keep it.
   [[nodiscard]] virtual HostError remove(const char* name) = 0;
 
   /// Links are followed. A name that isn't there gives an error and the kind Nothing.

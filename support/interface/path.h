@@ -14,6 +14,7 @@
 
 namespace support {
 
+/// By which host's rules a name is read.
 enum PathStyle : uint32_t {
   PathStyle_Detect = 0,
   PathStyle_Windows = 2,
@@ -24,6 +25,7 @@ enum PathStyle : uint32_t {
 /// No name that a host takes as a member or leaf is longer; longer ones are cut.
 inline constexpr size_t LongestPathComponent = 1029; ///< bytes
 
+/// The four parts of a name, as texts of their own: what the name was made from need not live on.
 class path {
 public:
   /// With PathStyle_Detect the style is worked out from the name. In a POSIX name only "/"
@@ -41,7 +43,9 @@ public:
   [[nodiscard]] const std::string& getExtension() const { return m_Extension; }
   [[nodiscard]] std::string getLeaf() const { return m_Base + m_Extension; }
 
+  /// Base and extension from this text, which is cut to LongestPathComponent; the rest stays.
   void replaceLeaf(std::string_view leaf);
+  /// All parts put together again.
   [[nodiscard]] std::string toString() const;
 
 private:

@@ -18,6 +18,7 @@
 
 namespace support {
 
+/// One buffer for one file after the other. It grows as needed and keeps its memory for the next.
 class ReadWindow {
 public:
   /// What has been read of another file is forgotten. The file stays the caller's.

@@ -37,6 +37,7 @@ public:
   /// The host must outlive this object and all files that it has opened.
   explicit SourceFiles(Host& host, size_t bound = DefaultBound);
 
+  /// The host that all its files are opened on.
   [[nodiscard]] Host& getHost() const;
 
   /// Opens a file for reading. The host's error number, or 0.
@@ -75,6 +76,7 @@ private:
 /// One of them. It is closed when nobody holds it any more.
 class SourceFile : public std::enable_shared_from_this<SourceFile> {
 public:
+  /// Closes the file; a close that fails is told by SourceFiles::takeCloseError.
   ~SourceFile();
   SourceFile(const SourceFile&) = delete;
   SourceFile& operator=(const SourceFile&) = delete;

@@ -12,6 +12,7 @@
 
 namespace support {
 
+/// What a build says of itself. The texts are views of constants.
 struct BuildData {
   std::string_view productName;
   std::string_view componentName;
