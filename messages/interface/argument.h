@@ -21,6 +21,7 @@ template <class Type>
 concept IntegerArgument = std::integral<Type> && !std::same_as<Type, bool> &&
                           !std::same_as<Type, char> && sizeof(Type) <= 8;
 
+/// A value of one conversion. It lives for one report, and holds a view of its text, not a copy.
 class Argument {
 public:
   enum class Kind : uint8_t { String, Character, Integer };

@@ -14,6 +14,7 @@
 
 namespace messages {
 
+/// One message in one language. Rows are constants, or belong to who installs them.
 struct CatalogueRow {
   Key key;
   std::string_view text; ///< UTF-8; a printf format if the message has arguments
@@ -42,6 +43,7 @@ void setExternalCatalogue(std::span<const CatalogueRow> rows);
 /// For initialise: English, and the host's own encoding.
 void resetLocale();
 
+/// EnglishCatalogue or JapaneseCatalogue.
 [[nodiscard]] uint32_t getCurrentCatalogue();
 
 /// The code page by its number: 65001 is UTF-8, the default. Texts leave in UTF-8 whatever it is,

@@ -24,6 +24,7 @@ inline constexpr uint32_t DiagnosticError = severityWord(Severity_Error);
 /// reported; another tool's letter is passed over without a word.
 bool applyDiagnosticOption(uint32_t severityWord, std::string_view text);
 
+/// The numbers of the names of --diag_style in the option table.
 enum DiagnosticStyle : uint32_t {
   DiagnosticStyle_List = 0,
   DiagnosticStyle_Zev = 1,

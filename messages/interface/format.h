@@ -18,6 +18,7 @@
 
 namespace messages {
 
+/// What became of a format. Faults are the program's own: its caller ends the process with them.
 enum class FormatStatus : uint8_t {
   Done,
   BadFormat,        ///< unknown conversion, or one that does not fit its argument

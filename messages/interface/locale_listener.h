@@ -12,6 +12,7 @@
 
 namespace messages {
 
+/// Belongs to the client, and must outlive the parser that calls it.
 class LocaleListener final : public tabledrivenparser::Listener {
 public:
   /// Reports a message at fatal severity, with the name of the locale as its argument.

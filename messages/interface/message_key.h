@@ -21,6 +21,7 @@ enum class Key : uint32_t {};
 inline constexpr std::string_view SeverityLetters = "?IWE?U??";
 inline constexpr uint32_t LargestNumber = 16383;
 
+/// What doesn't fit is cut to its bits; a severity letter that is none counts as "?".
 [[nodiscard]] constexpr Key makeKey(char letter, uint32_t number, char severityLetter) {
   const size_t severityPlace = SeverityLetters.find(severityLetter);
   const uint32_t place =
@@ -29,9 +30,11 @@ inline constexpr uint32_t LargestNumber = 16383;
              place << 1};
 }
 
+/// The key as it is shown where a text is missing.
 [[nodiscard]] constexpr uint32_t valueOf(Key key) {
   return static_cast<uint32_t>(key);
 }
+/// From 0 to LargestNumber.
 [[nodiscard]] constexpr uint32_t numberOf(Key key) {
   return valueOf(key) >> 4 & LargestNumber;
 }

@@ -102,6 +102,7 @@ struct Counters {
   uint32_t fatalErrors = 0;
   uint32_t internalFaults = 0;
 };
+/// Since initialise, by effective severity.
 [[nodiscard]] Counters getCounters();
 [[nodiscard]] uint32_t getErrorCount();
 

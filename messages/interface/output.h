@@ -51,6 +51,7 @@ public:
 
   /// From now on.
   void hold();
+  /// Lets what is held come out; what follows is written at once again.
   void release();
   /// Forgets what was written since `hold`. False if some of it is out already.
   [[nodiscard]] bool drop();

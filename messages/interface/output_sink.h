@@ -10,6 +10,7 @@
 
 namespace messages {
 
+/// The end of a stream. Belongs to who made it, and must outlive its use by the streams.
 class OutputSink {
 public:
   virtual ~OutputSink() = default;

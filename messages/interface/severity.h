@@ -26,9 +26,11 @@ inline constexpr uint32_t SeverityCount = 7; ///< 0 is not used
 inline constexpr uint32_t MayBeLowered = 1;
 inline constexpr uint32_t MayBeRaised = 2;
 
+/// `permissions` are MayBeLowered, MayBeRaised, both or none.
 [[nodiscard]] constexpr uint32_t severityWord(Severity severity, uint32_t permissions = 0) {
   return severity << 16 | permissions;
 }
+/// A Severity, or another number if the word is none.
 [[nodiscard]] constexpr uint32_t severityOf(uint32_t word) {
   return word >> 16;
 }
