@@ -15,6 +15,8 @@ class Parser;
 class TextSink;
 struct MatchString;
 
+/// Belongs to the client, who puts it in the option's value before the parse; must outlive the
+/// parser.
 class CallBackHandler {
 public:
   virtual ~CallBackHandler() = default;

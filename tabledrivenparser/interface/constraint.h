@@ -26,12 +26,14 @@ struct IntegerRange {
   int64_t high;
 };
 
+/// A rule for numbers; a value passes if one usable node of the chain accepts it.
 struct IntegerConstraintNode {
   const uint32_t* masks = nullptr;      ///< as MatchString::restrictions
   const IntegerRange* ranges = nullptr; ///< ended by a range whose low lies above its high
   const IntegerConstraintNode* next = nullptr;
 };
 
+/// The same for texts.
 struct StringConstraintNode {
   const uint32_t* masks = nullptr; ///< as MatchString::restrictions
   /// Alternatives separated by "|". An alternative that begins with "C" compares the case of

@@ -10,6 +10,7 @@
 
 namespace tabledrivenparser {
 
+/// A via file without a file: never opens, refills or closes anything.
 class DummyViaFile final : public ViaFile {
 public:
   /// text is NUL-terminated and must outlive this object.

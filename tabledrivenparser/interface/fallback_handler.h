@@ -12,6 +12,7 @@ namespace tabledrivenparser {
 class Parser;
 class TextSink;
 
+/// Belongs to the client and must outlive the parser; the option table holds the pointer.
 class FallbackHandler {
 public:
   virtual ~FallbackHandler() = default;

@@ -58,6 +58,7 @@ public:
     const LinkedListNode<T>* m_Node;
   };
 
+  /// Empty, and without a node of the region: the first element needs none.
   explicit LinkedList(alloclib::RegionGeneral& region) : m_Region(&region) {}
   LinkedList(const LinkedList&) = delete;
   LinkedList& operator=(const LinkedList&) = delete;
@@ -73,6 +74,7 @@ public:
   [[nodiscard]] Iterator begin() const { return Iterator(isEmpty() ? nullptr : &m_First); }
   [[nodiscard]] Iterator end() const { return Iterator(nullptr); }
 
+  /// At the end, in the same time whatever the length.
   void append(T value) {
     LinkedListNode<T>* node = &m_First;
     if (!isEmpty()) {
@@ -94,6 +96,7 @@ public:
     return Absent;
   }
 
+  /// Removes every element equal to value; the others keep their order.
   void removeAll(T value) {
     removeWhere([value](T element) { return detail::sameElement(element, value); });
   }

@@ -15,6 +15,7 @@ namespace tabledrivenparser {
 
 class Parser;
 
+/// Belongs to the client and must outlive the parser.
 class Listener {
 public:
   virtual ~Listener() = default;

@@ -27,12 +27,14 @@ namespace tabledrivenparser {
 class FallbackHandler;
 class Parser;
 
+/// What an option does with an argument. The numbers are part of the table format.
 enum RowKind : uint32_t {
   Kind_Required = 0, ///< a parameter is required
   Kind_Optional = 1, ///< implied parameter, an argument may replace it
   Kind_Implied = 2,  ///< implied parameter, no argument
 };
 
+/// Bits of MatchString::flags.
 enum RowFlag : uint8_t {
   Flag_OldSyntax = 1,  ///< a long name also works with one dash, a letter in either case
   Flag_Deprecated = 2, ///< see OptionTable::deprecatedPolicy
@@ -68,6 +70,7 @@ constexpr uint32_t NoRow = 0xFFFFFFFF;
 /// For each letter the first row that starts with it in either case, or NoRow.
 using FirstLetterIndex = std::array<uint32_t, 26>;
 
+/// The rows with what is said of all of them. A constant of the client, which outlives the parser.
 struct OptionTable {
   std::span<const MatchString> rows; ///< sorted: see areSorted
   FirstLetterIndex firstRows;        ///< indexByFirstLetter(rows)
@@ -77,6 +80,7 @@ struct OptionTable {
   FallbackHandler* fallback = nullptr; ///< the client's, null if there is none
 };
 
+/// Where an option's value comes from while nobody has set it.
 enum DefaultKind : uint32_t {
   Default_None = 0,
   Default_Fixed = 1,
@@ -84,12 +88,14 @@ enum DefaultKind : uint32_t {
   Default_Computed = 3, ///< by the record's default call back
 };
 
+/// One of several defaults, for tables that serve more than one tool by their masks.
 struct DefaultNode {
   const uint32_t* masks = nullptr; ///< as MatchString::restrictions
   Value value{};
   const DefaultNode* next = nullptr;
 };
 
+/// What an option id holds, whichever of its rows it is written with.
 struct ValueDefinition {
   ValueType type = Type_Boolean;
   DefaultKind defaultKind = Default_Fixed;
@@ -98,6 +104,7 @@ struct ValueDefinition {
   const MatchString* const* rows = nullptr; ///< null-terminated, in the order reports prefer
 };
 
+/// The client's own check of a value, behind the constraint. False refuses the argument.
 using Validator = bool (*)(const Parser& parser, uint32_t id, const Value& value);
 /// Is asked more than once: for a vector it gives the same list each time.
 using DefaultCallBack = Value (*)(const Parser& parser, uint32_t id);
@@ -135,6 +142,7 @@ struct ValueRecord {
   return left < right;
 }
 
+/// Whether each row comes before the next; two of one name are not sorted.
 [[nodiscard]] constexpr bool areSorted(std::span<const MatchString> rows) {
   for (size_t row = 1; row < rows.size(); ++row) {
     if (!comesBefore(rows[row - 1].name, rows[row].name)) return false;

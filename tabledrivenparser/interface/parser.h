@@ -40,6 +40,8 @@ struct ParserTables {
   std::span<ValueRecord> values;
 };
 
+/// One parse of one command line. Values point into its region and into the words: both must live
+/// for as long as they are read.
 class Parser {
 public:
   /// A via file at this depth is refused: nine nest. It stops a file that names itself, directly or
@@ -79,11 +81,13 @@ public:
   [[nodiscard]] uint32_t getValueCount() const {
     return static_cast<uint32_t>(m_Tables.definitions.size());
   }
+  /// The id must be below getValueCount(); another one is a programming fault.
   [[nodiscard]] const ValueDefinition& getDefinition(uint32_t id) const;
   [[nodiscard]] const ValueRecord& getRecord(uint32_t id) const;
   [[nodiscard]] bool isSet(uint32_t id) const { return getRecord(id).lastSet != 0; }
   /// The default by the definition's rule; null or zero if it has none.
   [[nodiscard]] Value getDefaultValue(uint32_t id) const;
+  /// Whether the value says the same as its default, set or not.
   [[nodiscard]] bool isDefault(uint32_t id) const;
 
   /// The value of an option of that type; asking for another type is a programming fault.
@@ -98,6 +102,8 @@ public:
 
   // The rest serves handlers, listeners and the parser's own rooms.
 
+  /// Passes a message to the client. Nothing more is passed after a fatal one. Texts in the
+  /// arguments are only viewed.
   void report(ReportLevel level, OptionMessage message,
               std::initializer_list<OptionMessageArgument> arguments);
   /// A NUL-terminated copy in the parser's region.

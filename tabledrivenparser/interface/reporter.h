@@ -14,6 +14,7 @@
 
 namespace tabledrivenparser {
 
+/// How bad it is; the client turns it into a severity of its own.
 enum class ReportLevel : uint32_t {
   Remark = 0,
   Warning = 1, ///< the only level that the user may raise or lower

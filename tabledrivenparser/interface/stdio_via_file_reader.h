@@ -9,6 +9,7 @@
 
 namespace tabledrivenparser {
 
+/// Has no state of its own: each open file is a stream, and the pointer that stands for it.
 class StdioViaFileReader final : public ViaFileReader {
 public:
   void* open(const char* name) override;

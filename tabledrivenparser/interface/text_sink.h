@@ -13,6 +13,7 @@
 
 namespace tabledrivenparser {
 
+/// Writes to a buffer that it doesn't own, and never beyond its end.
 class TextSink {
 public:
   enum class QuoteMode : bool { Never, Blanks };
@@ -22,6 +23,7 @@ public:
   TextSink(std::span<char> buffer, QuoteMode quoteMode, char separator)
       : m_Buffer(buffer), m_QuoteMode(quoteMode), m_Separator(separator) {}
 
+  /// Unquoted, as it stands.
   void put(char character);
   void put(std::string_view text);
   /// A value, after what belongs to it in front.

@@ -44,6 +44,7 @@ union Value {
   const DefaultNode* defaults; ///< only in a definition whose default is a list of nodes
 };
 
+/// Whether a value of the type is a list, to which each use of the option adds.
 [[nodiscard]] constexpr bool isVector(ValueType type) {
   return type == Type_IntVector || type == Type_Int64Vector || type == Type_StringVector ||
          type == Type_ViaFile;

@@ -21,6 +21,7 @@ class Parser;
 class ViaFileReader;
 enum class OptionMessage : uint16_t;
 
+/// One file being read. It owns the open file and the last two words, and nothing of the parser.
 class ViaFile {
 public:
   /// What a word and the word before it may take together, each with one terminator, as they stand
