@@ -37,6 +37,7 @@ struct Archiver {
 };
 
 void run(const Words& words) {
+  // posix_spawnp wants pointers to what it promises not to change.
   std::vector<char*> arguments;
   for (const std::string& word : words)
     arguments.push_back(const_cast<char*>(word.c_str()));
@@ -51,6 +52,7 @@ void run(const Words& words) {
   posix_spawn_file_actions_destroy(&actions);
   int status = 1;
   if (error == 0) waitpid(child, &status, 0);
+  // A run that failed took less than it should: no figure is better than that one.
   if (error != 0 || status != 0) {
     std::fprintf(stderr, "failed: %s (status %d)\n", words[0].c_str(), status);
     std::exit(1);
@@ -92,7 +94,9 @@ void addCases(const Archiver& archiver, const bench::SampleFolder& folder, const
   const auto makeCopy = [master, copy] {
     std::filesystem::copy_file(master, copy, std::filesystem::copy_options::overwrite_existing);
   };
+  // Made by the archiver that is measured: each lists and edits what it writes itself.
   run(joined(archiver, archiver.create, master, files));
+  // The last member is the one that is found last and moves nothing behind it.
   const std::string last = std::filesystem::path(files.back()).filename().string();
   addCase("list/" + what, archiver, nothing, joined(archiver, archiver.list, master));
   addCase("create/" + what, archiver, removeCopy, joined(archiver, archiver.create, copy, files));
@@ -111,6 +115,8 @@ void addLibrariesOfAnyFile(const Archivers& archivers, const bench::SampleFolder
     uint32_t count;
     uint64_t size;
   } libraries[] = {
+      // The start of a process, what is done for each member, and the copying of bytes: each of the
+      // three sizes has most of its time in one of them. 150 times the last is a gibibyte.
       {"10_members", 10, 2000},
       {"10000_members", 10000, 700},
       {"1_gigabyte_150_members", 150, 7158278},
@@ -131,6 +137,8 @@ int main(int argc, char** argv) {
     return 2;
   }
   const Archivers archivers = {
+      // In the order of Archiver's fields. Files are no objects, which the tool warns of and the
+      // others don't look at.
       {"quarn",
        argv[1],
        {"-t"},

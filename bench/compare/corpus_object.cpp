@@ -50,6 +50,8 @@ struct DebugSection {
   uint32_t percentOfBytes;
   uint32_t percentOfRelocations;
 };
+// Both columns add up to 100. Debug information is mostly entries that refer to others, and each
+// reference to a section or to code is a relocation.
 constexpr DebugSection DebugSections[] = {
     {".debug_abbrev", 0, 1, 0}, {".debug_info", 0, 49, 60},
     {".debug_loc", 0, 15, 25},  {".debug_ranges", 0, 5, 10},
@@ -77,6 +79,8 @@ uint32_t aroundAverage(uint32_t average, uint32_t number) {
   return average / 4 * 3 + static_cast<uint32_t>(uint64_t{average} / 2 * spread(number) >> 32);
 }
 
+// Different for each module and function, so that no two objects define one name but builds of a
+// module and inline functions.
 std::string functionName(uint32_t module, uint32_t function) {
   const std::string verb = Words[(module * 7 + function) % Words.size()];
   const std::string noun = Words[(module + function / 5) % Words.size()];
@@ -162,6 +166,7 @@ private:
   std::vector<SymbolSpec> m_Locals;
   std::vector<SymbolSpec> m_Globals;
   std::vector<SectionBuilder*> m_NeedingSymbolTable;
+  // A group's signature is a global symbol, whose index is known when all local ones are.
   std::vector<OpenGroup> m_Groups;
 };
 
@@ -227,6 +232,8 @@ void ObjectMaker::appendFunction(Code& code, const std::string& name, uint8_t bi
     addLocal({.name = m_Corpus.isWide ? "$x" : "$a", .section = section, .value = start});
   code.isMarked = m_Corpus.isWide || size <= LargestWithoutPool;
   if (!code.isMarked) addLocal({.name = "$d", .section = section, .value = start + size - 4});
+  // Any local symbol will do as a target: what a relocation means is nobody's question here, only
+  // that its symbol is one.
   for (uint64_t place = start; place < start + size; place += m_Corpus.codePerRelocation) {
     const uint32_t symbol = 1 + m_Shape.below(static_cast<uint32_t>(m_Locals.size()));
     code.relocations.push_back({.offset = place, .symbol = symbol, .type = getAbsoluteType()});
@@ -270,6 +277,7 @@ void ObjectMaker::addData() {
   }
   addSection(".bss", SHT_NOBITS, SHF_ALLOC | SHF_WRITE, 4).size(64 + m_Shape.below(64) * 4);
   addSection(".comment", SHT_PROGBITS, SHF_MERGE | SHF_STRINGS, 1).bytes("made by no compiler");
+  // An empty section, as most objects have one.
   addSection(".note.GNU-stack", SHT_PROGBITS, 0, 1);
 }
 
@@ -312,6 +320,7 @@ void ObjectMaker::addDebugSection(const DebugSection& row, uint32_t bytes, uint3
 
 // Functions of other modules.
 void ObjectMaker::addUndefined() {
+  // Half as many as it defines: the reader passes these rows and publishes none of them.
   const uint32_t count = 4 + m_FunctionCount / 2;
   for (uint32_t i = 0; i < count; ++i)
     m_Globals.push_back({.name = functionName(m_Module + 1 + i, m_Shape.below(8))});

@@ -18,6 +18,7 @@ namespace bench {
 
 namespace {
 
+// A pipe or a full disk takes less than it is given.
 void writeAll(int file, std::string_view bytes) {
   while (!bytes.empty()) {
     const ssize_t count = write(file, bytes.data(), bytes.size());

@@ -15,6 +15,7 @@
 
 namespace bench {
 
+// As large as the tool's own, so that what is compared is what stands around it.
 constexpr size_t BufferSize = 256 * 1024;
 
 // Room for bytes that are all written before they are read.
@@ -22,6 +23,7 @@ inline std::unique_ptr<char[]> makeRoom(size_t size) {
   return std::make_unique_for_overwrite<char[]>(size);
 }
 
+// Says what failed, and the host's reason, and ends the program with status 1.
 [[noreturn]] void fail(const std::string& what);
 
 class InputFile {

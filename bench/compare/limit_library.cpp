@@ -93,6 +93,7 @@ public:
     m_Output.put(ArchiveMagic);
   }
 
+  // In two pieces, so that offsets and names of a large symbol table need not be put together.
   void putTable(std::string_view nameField, std::string_view first, std::string_view second);
   void putMember(Member& member, std::string_view nameField);
   void finish();
@@ -191,6 +192,7 @@ Library::Library(const std::string& path) : file(path) {
       file.read(longNames.data(), member.getContentsOffset(), longNames.size());
     } else {
       const size_t place = field[0] == '/' ? std::strtoul(field.data() + 1, nullptr, 10) : 0;
+      // A short name ends at its "/" as a long one does.
       const std::string_view text = field[0] == '/' ? longNames : field;
       member.name = text.substr(place, text.find('/', place) - place);
       members.push_back(member);

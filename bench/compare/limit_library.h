@@ -23,6 +23,7 @@ namespace bench {
 
 using MemberHeader = std::array<char, arlib::MemberHeaderSize>;
 
+// The number in a field of the header, which a good library has there.
 uint32_t headerNumber(const MemberHeader& header, arlib::HeaderField field, uint32_t base = 10);
 
 struct Member {
@@ -38,6 +39,7 @@ struct Member {
   [[nodiscard]] uint64_t getContentsOffset() const { return offset + arlib::MemberHeaderSize; }
 };
 
+// A library as its headers tell it: found by reading each header once, in order.
 struct Library {
   explicit Library(const std::string& path);
 

@@ -113,6 +113,7 @@ uint64_t largestSymbol(std::string_view bytes, uint64_t largest) {
 template <class Elf>
 void checkRelocations(const ObjectPlace& object, Rows<typename Elf::Section> sections,
                       size_t symbols) {
+  // A piece is whole rows, so that none is cut in two.
   constexpr size_t RowSize = sizeof(typename Elf::Relocation);
   constexpr size_t PieceSize = RelocationWindow / RowSize * RowSize;
   std::optional<Window> window;
@@ -148,6 +149,7 @@ void publish(const ObjectPlace& object, ObjectBuffers& buffers, PublishedNames& 
   names.counts.push_back(count);
 }
 
+// The tool's own rule for sections that are not loaded.
 bool isDebug(std::string_view name) {
   return name.starts_with(".debug") || name.starts_with(".line") || name == "C$$fpmap";
 }

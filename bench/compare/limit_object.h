@@ -52,6 +52,7 @@ struct ObjectBuffers {
   std::vector<Stretch> stretches; // for each section
 };
 
+// Adds the object's published names, and their count, to those of the objects before it.
 void publishNames(const ObjectPlace& object, ObjectBuffers& buffers, PublishedNames& names);
 ObjectSizes computeSizes(const ObjectPlace& object, ObjectBuffers& buffers);
 

@@ -39,6 +39,7 @@ void makeCorpus(const bench::Corpus& corpus, uint64_t seed, uint32_t count,
   for (uint32_t i = 0; i < count; ++i) {
     const std::string name = objectName(corpus, i);
     writeFile(folder / name, objectBytes(corpus, seed, i));
+    // In the order in which the comparison puts them into a library.
     std::puts(name.c_str());
   }
 }

@@ -24,6 +24,7 @@ long long microseconds(const timeval& time) {
   return time.tv_sec * 1000000LL + time.tv_usec;
 }
 
+// No clock that somebody sets while a run is measured.
 long long now() {
   timespec time;
   clock_gettime(CLOCK_MONOTONIC, &time);
@@ -33,6 +34,7 @@ long long now() {
 pid_t start(const char* output, char** words) {
   posix_spawn_file_actions_t actions;
   posix_spawn_file_actions_init(&actions);
+  // A program that waits for input would wait for ever.
   posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
   posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, output, O_WRONLY | O_CREAT | O_TRUNC,
                                    0666);
