@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
+//
 // A via file: a text file of further arguments, as a row of words.
 //
 // A "#" or ";" anywhere, also in the middle of a word or inside quotes, starts a comment that lasts
@@ -7,6 +8,11 @@
 // lines. Quotes are removed, parentheses stay. A backslash protects a quote (a single one only
 // inside single quotes) and, inside quotes, a backslash; anywhere else it is a character like any
 // other, so that `dir\file.o` passes unchanged.
+//
+// The value store opens one for each via file and feeds its words to the parser, one level deeper
+// than the word that named it. What a file may try (no end, NUL bytes, words beyond all size) ends
+// in a fatal report; see the source.
+
 #pragma once
 
 #include <array>
