@@ -226,6 +226,46 @@ TEST(SourceTree, EveryFileNamesItsLicence) {
   }
 }
 
+// What a file is for stands before anything else.
+TEST(SourceTree, EveryFileBeginsWithWhatItDecides) {
+  std::vector<std::string> rooms = {"bench", "tests"};
+  for (const auto& [room, allowed] : Arrows)
+    rooms.push_back(room);
+  for (const std::string& room : rooms) {
+    for (const fs::path& file : sourcesOf(room)) {
+      std::ifstream stream(file);
+      std::string line;
+      std::getline(stream, line);
+      while (std::getline(stream, line) && line == "//") {
+      }
+      EXPECT_TRUE(line.starts_with("// ")) << file << " begins with " << line;
+    }
+  }
+}
+
+// The files of the driver by the names that a source and its header share: who is called, and who
+// calls him back through somebody else, would be one room under two names.
+TEST(SourceTree, NobodyInTheDriverIsCalledBack) {
+  std::map<std::string, Names> uses;
+  for (const fs::path& file : sourcesOf("quarn")) {
+    for (const std::string& include : includesOf(file)) {
+      if (include.starts_with("quarn/")) uses[file.stem()].insert(fs::path(include).stem());
+    }
+  }
+  for (auto& [name, used] : uses)
+    used.erase(name);
+  // Who uses nobody that is left is taken away, until nobody is left, or a circle.
+  for (bool isSmaller = true; isSmaller;) {
+    isSmaller =
+        std::erase_if(uses, [&uses](const auto& entry) {
+          return std::none_of(entry.second.begin(), entry.second.end(),
+                              [&uses](const std::string& used) { return uses.contains(used); });
+        }) != 0;
+  }
+  for (const auto& [name, used] : uses)
+    ADD_FAILURE() << name << " is part of a circle, or uses one";
+}
+
 TEST(SourceTree, EveryHeaderIsIncludedOnce) {
   for (const auto& [room, allowed] : Arrows) {
     for (const fs::path& file : sourcesOf(room)) {
