@@ -12,6 +12,10 @@ add_compile_options("-ffile-prefix-map=${CMAKE_SOURCE_DIR}/=" "-ffile-prefix-map
 add_library(quarn_warnings INTERFACE)
 target_compile_options(quarn_warnings INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
+  -Wcast-qual -Wextra-semi -Wformat=2 -Wold-style-cast -Woverloaded-virtual -Wundef
+  $<$<CXX_COMPILER_ID:GNU>:-Wduplicated-branches$<SEMICOLON>-Wduplicated-cond>
+  # The first one holds a rule: a switch over all of an enumeration has no default.
+  $<$<CXX_COMPILER_ID:Clang>:-Wcovered-switch-default$<SEMICOLON>-Wcomma$<SEMICOLON>-Wreserved-identifier$<SEMICOLON>-Wunreachable-code-aggressive>
   # g++ 12 takes a plain std::string "+" for an overlapping copy once it is inlined.
   $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>
   # Some assertions say in words what can't be: !"We shouldn't be here".

@@ -56,7 +56,7 @@ std::string textOf(const ValueDefinition& definition, const Value& value) {
 } // namespace
 
 alloclib::RegionOwner makeRegion() {
-  static const bool IsReady = (alloclib::initialise(), true);
+  static const bool IsReady = (static_cast<void>(alloclib::initialise()), true);
   EXPECT_TRUE(IsReady);
   return alloclib::RegionOwner(alloclib::RegionGeneral::Create(4096, "tabledrivenparser tests"));
 }
