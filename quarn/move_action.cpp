@@ -70,6 +70,7 @@ void Movement::reorder() {
   }
   std::sort(moved.begin(), moved.end());
   std::vector<ArchiveMember*> block;
+  block.reserve(moved.size());
   for (const auto& [number, member] : moved)
     block.push_back(member);
   m_Run.archive.moveMembers(block, static_cast<uint32_t>(inFront));

@@ -146,7 +146,7 @@ bool ViaFile::refill() {
     const ptrdiff_t count = m_Reader->read(m_File, free, BufferSize - m_Text.size());
     if (count == ViaFileReader::ReadError) fail(OptionMessage::ViaFileReadError);
     if (count <= 0) break;
-    const size_t size = static_cast<size_t>(count);
+    const auto size = static_cast<size_t>(count);
     // Looked for in comments too: what holds a NUL is no text.
     if (std::find(free, free + size, '\0') != free + size) {
       fail(OptionMessage::NulInViaFile);

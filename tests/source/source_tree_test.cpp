@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Rules of the house that no compiler checks: who may include from whom, that the map leads to what
-// there is, licences, names of tests, that each message of the catalogue is reported by somebody,
-// and that the help knows each option. The rules are tables here; a new room is a row.
+// How the rooms of the tree hang together, and what agrees from file to file: who may include from
+// whom, that the map leads to what there is, licences, names of tests, that each message of the
+// catalogue is reported by somebody, and that the help knows each option. The rules are tables
+// here; a new room is a row.
 
 #include "quarn/option_table.h"
+#include "tree.h"
 
 #include "messages/interface/catalogue.h"
 #include "messages/interface/message_keys.h"
@@ -14,7 +16,6 @@
 #include <algorithm>
 #include <filesystem>
 #include <fstream>
-#include <iterator>
 #include <map>
 #include <regex>
 #include <set>
@@ -69,25 +70,7 @@ const std::map<std::string, std::string> ElfextsPromisedPlaces = {
     {"sizes_statistics", "sizes"},   {"sort", "containers"},
 };
 
-const fs::path Root = QUARN_SOURCE_DIR;
-
-std::string contentsOf(const fs::path& file) {
-  std::ifstream stream(file, std::ios::binary);
-  return {std::istreambuf_iterator<char>(stream), {}};
-}
-
-bool isSource(const fs::path& file) {
-  return file.extension() == ".h" || file.extension() == ".cpp";
-}
-
-std::vector<fs::path> sourcesOf(const std::string& room) {
-  std::vector<fs::path> files;
-  for (const auto& entry : fs::recursive_directory_iterator(Root / room)) {
-    if (entry.is_regular_file() && isSource(entry.path())) files.push_back(entry.path());
-  }
-  std::sort(files.begin(), files.end());
-  return files;
-}
+const fs::path Root = treeRoot();
 
 std::vector<std::string> includesOf(const fs::path& file) {
   static const std::regex Line("#include \"([^\"]+)\"");
