@@ -77,7 +77,7 @@ RegionGeneral* RegionGeneral::createPlain(Region* parent, size_t firstBlockSize,
   const bool tracing = (flagsState & Flags_Tracing) != 0;
   RegionStats* stats = RegionStats::start(name, initialSize, tracing);
   void* memory = parent->AllocFull(firstBlockSize, PageSize, nullptr);
-  Block* block = ::new (memory) Block{firstBlockSize, nullptr};
+  auto* block = ::new (memory) Block{firstBlockSize, nullptr};
 
   auto* region = ::new (static_cast<void*>(block + 1)) RegionGeneral(stats, parent, flagsState);
   region->m_Blocks = block;

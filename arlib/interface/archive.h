@@ -274,8 +274,8 @@ private:
   void putTablesInPlace();
   void forgetTable(ArchiveMember*& table);
   const char* copyToRegion(std::string_view text);
-  std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
-                                     const ArchiveMember* archiveMember) const;
+  static std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
+                                            const ArchiveMember* archiveMember);
 
   support::SourceFiles m_SourceFiles;
   /// All that members' locations refer to, and perhaps some to which none refers any more.

@@ -178,7 +178,7 @@ void Archive::noteTablesUpToDate() {
 }
 
 ArchiveMember* Archive::appendMember(std::string_view regionName) {
-  ArchiveMember* member = alloclib::create<ArchiveMember>(*m_ObjectRegion, this);
+  auto* member = alloclib::create<ArchiveMember>(*m_ObjectRegion, this);
   member->m_Name = regionName;
   m_ArchiveMembers.append(member);
   return member;
@@ -325,8 +325,9 @@ void Archive::takeOut(std::span<ArchiveMember* const> sortedMembers) {
 
 Symbol Archive::symbolOf(std::string_view name, ArchiveMember* member) const {
   const size_t marker = name.find(AttributeMarker);
-  const std::string_view attributes =
-      marker == name.npos ? std::string_view() : name.substr(marker + AttributeMarker.size());
+  const std::string_view attributes = marker == std::string_view::npos
+                                          ? std::string_view()
+                                          : name.substr(marker + AttributeMarker.size());
   return {name.substr(0, marker), attributes, this, member};
 }
 
@@ -470,10 +471,10 @@ void Archive::groupSymbols() {
 }
 
 std::span<Symbol* const> Archive::symbolsOf(const elfext::FastArray<Symbol*>& symbols,
-                                            const ArchiveMember* archiveMember) const {
+                                            const ArchiveMember* archiveMember) {
   const auto first =
       std::partition_point(symbols.begin(), symbols.end(), [&](const Symbol* symbol) {
-        return std::less<const ArchiveMember*>()(symbol->getDefiningMember(), archiveMember);
+        return std::less<>()(symbol->getDefiningMember(), archiveMember);
       });
   const auto last = std::partition_point(first, symbols.end(), [&](const Symbol* symbol) {
     return symbol->getDefiningMember() == archiveMember;

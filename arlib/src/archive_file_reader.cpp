@@ -25,7 +25,7 @@ namespace arlib {
 namespace {
 
 bool isBlank(std::string_view field) {
-  return field.find_first_not_of(' ') == field.npos;
+  return field.find_first_not_of(' ') == std::string_view::npos;
 }
 
 // Header fields are shown as they stand, up to a NUL.
@@ -225,21 +225,22 @@ bool ArchiveFileReader::parseLongName(std::string_view digits, std::string_view&
 // An index is out of range behind the table, on an entry's newline, or where no entry ends behind
 // it. The last terminator is known beforehand, so that a table without one is not searched again
 // for each member.
-bool ArchiveFileReader::findLongNameEnd(std::string_view table, uint32_t index, size_t& end) {
+bool ArchiveFileReader::findLongNameEnd(std::string_view table, uint32_t index, size_t& end) const {
   if (index >= table.size()) return false;
   if (index > 0 && table[index] == '\n' && table[index - 1] == '/') return false;
-  if (m_LastTerminator == table.npos || index > m_LastTerminator) return false;
+  if (m_LastTerminator == std::string_view::npos || index > m_LastTerminator) return false;
   end = table.find(LongNameTerminator, index);
   return true;
 }
 
-bool ArchiveFileReader::parseShortName(std::string_view text, std::string_view& name) {
-  const size_t slash = text.find('/');
-  if (slash == text.npos) return m_Archive.goOn(&ErrorHandler::reportNoNameTerminator, m_Offset);
-  if (!isBlank(text.substr(slash + 1))) {
+bool ArchiveFileReader::parseShortName(std::string_view field, std::string_view& name) {
+  const size_t slash = field.find('/');
+  if (slash == std::string_view::npos)
+    return m_Archive.goOn(&ErrorHandler::reportNoNameTerminator, m_Offset);
+  if (!isBlank(field.substr(slash + 1))) {
     return m_Archive.goOn(&ErrorHandler::reportTrailingNameCharacter, m_Offset);
   }
-  name = untilNul(text.substr(0, slash));
+  name = untilNul(field.substr(0, slash));
   return true;
 }
 

@@ -38,12 +38,12 @@ private:
   Pass readMember();
   Pass readHeader();
   bool parseHeader();
-  bool parseNumber(HeaderField field, uint32_t base, FieldReport report, uint32_t& value);
+  bool parseNumber(HeaderField which, uint32_t base, FieldReport report, uint32_t& value);
   bool parseSize();
   bool parseName(std::string_view& name);
   bool parseLongName(std::string_view digits, std::string_view& name);
   bool parseShortName(std::string_view field, std::string_view& name);
-  bool findLongNameEnd(std::string_view table, uint32_t index, size_t& end);
+  bool findLongNameEnd(std::string_view table, uint32_t index, size_t& end) const;
   bool checkHostFile();
   ArchiveMember* addMember(std::string_view name);
   [[nodiscard]] bool areContentsTaken(const ArchiveMember* member) const;

@@ -90,7 +90,7 @@ private:
   bool createTemporary();
   bool writeTemporary();
   bool writeMember(GatheringOutput& output, const ArchiveMember& member);
-  int writeHeader(GatheringOutput& output, const ArchiveMember& member);
+  static int writeHeader(GatheringOutput& output, const ArchiveMember& member);
   bool writeContents(GatheringOutput& output, const ArchiveMember& member);
   bool closeTemporary();
   bool replaceTarget();

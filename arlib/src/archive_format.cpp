@@ -49,7 +49,7 @@ bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uin
   if (start == text.size() || !isDigit(text[start])) return false;
   size_t position = start;
   while (position < text.size() && isDigit(text[position])) {
-    const uint32_t value = static_cast<uint32_t>(text[position++] - '0');
+    const auto value = static_cast<uint32_t>(text[position++] - '0');
     if (value >= base) break;
     const uint64_t next = uint64_t{result} * base + value;
     if (next > UINT32_MAX) return false;

@@ -106,7 +106,7 @@ void ArchiveMember::takeContents(std::span<uint8_t> bytes) {
 
 void ArchiveMember::freeContents() {
   if (m_Contents && m_ContentsAreViewed) {
-    m_Archive->m_ViewedBytes.push_back({m_Contents->bytes, m_Contents->capacity});
+    m_Archive->m_ViewedBytes.emplace_back(m_Contents->bytes, m_Contents->capacity);
   } else if (m_Contents) {
     m_Archive->m_ContainerRegion->discard(m_Contents->bytes, m_Contents->capacity);
   }

@@ -85,6 +85,14 @@ bool isPublished(const elfext::ObjectOutline::OutlinedSymbol& symbol, bool inclu
   return symbol.name != nullptr && *symbol.name != '\0';
 }
 
+// For names that have bytes in common: these are copied once.
+void setSharedNames(std::span<const char* const> published, SymbolNameList& names) {
+  names.clear();
+  const auto copy = [&names](std::string_view whole) { return names.copy(whole); };
+  for (const std::string_view shared : support::copyShared(published, copy))
+    names.addCopied(shared);
+}
+
 // Names that are more bytes than their object has in all must have bytes in common.
 void addNames(std::span<const char* const> published, uint64_t objectSize, SymbolNameList& names) {
   names.reserve(static_cast<uint32_t>(published.size()));
@@ -92,13 +100,7 @@ void addNames(std::span<const char* const> published, uint64_t objectSize, Symbo
   for (const char* name : published) {
     const std::string_view text = name;
     bytes += text.size();
-    if (bytes > objectSize) {
-      names.clear();
-      const auto copy = [&names](std::string_view whole) { return names.copy(whole); };
-      for (const std::string_view shared : support::copyShared(published, copy))
-        names.addCopied(shared);
-      return;
-    }
+    if (bytes > objectSize) return setSharedNames(published, names);
     names.add(text);
   }
 }

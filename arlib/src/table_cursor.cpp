@@ -39,7 +39,7 @@ bool TableCursor::viewWord() {
 }
 
 bool TableCursor::viewName(size_t& end) {
-  while (end == m_View.npos) {
+  while (end == std::string_view::npos) {
     const size_t searched = m_View.size();
     if (!viewMore()) return false;
     end = m_View.find('\0', searched);
@@ -51,7 +51,7 @@ bool TableCursor::findData() {
   do {
     const size_t data = m_View.find_first_not_of('\0');
     skip(std::min(data, m_View.size()));
-    if (data != m_View.npos) return true;
+    if (data != std::string_view::npos) return true;
   } while (viewMore());
   return false;
 }

@@ -37,7 +37,7 @@ public:
   // be had. Good until the next call; for as long as the bytes if these are in memory.
   [[nodiscard]] std::optional<std::string_view> takeName() {
     size_t end = m_View.find('\0');
-    if (end == m_View.npos && !viewName(end)) return std::nullopt;
+    if (end == std::string_view::npos && !viewName(end)) return std::nullopt;
     const std::string_view name = m_View.substr(0, end);
     skip(end + 1);
     return name;

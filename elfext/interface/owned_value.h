@@ -20,7 +20,10 @@ public:
   OwnedValue(const OwnedValue& other)
       : m_Value(other ? std::make_unique<T>(*other) : std::unique_ptr<T>()) {}
   OwnedValue(OwnedValue&&) noexcept = default;
-  OwnedValue& operator=(const OwnedValue& other) { return *this = OwnedValue(other); }
+  OwnedValue& operator=(const OwnedValue& other) {
+    *this = OwnedValue(other);
+    return *this;
+  }
   OwnedValue& operator=(OwnedValue&&) noexcept = default;
   ~OwnedValue() = default;
 

@@ -58,7 +58,7 @@ class ObjectModule;
                                DeferredContentsSelector* selector);
 
 /// The second form for a file that others read as well, all through its one opening.
-[[nodiscard]] bool readElfFile(std::shared_ptr<support::SourceFile> file, uint64_t offset,
+[[nodiscard]] bool readElfFile(const std::shared_ptr<support::SourceFile>& file, uint64_t offset,
                                uint64_t size, ObjectModule& module,
                                DeferredContentsSelector* selector);
 

@@ -83,7 +83,7 @@ void appendCharacter(std::string& text, const Conversion& conversion, char value
 
 void appendSigned(std::string& text, const Conversion& conversion, int64_t value) {
   // Negated in unsigned arithmetic, where the smallest value has its counterpart.
-  const uint64_t bits = static_cast<uint64_t>(value);
+  const auto bits = static_cast<uint64_t>(value);
   DigitBuffer buffer;
   NumberParts parts = makeParts(buffer, conversion, value < 0 ? 0 - bits : bits);
   if (value < 0) {

@@ -113,7 +113,7 @@ bool BuildAttributesSectionParser::parse(AttributeBytes section, bool isLittleEn
   for (size_t position = 1; position < section.size();) {
     const AttributeBytes rest = section.subspan(position);
     if (rest.size() < LengthSize) return false;
-    const uint32_t length = getWord<uint32_t>(rest.data(), isLittleEndian);
+    const auto length = getWord<uint32_t>(rest.data(), isLittleEndian);
     if (length <= LengthSize || length > rest.size()) return false;
     SubsectionWalk walk(*this, indices, isLittleEndian);
     if (!walk.walk(rest.subspan(LengthSize, length - LengthSize))) isWell = false;

@@ -86,7 +86,7 @@ bool take(std::string_view& text, std::string_view beginning) {
 
 // Steps over the first row's name that the text begins with; null if there is none.
 template <class Rows>
-auto takeName(std::string_view& text, const Rows& rows) -> const decltype(&rows[0]) {
+auto takeName(std::string_view& text, const Rows& rows) -> decltype(&rows[0]) {
   for (const auto& row : rows) {
     if (take(text, row.name)) return &row;
   }

@@ -12,7 +12,7 @@ namespace elfext {
 
 // Whether the name starts with a dollar and one of the letters.
 [[nodiscard]] inline bool startsWithDollar(const char* name, std::string_view letters) {
-  return name != nullptr && name[0] == '$' && letters.find(name[1]) != letters.npos;
+  return name != nullptr && name[0] == '$' && letters.find(name[1]) != std::string_view::npos;
 }
 
 [[nodiscard]] inline bool isMappingSymbolName(const char* name) {

@@ -248,6 +248,7 @@ void ObjectModule::noteComdatGroup(Group* group) {
     m_MapSignaturesToComdatGroups.put(signature, group);
 }
 
+// NOLINTNEXTLINE(readability-function-size): the fields of a program header
 Segment* ObjectModule::createSegment(uint32_t type, uint64_t offset, uint64_t vaddr, uint64_t paddr,
                                      uint64_t filesz, uint64_t memsz, uint32_t flags,
                                      uint64_t align) {

@@ -77,6 +77,7 @@ void Pruner::markDependentSections() {
   };
   for (Group* group : m_ObjectModule.m_Groups)
     if (group->m_Goes && group->m_GroupSection != nullptr) take(group->m_GroupSection);
+  // NOLINTNEXTLINE(modernize-loop-convert): it grows meanwhile
   for (size_t next = 0; next < going.size(); ++next)
     for (bool isDynamic : {false, true})
       for (RelocationSection* section : going[next]->getRelocationSections(isDynamic).getSpan())
@@ -187,7 +188,7 @@ void Pruner::sweepGroups() {
     m_ObjectModule.noteComdatGroup(group);
 }
 
-void Pruner::sweepSection(Section& section) const {
+void Pruner::sweepSection(Section& section) {
   const auto goes = [](const Section* other) { return other->m_Goes; };
   if (section.m_Link != nullptr && section.m_Link->m_Goes) section.m_Link = nullptr;
   if (section.m_Segment != nullptr && section.m_Segment->m_Goes) section.m_Segment = nullptr;

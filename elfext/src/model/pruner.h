@@ -31,7 +31,7 @@ private:
 
   void sweepRelocations();
   void sweepPlacement();
-  void sweepSection(Section& section) const;
+  static void sweepSection(Section& section);
   void sweepSections();
   void sweepOverlayRecords();
   void sweepSymbols();

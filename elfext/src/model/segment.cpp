@@ -10,6 +10,7 @@
 
 namespace elfext {
 
+// NOLINTNEXTLINE(readability-function-size): the fields of a program header
 Segment::Segment(ObjectModule* objectModule, uint32_t type, uint64_t offset, uint64_t vaddr,
                  uint64_t paddr, uint64_t filesz, uint64_t memsz, uint32_t flags, uint64_t align)
     : m_ObjectModule(objectModule), m_VirtualAddress(vaddr), m_PhysicalAddress(paddr),

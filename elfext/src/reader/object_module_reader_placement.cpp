@@ -86,6 +86,13 @@ private:
   std::vector<Region> m_Regions;
 };
 
+// Neither refused nor too far: a region joins once, at a distance that is the difference of two
+// offsets of one file.
+void tie(FileRegion& first, FileRegion& second, uint64_t distance) {
+  [[maybe_unused]] const bool ret = FileRegion::link(first, second, distance);
+  QUARN_ASSERT(1, ret);
+}
+
 // Going up by start, a region shares a byte with an earlier one exactly when it starts before the
 // farthest end so far; tying it to that one ties it to all that it shares bytes with.
 void tieOverlappingRegions(std::vector<Region> regions) {
@@ -96,13 +103,8 @@ void tieOverlappingRegions(std::vector<Region> regions) {
   std::sort(regions.begin(), regions.end(), comesFirst);
   const Region* farthest = nullptr;
   for (const Region& region : regions) {
-    if (farthest != nullptr && region.extent.start < farthest->extent.end) {
-      [[maybe_unused]] const bool ret = FileRegion::link(
-          // Neither refused nor too far: a region joins once, at a distance that is the difference
-          // of two offsets of one file.
-          *farthest->region, *region.region, region.extent.start - farthest->extent.start);
-      QUARN_ASSERT(1, ret);
-    }
+    if (farthest != nullptr && region.extent.start < farthest->extent.end)
+      tie(*farthest->region, *region.region, region.extent.start - farthest->extent.start);
     if (farthest == nullptr || region.extent.end > farthest->extent.end) farthest = &region;
   }
 }
@@ -116,9 +118,7 @@ void tieSectionsWithoutBytes(ReadContext& context) {
     if (segments[i] == NoExtent) continue;
     const uint64_t distance =
         context.sectionHeaders[i].offset - context.programHeaders[segments[i]].offset;
-    [[maybe_unused]] const bool ret = FileRegion::link(*context.module.getSegment(segments[i]),
-                                                       *context.module.getSection(i), distance);
-    QUARN_ASSERT(1, ret);
+    tie(*context.module.getSegment(segments[i]), *context.module.getSection(i), distance);
   }
 }
 
@@ -130,8 +130,7 @@ void createRawDataBlocks(ReadContext& context) {
     // The bytes stay in the image: a gap may be as large as the file.
     ModuleBuilder::getBuffer(*block).defer(context.image, gap.start, gap.end - gap.start);
     const uint64_t distance = gap.start - context.programHeaders[gap.segment].offset;
-    [[maybe_unused]] const bool ret = FileRegion::link(*segment, *block, distance);
-    QUARN_ASSERT(1, ret);
+    tie(*segment, *block, distance);
   }
 }
 

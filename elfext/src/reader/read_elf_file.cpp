@@ -163,7 +163,7 @@ bool readElfFile(support::Host& host, const char* fileName, uint64_t offset, uin
   return readOwnFile(files, file, offset, size, module);
 }
 
-bool readElfFile(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
+bool readElfFile(const std::shared_ptr<support::SourceFile>& file, uint64_t offset, uint64_t size,
                  ObjectModule& module, DeferredContentsSelector*) {
   QUARN_ASSERT(1, file != NULL);
   return readShared(file, offset, size, module);

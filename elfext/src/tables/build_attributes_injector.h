@@ -57,12 +57,12 @@ public:
                           InjectionBudget& budget)
       : m_Store(store), m_Scope(scope), m_Budget(budget) {}
 
-  bool parseFileSubSubsection(std::string_view vendor, AttributeBytes run) override;
+  bool parseFileSubSubsection(std::string_view vendor, AttributeBytes bytes) override;
   // False for indices that are not those of sections, or of symbols.
   bool parseSectionSubSubsection(std::string_view vendor, std::span<const uint32_t> indices,
-                                 AttributeBytes run) override;
+                                 AttributeBytes bytes) override;
   bool parseSymbolSubSubsection(std::string_view vendor, std::span<const uint32_t> indices,
-                                AttributeBytes run) override;
+                                AttributeBytes bytes) override;
 
 private:
   struct Run;

@@ -112,7 +112,7 @@ bool readDecoration(const AttributeSymbol& symbol, NameReader& names, Decoration
   if (symbol.category != Symbol::Category_Absolute) return false;
   const std::string_view name = names.read(symbol.name);
   const size_t marker = name.find(DecorationMarker);
-  if (marker == name.npos) return false;
+  if (marker == std::string_view::npos) return false;
   decoration = {symbol, name.substr(marker + DecorationMarker.size()), name.substr(0, marker)};
   return true;
 }

@@ -19,7 +19,7 @@ namespace elfext {
 namespace {
 
 std::vector<DynamicTag> getTags(const ObjectTables& tables, const uint8_t* bytes, uint64_t size) {
-  const uint32_t fieldSize = tables.format.isWide ? 8 : 4;
+  const uint64_t fieldSize = tables.format.isWide ? 8 : 4;
   std::vector<DynamicTag> tags;
   // By subtraction: a section may end in the middle of a pair.
   for (uint64_t pos = 0; size - pos >= 2 * fieldSize; pos += 2 * fieldSize) {
