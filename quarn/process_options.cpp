@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Values into settings, in one fixed order. That order decides what is printed first, which of two
-// actions is the second one, and what -u and -n mean together; the order on the command line
-// doesn't.
+// actions is the second one, and that --new_files_only goes over -u. The order on the command line
+// counts only between a switch and its own opposite, which write the same value.
 #include "quarn/process_options.h"
 
 #include "checking/interface/checking.h"

@@ -271,6 +271,27 @@ TEST(SourceTree, TestsAreNamedInCamelCase) {
   }
 }
 
+// Who looks for the test of a promise finds it under the name that the list of promises has.
+TEST(SourceTree, TheListOfPromisesLeadsToTests) {
+  const std::regex quoted("`(\\w+)\\.(\\w+)`");
+  const std::regex test("\\nT(?:YPED_T)?EST(?:_F|_P)?\\((\\w+),\\s*(\\w+)\\)");
+  Names known;
+  for (const fs::path& file : sourcesOf("tests")) {
+    const std::string text = contentsOf(file);
+    for (std::sregex_iterator match(text.begin(), text.end(), test), end; match != end; ++match)
+      known.insert((*match)[1].str() + "." + (*match)[2].str());
+  }
+  for (const auto& entry : fs::directory_iterator(treeRoot() / "tests/cli"))
+    known.insert(entry.path().filename());
+  const std::string list = contentsOf(treeRoot() / "tests/README.md");
+  size_t count = 0;
+  for (std::sregex_iterator match(list.begin(), list.end(), quoted), end; match != end; ++match) {
+    EXPECT_TRUE(known.contains((*match)[1].str() + "." + (*match)[2].str())) << (*match)[0];
+    ++count;
+  }
+  EXPECT_GT(count, 20u);
+}
+
 // A text that nobody prints has no place in the catalogues.
 TEST(SourceTree, EveryMessageIsReported) {
   std::string sources;

@@ -64,7 +64,7 @@ protected:
 };
 
 using FaultInAnEdit = FaultInTheTool;
-using FaultInAReading = FaultInTheTool;
+using FaultInARunThatReads = FaultInTheTool;
 
 } // namespace
 
@@ -128,7 +128,7 @@ INSTANTIATE_TEST_SUITE_P(Tool, FaultInAnEdit,
                                          Words{"-s", "lib.a"}, Words{"-n", "-s", "lib.a"},
                                          Words{"--create", "--normalise=5", "lib.a", "a.o"}));
 
-TEST_P(FaultInAReading, LeavesTheArchiveAndOnlyWholeFiles) {
+TEST_P(FaultInARunThatReads, LeavesTheArchiveAndNoHalfFile) {
   uint64_t needed = 0;
   fill();
   m_Folder.removeAllBut({"lib.a"});
@@ -154,7 +154,7 @@ TEST_P(FaultInAReading, LeavesTheArchiveAndOnlyWholeFiles) {
   }
 }
 
-INSTANTIATE_TEST_SUITE_P(Tool, FaultInAReading,
+INSTANTIATE_TEST_SUITE_P(Tool, FaultInARunThatReads,
                          testing::Values(Words{"-x", "lib.a"}, Words{"-t", "lib.a"},
                                          Words{"-tv", "lib.a"}, Words{"-p", "lib.a"},
                                          Words{"--zs", "lib.a"}));
