@@ -47,7 +47,7 @@ void readAndWrite(support::Host& host, arlib::ErrorHandler* handler) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = (alloclib::initialise(), true);
+  static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised) return 0;
   LenientHandler lenient;
   for (arlib::ErrorHandler* handler :

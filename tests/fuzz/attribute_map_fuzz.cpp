@@ -81,7 +81,7 @@ void lookUp(std::string_view name, const LibraryAttributeMap& map) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = (alloclib::initialise(), true);
+  static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const LibraryAttributeMap map = readMap(text);

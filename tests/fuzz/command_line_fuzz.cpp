@@ -64,7 +64,7 @@ void parse(const std::vector<std::string>& words, std::string_view file, size_t 
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = (alloclib::initialise(), true);
+  static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   parse(linesOf(text), text, size_t{data[0]} + 1);

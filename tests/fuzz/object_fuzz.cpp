@@ -101,7 +101,7 @@ void compareRoads(std::span<const uint8_t> bytes) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = (alloclib::initialise(), true);
+  static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
   ElfextErrorStringCapture refusing;
   AcceptingHandler accepting;

@@ -118,7 +118,7 @@ bool isPrefix(const std::vector<std::string>& front, const std::vector<std::stri
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = (alloclib::initialise(), true);
+  static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const Reading reading = readFile(text, ViaFile::BufferSize);

@@ -24,7 +24,11 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-// Memory that is left to the host at the end of a run is no fault of it.
+// Memory that is left to the host at the end of a run is no fault of it. The name is the
+// sanitizer's, which looks for it.
+#ifdef __clang__
+#pragma clang diagnostic ignored "-Wreserved-identifier"
+#endif
 extern "C" const char* __asan_default_options();
 extern "C" const char* __asan_default_options() {
   return "detect_leaks=0";
