@@ -42,18 +42,21 @@ function(quarn_library name)
   endif()
 endfunction()
 
-# quarn_test_program(name [CASES_APART] SOURCES file... LIBRARIES library...): one GoogleTest
+# quarn_test_program(name [CASES_APART] [OPTIMISED] SOURCES file... LIBRARIES library...): one GoogleTest
 # program and one ctest entry, or one for each of its cases where these are long and many cores can
 # share them. Two thousand short cases take less time than two thousand starts of a program.
 #
 # Tests are compiled without optimisation, on headers that are read once: that takes a third of the
-# time, and what is tested are the libraries, which keep theirs.
+# time, and what is tested are the libraries, which keep theirs. OPTIMISED is for programs that
+# spend minutes in what headers hold, which is compiled like the test.
 function(quarn_test_program name)
-  cmake_parse_arguments(ARG "CASES_APART" "" "SOURCES;LIBRARIES" ${ARGN})
+  cmake_parse_arguments(ARG "CASES_APART;OPTIMISED" "" "SOURCES;LIBRARIES" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
   target_link_libraries(${name} PRIVATE ${ARG_LIBRARIES} quarn_warnings GTest::gmock GTest::gtest_main)
-  target_compile_options(${name} PRIVATE -O0)
-  target_precompile_headers(${name} REUSE_FROM test_headers)
+  if(NOT ARG_OPTIMISED)
+    target_compile_options(${name} PRIVATE -O0)
+    target_precompile_headers(${name} REUSE_FROM test_headers)
+  endif()
   # What asks for more memory than there is gets a refusal, as it does without the sanitizers.
   set(environment "ASAN_OPTIONS=allocator_may_return_null=1")
   if(ARG_CASES_APART)
