@@ -18,6 +18,7 @@
 #include "checking/interface/checking.h"
 #include "elfext/interface/fast_array.h"
 #include "elfext/interface/full_attr.h"
+#include "elfext/interface/object_outline.h"
 #include "support/interface/source_file.h"
 
 #include <cstdint>
@@ -79,6 +80,14 @@ public:
   [[nodiscard]] bool getUniqueSymbolsOnly() const { return m_UniqueSymbolsOnly; }
   void setUseObjectBuildAttributes(bool use) { m_UseObjectBuildAttributes = use; }
   [[nodiscard]] bool getUseObjectBuildAttributes() const { return m_UseObjectBuildAttributes; }
+
+  /// Whose objects publish their symbols. Of foreign ones no build is told from another.
+  void setMachines(elfext::ObjectOutline::Machines machines) { m_Machines = machines; }
+  [[nodiscard]] elfext::ObjectOutline::Machines getMachines() const { return m_Machines; }
+
+  /// Whether members keep the folders of their names, when they are read and when they are added.
+  /// Without this, a name is cut to its last component.
+  void setKeepFolders(bool keep) { m_KeepFolders = keep; }
 
   /// Whether getSymbols and what builds on it will be called, as they may be unless somebody says
   /// no before the read: then the table is checked as ever, and its bytes are not kept.
@@ -242,6 +251,8 @@ private:
   /// Keeps the file for the members whose bytes it has.
   support::SourceFile* hold(const std::shared_ptr<support::SourceFile>& file);
   ArchiveMember* appendMember(std::string_view regionName);
+  /// What a member is called that comes with this name.
+  [[nodiscard]] std::string_view memberNameOf(std::string_view name) const;
   /// Date, uid, gid and mode are those of the file.
   ArchiveMember* appendFileMember(std::string_view regionName,
                                   const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
@@ -294,6 +305,8 @@ private:
   bool m_UniqueSymbolsOnly = false;
   bool m_UseObjectBuildAttributes = false;
   bool m_AreSymbolsWanted = true;
+  bool m_KeepFolders = false;
+  elfext::ObjectOutline::Machines m_Machines = elfext::ObjectOutline::Machines::Own;
   std::optional<elfext::FullAttr> m_LibraryAttributes;
 
   /// Bytes of tables that were read and then replaced: names and symbols are views of them.

@@ -95,9 +95,10 @@ bool parseHeaderNumber(std::string_view text, uint32_t base, uint32_t width, uin
   return value + (value & 1);
 }
 
-/// Whether a name goes in the long-name table.
+/// Whether a name goes in the long-name table. One with folders does, as a "/" ends the name in a
+/// header.
 constexpr bool isLongName(std::string_view name) {
-  return name.size() > MaximumShortName;
+  return name.size() > MaximumShortName || name.find('/') != std::string_view::npos;
 }
 
 /// Where the next header starts, for a header at `offset` whose contents have `size` bytes.

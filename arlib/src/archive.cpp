@@ -177,6 +177,10 @@ void Archive::noteTablesUpToDate() {
   m_SymbolTableUpToDate = true;
 }
 
+std::string_view Archive::memberNameOf(std::string_view name) const {
+  return m_KeepFolders ? name : support::lastPathComponent(name);
+}
+
 ArchiveMember* Archive::appendMember(std::string_view regionName) {
   auto* member = alloclib::create<ArchiveMember>(*m_ObjectRegion, this);
   member->m_Name = regionName;
@@ -265,8 +269,8 @@ ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe&
     fail(&ErrorHandler::reportReadError, fileName, error);
     return nullptr;
   }
-  const std::string_view leaf = support::lastPathComponent(fileName);
-  ArchiveMember* member = appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, 0,
+  const std::string_view name = memberNameOf(fileName);
+  ArchiveMember* member = appendFileMember({copyToRegion(name), name.size()}, probe.file, 0,
                                            static_cast<uint32_t>(probe.status.size));
   member->m_Type = ArchiveMemberType::decide(probe.getFirstBytes());
   return member;
@@ -286,17 +290,17 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   FileProbe probe;
   if (!openSource(fileName, probe)) return nullptr;
   if (!cutToFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
-  const std::string_view leaf = support::lastPathComponent(memberName);
+  const std::string_view name = memberNameOf(memberName);
   ArchiveMember* member =
-      appendFileMember({copyToRegion(leaf), leaf.size()}, probe.file, offset, size);
+      appendFileMember({copyToRegion(name), name.size()}, probe.file, offset, size);
   member->m_Type = ArchiveMemberType::decide(member);
   return member;
 }
 
 ArchiveMember* Archive::addMemberFromMember(const ArchiveMember& source) {
   QUARN_ASSERT(1, !m_ReadOnly);
-  const std::string_view leaf = support::lastPathComponent(source.getName());
-  ArchiveMember* member = appendMember({copyToRegion(leaf), leaf.size()});
+  const std::string_view name = memberNameOf(source.getName());
+  ArchiveMember* member = appendMember({copyToRegion(name), name.size()});
   member->setContentsFromMember(source);
   noteEdit(Edit::FileMember);
   return member;

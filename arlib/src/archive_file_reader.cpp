@@ -260,11 +260,11 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   uint32_t size = m_Numbers.size;
   if (!m_Archive.cutToFile(m_File->getName(), name, offset, size, m_Status.size)) return nullptr;
   // A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
-  std::string_view leaf = support::lastPathComponent(name);
+  std::string_view memberName = m_Archive.memberNameOf(name);
   if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
-    leaf = {m_Archive.copyToRegion(leaf), leaf.size()};
+    memberName = {m_Archive.copyToRegion(memberName), memberName.size()};
   }
-  ArchiveMember* member = m_Archive.appendFileMember(leaf, m_File, offset, size);
+  ArchiveMember* member = m_Archive.appendFileMember(memberName, m_File, offset, size);
   member->m_FileNameTableOffset = m_LongNameIndex;
   member->m_Date = m_Numbers.date;
   member->m_Uid = m_Numbers.uid;

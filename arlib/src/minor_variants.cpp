@@ -51,11 +51,13 @@ uint64_t quickHash(std::string_view name) {
 }
 
 // Names of a good object are about as long as the object, at most. Those that share their bytes a
-// thousand times over are a trap for whoever compares them.
+// thousand times over are a trap for whoever compares them. Of foreign objects nobody could say
+// which build is which.
 bool isComparable(const HostingMember& hosting) {
   constexpr uint64_t LargestExcess = 4;
   constexpr uint64_t AlwaysFine = 0x100000;
   const uint64_t size = hosting.key.textSize;
+  if (hosting.isForeign) return false;
   return size <= AlwaysFine || size / LargestExcess <= hosting.member->getSize();
 }
 

@@ -37,6 +37,7 @@ struct HostingMember {
   const SymbolNameList* names;
   NamesKey key;
   elfext::FullAttr attributes = {};
+  bool isForeign = false; // says nothing of builds
 };
 
 // Neighbours in the table to come: names that lead to one member.

@@ -46,6 +46,7 @@ bool SymbolTableMaker::isTableWanted() const {
 void SymbolTableMaker::collectSymbolHostingMembers() {
   const elfext::FullAttr nothingStated = m_Records.get("");
   ObjectReading reading{m_Records};
+  reading.outline.setMachines(m_Archive.getMachines());
   QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
   const std::span<ArchiveMember* const> members = m_Archive.getMembers();
   for (uint32_t place = 0; place < members.size(); ++place) {
@@ -60,8 +61,9 @@ void SymbolTableMaker::collectSymbolHostingMembers() {
       return;
     }
     if (names->getSize() == 0) continue;
-    m_SymbolHostingMembers.append(
-        {member, place, names, NamesKey(*names), attributes.value_or(nothingStated)});
+    m_SymbolHostingMembers.append({member, place, names, NamesKey(*names),
+                                   attributes.value_or(nothingStated),
+                                   reading.outline.isForeign()});
   }
 }
 

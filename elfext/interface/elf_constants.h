@@ -8,11 +8,13 @@
 // never taken for one of them.
 #pragma once
 
+#include <array>
 #include <cstdint>
 
 namespace elfext {
 
-/// e_ident
+/// e_ident; the first four bytes of every ELF file.
+constexpr std::array<uint8_t, 4> ElfMagic = {0x7F, 'E', 'L', 'F'};
 constexpr uint32_t ELFCLASS32 = 1;
 constexpr uint32_t ELFCLASS64 = 2;
 constexpr uint32_t ELFDATA2LSB = 1;

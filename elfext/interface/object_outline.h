@@ -42,10 +42,20 @@ public:
     const char* sectionName; ///< of a hosted symbol; null for none
   };
 
+  /// Whose objects are read.
+  enum class Machines : uint8_t {
+    Own, ///< all others are refused
+    Any, ///< of others the symbols are read, as far as the ELF standard defines them; what is no
+         ///< ELF file at all is an object about which nothing is known, and no error
+  };
+
   ObjectOutline();
   ~ObjectOutline();
   ObjectOutline(const ObjectOutline&) = delete;
   ObjectOutline& operator=(const ObjectOutline&) = delete;
+
+  /// For the reads to come.
+  void setMachines(Machines machines) { m_Machines = machines; }
 
   /// Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
   /// to the handler, which may be null; the outline is then empty, as it is when the handler lets a
@@ -60,6 +70,9 @@ public:
   [[nodiscard]] std::vector<OutlinedSection> getSections() const;
   /// The static ones, in their order, without the null symbol; good until the next read.
   [[nodiscard]] std::span<const OutlinedSymbol> getSymbols();
+  /// Whether the object is of a machine that is none of ours. It has symbols, and no more; where
+  /// they stand is not told.
+  [[nodiscard]] bool isForeign() const;
   /// e_entry; 0 of an empty outline.
   [[nodiscard]] uint64_t getEntry() const;
   /// The attributes of the object as a whole; null if it has none, or if they were not wanted.
@@ -70,6 +83,11 @@ public:
 private:
   struct Content;
 
+  std::span<const OutlinedSymbol> getForeignSymbols();
+  bool readForeign(std::unique_ptr<Content> content);
+  bool readOwn(std::unique_ptr<Content> content, bool wantsAttributes);
+
+  Machines m_Machines = Machines::Own;
   /// What serves one object after the other: objects of an archive are neighbours, and much alike.
   std::shared_ptr<support::SourceFile> m_File; ///< that was read last
   std::unique_ptr<ImageMemory> m_Memory;

@@ -6,6 +6,7 @@
 #include "elfext/interface/format_recognizer.h"
 
 #include "checking/interface/checking.h"
+#include "elfext/interface/elf_constants.h"
 
 #include <algorithm>
 #include <array>
@@ -19,7 +20,6 @@ constexpr size_t IdentSize = 16;
 constexpr size_t ClassPosition = 4;
 constexpr size_t Header32Size = 52;
 constexpr size_t Header64Size = 64;
-constexpr std::array<uint8_t, 4> Magic = {0x7F, 'E', 'L', 'F'};
 
 } // namespace
 
@@ -30,7 +30,7 @@ bool isElfData(std::span<const uint8_t> data) {
   // other.
   if (data[ClassPosition] == 2) return data.size() >= Header64Size;
   return data[ClassPosition] == 1 && data.size() >= Header32Size &&
-         std::equal(Magic.begin(), Magic.end(), data.begin());
+         std::equal(ElfMagic.begin(), ElfMagic.end(), data.begin());
 }
 
 bool isElfFile(support::Host& host, support::FileHandle file, uint64_t offset, uint64_t size) {

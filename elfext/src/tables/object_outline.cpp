@@ -17,6 +17,7 @@
 #include "elfext/src/tables/object_tables.h"
 #include "elfext/src/tables/sizes_source.h"
 
+#include <algorithm>
 #include <string>
 #include <utility>
 
@@ -37,9 +38,20 @@ struct ObjectOutline::Content {
   ObjectTables tables;
   std::optional<LooseAttributeStore> attributes = {};
   bool areAttributesWanted = false;
+  bool isForeign = false;
 };
 
 namespace {
+
+// False after a report, if the bytes can't be had.
+bool lookForMagic(ObjectTables& tables, bool& hasMagic) {
+  hasMagic = tables.image.contains(0, ElfMagic.size());
+  if (!hasMagic) return true;
+  const uint8_t* bytes = tables.view(0, ElfMagic.size());
+  if (bytes == nullptr) return false;
+  hasMagic = std::equal(ElfMagic.begin(), ElfMagic.end(), bytes);
+  return true;
+}
 
 // Of a file with no overlapping sections.
 template <class Function>
@@ -137,11 +149,28 @@ bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t off
   // The former image used the same memory; from here on its views would be wrong.
   m_Content.reset();
   if (!isInFile) return refuse(tables.reporter, &ErrorHandler::ioErrorReading, 0);
-  bool isForeign = false;
   if (!content->image.prepare(*m_Memory)) return tables.failRead();
-  if (!checkHeaders(tables, isForeign)) return false;
+  if (m_Machines == Machines::Any) {
+    bool hasMagic = false;
+    if (!lookForMagic(tables, hasMagic)) return false;
+    if (!hasMagic) return true;
+    if (!checkHeaderOfAnyMachine(tables, content->isForeign)) return false;
+    if (content->isForeign) return readForeign(std::move(content));
+  }
+  if (!checkHeaders(tables, content->isForeign)) return false;
   // The handler let it pass: an object about which nothing is known, and no error.
-  if (isForeign) return true;
+  if (content->isForeign) return true;
+  return readOwn(std::move(content), wantsAttributes);
+}
+
+bool ObjectOutline::readForeign(std::unique_ptr<Content> content) {
+  if (!checkForeignTables(content->tables)) return false;
+  m_Content = std::move(content);
+  return true;
+}
+
+bool ObjectOutline::readOwn(std::unique_ptr<Content> content, bool wantsAttributes) {
+  ObjectTables& tables = content->tables;
   if (!checkTables(tables)) return false;
   content->attributes.emplace(tables, wantsAttributes);
   content->areAttributesWanted = wantsAttributes;
@@ -150,9 +179,13 @@ bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t off
   return true;
 }
 
+bool ObjectOutline::isForeign() const {
+  return m_Content != nullptr && m_Content->isForeign;
+}
+
 std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
   std::vector<OutlinedSection> sections;
-  if (m_Content == nullptr) return sections;
+  if (m_Content == nullptr || m_Content->isForeign) return sections;
   const ObjectTables& tables = m_Content->tables;
   sections.reserve(tables.getSectionCount());
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
@@ -165,6 +198,7 @@ std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
 std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
   m_Symbols.clear();
   if (m_Content == nullptr) return {};
+  if (m_Content->isForeign) return getForeignSymbols();
   const ObjectTables& tables = m_Content->tables;
   m_Symbols.reserve(m_Content->attributes->getSymbolCount());
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
@@ -173,6 +207,22 @@ std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
     m_Symbols.push_back({table.nameOf(row), home.category, row.getBinding(),
                          isHosted ? tables.nameOf(home.section) : nullptr});
   });
+  return m_Symbols;
+}
+
+// Any section index but that of undefined symbols means a definition; what the reserved ones mean
+// is each machine's own.
+std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getForeignSymbols() {
+  const ObjectTables& tables = m_Content->tables;
+  for (const SymbolTable& table : tables.symbolTables) {
+    m_Symbols.reserve(table.rowCount);
+    tables.forEachSymbolRow(table, [&](uint32_t, const SymbolRow& row) {
+      const Symbol::Category category =
+          row.shndx == SHN_UNDEF ? Symbol::Category_Undefined : Symbol::Category_Hosted;
+      m_Symbols.push_back({table.nameOf(row), category, row.getBinding(), nullptr});
+      return true;
+    });
+  }
   return m_Symbols;
 }
 
@@ -187,7 +237,7 @@ const FullAttr* ObjectOutline::getOwnAttributes() const {
 }
 
 std::optional<SizesStatistics> ObjectOutline::computeSizes() {
-  if (m_Content == nullptr) return SizesStatistics();
+  if (m_Content == nullptr || m_Content->isForeign) return SizesStatistics();
   ObjectTables& tables = m_Content->tables;
   SizesSource source;
   addSections(tables, source);

@@ -14,7 +14,6 @@ namespace elfext {
 namespace {
 
 constexpr uint64_t IdentSize = 16;
-constexpr std::array<uint8_t, 4> Magic = {0x7F, 'E', 'L', 'F'};
 constexpr uint32_t EM_ZEV64_SECOND = 184;
 
 bool readFileHeader(ObjectTables& tables) {
@@ -25,7 +24,7 @@ bool readFileHeader(ObjectTables& tables) {
   const uint8_t* bytes = tables.view(0, fileHeaderSize(isWide));
   if (bytes == nullptr) return false;
   // Class 2 alone decides; only the other path looks at the magic.
-  if (!isWide && !std::equal(Magic.begin(), Magic.end(), bytes))
+  if (!isWide && !std::equal(ElfMagic.begin(), ElfMagic.end(), bytes))
     return mapLowLevelResult(tables.reporter, LowLevelResult::WrongMagic);
   if (!isWide && bytes[EI_CLASS] != ELFCLASS32)
     return mapLowLevelResult(tables.reporter, LowLevelResult::WrongClass);
@@ -53,12 +52,17 @@ bool isMachineSupported(uint16_t machine) {
 
 } // namespace
 
-bool checkHeaders(ObjectTables& tables, bool& isForeign) {
+bool checkHeaderOfAnyMachine(ObjectTables& tables, bool& isForeign) {
   if (!readFileHeader(tables) || !checkFileHeader(tables)) return false;
-  const uint16_t machine = tables.fileHeader.machine;
+  isForeign = !isMachineSupported(tables.fileHeader.machine);
+  return true;
+}
+
+bool checkHeaders(ObjectTables& tables, bool& isForeign) {
+  if (!checkHeaderOfAnyMachine(tables, isForeign)) return false;
   // Objects of other processors are members like any other, for a handler that wants them.
-  isForeign = !isMachineSupported(machine);
-  if (isForeign) return goOn(tables.reporter, &ErrorHandler::unsupportedMachine, machine);
+  if (isForeign)
+    return goOn(tables.reporter, &ErrorHandler::unsupportedMachine, tables.fileHeader.machine);
   return checkSectionHeaders(tables) && checkProgramHeaders(tables);
 }
 

@@ -276,6 +276,10 @@ struct ObjectTables {
 // The file header and the two tables of headers. A handler that lets a foreign machine pass ends
 // this with `isForeign` and true, and there is nothing more to read.
 [[nodiscard]] bool checkHeaders(ObjectTables& tables, bool& isForeign);
+// The file header of an object of any machine.
+[[nodiscard]] bool checkHeaderOfAnyMachine(ObjectTables& tables, bool& isForeign);
+// What follows it in a foreign object: the section headers, and the one symbol table.
+[[nodiscard]] bool checkForeignTables(ObjectTables& tables);
 // All that the headers lead to, but for build attributes.
 [[nodiscard]] bool checkTables(ObjectTables& tables);
 
@@ -294,5 +298,13 @@ struct ObjectTables {
 [[nodiscard]] bool checkDynamicSections(ObjectTables& tables);
 [[nodiscard]] bool checkDebugOverlays(ObjectTables& tables);
 [[nodiscard]] bool checkSegmentMaps(ObjectTables& tables);
+
+// ---- The steps for one section
+
+[[nodiscard]] bool checkTableShape(ObjectTables& tables, uint32_t index);
+[[nodiscard]] bool checkStringTable(ObjectTables& tables, uint32_t index);
+[[nodiscard]] bool checkSymbolTableLink(ObjectTables& tables, uint32_t index);
+// Fills the table for its rows to be checked.
+[[nodiscard]] bool openSymbolTable(ObjectTables& tables, uint32_t index, SymbolTable& table);
 
 } // namespace elfext

@@ -100,7 +100,7 @@ bool checkLinkByType(ObjectTables& tables, uint32_t index) {
     return checkLink(tables, index, DynamicRule);
   case SHT_SYMTAB:
   case SHT_DYNSYM:
-    return checkLink(tables, index, SymbolTableRule);
+    return checkSymbolTableLink(tables, index);
   case SHT_REL:
   case SHT_RELA:
     return checkRelocationLinks(tables, index);
@@ -136,6 +136,10 @@ bool checkLinks(ObjectTables& tables) {
     if (!checkPlainLink(tables, i)) return false;
   }
   return true;
+}
+
+bool checkSymbolTableLink(ObjectTables& tables, uint32_t index) {
+  return checkLink(tables, index, SymbolTableRule);
 }
 
 bool isLinkedByType(uint32_t type) {

@@ -50,25 +50,6 @@ bool readTable(ObjectTables& tables, uint64_t offset, uint64_t count, uint32_t r
   return true;
 }
 
-// A table of fixed rows must have rows of the right size, and whole ones.
-bool checkTableShape(ObjectTables& tables, uint32_t index) {
-  SectionHeader& header = tables.sectionHeaders[index];
-  const uint64_t expected = expectedEntrySize(header.type, tables.fileHeader.ident[EI_CLASS]);
-  if (expected == 0) return true;
-  if (header.entsize != 0 && header.entsize != expected) {
-    if (!goOn(tables.reporter, &ErrorHandler::wrongEntrySize, index, header.entsize, expected))
-      return false;
-    // Mended as the handler's contract says: the row size is ours in any case.
-    header.entsize = expected;
-  }
-  if (header.size % expected == 0) return true;
-  if (!goOn(tables.reporter, &ErrorHandler::sizeNotMultiple, index, header.size, expected))
-    return false;
-  // Rows that are whole are still good; what is left of them is nobody's.
-  header.size -= header.size % expected;
-  return true;
-}
-
 // Sections whose extents leave the image end the read anyway.
 void findOverlap(ObjectTables& tables) {
   std::vector<Extent> extents;
@@ -97,36 +78,6 @@ void findLoadSegments(ObjectTables& tables) {
   for (const SectionHeader& header : tables.sectionHeaders)
     sections.push_back({header.offset, endOf(header.offset, header.size), 0});
   tables.loadSegments = findFirstHolders(loads, sections);
-}
-
-// A string table must start and end with a zero byte: whoever looks for the end of a name in it
-// finds one. Mending makes a copy, and overlapping tables might be many.
-bool checkStringTable(ObjectTables& tables, uint32_t index) {
-  const SectionHeader& header = tables.sectionHeaders[index];
-  if (header.size == 0) {
-    if (!goOn(tables.reporter, &ErrorHandler::emptyStringTable, index)) return false;
-    tables.mendedStrings[index] = {0};
-    return true;
-  }
-  // Names will be looked for all over the table, but for one that is not used in the end.
-  if (!tables.overlap && tables.view(header.offset, header.size) == nullptr) return false;
-  const uint8_t* first = tables.view(header.offset, 1);
-  const uint8_t* last = tables.view(header.offset + header.size - 1, 1);
-  if (first == nullptr || last == nullptr) return false;
-  const bool isBadAtStart = *first != 0;
-  const bool isBadAtEnd = *last != 0;
-  if (!isBadAtStart && !isBadAtEnd) return true;
-  if (!goOn(tables.reporter, &ErrorHandler::stringTableNotZeroEnded, index, isBadAtStart,
-            isBadAtEnd))
-    return false;
-  // Nobody will look into it.
-  if (tables.overlap) return true;
-  std::vector<uint8_t>& mended = tables.mendedStrings[index];
-  // The whole table has been viewed above, so its bytes follow the first one.
-  mended.assign(first, first + header.size);
-  mended.front() = 0;
-  mended.back() = 0;
-  return true;
 }
 
 bool checkSectionBytes(ObjectTables& tables, uint32_t index) {
@@ -173,6 +124,55 @@ bool dropNames(ObjectTables& tables) {
 }
 
 } // namespace
+
+// A table of fixed rows must have rows of the right size, and whole ones.
+bool checkTableShape(ObjectTables& tables, uint32_t index) {
+  SectionHeader& header = tables.sectionHeaders[index];
+  const uint64_t expected = expectedEntrySize(header.type, tables.fileHeader.ident[EI_CLASS]);
+  if (expected == 0) return true;
+  if (header.entsize != 0 && header.entsize != expected) {
+    if (!goOn(tables.reporter, &ErrorHandler::wrongEntrySize, index, header.entsize, expected))
+      return false;
+    // Mended as the handler's contract says: the row size is ours in any case.
+    header.entsize = expected;
+  }
+  if (header.size % expected == 0) return true;
+  if (!goOn(tables.reporter, &ErrorHandler::sizeNotMultiple, index, header.size, expected))
+    return false;
+  // Rows that are whole are still good; what is left of them is nobody's.
+  header.size -= header.size % expected;
+  return true;
+}
+
+// A string table must start and end with a zero byte: whoever looks for the end of a name in it
+// finds one. Mending makes a copy, and overlapping tables might be many.
+bool checkStringTable(ObjectTables& tables, uint32_t index) {
+  const SectionHeader& header = tables.sectionHeaders[index];
+  if (header.size == 0) {
+    if (!goOn(tables.reporter, &ErrorHandler::emptyStringTable, index)) return false;
+    tables.mendedStrings[index] = {0};
+    return true;
+  }
+  // Names will be looked for all over the table, but for one that is not used in the end.
+  if (!tables.overlap && tables.view(header.offset, header.size) == nullptr) return false;
+  const uint8_t* first = tables.view(header.offset, 1);
+  const uint8_t* last = tables.view(header.offset + header.size - 1, 1);
+  if (first == nullptr || last == nullptr) return false;
+  const bool isBadAtStart = *first != 0;
+  const bool isBadAtEnd = *last != 0;
+  if (!isBadAtStart && !isBadAtEnd) return true;
+  if (!goOn(tables.reporter, &ErrorHandler::stringTableNotZeroEnded, index, isBadAtStart,
+            isBadAtEnd))
+    return false;
+  // Nobody will look into it.
+  if (tables.overlap) return true;
+  std::vector<uint8_t>& mended = tables.mendedStrings[index];
+  // The whole table has been viewed above, so its bytes follow the first one.
+  mended.assign(first, first + header.size);
+  mended.front() = 0;
+  mended.back() = 0;
+  return true;
+}
 
 bool checkSectionHeaders(ObjectTables& tables) {
   const uint64_t offset = tables.fileHeader.shoff;

@@ -127,9 +127,25 @@ private:
   RowMarks m_IsBadIndex;
 };
 
+bool checkOverlappingTable(ObjectTables& tables, const SymbolTable& table,
+                           std::optional<OverlappingTables>& overlappingTables) {
+  if (!overlappingTables) {
+    const uint8_t* image = tables.view(0, tables.image.getSize());
+    if (image == nullptr) return false;
+    overlappingTables.emplace(tables, std::span(image, tables.image.getSize()));
+  }
+  const auto indexSection = tables.indexSections.find(table.section);
+  const uint64_t indexOffset = indexSection == tables.indexSections.end()
+                                   ? 0
+                                   : tables.sectionHeaders[indexSection->second].offset;
+  return !overlappingTables->isSuspicious(table, indexOffset) || checkRows(tables, table);
+}
+
+} // namespace
+
 // The rows, and what they refer to. Of a file with overlapping sections not the strings, as nothing
 // is taken from them.
-bool openTable(ObjectTables& tables, uint32_t index, SymbolTable& table) {
+bool openSymbolTable(ObjectTables& tables, uint32_t index, SymbolTable& table) {
   const SectionHeader& header = tables.sectionHeaders[index];
   const uint64_t rowCount = tables.rowCount(index);
   table.section = index;
@@ -152,28 +168,12 @@ bool openTable(ObjectTables& tables, uint32_t index, SymbolTable& table) {
   return table.strings != nullptr;
 }
 
-bool checkOverlappingTable(ObjectTables& tables, const SymbolTable& table,
-                           std::optional<OverlappingTables>& overlappingTables) {
-  if (!overlappingTables) {
-    const uint8_t* image = tables.view(0, tables.image.getSize());
-    if (image == nullptr) return false;
-    overlappingTables.emplace(tables, std::span(image, tables.image.getSize()));
-  }
-  const auto indexSection = tables.indexSections.find(table.section);
-  const uint64_t indexOffset = indexSection == tables.indexSections.end()
-                                   ? 0
-                                   : tables.sectionHeaders[indexSection->second].offset;
-  return !overlappingTables->isSuspicious(table, indexOffset) || checkRows(tables, table);
-}
-
-} // namespace
-
 bool checkSymbols(ObjectTables& tables) {
   std::optional<OverlappingTables> overlappingTables;
   for (uint32_t i = 0; i < tables.getSectionCount(); ++i) {
     if (!isSymbolTable(tables.typeOf(i)) || tables.isBroken(i)) continue;
     SymbolTable table;
-    if (!openTable(tables, i, table)) return false;
+    if (!openSymbolTable(tables, i, table)) return false;
     if (tables.overlap) {
       if (!checkOverlappingTable(tables, table, overlappingTables)) return false;
       continue;
