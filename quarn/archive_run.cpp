@@ -9,7 +9,6 @@
 #include "arlib/interface/writer_turn.h"
 #include "elfext/interface/library_attribute_map.h"
 #include "messages/interface/output.h"
-#include "quarn/actions.h"
 #include "quarn/arlib_error_handler.h"
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
@@ -88,7 +87,8 @@ RunEnd writeArchive(Run& run) {
   return newFile == arlib::NewFile::Exists ? RunEnd::Overtaken : RunEnd::Done;
 }
 
-RunEnd openActAndWrite(Run& run, const char* archiveName, messages::HeldOutput& output) {
+RunEnd openActAndWrite(Run& run, const char* archiveName, const RunAction& action,
+                       messages::HeldOutput& output) {
   const bool isOpen = openArchive(run, archiveName);
   // Nobody can overtake who has his turn.
   if (!run.openStatus.missing) output.release();
@@ -98,7 +98,7 @@ RunEnd openActAndWrite(Run& run, const char* archiveName, messages::HeldOutput& 
     return RunEnd::Done;
   }
   if (!findPosition(run)) return RunEnd::Done;
-  doAction(run);
+  action(run);
   if (run.isCancelled || hasErrors()) return RunEnd::Done;
   chooseSymbolTableMode(run);
   return writeArchive(run);
@@ -117,18 +117,20 @@ void setLibraryAttributes(arlib::Archive& archive, const char* archiveName, cons
 }
 
 RunEnd runOnce(support::Host& host, const char* archiveName, const Settings& settings,
-               messages::HeldOutput& output) {
+               const RunAction& action, messages::HeldOutput& output) {
   arlib::Archive archive(host);
   ArlibErrorHandler handler(settings.verbose);
   archive.setErrorHandler(&handler);
   archive.setIncludeDebugSymbols(settings.includeDebugSymbols);
   archive.setUniqueSymbolsOnly(settings.uniqueSymbolsOnly);
   archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
+  archive.setMachines(settings.machines);
+  archive.setKeepFolders(settings.keepFolders);
   archive.setSymbolsWanted(false);
   setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
   ArchiveOpenStatus openStatus;
   Run run = {archive, settings, openStatus};
-  const RunEnd end = openActAndWrite(run, archiveName, output);
+  const RunEnd end = openActAndWrite(run, archiveName, action, output);
   archive.closeFiles();
   return end;
 }
@@ -138,12 +140,13 @@ RunEnd runOnce(support::Host& host, const char* archiveName, const Settings& set
 // Somebody else's new archive is taken over as if it had been there from the start. What this run
 // has said so far is held back until it is known to be true: too much of it, and there is no way
 // back.
-void runOnArchive(support::Host& host, const char* archiveName, const Settings& settings) {
+void runOnArchive(support::Host& host, const char* archiveName, const Settings& settings,
+                  const RunAction& action) {
   constexpr int MostRuns = 100; // others that make and remove it all the time can't be outrun
   messages::HeldOutput output;
   for (int run = 0; run < MostRuns; ++run) {
     if (settings.accessMode == Access_Write) output.hold();
-    if (runOnce(host, archiveName, settings, output) == RunEnd::Done) return;
+    if (runOnce(host, archiveName, settings, action, output) == RunEnd::Done) return;
     if (!output.drop()) break;
   }
   reportMessage(messages::ErrorWord, messages::WritingArchive, archiveName, hostErrorText(EEXIST));

@@ -8,12 +8,18 @@
 // new archive where somebody else was faster starts over with the one that is there now.
 #pragma once
 
-#include "quarn/settings.h"
+#include "quarn/run.h"
 #include "support/interface/host.h"
+
+#include <functional>
 
 namespace quarn {
 
-// What went wrong has been reported.
-void runOnArchive(support::Host& host, const char* archiveName, const Settings& settings);
+using RunAction = std::function<void(Run&)>;
+
+// Does the action on the archive. It may be done again from the start, on an archive that somebody
+// else has made meanwhile. What went wrong has been reported.
+void runOnArchive(support::Host& host, const char* archiveName, const Settings& settings,
+                  const RunAction& action);
 
 } // namespace quarn

@@ -2,12 +2,11 @@
 //
 // Extraction and printing. Contents pass through in pieces, so that a member of any size needs no
 // memory of its size.
-#include "quarn/actions.h"
-
-#include "arlib/interface/contents_reader.h"
 #include "messages/interface/output.h"
-#include "quarn/member_selection.h"
+#include "quarn/actions.h"
+#include "quarn/extraction.h"
 #include "quarn/reporting.h"
+#include "support/interface/path.h"
 
 #include <cerrno>
 #include <string>
@@ -15,38 +14,25 @@
 namespace quarn {
 
 using arlib::ArchiveMember;
-using arlib::ContentsReader;
 
 namespace {
 
-constexpr size_t LongestFileName = 260; // of any host that archives are exchanged with
-constexpr size_t LongestHostName = 255; // of this one
+constexpr size_t LongestFileName = 260;   // of any host that archives are exchanged with
+constexpr size_t LongestHostName = 255;   // of this one
+constexpr uint32_t PermissionBits = 0777; // and none that gives a program its owner's rights
 
-class Extraction final : public MemberRoutine {
-public:
-  explicit Extraction(const Run& run)
-      : m_Settings(run.settings), m_Files(run.archive.getSourceFiles()),
-        m_Host(run.archive.getHost()), m_ArchiveStatus(run.archive.getOwnFile()->getStatus()),
-        m_Contents(run.archive) {}
+} // namespace
 
-  void operator()(ArchiveMember& member) override;
+Extraction::Extraction(const Run& run)
+    : m_Settings(run.settings), m_Files(run.archive.getSourceFiles()),
+      m_Host(run.archive.getHost()), m_ArchiveStatus(run.archive.getOwnFile()->getStatus()),
+      m_Contents(run.archive) {}
 
-private:
-  [[nodiscard]] std::string outputName(std::string_view name) const;
-  [[nodiscard]] bool mayWrite(const std::string& name) const;
-  bool copy(const ArchiveMember& member, support::FileHandle file, int& writeError);
-  void write(const ArchiveMember& member, const std::string& name, support::FileHandle file);
-
-  const Settings& m_Settings;
-  support::SourceFiles& m_Files;
-  support::Host& m_Host;
-  const support::FileStatus& m_ArchiveStatus;
-  ContentsReader m_Contents;
-};
-
+// A folder in a name is not followed: an archive must not choose where files are written.
 std::string Extraction::outputName(std::string_view name) const {
-  if (!m_Settings.truncateNames) return std::string(name);
-  return std::string(name.substr(0, LongestFileName).substr(0, LongestHostName));
+  const std::string_view leaf = support::lastPathComponent(name);
+  if (!m_Settings.truncateNames) return std::string(leaf);
+  return std::string(leaf.substr(0, LongestFileName).substr(0, LongestHostName));
 }
 
 // A member that is called like the archive would be written over it before its bytes are read.
@@ -90,12 +76,20 @@ bool Extraction::copy(const ArchiveMember& member, support::FileHandle file, int
   return true;
 }
 
+// Archives of tools that know no modes have 0 there, and nobody could read such a file.
+void Extraction::restoreStatus(const ArchiveMember& member, support::FileHandle file) {
+  const uint32_t mode = member.getMode() & PermissionBits;
+  if (m_Settings.restoreModes && mode != 0) m_Host.setPermissions(file, mode);
+  if (m_Settings.restoreDates) m_Host.setTimes(file, member.getDate());
+}
+
 // Half a file looks like a whole one to whoever uses it, so it is removed.
 void Extraction::write(const ArchiveMember& member, const std::string& name,
                        support::FileHandle file) {
   int error = 0;
   const bool isRead = copy(member, file, error);
   if (error == 0) error = m_Host.flush(file);
+  restoreStatus(member, file);
   const int closeError = m_Host.close(file);
   if (error == 0) error = closeError;
   if (isRead && error == 0) return;
@@ -106,25 +100,29 @@ void Extraction::write(const ArchiveMember& member, const std::string& name,
   [[maybe_unused]] const int removeError = m_Host.remove(name.c_str());
 }
 
+void ContentsPrinter::print(const ArchiveMember& member) {
+  if (!m_Contents.start(member)) return;
+  std::span<const uint8_t> piece;
+  while (m_Contents.read(piece) && !piece.empty()) {
+    messages::writeRaw({reinterpret_cast<const char*>(piece.data()), piece.size()});
+  }
+}
+
+namespace {
+
 class Printing final : public MemberRoutine {
 public:
-  explicit Printing(const Run& run) : m_Settings(run.settings), m_Contents(run.archive) {}
+  explicit Printing(const Run& run) : m_Settings(run.settings), m_Printer(run.archive) {}
 
   void operator()(ArchiveMember& member) override {
     verboseMessage(m_Settings, messages::PrintedMember, member.getName());
-    if (!m_Contents.start(member)) return;
-    std::span<const uint8_t> piece;
-    while (m_Contents.read(piece) && !piece.empty()) {
-      messages::writeRaw({reinterpret_cast<const char*>(piece.data()), piece.size()});
-    }
+    m_Printer.print(member);
   }
-
-  // Too late to take anything back, but not to tell.
-  void finish() { m_Contents.finish(); }
+  void finish() { m_Printer.finish(); }
 
 private:
   const Settings& m_Settings;
-  ContentsReader m_Contents;
+  ContentsPrinter m_Printer;
 };
 
 } // namespace

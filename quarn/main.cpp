@@ -2,10 +2,11 @@
 //
 // The program: the host's real files, and clean-up on signals from the first moment on. All else is
 // a library, so that tests can run it on other hosts.
+#include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
 
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
-  quarn::startUp(argc, argv, support::getPosixHost());
+  quarn::startUp(argc, argv, support::getPosixHost(), quarn::quarnMain);
 }

@@ -6,6 +6,7 @@
 #include "quarn/quarn_main.h"
 
 #include "messages/interface/messages.h"
+#include "quarn/actions.h"
 #include "quarn/archive_run.h"
 #include "quarn/banner.h"
 #include "quarn/file_list.h"
@@ -100,7 +101,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
     tell(obstacle, settings, toolName);
   } else {
     settings.fileList = findFiles(parser, host, settings);
-    runOnArchive(host, archiveName, settings);
+    runOnArchive(host, archiveName, settings, doAction);
   }
   parser.releaseValues();
 }

@@ -3,6 +3,8 @@
 // What one run is to do: the command line as one record. Nothing else holds an option's value.
 #pragma once
 
+#include "elfext/interface/object_outline.h"
+
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -66,6 +68,11 @@ struct Settings {
   bool includeDebugSymbols = false;
   bool uniqueSymbolsOnly = false;
   bool useObjectBuildAttributes = false;
+  // The next four are what other tools of the kind do, and no option of this one asks for.
+  elfext::ObjectOutline::Machines machines = elfext::ObjectOutline::Machines::Own;
+  bool keepFolders = false;  // in the names of members
+  bool restoreModes = false; // of files that are extracted
+  bool restoreDates = false;
   std::vector<std::string> fileList; // the file_list words in order, after expansion on disk
 
   // Chooses the action. A second, different one is reported and leaves the first in place.

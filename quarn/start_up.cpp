@@ -11,7 +11,6 @@
 #include "messages/interface/messages.h"
 #include "messages/interface/output.h"
 #include "messages/interface/process_end.h"
-#include "quarn/quarn_main.h"
 #include "quarn/reporting.h"
 #include "support/interface/tool_name.h"
 
@@ -30,14 +29,14 @@ alloclib::RegionGeneral* driverRegion = nullptr;
 
 } // namespace
 
-void startUp(int argc, const char* const* argv, support::Host& host) {
+void startUp(int argc, const char* const* argv, support::Host& host, Work work) {
   session = new alloclib::Session;
   driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
   messages::initialise();
   messages::setExitHandler(shutDown);
   std::array<char, support::ToolNameSize> toolName;
   support::toolNameFrom(argc > 0 ? argv[0] : nullptr, toolName);
-  quarnMain(argc, argv, toolName.data(), host, *driverRegion);
+  work(argc, argv, toolName.data(), host, *driverRegion);
   flushOutput();
   shutDown(hasErrors() ? 1 : 0);
 }

@@ -112,6 +112,10 @@ struct Counters {
 using LimitHandler = void (*)();
 void setLimit(uint32_t limit, LimitHandler handler);
 
+/// The name that diagnostics without a location begin with, as builds run many programs that write
+/// to one log. The tool itself has none. The text must outlive its use.
+void setProgramName(std::string_view name);
+
 /// The look of diagnostics: 0 the tool's own, 1 for development environments, 2 for editors.
 [[nodiscard]] uint32_t getStyle();
 void setStyle(uint32_t style);

@@ -26,6 +26,7 @@ struct MessageState {
   bool hasNumberOverrides = false; // spares clearing the table in nearly every run
   std::array<uint32_t, SeverityCount> counts{};
   uint32_t style = 0;
+  std::string_view programName; // empty: lines don't begin with one
   uint32_t limit = 50;
   LimitHandler limitHandler = nullptr; // null: end the process
   uint32_t column = 0;

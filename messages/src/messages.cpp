@@ -46,6 +46,8 @@ constexpr StyleRow Styles[] = {
 };
 // clang-format on
 
+constexpr uint32_t EnvironmentStyle = 1;
+
 // The report of a bad style needs a style itself.
 const StyleRow& getCurrentStyle() {
   return Styles[messageState.style < std::size(Styles) ? messageState.style : 0];
@@ -118,7 +120,13 @@ void appendArguments(std::string& line, std::string_view format,
 void appendLead(std::string& line, const Location* location, uint32_t severity) {
   const Location place = location ? *location : Location{};
   const size_t known = knownFieldCount(place);
-  const std::string_view file = known == 0 ? ToolName : place.file;
+  const std::string_view program = messageState.programName;
+  // Where a location begins the line, whoever reads it looks there for a file. The style of
+  // development environments has a name in that place anyway.
+  const bool hasNameInFront = messageState.style != EnvironmentStyle && known == 0;
+  if (hasNameInFront && !program.empty()) line.append(program).append(": ");
+  const std::string_view name = program.empty() ? ToolName : program;
+  const std::string_view file = known == 0 ? name : place.file;
   appendArguments(
       line, getCurrentStyle().locationFormats[known],
       ArgumentArray<std::string_view, uint32_t, uint32_t>{file, place.line, place.column});
@@ -147,6 +155,7 @@ void initialise() {
   state.severityMap = {0, 1, 2, 3, 4, 5, 6};
   state.counts.fill(0);
   state.style = 0;
+  state.programName = {};
   setLimit(50, nullptr);
   state.column = 0;
   state.diagnosticStream = Stream::Error;
@@ -210,6 +219,10 @@ uint32_t getErrorCount() {
 void setLimit(uint32_t limit, LimitHandler handler) {
   messageState.limit = limit;
   messageState.limitHandler = handler;
+}
+
+void setProgramName(std::string_view name) {
+  messageState.programName = name;
 }
 
 uint32_t getStyle() {

@@ -125,6 +125,10 @@ public:
   /// Best effort: the permission bits of `mode`.
   virtual void setPermissions(FileHandle file, uint32_t mode) = 0;
 
+  /// Best effort: when the file was last changed and used, in seconds since 1970. What is written
+  /// later changes it again.
+  virtual void setTimes(FileHandle file, int64_t seconds) = 0;
+
   /// The name that a chain of symbolic links leads to, also when nothing is there. A name that is
   /// no link is returned as it is.
   [[nodiscard]] virtual std::string followLinks(const char* name) = 0;

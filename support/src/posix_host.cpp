@@ -281,6 +281,12 @@ public:
     [[maybe_unused]] const int result = fchmod(file.number, mode & 07777);
   }
 
+  void setTimes(FileHandle file, int64_t seconds) override {
+    const timespec time = {.tv_sec = static_cast<time_t>(seconds), .tv_nsec = 0};
+    const timespec times[] = {time, time};
+    [[maybe_unused]] const int result = futimens(file.number, times);
+  }
+
   std::string followLinks(const char* name) override {
     constexpr int MaximumLinks = 40; // as the kernel: a longer chain is a circle
     std::string place = name;

@@ -126,6 +126,10 @@ void FaultyHost::setPermissions(FileHandle file, uint32_t mode) {
   if (fault("setPermissions", m_OpenNames[file.number]) == 0) m_Host.setPermissions(file, mode);
 }
 
+void FaultyHost::setTimes(FileHandle file, int64_t seconds) {
+  if (fault("setTimes", m_OpenNames[file.number]) == 0) m_Host.setTimes(file, seconds);
+}
+
 HostError FaultyHost::listDirectory(const char* name, std::vector<std::string>& names) {
   names.clear();
   const HostError error = fault("listDirectory", name);

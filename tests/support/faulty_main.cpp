@@ -8,6 +8,7 @@
 // It is a program of its own, so that signals end a real process and the temporaries of the real
 // host are looked for on a real disk.
 
+#include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
 #include "tests/support/faulty_host.h"
@@ -47,5 +48,5 @@ int main(int argc, char** argv) {
   else
     getFaultyHost().failCall(call, static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
   std::atexit(writeCallCount);
-  quarn::startUp(argc, argv, getFaultyHost());
+  quarn::startUp(argc, argv, getFaultyHost(), quarn::quarnMain);
 }

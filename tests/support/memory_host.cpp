@@ -216,6 +216,10 @@ void MemoryHost::setPermissions(FileHandle file, uint32_t mode) {
   target.mode = (target.mode & ~07777u) | (mode & 07777u);
 }
 
+void MemoryHost::setTimes(FileHandle file, int64_t seconds) {
+  m_Open.at(static_cast<size_t>(file.number))->modificationTime = seconds;
+}
+
 std::string MemoryHost::followLinks(const char* name) {
   std::string place = name;
   for (auto found = m_Files.find(place); found != m_Files.end() && !found->second->link.empty();

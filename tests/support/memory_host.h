@@ -89,6 +89,7 @@ public:
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
   bool isWritable(const char* name) override;
   void setPermissions(support::FileHandle file, uint32_t mode) override;
+  void setTimes(support::FileHandle file, int64_t seconds) override;
   std::string followLinks(const char* name) override;
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
 

@@ -7,6 +7,7 @@
 
 #include "tests/support/tool_folder.h"
 
+#include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
 
@@ -145,7 +146,8 @@ ToolRun ToolFolder::runOn(support::Host& host, const std::vector<std::string>& w
     enter();
     support::installSignalCleanUp();
     const std::vector<const char*> arguments = argumentsOf("quarn", words);
-    quarn::startUp(static_cast<int>(arguments.size()) - 1, arguments.data(), host);
+    quarn::startUp(static_cast<int>(arguments.size()) - 1, arguments.data(), host,
+                   quarn::quarnMain);
   }
   return collect(process);
 }

@@ -4,6 +4,7 @@
 // as they are known, texts from outside that hold conversions or control bytes, and the error that
 // is one too many.
 
+#include "messages/interface/catalogue.h"
 #include "tests/support/messages_fixture.h"
 
 namespace messages {
@@ -38,6 +39,38 @@ TEST_F(ReportTest, PrintsRemarksWithoutPrefixOrCodeInEveryStyle) {
   EXPECT_EQ(getErrorText(), "Creating archive 'lib.a'\n"
                             "quarn : Creating archive 'lib.a'\n"
                             "Creating archive 'lib.a'\n");
+}
+
+TEST_F(ReportTest, BeginsWithTheNameOfTheProgramWhereNoFileIsKnown) {
+  setProgramName("quarn-ar");
+  for (const uint32_t number : {0u, 1u, 2u}) {
+    setStyle(number);
+    report(RemarkWord, nullptr, CreatingArchive, "lib.a");
+    report(ErrorWord, nullptr, NoArchiveSpecified);
+    const Location place = {.file = "x.c", .line = 3};
+    report(ErrorWord, &place, NoArchiveSpecified);
+  }
+  const std::string text(getMessageText(NoArchiveSpecified));
+  EXPECT_EQ(getErrorText(), "quarn-ar: Creating archive 'lib.a'\n"
+                            "quarn-ar: Error: L6838E: " +
+                                text +
+                                "\n"
+                                "\"x.c\", line 3: Error: L6838E: " +
+                                text +
+                                "\n"
+                                "quarn-ar : Creating archive 'lib.a'\n"
+                                "quarn-ar : error L6838:  " +
+                                text +
+                                "\n"
+                                "x.c(3) : error L6838:  " +
+                                text +
+                                "\n"
+                                "quarn-ar: Creating archive 'lib.a'\n"
+                                "quarn-ar: Error: L6838E: " +
+                                text +
+                                "\n"
+                                "x.c:3: Error: L6838E: " +
+                                text + "\n");
 }
 
 TEST_F(ReportTest, AlwaysShowsTheCodeLetterOfTheTool) {

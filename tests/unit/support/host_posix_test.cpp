@@ -269,6 +269,17 @@ TEST_F(PosixHostTest, SetsPermissionBitsAlone) {
   m_Host.setPermissions(FileHandle{12345}, 0600);
 }
 
+TEST_F(PosixHostTest, SetsTimes) {
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("file").c_str(), file), 0);
+  m_Host.setTimes(file, 1'000'000'000);
+  FileStatus status;
+  ASSERT_EQ(m_Host.statusOf(file, status), 0);
+  EXPECT_EQ(status.modificationTime, 1'000'000'000);
+  EXPECT_EQ(m_Host.close(file), 0);
+  m_Host.setTimes(FileHandle{12345}, 0);
+}
+
 TEST_F(PosixHostTest, FollowsLinksToTheirEnd) {
   fs::create_directory(at("dir"));
   make("file", "");
