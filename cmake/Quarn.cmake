@@ -1,17 +1,19 @@
 # SPDX-License-Identifier: Apache-2.0
-# How every target of the house is compiled, and the two functions that declare one.
+# How every target of the house is compiled, and the two functions that declare one. Nothing here
+# reaches a target of somebody else's that is linked with ours, but that it needs C++20.
 
 set(CMAKE_CXX_STANDARD 20)
 set(CMAKE_CXX_STANDARD_REQUIRED ON)
 set(CMAKE_CXX_EXTENSIONS OFF)
-set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+if(PROJECT_IS_TOP_LEVEL)
+  set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+endif()
 
-# The same source gives the same bytes wherever the tree and the build folder lie.
-add_compile_options("-ffile-prefix-map=${CMAKE_SOURCE_DIR}/=" "-ffile-prefix-map=${CMAKE_BINARY_DIR}/=build/")
-
-add_library(quarn_warnings INTERFACE)
-target_compile_options(quarn_warnings INTERFACE
-  -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
+add_library(quarn_flags INTERFACE)
+target_compile_options(quarn_flags INTERFACE
+  # The same source gives the same bytes wherever the tree and the build folder lie.
+  "-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=" "-ffile-prefix-map=${PROJECT_BINARY_DIR}/=build/"
+  -Wall -Wextra -Wpedantic -Wconversion -Wshadow $<$<BOOL:${QUARN_WERROR}>:-Werror>
   -Wcast-qual -Wextra-semi -Wformat=2 -Wold-style-cast -Woverloaded-virtual -Wundef
   $<$<CXX_COMPILER_ID:GNU>:-Wduplicated-branches$<SEMICOLON>-Wduplicated-cond>
   # The first one holds a rule: a switch over all of an enumeration has no default.
@@ -22,27 +24,33 @@ target_compile_options(quarn_warnings INTERFACE
   $<$<CXX_COMPILER_ID:Clang>:-Wno-string-conversion>)
 
 if(QUARN_SANITIZE)
-  add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
-  add_link_options(-fsanitize=address,undefined -fno-sanitize-recover=all)
+  target_compile_options(quarn_flags INTERFACE
+    -fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  # Who links with our libraries needs their runtime.
+  target_link_options(quarn_flags INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all)
 endif()
 
-# quarn_library(name SOURCES file... DEPENDS library...): one library of the house. DEPENDS is
-# the whole list of rooms that it may include from.
-function(quarn_library name)
+# quarn_library(room SOURCES file... DEPENDS room...): one library of the house, quarn::room to all
+# others. DEPENDS is the whole list of rooms that it may include from.
+function(quarn_library room)
   cmake_parse_arguments(ARG "" "" "SOURCES;DEPENDS" ${ARGN})
-  add_library(${name} STATIC ${ARG_SOURCES})
-  target_include_directories(${name} PUBLIC ${CMAKE_SOURCE_DIR})
-  target_link_libraries(${name} PUBLIC ${ARG_DEPENDS} PRIVATE quarn_warnings)
+  list(TRANSFORM ARG_DEPENDS PREPEND quarn::)
+  set(target quarn_${room})
+  add_library(${target} STATIC ${ARG_SOURCES})
+  add_library(quarn::${room} ALIAS ${target})
+  target_compile_features(${target} PUBLIC cxx_std_20)
+  target_include_directories(${target} PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>)
+  target_link_libraries(${target} PUBLIC ${ARG_DEPENDS} PRIVATE $<BUILD_INTERFACE:quarn_flags>)
   # The fuzzing engine steers by what the libraries do, not only by what its target does.
   if(QUARN_SANITIZE AND CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
-    target_compile_options(${name} PRIVATE -fsanitize=fuzzer-no-link)
+    target_compile_options(${target} PRIVATE -fsanitize=fuzzer-no-link)
   endif()
   if(QUARN_SHAKE_ORDER)
-    target_compile_definitions(${name} PUBLIC QUARN_SHAKE_ORDER)
+    target_compile_definitions(${target} PUBLIC QUARN_SHAKE_ORDER)
   endif()
 endfunction()
 
-# quarn_test_program(name [CASES_APART] [OPTIMISED] SOURCES file... LIBRARIES library...): one GoogleTest
+# quarn_test_program(name [CASES_APART] [OPTIMISED] SOURCES file... LIBRARIES room...): one GoogleTest
 # program and one ctest entry, or one for each of its cases where these are long and many cores can
 # share them. Two thousand short cases take less time than two thousand starts of a program.
 #
@@ -51,11 +59,12 @@ endfunction()
 # spend minutes in what headers hold, which is compiled like the test.
 function(quarn_test_program name)
   cmake_parse_arguments(ARG "CASES_APART;OPTIMISED" "" "SOURCES;LIBRARIES" ${ARGN})
+  list(TRANSFORM ARG_LIBRARIES PREPEND quarn::)
   add_executable(${name} ${ARG_SOURCES})
-  target_link_libraries(${name} PRIVATE ${ARG_LIBRARIES} quarn_warnings GTest::gmock GTest::gtest_main)
+  target_link_libraries(${name} PRIVATE ${ARG_LIBRARIES} quarn_flags GTest::gmock GTest::gtest_main)
   if(NOT ARG_OPTIMISED)
     target_compile_options(${name} PRIVATE -O0)
-    target_precompile_headers(${name} REUSE_FROM test_headers)
+    target_precompile_headers(${name} REUSE_FROM quarn_test_headers)
   endif()
   # What asks for more memory than there is gets a refusal, as it does without the sanitizers.
   set(environment "ASAN_OPTIONS=allocator_may_return_null=1")

@@ -4,7 +4,7 @@
 # quarn_write_rooms(file): a line for each folder that has targets so far, its name and those of the
 # folders that its targets are linked with.
 function(quarn_write_rooms file)
-  get_property(folders DIRECTORY PROPERTY SUBDIRECTORIES)
+  get_property(folders DIRECTORY ${PROJECT_SOURCE_DIR} PROPERTY SUBDIRECTORIES)
   set(lines "")
   foreach(folder IN LISTS folders)
     get_property(targets DIRECTORY ${folder} PROPERTY BUILDSYSTEM_TARGETS)
@@ -18,7 +18,7 @@ function(quarn_write_rooms file)
         endif()
       endforeach()
     endforeach()
-    list(REMOVE_ITEM rooms ${folder} ${CMAKE_SOURCE_DIR})
+    list(REMOVE_ITEM rooms ${folder} ${PROJECT_SOURCE_DIR})
     list(REMOVE_DUPLICATES rooms)
     set(line ${folder} ${rooms})
     list(TRANSFORM line REPLACE "^.*/" "")
@@ -27,11 +27,12 @@ function(quarn_write_rooms file)
   endforeach()
   file(WRITE ${file} "${lines}")
 endfunction()
+quarn_write_rooms(${PROJECT_BINARY_DIR}/rooms.txt)
 
 # `--target map` draws the picture anew.
 find_package(Python3 3.8 COMPONENTS Interpreter)
-set(QUARN_DRAW_ROOMS ${Python3_EXECUTABLE} ${CMAKE_SOURCE_DIR}/scripts/draw_rooms
-  ${CMAKE_BINARY_DIR}/rooms.txt ${CMAKE_SOURCE_DIR}/docs/architecture.md)
+set(QUARN_DRAW_ROOMS ${Python3_EXECUTABLE} ${PROJECT_SOURCE_DIR}/scripts/draw_rooms
+  ${PROJECT_BINARY_DIR}/rooms.txt ${PROJECT_SOURCE_DIR}/docs/architecture.md)
 if(Python3_FOUND)
   add_custom_target(map COMMAND ${QUARN_DRAW_ROOMS} VERBATIM)
 endif()

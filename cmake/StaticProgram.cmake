@@ -9,7 +9,7 @@ check_cxx_source_compiles("#include <string>\nint main(int c, char**) { return s
 unset(CMAKE_REQUIRED_LINK_OPTIONS)
 
 function(quarn_static_program target)
-  if(QUARN_HAS_STATIC_LIBRARIES AND CMAKE_BUILD_TYPE STREQUAL "Release" AND NOT QUARN_SANITIZE)
-    target_link_options(${target} PRIVATE -static)
+  if(QUARN_HAS_STATIC_LIBRARIES AND NOT QUARN_SANITIZE)
+    target_link_options(${target} PRIVATE $<$<CONFIG:Release>:-static>)
   endif()
 endfunction()
