@@ -11,7 +11,7 @@ each corpus, to see how their processor time grows.
 GNU's programs look for plugins beside themselves, and would hand each object to them; copies in
 another place find none.
 
-Prints Markdown, and says on standard error how far it is. `cmake --build --preset release --target
+Prints Markdown, and says on standard error how far it is. `cmake --build --preset dev --target
 compare` measures everything; to choose, run this file by hand (--help).
 """
 import argparse
