@@ -1,12 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The table of contents and the symbol table, as lines on stdout.
-#include "quarn/actions.h"
+#include "quarn/listing.h"
 
 #include "arlib/interface/archive_format.h"
 #include "checking/interface/checking.h"
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/attribute_text_cache.h"
+#include "quarn/actions.h"
 #include "quarn/local_dates.h"
 #include "quarn/member_selection.h"
 #include "quarn/reporting.h"
@@ -18,9 +19,6 @@ namespace quarn {
 
 using arlib::ArchiveMember;
 
-namespace {
-
-// "rw-r--r--": the low nine bits alone.
 std::string modeText(uint32_t mode) {
   std::string text = "rwxrwxrwx";
   for (size_t i = 0; i < text.size(); ++i) {
@@ -28,6 +26,8 @@ std::string modeText(uint32_t mode) {
   }
   return text;
 }
+
+namespace {
 
 class Listing final : public MemberRoutine {
 public:
