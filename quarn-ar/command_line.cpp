@@ -49,7 +49,8 @@ private:
   Program m_Program;
   Request& m_Request;
   Answer m_Answer = Answer::Run;
-  std::string m_Letters; // all that there were
+  std::string m_Letters;        // all that there were
+  bool m_HasLetterWord = false; // without a dash
   bool m_OptionsEnd = false;
   std::vector<std::string> m_Operands;
 };
@@ -115,19 +116,15 @@ bool applyStyle(CommandLine&, std::string_view value) {
   return refuse("there is no diagnostic style '%s'", value);
 }
 
-// A bad element has been reported.
-bool applyDiagnostics(uint32_t severityWord, std::string_view numbers) {
+// Elements between commas. A bad one is warned of, and no reason to stop.
+template <uint32_t SeverityWord>
+bool applySeverity(CommandLine&, std::string_view numbers) {
   while (!numbers.empty()) {
     const size_t length = std::min(numbers.find(','), numbers.size());
-    if (messages::applyDiagnosticOption(severityWord, numbers.substr(0, length))) return false;
+    static_cast<void>(messages::applyDiagnosticOption(SeverityWord, numbers.substr(0, length)));
     numbers.remove_prefix(std::min(length + 1, numbers.size()));
   }
   return true;
-}
-
-template <uint32_t SeverityWord>
-bool applySeverity(CommandLine&, std::string_view numbers) {
-  return applyDiagnostics(SeverityWord, numbers);
 }
 
 bool acceptValue(CommandLine&, std::string_view) {
@@ -205,11 +202,12 @@ bool CommandLine::readOption(std::span<const std::string>& words) {
 
 // The first operand is letters, unless the operation has been told before.
 bool CommandLine::readOperand(const std::string& word) {
-  const bool isFirst = m_Operands.empty() && m_Program == Program::Ar;
-  if (!isFirst || m_Request.operation != Operation::None || has('s')) {
+  const bool isOperationTold = m_Request.operation != Operation::None || has('s');
+  if (m_Program == Program::Ranlib || isOperationTold || m_HasLetterWord) {
     m_Operands.push_back(word);
     return true;
   }
+  m_HasLetterWord = true;
   return readLetters(word, word);
 }
 

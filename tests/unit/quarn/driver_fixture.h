@@ -15,6 +15,7 @@
 #include "alloclib/interface/region_objects.h"
 #include "quarn/quarn_main.h"
 #include "quarn/reporting.h"
+#include "quarn/start_up.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/memory_host.h"
 #include "tests/support/messages_fixture.h"
@@ -77,7 +78,10 @@ protected:
     m_Host.addFile("lib.a", library.bytes());
   }
 
-  RunOutcome run(const Words& words) {
+  RunOutcome run(const Words& words) { return runWork(quarnMain, "quarn", words); }
+
+  // Any program on the driver's road.
+  RunOutcome runWork(Work work, const char* toolName, const Words& words) {
     messages::StringSink output;
     messages::StringSink errors;
     messages::setOutputSinks(&output, &errors);
@@ -85,7 +89,7 @@ protected:
     const Arguments arguments(words);
     RunOutcome outcome;
     outcome.status = statusOf([&] {
-      quarnMain(arguments.count(), arguments.values(), "quarn", m_Host, *m_Memory);
+      work(arguments.count(), arguments.values(), toolName, m_Host, *m_Memory);
       messages::endProcess(hasErrors() ? 1 : 0);
     });
     messages::flushAll();

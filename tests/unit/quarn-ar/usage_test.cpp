@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What build systems read of the version and the help.
+
+#include "quarn-ar/usage.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace quarn_ar {
+
+namespace {
+
+using testing::HasSubstr;
+using testing::MatchesRegex;
+using testing::Not;
+
+TEST(Usage, KnowsTheProgramByTheEndOfItsName) {
+  EXPECT_EQ(programNamed("quarn-ar"), Program::Ar);
+  EXPECT_EQ(programNamed("quarn-ranlib"), Program::Ranlib);
+  EXPECT_EQ(programNamed("zev-none-elf-ranlib"), Program::Ranlib);
+  EXPECT_EQ(programNamed("ranlib-ar"), Program::Ar);
+  EXPECT_EQ(programNamed(""), Program::Ar);
+}
+
+TEST(Usage, SaysWhatItIsCompatibleWith) {
+  EXPECT_THAT(versionText(Program::Ar),
+              MatchesRegex("quarn-ar [0-9.]+ \\(compatible with GNU ar\\)\n"));
+  EXPECT_THAT(versionText(Program::Ranlib),
+              MatchesRegex("quarn-ranlib [0-9.]+ \\(compatible with GNU ranlib\\)\n"));
+}
+
+// Archives without dates and response files are there, thin archives are not.
+TEST(Usage, NamesTheLettersThatBuildSystemsLookFor) {
+  const std::string help = helpText(Program::Ar, "quarn-ar");
+  EXPECT_THAT(help, HasSubstr("Usage: quarn-ar [-]{dmpqrstx}"));
+  EXPECT_THAT(help, HasSubstr("[D]"));
+  EXPECT_THAT(help, HasSubstr("@<"));
+  EXPECT_THAT(helpText(Program::Ranlib, "quarn-ranlib"), HasSubstr("-D"));
+}
+
+} // namespace
+
+} // namespace quarn_ar
