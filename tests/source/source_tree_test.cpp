@@ -10,6 +10,7 @@
 
 #include "messages/interface/catalogue.h"
 #include "messages/interface/message_keys.h"
+#include "support/interface/version_banner.h"
 
 #include <gtest/gtest.h>
 
@@ -290,6 +291,12 @@ TEST(SourceTree, TheListOfPromisesLeadsToTests) {
     ++count;
   }
   EXPECT_GT(count, 20u);
+}
+
+TEST(SourceTree, TheNewestChangesAreOfThisVersion) {
+  const std::string changes = contentsOf(Root / "CHANGELOG.md");
+  const std::string heading = "# Changes\n\n## " + std::string(support::getBuildData().version);
+  EXPECT_TRUE(changes.starts_with(heading + " ") || changes.starts_with(heading + "\n")) << heading;
 }
 
 // A text that nobody prints has no place in the catalogues.
