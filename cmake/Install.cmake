@@ -17,7 +17,9 @@ set(about_elfext "ELF objects and their build attributes")
 set(about_arlib "Archives of object code, read and written")
 
 # Programs.
-install(TARGETS quarn COMPONENT programs)
+install(TARGETS quarn quarn-ar COMPONENT programs)
+install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX}"
+  COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
 
 # Headers and libraries.
 foreach(room IN LISTS rooms)

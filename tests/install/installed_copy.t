@@ -5,6 +5,8 @@ An installation goes into any folder, and may be moved afterwards:
   $ place=$PWD/other/place
   $ (cd other/place && ls -d */* include/quarn/*)
   bin/quarn
+  bin/quarn-ar
+  bin/quarn-ranlib
   include/quarn
   include/quarn/alloclib
   include/quarn/arlib

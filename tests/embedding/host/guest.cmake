@@ -24,7 +24,7 @@ function(check_guest)
   endif()
 
   collect_targets(targets ${QUARN_TREE})
-  list(FILTER targets EXCLUDE REGEX "^quarn(_|$)")
+  list(FILTER targets EXCLUDE REGEX "^quarn([_-]|$)")
   if(targets)
     message(FATAL_ERROR "targets under names that could be the host's: ${targets}")
   endif()
