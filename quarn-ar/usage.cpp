@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Build systems look for "[D]" in the help before they ask for archives without dates, and for "@<"
-// before they write response files; "[T]" for thin archives is not there, as these are refused.
+// before they write response files. They also ask for thin archives where they see "[T]": these are
+// refused, so T stands without brackets.
 #include "quarn-ar/usage.h"
 
 #include "support/interface/version_banner.h"
@@ -36,7 +37,7 @@ Modifiers:
   [P]  names with their folders
   [s]  with a symbol table (default)
   [S]  without a symbol table
-  [T]  cut names that the host can't take (x); archives without contents are not made
+   T   cut names that the host can't take (x); thin archives are not made
   [u]  replace only what is older than its file (r)
   [U]  with dates, owners and modes of files
   [v]  tell of each member

@@ -36,6 +36,7 @@ TEST(Usage, NamesTheLettersThatBuildSystemsLookFor) {
   EXPECT_THAT(help, HasSubstr("Usage: quarn-ar [-]{dmpqrstx}"));
   EXPECT_THAT(help, HasSubstr("[D]"));
   EXPECT_THAT(help, HasSubstr("@<"));
+  EXPECT_THAT(help, Not(HasSubstr("[T]")));
   EXPECT_THAT(helpText(Program::Ranlib, "quarn-ranlib"), HasSubstr("-D"));
 }
 
