@@ -211,10 +211,13 @@ TEST(SourceTree, EveryFileNamesItsLicence) {
 }
 
 // Such files have marks of their own for comments. A shell may want the first line for itself.
-TEST(SourceTree, EveryPageNamesItsLicence) {
+TEST(SourceTree, PagesAndCompletionsNameTheirLicence) {
   const std::regex licence("(#[^\n]*\n)?[.\\\\\"#]+ SPDX-License-Identifier: Apache-2.0\n[^]*");
-  for (const auto& entry : fs::directory_iterator(Root / "manual"))
-    EXPECT_TRUE(std::regex_match(contentsOf(entry.path()).substr(0, 200), licence)) << entry.path();
+  for (const char* folder : {"manual", "completions"}) {
+    for (const auto& entry : fs::directory_iterator(Root / folder))
+      EXPECT_TRUE(std::regex_match(contentsOf(entry.path()).substr(0, 200), licence))
+          << entry.path();
+  }
 }
 
 // What a file is for stands before anything else.
