@@ -1,8 +1,9 @@
 # SPDX-License-Identifier: Apache-2.0
 # shellcheck shell=bash
 #
-# Completion for quarn in bash: options, their values, the archive, its members, and files. It asks the
-# program itself for the names of members. What can't be read completes to nothing, without a word.
+# Completion for quarn, quarn-ar and quarn-ranlib in bash: options, their values, letters, the archive, its
+# members, and files. It asks the program itself for the names of members. What can't be read completes to
+# nothing, without a word.
 
 __quarn_letters='-a -b -C -c -d -h -i -m -n -p -q -r -s -T -t -u -V -v -x'
 __quarn_names='--create --debug_symbols --entries --help --new_files_only --no_debug_symbols
@@ -15,6 +16,13 @@ __quarn_styles='zev gnu ide devstudio list'
 __quarn_locales='en_US ja_JP en_US.UTF-8 ja_JP.UTF-8 UTF-8'
 __quarn_levels='none low medium high extravagant show'
 __quarn_warnings='L3910 L3920 L6831 L6874 L6875 L6876 L6877 L6974'
+
+__quarn_ar_operations='dmpqrstx'
+__quarn_ar_modifiers='abcCDfilNoPsSTuUvV'
+# Letters that not all operations know, each with those that do.
+__quarn_ar_restricted='a:mr b:mr C:x i:mr N:dx o:x P:dmpqrst S:dmpqrtx T:x u:r'
+__quarn_ar_names='--diag_error= --diag_remark= --diag_style= --diag_suppress= --diag_warning= --help
+  --plugin= --rsp-quoting= --target= --version'
 
 # The words of the line, in $words, with the one at the cursor, up to there, in $cword. The shell divides
 # words at characters such as "=" and ":", which are put together again, and has no word for a cursor between
@@ -193,11 +201,14 @@ __quarn_offer_value() {
     --message_locale) __quarn_offer_words "$__quarn_locales" ;;
     --libattrmap) __quarn_offer_files ;;
     --via) __quarn_offer_element __quarn_offer_files ;;
+    --plugin) __quarn_offer_files ;;
+    --rsp-quoting) __quarn_offer_words 'posix windows' ;;
+    --target) __quarn_offer_words 'default binary' ;;
   esac
 }
 
 __quarn_offer_options() {
-  __quarn_offer_words "$__quarn_letters $__quarn_names $__quarn_names_with_value"
+  __quarn_offer_words "$1"
   [[ ${#COMPREPLY[@]} = 1 && ${COMPREPLY[0]} = *= ]] && compopt -o nospace 2> /dev/null
 }
 
@@ -239,7 +250,7 @@ _quarn() {
     if [[ $current = =* ]]; then before+='=' current=${current:1}; fi
     __quarn_offer_value "$option"
   elif [[ -z $ended && $current = -* ]]; then
-    __quarn_offer_options
+    __quarn_offer_options "$__quarn_letters $__quarn_names $__quarn_names_with_value"
   elif (( place == 0 )); then
     __quarn_offer_archives
   else
@@ -248,4 +259,99 @@ _quarn() {
   __quarn_drop_head
 }
 
+# The words of quarn-ar but its options: its letters in $letters, the others in $operands, with an empty one at
+# the cursor, which is number $place. In $option the one whose value is at the cursor.
+__quarn_ar_scan() {
+  local at word isValue='' ended=''
+  letters='' operands=() place=-1 option=''
+  for (( at = 1; at < ${#words[@]}; ++at )); do
+    word=${words[at]}
+    if [[ -n $isValue ]]; then
+      if (( at == cword )); then option=$isValue; fi
+      isValue=''
+    elif [[ $word = -- && -z $ended ]] && (( at != cword )); then
+      ended=yes
+    elif [[ $word = -?* && -z $ended ]]; then
+      if [[ " $__quarn_ar_names " = *[[:space:]]"$word="* ]]; then isValue=$word; fi
+      if [[ $word != --* ]] && (( at != cword )); then letters+=${word#-}; fi
+    elif [[ -z $isRanlib && $letters != *["$__quarn_ar_operations"]* ]] && (( at < cword )); then
+      letters+=$word
+    else
+      if (( at == cword )); then place=${#operands[@]} word=''; fi
+      __quarn_unquote "$word"
+      operands+=("$REPLY")
+    fi
+  done
+}
+
+# The word of letters at the cursor, as it is and with each letter that may follow.
+__quarn_ar_offer_letters() {
+  local at letter known=$letters${current#-} operation knows
+  operation=${known//[!"$__quarn_ar_operations"]/}
+  operation=${operation:0:1}
+  if [[ -z $operation ]]; then
+    for (( at = 0; at < ${#__quarn_ar_operations}; ++at )); do
+      COMPREPLY+=("$current${__quarn_ar_operations:at:1}")
+    done
+    return
+  fi
+  COMPREPLY=("$current")
+  for (( at = 0; at < ${#__quarn_ar_modifiers}; ++at )); do
+    letter=${__quarn_ar_modifiers:at:1}
+    [[ $known != *"$letter"* ]] || continue
+    knows=" $__quarn_ar_restricted "
+    if [[ $knows = *" $letter:"* ]]; then
+      knows=${knows#* "$letter":}
+      [[ ${knows%% *} = *"$operation"* ]] || continue
+    fi
+    COMPREPLY+=("$current$letter")
+  done
+}
+
+# An operand: a place and a count, if the letters want them, the archive, and what is in it or goes into it.
+__quarn_ar_offer_operand() {
+  local needed=0 archive
+  if [[ $letters = *[abi]* ]]; then needed=$(( needed + 1 )); fi
+  if [[ $letters = *N* ]]; then needed=$(( needed + 1 )); fi
+  archive=${operands[needed]-}
+  if [[ -n $isRanlib ]] || (( place == needed )); then
+    __quarn_offer_archives
+  elif (( place == 0 )) && [[ $letters = *[abi]* ]]; then
+    __quarn_offer_members
+  elif (( place > needed )) && [[ $letters = *[rq]* ]]; then
+    __quarn_offer_files
+  elif (( place > needed )) && [[ $letters = *[dmptx]* ]]; then
+    __quarn_offer_members
+  fi
+}
+
+_quarn_ar() {
+  local words cword letters operands place option current before='' REPLY isRanlib=''
+  [[ $1 != *ranlib ]] || isRanlib=yes
+  COMPREPLY=()
+  __quarn_split
+  __quarn_ar_scan
+  __quarn_unquote "${words[cword]}"
+  current=$REPLY
+  if [[ -n $option ]]; then
+    __quarn_offer_value "$option"
+  elif [[ $current = --*=* ]]; then
+    option=${current%%=*} before=$option= current=${current#*=}
+    __quarn_offer_value "$option"
+  elif [[ $current = --* ]]; then
+    __quarn_offer_options "$__quarn_ar_names"
+  elif [[ $current = @* ]]; then
+    before=@ current=${current#@}
+    __quarn_offer_files
+  elif [[ -n $isRanlib && $current = -* ]]; then
+    __quarn_offer_options "-D -h -t -U -v -V $__quarn_ar_names"
+  elif [[ -z $isRanlib && ( $current = -* || $letters != *["$__quarn_ar_operations"]* ) ]]; then
+    __quarn_ar_offer_letters
+  else
+    __quarn_ar_offer_operand
+  fi
+  __quarn_drop_head
+}
+
 complete -F _quarn quarn
+complete -F _quarn_ar quarn-ar quarn-ranlib

@@ -1,7 +1,8 @@
 # SPDX-License-Identifier: Apache-2.0
 #
-# Completion for quarn in fish: options, their values, the archive, its members, and files. It asks the
-# program itself for the names of members. What can't be read completes to nothing, without a word.
+# Completion for quarn, quarn-ar and quarn-ranlib in fish: options, their values, letters, the archive, its
+# members, and files. It asks the program itself for the names of members. What can't be read completes to
+# nothing, without a word.
 
 # Of the words of a command line the options, or those that are neither options nor values of theirs.
 function __quarn_pick --argument-names kind
@@ -57,7 +58,10 @@ end
 # A control character, which the program shows by its number, is any character. A name that begins as an
 # option does gets a folder, which does not count.
 function __quarn_members
-    set -l archive (__quarn_pick words (__quarn_others))[1]
+    __quarn_members_of (__quarn_pick words (__quarn_others))[1]
+end
+
+function __quarn_members_of --argument-names archive
     set archive (string replace -r '^~/' $HOME/ -- "$archive")
     test -f "$archive"; or return
     set -l program (commandline -op)[1]
@@ -82,6 +86,104 @@ function __quarn_all_warnings
     __quarn_warnings
     __quarn_list warning\t'all warnings'
 end
+
+set -g __quarn_ar_operations dmpqrstx
+set -g __quarn_ar_modifiers abcCDfilNoPsSTuUvV
+# Letters that not all operations know, each with those that do.
+set -g __quarn_ar_restricted a:mr b:mr C:x i:mr N:dx o:x P:dmpqrst S:dmpqrtx T:x u:r
+
+# The letters that quarn-ar has been given in front of the cursor.
+function __quarn_ar_letters
+    set -l letters
+    for word in (__quarn_ar_words (commandline -opc)[2..])
+        if string match -qr -- '^-[^-]' $word
+            set letters "$letters"(string sub -s 2 -- $word)
+        else if not string match -qr -- "[$__quarn_ar_operations]" "$letters"
+            set letters "$letters$word"
+        end
+    end
+    echo $letters
+end
+
+# Words without long options and their values.
+function __quarn_ar_words
+    set -l is_value no
+    for word in $argv
+        if test $is_value = yes
+            set is_value no
+        else if string match -qr -- '^--(plugin|target|rsp-quoting|diag_[a-z]+)$' $word
+            set is_value yes
+        else if not string match -q -- '--*' $word
+            printf '%s\n' $word
+        end
+    end
+end
+
+# The operands of quarn-ar behind its letters; that at the cursor is empty.
+function __quarn_ar_operands
+    set -l letters
+    for word in (__quarn_ar_words (__quarn_others))
+        if string match -qr -- '^-.' $word
+            set letters "$letters"(string sub -s 2 -- $word)
+        else if test "$word" != ''; and not string match -qr -- "[$__quarn_ar_operations]" "$letters"
+            set letters "$letters$word"
+        else
+            printf '%s\n' "$word"
+        end
+    end
+end
+
+# What the operand at the cursor is: letters, place, count, archive, file, member, or nothing.
+function __quarn_ar_kind
+    set -l letters (__quarn_ar_letters)
+    if not string match -qr -- "[$__quarn_ar_operations]" "$letters"
+        string match -q -- '--*' (commandline -ct); or echo letters
+        return
+    end
+    set -l kinds
+    string match -qr -- '[abi]' $letters; and set -a kinds place
+    string match -q -- '*N*' $letters; and set -a kinds count
+    set -a kinds archive
+    string match -q -- '-*' (commandline -ct); and return
+    set -l at (contains -i -- '' (__quarn_ar_operands)); or return
+    if test $at -le (count $kinds)
+        echo $kinds[$at]
+    else if string match -qr -- '[rq]' $letters
+        echo file
+    else if string match -qr -- '[dmptx]' $letters
+        echo member
+    end
+end
+
+# The word of letters at the cursor, as it is and with each letter that may follow.
+function __quarn_ar_offer_letters
+    set -l current (commandline -ct)
+    set -l operation (string match -r -- "[$__quarn_ar_operations]" "$current")
+    if test -z "$operation"
+        printf "$current%s\n" (string split '' $__quarn_ar_operations)
+        return
+    end
+    printf '%s\n' $current
+    for letter in (string split '' $__quarn_ar_modifiers)
+        string match -q -- "*$letter*" $current; and continue
+        set -l knows (string match -r -- "^$letter:.*" $__quarn_ar_restricted)
+        test -z "$knows"; or string match -q -- "*:*$operation*" $knows; and printf '%s\n' $current$letter
+    end
+end
+
+function __quarn_ar_members
+    set -l letters (__quarn_ar_letters)
+    set -l at 1
+    string match -qr -- '[abi]' $letters; and set at (math $at + 1)
+    string match -q -- '*N*' $letters; and set at (math $at + 1)
+    set -l operands (__quarn_ar_operands)
+    __quarn_members_of "$operands[$at]"
+end
+
+# Each name of the program loads this file.
+complete -e -c quarn
+complete -e -c quarn-ar
+complete -e -c quarn-ranlib
 
 complete -c quarn -f
 complete -c quarn -n __quarn_wants_archive -a '(__fish_complete_suffix .a)'
@@ -135,3 +237,28 @@ complete -c quarn -l via -r -F -d 'Read further words from a file'
 complete -c quarn -l vsn -d 'Show the version'
 complete -c quarn -l zs -d 'Show the symbol table'
 complete -c quarn -l zt -d 'Show sizes and entry points'
+
+complete -c quarn-ar -f
+complete -c quarn-ar -n 'contains (__quarn_ar_kind) letters' -a '(__quarn_ar_offer_letters)'
+complete -c quarn-ar -n 'contains (__quarn_ar_kind) place member' -a '(__quarn_ar_members)' -d member
+complete -c quarn-ar -n 'contains (__quarn_ar_kind) archive' -a '(__fish_complete_suffix .a)'
+complete -c quarn-ar -n 'contains (__quarn_ar_kind) file' -F
+complete -c quarn-ranlib -f -a '(__fish_complete_suffix .a)'
+complete -c quarn-ranlib -s D -d 'Nothing, for compatibility'
+complete -c quarn-ranlib -s t -d 'Make the table anew all the same'
+complete -c quarn-ranlib -s U -d 'Nothing, for compatibility'
+complete -c quarn-ranlib -s v -d 'Show the version'
+for name in quarn-ar quarn-ranlib
+    complete -c $name -s h -d 'Show the help'
+    complete -c $name -s V -d 'Show the version'
+    complete -c $name -l diag_error -x -a '(__quarn_all_warnings)' -d 'Make errors of warnings'
+    complete -c $name -l diag_remark -x -a '(__quarn_warnings)' -d 'Make remarks of warnings'
+    complete -c $name -l diag_style -x -a 'zev gnu ide devstudio list' -d 'Choose the form of diagnostics'
+    complete -c $name -l diag_suppress -x -a '(__quarn_all_warnings)' -d 'Say nothing of warnings'
+    complete -c $name -l diag_warning -x -a '(__quarn_all_warnings)' -d 'Make warnings of warnings again'
+    complete -c $name -l help -d 'Show the help'
+    complete -c $name -l plugin -r -F -d 'Nothing, for compatibility'
+    complete -c $name -l rsp-quoting -x -a 'posix windows' -d 'How response files quote'
+    complete -c $name -l target -x -a 'default binary' -d 'The format of archives'
+    complete -c $name -l version -d 'Show the version'
+end

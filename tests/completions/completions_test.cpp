@@ -5,6 +5,7 @@
 #include "checking/src/level_names.h"
 #include "messages/interface/catalogue.h"
 #include "messages/interface/message_keys.h"
+#include "quarn-ar/usage.h"
 #include "quarn/option_table.h"
 
 #include <gtest/gtest.h>
@@ -38,10 +39,12 @@ std::string contentsOf(const std::string& name) {
   return {std::istreambuf_iterator<char>(file), {}};
 }
 
-// The lists of bash stand in front of its functions, where no other words with dashes are.
+// The part of a file that has the options of quarn and no other words of their kind.
 std::string optionsPartOf(const std::string& name) {
   const std::string text = contentsOf(name);
-  return name == "quarn.bash" ? text.substr(0, text.find("__quarn_styles")) : text;
+  if (name == "quarn.bash") return text.substr(0, text.find("__quarn_styles"));
+  if (name == "_quarn") return text.substr(0, text.find("_quarn_ar_operations"));
+  return text;
 }
 
 Names groupsOf(const std::string& text, const char* pattern) {
@@ -76,7 +79,7 @@ TEST(Completions, KnowWhichOptionsWantAValue) {
     if (!row.name.empty() && row.kind == tabledrivenparser::Kind_Required)
       wanting.emplace(row.name);
   }
-  EXPECT_EQ(groupsOf(contentsOf("_quarn"), "\\n +'(?:\\([^)]*\\)|\\*)?--?([A-Za-z_]+)[=+]\\["),
+  EXPECT_EQ(groupsOf(optionsPartOf("_quarn"), "\\n +'(?:\\([^)]*\\)|\\*)?--?([A-Za-z_]+)[=+]\\["),
             wanting);
   EXPECT_EQ(groupsOf(contentsOf("quarn.fish"), "\\ncomplete -c quarn -[sl] ([A-Za-z_]+) -[xr] "),
             wanting);
@@ -111,6 +114,33 @@ TEST(Completions, KnowNumbersOfMessages) {
     EXPECT_EQ(known.size(), 8u) << completion.file;
     for (const std::string& number : known)
       EXPECT_TRUE(numbers.contains(number)) << completion.file << ": " << number;
+  }
+}
+
+// The help begins with both, as build systems read it.
+TEST(Completions, KnowTheLettersOfQuarnAr) {
+  const std::string help = quarn_ar::helpText(quarn_ar::Program::Ar, "quarn-ar");
+  std::smatch letters;
+  ASSERT_TRUE(std::regex_search(help, letters, std::regex("\\{([a-z]+)\\}\\[([A-Za-z]+)\\]")));
+  const std::string operations = "_quarn_ar_operations(=| )'?" + letters[1].str() + "\\b";
+  const std::string modifiers = "_quarn_ar_modifiers(=| )'?" + letters[2].str() + "\\b";
+  for (const Completion& completion : Completions) {
+    const std::string text = contentsOf(completion.file);
+    EXPECT_TRUE(std::regex_search(text, std::regex(operations))) << completion.file;
+    EXPECT_TRUE(std::regex_search(text, std::regex(modifiers))) << completion.file;
+  }
+}
+
+TEST(Completions, KnowTheOptionsOfQuarnAr) {
+  const std::string help = quarn_ar::helpText(quarn_ar::Program::Ar, "quarn-ar");
+  const Names names = groupsOf(help, "--([a-z_-]+)");
+  EXPECT_GT(names.size(), 8u);
+  for (const Completion& completion : Completions) {
+    const std::string text = contentsOf(completion.file);
+    const std::string part = text.substr(text.find("_quarn_ar_"));
+    for (const std::string& name : names)
+      EXPECT_TRUE(std::regex_search(part, std::regex("(--|-l )" + name + "[=\\[ '\\n]")))
+          << completion.file << ": " << name;
   }
 }
 

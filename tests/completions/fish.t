@@ -1,11 +1,11 @@
 What fish makes of a line when completion is asked for.
 
   $ . "$TESTDIR/setup.sh"
-  $ complete() { "$TESTDIR/complete_in_fish" "$@"; }
+  $ completed() { "$TESTDIR/complete_in_fish" "$@"; }
 
 Members, for each action that reads or edits, alone and among other letters; each is quoted.
 
-  $ complete 'quarn -t lib.a ' 'quarn -x lib.a t' 'quarn -dv lib.a i' 'quarn -m lib.a m' 'quarn -p lib.a a' \
+  $ completed 'quarn -t lib.a ' 'quarn -x lib.a t' 'quarn -dv lib.a i' 'quarn -m lib.a m' 'quarn -p lib.a a' \
   >   'quarn -tv lib.a s' 'quarn -x lib.a \[' 'quarn -x lib.a b' 'quarn -x lib.a key=1' 'quarn -x lib.a ./-' \
   >   'quarn lib.a -x on'
   quarn -t lib.a : 'a;b&c|(d).o' 'bell?.o' it\'s.o key=1:2.o 'money$x.o' one.o 'say "hi".o' 'two words.o' '[x]*?.o'
@@ -22,7 +22,7 @@ Members, for each action that reads or edits, alone and among other letters; eac
 
 In quotes that have been opened already, and behind a part that is quoted.
 
-  $ complete 'quarn -x lib.a "t' "quarn -x lib.a 'm" 'quarn -x lib.a two\ w' "quarn -x lib.a 'i"
+  $ completed 'quarn -x lib.a "t' "quarn -x lib.a 'm" 'quarn -x lib.a two\ w' "quarn -x lib.a 'i"
   quarn -x lib.a "t: 'two words.o'
   quarn -x lib.a 'm: 'money$x.o'
   quarn -x lib.a two\ w: 'two words.o'
@@ -30,14 +30,14 @@ In quotes that have been opened already, and behind a part that is quoted.
 
 An archive whose name is quoted itself, behind "--", and in another folder.
 
-  $ complete 'quarn -t folder/my\ lib.a o' 'quarn -t "folder/my lib.a" o' 'quarn -t -- lib.a o'
+  $ completed 'quarn -t folder/my\ lib.a o' 'quarn -t "folder/my lib.a" o' 'quarn -t -- lib.a o'
   quarn -t folder/my\ lib.a o: one.o
   quarn -t "folder/my lib.a" o: one.o
   quarn -t -- lib.a o: one.o
 
 Positions, also where the archive stands behind the cursor.
 
-  $ complete 'quarn -r lib.a -a o' 'quarn -m lib.a -b o' 'quarn -mv lib.a -i on' 'quarn -r lib.a -ao'
+  $ completed 'quarn -r lib.a -a o' 'quarn -m lib.a -b o' 'quarn -mv lib.a -i on' 'quarn -r lib.a -ao'
   quarn -r lib.a -a o: one.o
   quarn -m lib.a -b o: one.o
   quarn -mv lib.a -i on: one.o
@@ -45,7 +45,7 @@ Positions, also where the archive stands behind the cursor.
 
 A missing or broken archive, a folder or a pipe has no members, and nothing is said.
 
-  $ complete 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
+  $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
   >   'quarn -a '
   quarn -t none.a :
   quarn -t broken.a :
@@ -56,7 +56,7 @@ A missing or broken archive, a folder or a pipe has no members, and nothing is s
 
 The archive: what ends as archives do, and anything where nothing does.
 
-  $ complete 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
+  $ completed 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
   quarn -t l: lib.a
   quarn -t : broken.a folder/ lib.a new.o pipe.a
   quarn -t folder/: 'folder/my lib.a'
@@ -65,7 +65,7 @@ The archive: what ends as archives do, and anything where nothing does.
 
 Files, for who inserts; reports want no more words.
 
-  $ complete 'quarn -r lib.a n' 'quarn -qv lib.a n' 'quarn --create new.a n' 'quarn --sizes lib.a ' \
+  $ completed 'quarn -r lib.a n' 'quarn -qv lib.a n' 'quarn --create new.a n' 'quarn --sizes lib.a ' \
   >   'quarn --zs lib.a ' 'quarn -s lib.a '
   quarn -r lib.a n: new.o
   quarn -qv lib.a n: new.o
@@ -76,7 +76,7 @@ Files, for who inserts; reports want no more words.
 
 Options, and the values that they know.
 
-  $ complete 'quarn --diag_style=' 'quarn --diag_style=d' 'quarn --diag_style ' 'quarn --message_locale=j' \
+  $ completed 'quarn --diag_style=' 'quarn --diag_style=d' 'quarn --diag_style ' 'quarn --message_locale=j' \
   >   'quarn --db_check h' 'quarn --diag_error=L6876,w' 'quarn --diag_suppress=L397' 'quarn --libattrmap=n' \
   >   'quarn --via n' 'quarn --normalise=' 'quarn --cre' 'quarn --no_' 'quarn --nor' 'quarn -t lib.a --uni'
   quarn --diag_style=: --diag_style=devstudio --diag_style=gnu --diag_style=ide --diag_style=list --diag_style=zev
@@ -96,6 +96,41 @@ Options, and the values that they know.
 
 Behind "--" nothing is an option.
 
-  $ complete 'quarn -t -- -' 'quarn -t -- lib.a --c'
+  $ completed 'quarn -t -- -' 'quarn -t -- lib.a --c'
   quarn -t -- -:
   quarn -t -- lib.a --c:
+
+The words of ar and ranlib: letters, a place and a count, the archive, and what is in it or goes into it.
+
+  $ completed 'quarn-ar ' 'quarn-ar r' 'quarn-ar t l' 'quarn-ar t lib.a o' 'quarn-ar t lib.a ./-' \
+  >   'quarn-ar rc lib.a n' 'quarn-ar q lib.a n' 'quarn-ar ra o' 'quarn-ar mb one.o l' 'quarn-ar xN 2 l' \
+  >   'quarn-ar xN 2 lib.a i' 'quarn-ar -d -v lib.a m' 'quarn-ar s lib.a ' 'quarn-ar t none.a ' \
+  >   'quarn-ar t broken.a ' 'quarn-ar t lib.a two\ w' 'quarn-ar --rsp' 'quarn-ar --rsp-quoting=' \
+  >   'quarn-ar --diag_style=d' 'quarn-ar --target d' 'quarn-ar --target default t lib.a i' 'quarn-ranlib l' \
+  >   'quarn-ranlib lib.a folder/' 'quarn-ranlib --v' 'quarn-ranlib --plugin n' 'quarn-ranlib -'
+  quarn-ar : d m p q r s t x
+  quarn-ar r: r ra rb rc rD rf ri rl rP rS rs rU ru rV rv
+  quarn-ar t l: lib.a
+  quarn-ar t lib.a o: one.o
+  quarn-ar t lib.a ./-: ./-dash.o
+  quarn-ar rc lib.a n: new.o
+  quarn-ar q lib.a n: new.o
+  quarn-ar ra o:
+  quarn-ar mb one.o l: lib.a
+  quarn-ar xN 2 l: lib.a
+  quarn-ar xN 2 lib.a i: it\'s.o
+  quarn-ar -d -v lib.a m: 'money$x.o'
+  quarn-ar s lib.a :
+  quarn-ar t none.a :
+  quarn-ar t broken.a :
+  quarn-ar t lib.a two\ w: 'two words.o'
+  quarn-ar --rsp: --rsp-quoting
+  quarn-ar --rsp-quoting=: --rsp-quoting=posix --rsp-quoting=windows
+  quarn-ar --diag_style=d: --diag_style=devstudio
+  quarn-ar --target d: default
+  quarn-ar --target default t lib.a i: it\'s.o
+  quarn-ranlib l: lib.a
+  quarn-ranlib lib.a folder/: 'folder/my lib.a'
+  quarn-ranlib --v: --version
+  quarn-ranlib --plugin n: new.o
+  quarn-ranlib -: -D -h -t -U -V -v --diag_error --diag_remark --diag_style --diag_suppress --diag_warning --help --plugin --rsp-quoting --target --version

@@ -1,11 +1,11 @@
 What zsh makes of a line when completion is asked for.
 
   $ . "$TESTDIR/setup.sh"
-  $ complete() { "$TESTDIR/complete_in" zsh "$@"; }
+  $ completed() { "$TESTDIR/complete_in" zsh "$@"; }
 
 Members, for each action that reads or edits, alone and among other letters; each is quoted.
 
-  $ complete 'quarn -t lib.a ' 'quarn -x lib.a t' 'quarn -dv lib.a i' 'quarn -m lib.a m' 'quarn -p lib.a a' \
+  $ completed 'quarn -t lib.a ' 'quarn -x lib.a t' 'quarn -dv lib.a i' 'quarn -m lib.a m' 'quarn -p lib.a a' \
   >   'quarn -tv lib.a s' 'quarn -x lib.a \[' 'quarn -x lib.a b' 'quarn -x lib.a key=1' 'quarn -x lib.a ./-' \
   >   'quarn lib.a -x on'
   quarn -t lib.a ./-dash.o \[x\]\*\?.o a\;b\&c\|\(d\).o bell\?.o it\'s.o key=1:2.o money\$x.o one.o say\ \"hi\".o two\ words.o |
@@ -22,7 +22,7 @@ Members, for each action that reads or edits, alone and among other letters; eac
 
 In quotes that have been opened already, and behind a part that is quoted.
 
-  $ complete $'quarn -x lib.a "t\t' $'quarn -x lib.a \'m\t' $'quarn -x lib.a "m\t' $'quarn -x lib.a "s\t' \
+  $ completed $'quarn -x lib.a "t\t' $'quarn -x lib.a \'m\t' $'quarn -x lib.a "m\t' $'quarn -x lib.a "s\t' \
   >   $'quarn -x lib.a \'i\t' $'quarn -x lib.a two\\ w\t' $'quarn -x lib.a k\t' $'quarn -m lib.a -a"t\t' \
   >   $'quarn -t "fol\t'
   quarn -x lib.a "two words.o" |
@@ -37,14 +37,14 @@ In quotes that have been opened already, and behind a part that is quoted.
 
 An archive whose name is quoted itself, behind "--", and in another folder.
 
-  $ complete 'quarn -t folder/my\ lib.a o' 'quarn -t "folder/my lib.a" o' 'quarn -t -- lib.a o'
+  $ completed 'quarn -t folder/my\ lib.a o' 'quarn -t "folder/my lib.a" o' 'quarn -t -- lib.a o'
   quarn -t folder/my\ lib.a one.o |
   quarn -t "folder/my lib.a" one.o |
   quarn -t -- lib.a one.o |
 
 Positions, also where the archive stands behind the cursor.
 
-  $ complete 'quarn -r lib.a -a o' 'quarn -m -b ^ lib.a' 'quarn -mv lib.a -i on' 'quarn -r lib.a -ao'
+  $ completed 'quarn -r lib.a -a o' 'quarn -m -b ^ lib.a' 'quarn -mv lib.a -i on' 'quarn -r lib.a -ao'
   quarn -r lib.a -a one.o |
   quarn -m -b ./-dash.o \[x\]\*\?.o a\;b\&c\|\(d\).o bell\?.o it\'s.o key=1:2.o money\$x.o one.o say\ \"hi\".o  two\ words.o lib.a|
   quarn -mv lib.a -i one.o |
@@ -52,7 +52,7 @@ Positions, also where the archive stands behind the cursor.
 
 A missing or broken archive, a folder or a pipe has no members, and nothing is said.
 
-  $ complete 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
+  $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
   >   'quarn -a '
   quarn -t none.a |
   quarn -t broken.a |
@@ -63,7 +63,7 @@ A missing or broken archive, a folder or a pipe has no members, and nothing is s
 
 The archive: what ends as archives do, and anything where nothing does.
 
-  $ complete 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
+  $ completed 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
   quarn -t lib.a |
   quarn -t broken.a folder lib.a |
   quarn -t folder/my\ lib.a |
@@ -72,7 +72,7 @@ The archive: what ends as archives do, and anything where nothing does.
 
 Files, for who inserts; reports want no more words.
 
-  $ complete 'quarn -r lib.a n' 'quarn -qv lib.a n' 'quarn --create new.a n' 'quarn --sizes lib.a ' \
+  $ completed 'quarn -r lib.a n' 'quarn -qv lib.a n' 'quarn --create new.a n' 'quarn --sizes lib.a ' \
   >   'quarn --zs lib.a ' 'quarn -s lib.a '
   quarn -r lib.a new.o |
   quarn -qv lib.a new.o |
@@ -83,7 +83,7 @@ Files, for who inserts; reports want no more words.
 
 Options, and the values that they know.
 
-  $ complete 'quarn --diag_style=' 'quarn --diag_style=d' 'quarn --diag_style ' 'quarn --message_locale=j' \
+  $ completed 'quarn --diag_style=' 'quarn --diag_style=d' 'quarn --diag_style ' 'quarn --message_locale=j' \
   >   'quarn --db_check h' 'quarn --diag_error=L6876,w' 'quarn --diag_suppress=L397' 'quarn --libattrmap=n' \
   >   'quarn --via n' 'quarn --normalise=' 'quarn --cre' 'quarn --no_' 'quarn --nor' 'quarn -t lib.a --uni'
   quarn --diag_style=devstudio --diag_style=gnu --diag_style=ide --diag_style=list --diag_style=zev |
@@ -103,6 +103,43 @@ Options, and the values that they know.
 
 Behind "--" nothing is an option.
 
-  $ complete 'quarn -t -- -' 'quarn -t -- lib.a --c'
+  $ completed 'quarn -t -- -' 'quarn -t -- lib.a --c'
   quarn -t -- -|
   quarn -t -- lib.a --c|
+
+The words of ar and ranlib: letters, a place and a count, the archive, and what is in it or goes into it.
+
+  $ completed 'quarn-ar ' 'quarn-ar r' 'quarn-ar t l' 'quarn-ar t lib.a o' 'quarn-ar t lib.a ./-' \
+  >   'quarn-ar rc lib.a n' 'quarn-ar q lib.a n' 'quarn-ar -x' 'quarn-ar ra o^ lib.a' 'quarn-ar mb one.o l' \
+  >   'quarn-ar xN 2 l' 'quarn-ar xN 2 lib.a i' 'quarn-ar -d -v lib.a m' 'quarn-ar s lib.a ' \
+  >   'quarn-ar t none.a ' 'quarn-ar t broken.a ' 'quarn-ar t lib.a two\ w' 'quarn-ar --rsp' \
+  >   'quarn-ar --rsp-quoting=' 'quarn-ar --diag_style=d' 'quarn-ar --target d' \
+  >   'quarn-ar --target default t lib.a i' 'quarn-ranlib l' 'quarn-ranlib lib.a folder/' 'quarn-ranlib --v' \
+  >   'quarn-ranlib --plugin n' 'quarn-ar rc lib.a @n'
+  quarn-ar d m p q r s t x|
+  quarn-ar r rD rP rS rU rV ra rb rc rf ri rl rs ru rv|
+  quarn-ar t lib.a |
+  quarn-ar t lib.a one.o |
+  quarn-ar t lib.a ./-dash.o |
+  quarn-ar rc lib.a new.o |
+  quarn-ar q lib.a new.o |
+  quarn-ar -x -xC -xD -xN -xS -xT -xU -xV -xc -xf -xl -xo -xs -xv|
+  quarn-ar ra one.o  lib.a|
+  quarn-ar mb one.o lib.a |
+  quarn-ar xN 2 lib.a |
+  quarn-ar xN 2 lib.a it\'s.o |
+  quarn-ar -d -v lib.a money\$x.o |
+  quarn-ar s lib.a |
+  quarn-ar t none.a |
+  quarn-ar t broken.a |
+  quarn-ar t lib.a two\ words.o |
+  quarn-ar --rsp-quoting=|
+  quarn-ar --rsp-quoting=posix --rsp-quoting=windows |
+  quarn-ar --diag_style=devstudio |
+  quarn-ar --target default |
+  quarn-ar --target default t lib.a it\'s.o |
+  quarn-ranlib lib.a |
+  quarn-ranlib lib.a folder/my\ lib.a |
+  quarn-ranlib --version |
+  quarn-ranlib --plugin new.o |
+  quarn-ar rc lib.a @new.o |
