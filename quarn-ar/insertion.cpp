@@ -24,7 +24,7 @@ constexpr std::string_view NameEnd = "/\n";
 class Insertion {
 public:
   Insertion(quarn::Run& run, const Request& request)
-      : m_Run(run), m_Request(request), m_Archive(run.archive), m_Members(run.archive, request) {}
+      : m_Request(request), m_Archive(run.archive), m_Members(run.archive, request) {}
 
   void insert(const std::string& file);
   [[nodiscard]] const std::vector<ArchiveMember*>& getAdded() const { return m_Added; }
@@ -36,7 +36,6 @@ private:
                              const FileProbe& probe);
   void setNumbers(ArchiveMember& member) const;
 
-  quarn::Run& m_Run;
   const Request& m_Request;
   arlib::Archive& m_Archive;
   NamedMembers m_Members;
