@@ -1,6 +1,6 @@
 # SPDX-License-Identifier: Apache-2.0
-# What an installation holds, in two parts: the programs, and all that programs which link the
-# libraries are built with. Nothing in it says where it lies, so that the whole may be moved.
+# What an installation holds, in two parts: the programs with their pages, and all that programs
+# which link the libraries are built with. Nothing in it says where it lies, so that the whole may be moved.
 include(GNUInstallDirs)
 include(CMakePackageConfigHelpers)
 
@@ -20,6 +20,27 @@ set(about_arlib "Archives of object code, read and written")
 install(TARGETS quarn quarn-ar COMPONENT programs)
 install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX}"
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
+foreach(page IN ITEMS quarn.1 quarn-archive.5 quarn-attributes.7)
+  string(REGEX MATCH "[0-9]$" section ${page})
+  install(FILES ${PROJECT_SOURCE_DIR}/manual/${page}
+    COMPONENT programs DESTINATION ${CMAKE_INSTALL_MANDIR}/man${section})
+endforeach()
+
+# Shells look for a command's completion under the command's name; zsh reads the names from the file,
+# in another folder of the system's than of anybody else's.
+set(completions ${PROJECT_SOURCE_DIR}/completions)
+foreach(program IN ITEMS quarn quarn-ar quarn-ranlib)
+  install(FILES ${completions}/quarn.bash COMPONENT programs RENAME ${program}
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+  install(FILES ${completions}/quarn.fish COMPONENT programs RENAME ${program}.fish
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/fish/vendor_completions.d)
+endforeach()
+set(zsh_functions site-functions)
+if(CMAKE_INSTALL_PREFIX STREQUAL "/usr" AND EXISTS /etc/debian_version)
+  set(zsh_functions vendor-completions)
+endif()
+install(FILES ${completions}/_quarn COMPONENT programs
+  DESTINATION ${CMAKE_INSTALL_DATADIR}/zsh/${zsh_functions})
 
 # Headers and libraries.
 foreach(room IN LISTS rooms)

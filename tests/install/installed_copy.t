@@ -24,6 +24,21 @@ An installation goes into any folder, and may be moved afterwards:
   lib/libquarn_support.a
   lib/libquarn_tabledrivenparser.a
   lib/pkgconfig
+  share/bash-completion
+  share/fish
+  share/man
+  share/zsh
+  $ (cd other/place/share && find . -type f | sort)
+  ./bash-completion/completions/quarn
+  ./bash-completion/completions/quarn-ar
+  ./bash-completion/completions/quarn-ranlib
+  ./fish/vendor_completions.d/quarn-ar.fish
+  ./fish/vendor_completions.d/quarn-ranlib.fish
+  ./fish/vendor_completions.d/quarn.fish
+  ./man/man1/quarn.1
+  ./man/man5/quarn-archive.5
+  ./man/man7/quarn-attributes.7
+  ./zsh/site-functions/_quarn
 
 Nothing in it knows where it was built, or installed first:
 

@@ -303,6 +303,16 @@ TEST(SourceTree, TheListOfPromisesLeadsToTests) {
   EXPECT_GT(count, 20u);
 }
 
+TEST(SourceTree, EveryPageAndCompletionIsInstalled) {
+  const std::string rules = contentsOf(Root / "cmake/Install.cmake");
+  for (const char* folder : {"manual", "completions"}) {
+    for (const auto& entry : fs::directory_iterator(Root / folder)) {
+      const std::string name = entry.path().filename();
+      EXPECT_NE(rules.find(name), std::string::npos) << folder << "/" << name;
+    }
+  }
+}
+
 TEST(SourceTree, TheNewestChangesAreOfThisVersion) {
   const std::string changes = contentsOf(Root / "CHANGELOG.md");
   const std::string heading = "# Changes\n\n## " + std::string(support::getBuildData().version);
