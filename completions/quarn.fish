@@ -55,8 +55,8 @@ function __quarn_wants_members
     not __quarn_wants_archive; and __quarn_has dmptx -; and not __quarn_has rq create
 end
 
-# A control character, which the program shows by its number, is any character. A name that begins as an
-# option does gets a folder, which does not count.
+# A control character, which the program shows by its number, is any character; so is a tab, which would end
+# the name here. A name that begins as an option does gets a folder, which does not count.
 function __quarn_members
     __quarn_members_of (__quarn_pick words (__quarn_others))[1]
 end
@@ -66,7 +66,7 @@ function __quarn_members_of --argument-names archive
     test -f "$archive"; or return
     set -l program (commandline -op)[1]
     command $program -t -- $archive 2>/dev/null </dev/null | string match -r . --entire \
-        | string replace -ar '\\\\[01][0-7][0-7]' '?' | string replace -r '^-' './-'
+        | string replace -ar '\\\\[01][0-7][0-7]|\t' '?' | string replace -r '^-' './-'
 end
 
 # The elements of a list that are there already, in front of each name.

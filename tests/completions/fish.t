@@ -20,6 +20,15 @@ Members, for each action that reads or edits, alone and among other letters; eac
   quarn -x lib.a ./-: ./-dash.o
   quarn lib.a -x on: one.o
 
+Names with characters that one shell or another takes for its own.
+
+  $ completed 'quarn -t odd.a ' 'quarn -t odd.a a:' 'quarn -t odd.a \~' 'quarn -t odd.a \!' 'quarn -t odd.a tab'
+  quarn -t odd.a : !last.o '#note.o' =which.o a:b.o 'p%q.o' 'tab?here.o' ^c.o '{a,b}.o' '~home.o'
+  quarn -t odd.a a:: a:b.o
+  quarn -t odd.a \~: '~home.o'
+  quarn -t odd.a \!: !last.o
+  quarn -t odd.a tab: 'tab?here.o'
+
 In quotes that have been opened already, and behind a part that is quoted.
 
   $ completed 'quarn -x lib.a "t' "quarn -x lib.a 'm" 'quarn -x lib.a two\ w' "quarn -x lib.a 'i"
@@ -58,7 +67,7 @@ The archive: what ends as archives do, and anything where nothing does.
 
   $ completed 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
   quarn -t l: lib.a
-  quarn -t : broken.a folder/ lib.a new.o pipe.a
+  quarn -t : broken.a folder/ lib.a new.o odd.a pipe.a
   quarn -t folder/: 'folder/my lib.a'
   quarn -t n: new.o
   quarn n: new.o

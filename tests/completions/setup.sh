@@ -8,6 +8,12 @@ for name in 'one.o' 'two words.o' "it's.o" 'money$x.o' 'a;b&c|(d).o' '[x]*?.o' '
   printf '%s' "$name" > "files/$name"
 done
 library lib.a files/*
+rm files/*
+# Characters that one shell or another takes for its own.
+for name in '~home.o' '#note.o' '!last.o' '=which.o' '{a,b}.o' $'tab\there.o' 'a:b.o' '^c.o' 'p%q.o'; do
+  printf '%s' "$name" > "files/$name"
+done
+library odd.a files/*
 cp lib.a 'folder/my lib.a'
 rm -r files
 echo 'no archive' > broken.a

@@ -20,6 +20,15 @@ Members, for each action that reads or edits, alone and among other letters; eac
   quarn -x lib.a ./-dash.o |
   quarn lib.a -x one.o |
 
+Names with characters that one shell or another takes for its own.
+
+  $ completed 'quarn -t odd.a ' 'quarn -t odd.a a:' 'quarn -t odd.a \~' 'quarn -t odd.a \!' 'quarn -t odd.a tab'
+  quarn -t odd.a \!last.o \#note.o \=which.o \^c.o a:b.o p%q.o tab$'\t'here.o \{a,b\}.o \~home.o |
+  quarn -t odd.a a:b.o |
+  quarn -t odd.a \~home.o |
+  quarn -t odd.a \!last.o |
+  quarn -t odd.a tab$'\t'here.o |
+
 In quotes that have been opened already, and behind a part that is quoted.
 
   $ completed $'quarn -x lib.a "t\t' $'quarn -x lib.a \'m\t' $'quarn -x lib.a "m\t' $'quarn -x lib.a "s\t' \
@@ -50,6 +59,14 @@ Positions, also where the archive stands behind the cursor.
   quarn -mv lib.a -i one.o |
   quarn -r lib.a -aone.o |
 
+With the cursor in a word, what stands in front of it counts.
+
+  $ completed 'quarn -t lib.a o^x' 'quarn --diag_st^=gnu -t' 'quarn -x l^ one.o' 'quarn -t lib.a ^one.o'
+  quarn -t lib.a ox|
+  quarn --diag_st=gnu -t|
+  quarn -x lib.a  one.o|
+  quarn -t lib.a one.o |
+
 A missing or broken archive, a folder or a pipe has no members, and nothing is said.
 
   $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
@@ -65,7 +82,7 @@ The archive: what ends as archives do, and anything where nothing does.
 
   $ completed 'quarn -t l' 'quarn -t ' 'quarn -t folder/' 'quarn -t n' 'quarn n'
   quarn -t lib.a |
-  quarn -t broken.a folder lib.a |
+  quarn -t broken.a folder lib.a odd.a |
   quarn -t folder/my\ lib.a |
   quarn -t new.o |
   quarn new.o |
