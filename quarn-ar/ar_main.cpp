@@ -50,9 +50,11 @@ void show(const std::string& text) {
 void runOnArchives(support::Host& host, const Request& request) {
   const auto operation = [&request](quarn::Run& run) { doOperation(run, request); };
   for (const std::string& archive : request.archives) {
+    messages::setSubject(archive);
     quarn::runOnArchive(host, archive.c_str(), request.settings, operation);
-    if (quarn::hasErrors()) return;
+    if (quarn::hasErrors()) break;
   }
+  messages::setSubject({});
 }
 
 } // namespace

@@ -116,6 +116,11 @@ void setLimit(uint32_t limit, LimitHandler handler);
 /// to one log. The tool itself has none. The text must outlive its use.
 void setProgramName(std::string_view name);
 
+/// The file that the run is about: in the styles that others read by program it stands in the place
+/// of a location that is not known, so that an editor has something to open. The tool itself has
+/// none. The text must outlive its use.
+void setSubject(std::string_view file);
+
 /// The look of diagnostics: 0 the tool's own, 1 for development environments, 2 for editors.
 [[nodiscard]] uint32_t getStyle();
 void setStyle(uint32_t style);

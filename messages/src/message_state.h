@@ -27,6 +27,7 @@ struct MessageState {
   std::array<uint32_t, SeverityCount> counts{};
   uint32_t style = 0;
   std::string_view programName; // empty: lines don't begin with one
+  std::string_view subject;     // empty: a location that is not known is left out
   uint32_t limit = 50;
   LimitHandler limitHandler = nullptr; // null: end the process
   uint32_t column = 0;

@@ -46,6 +46,7 @@ constexpr StyleRow Styles[] = {
 };
 // clang-format on
 
+constexpr uint32_t OwnStyle = 0;
 constexpr uint32_t EnvironmentStyle = 1;
 
 // The report of a bad style needs a style itself.
@@ -118,7 +119,8 @@ void appendArguments(std::string& line, std::string_view format,
 }
 
 void appendLead(std::string& line, const Location* location, uint32_t severity) {
-  const Location place = location ? *location : Location{};
+  Location place = location ? *location : Location{};
+  if (place.file.empty() && messageState.style != OwnStyle) place.file = messageState.subject;
   const size_t known = knownFieldCount(place);
   const std::string_view program = messageState.programName;
   // Where a location begins the line, whoever reads it looks there for a file. The style of
@@ -156,6 +158,7 @@ void initialise() {
   state.counts.fill(0);
   state.style = 0;
   state.programName = {};
+  state.subject = {};
   setLimit(50, nullptr);
   state.column = 0;
   state.diagnosticStream = Stream::Error;
@@ -223,6 +226,10 @@ void setLimit(uint32_t limit, LimitHandler handler) {
 
 void setProgramName(std::string_view name) {
   messageState.programName = name;
+}
+
+void setSubject(std::string_view file) {
+  messageState.subject = file;
 }
 
 uint32_t getStyle() {

@@ -73,6 +73,24 @@ TEST_F(ReportTest, BeginsWithTheNameOfTheProgramWhereNoFileIsKnown) {
                                 text + "\n");
 }
 
+TEST_F(ReportTest, BeginsWithTheSubjectInTheStylesOfOtherPrograms) {
+  setProgramName("quarn-ar");
+  setSubject("lib.a");
+  for (const uint32_t number : {0u, 1u, 2u}) {
+    setStyle(number);
+    report(WarningWord, nullptr, AddingNonElfObject, "x", "lib.a");
+    const Location place = {.file = "x.c"};
+    report(WarningWord, &place, AddingNonElfObject, "x", "lib.a");
+  }
+  EXPECT_EQ(getErrorText(),
+            "quarn-ar: Warning: L6875W: Adding non-ELF object 'x' to archive 'lib.a'\n"
+            "\"x.c\": Warning: L6875W: Adding non-ELF object 'x' to archive 'lib.a'\n"
+            "lib.a : warning L6875:  Adding non-ELF object 'x' to archive 'lib.a'\n"
+            "x.c : warning L6875:  Adding non-ELF object 'x' to archive 'lib.a'\n"
+            "lib.a: Warning: L6875W: Adding non-ELF object 'x' to archive 'lib.a'\n"
+            "x.c: Warning: L6875W: Adding non-ELF object 'x' to archive 'lib.a'\n");
+}
+
 TEST_F(ReportTest, AlwaysShowsTheCodeLetterOfTheTool) {
   report(FatalWord, nullptr, UnrecognizedOption, "--", "x");
   EXPECT_EQ(getErrorText(), "Fatal error: L3900U: Unrecognized option '--x'.\n");

@@ -200,7 +200,7 @@ TEST_F(CommandLineTest, MovesDiagnosticsAsTheToolDoes) {
   EXPECT_EQ(ar({"--diag_suppress=6831,L6875", "d", "lib.a", "b.o"}).errors, "");
   EXPECT_EQ(ar({"--diag_error=6831", "d", "lib.a", "b.o"}).status, 1);
   EXPECT_EQ(ar({"--diag_style=ide", "d", "lib.a", "b.o"}).errors,
-            "quarn-ar : warning L6831:  'b.o' not present in archive 'lib.a'\n");
+            "lib.a : warning L6831:  'b.o' not present in archive 'lib.a'\n");
   EXPECT_EQ(ar({"--diag_error=99999", "t", "lib.a"}).errors,
             "quarn-ar: Warning: L9962I: Unknown diagnostic number 99999\n");
 }
