@@ -20,6 +20,8 @@ set(about_arlib "Archives of object code, read and written")
 install(TARGETS quarn quarn-ar COMPONENT programs)
 install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX}"
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
+install(FILES ${CMAKE_CURRENT_LIST_DIR}/QuarnArchiver.cmake ${PROJECT_SOURCE_DIR}/docs/problem-matcher.json
+  COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
 foreach(page IN ITEMS quarn.1 quarn-archive.5 quarn-attributes.7)
   string(REGEX MATCH "[0-9]$" section ${page})
   install(FILES ${PROJECT_SOURCE_DIR}/manual/${page}
@@ -53,7 +55,7 @@ endforeach()
 
 # For CMake.
 configure_package_config_file(${CMAKE_CURRENT_LIST_DIR}/quarn-config.cmake.in
-  ${PROJECT_BINARY_DIR}/quarn-config.cmake INSTALL_DESTINATION ${folder} PATH_VARS CMAKE_INSTALL_BINDIR)
+  ${PROJECT_BINARY_DIR}/quarn-config.cmake INSTALL_DESTINATION ${folder} PATH_VARS CMAKE_INSTALL_BINDIR CMAKE_INSTALL_DATADIR)
 write_basic_package_version_file(${PROJECT_BINARY_DIR}/quarn-config-version.cmake
   COMPATIBILITY SameMajorVersion)
 install(FILES ${PROJECT_BINARY_DIR}/quarn-config.cmake ${PROJECT_BINARY_DIR}/quarn-config-version.cmake

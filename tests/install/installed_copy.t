@@ -27,6 +27,7 @@ An installation goes into any folder, and may be moved afterwards:
   share/bash-completion
   share/fish
   share/man
+  share/quarn
   share/zsh
   $ (cd other/place/share && find . -type f | sort)
   ./bash-completion/completions/quarn
@@ -38,6 +39,8 @@ An installation goes into any folder, and may be moved afterwards:
   ./man/man1/quarn.1
   ./man/man5/quarn-archive.5
   ./man/man7/quarn-attributes.7
+  ./quarn/QuarnArchiver.cmake
+  ./quarn/problem-matcher.json
   ./zsh/site-functions/_quarn
 
 Nothing in it knows where it was built, or installed first:
@@ -112,6 +115,9 @@ CMake finds parts and programs by name, and refuses what is not there:
   >   'get_target_property(tool quarn::quarn LOCATION)' \
   >   'file(RELATIVE_PATH tool ${CMAKE_PREFIX_PATH} ${tool})' 'message(STATUS "told: ${tool}")'
   bin/quarn
+  $ ask 'find_package(quarn REQUIRED)' 'include(QuarnArchiver)' \
+  >   'file(RELATIVE_PATH tool ${CMAKE_PREFIX_PATH} ${CMAKE_AR})' 'message(STATUS "told: ${tool}")'
+  bin/quarn-ar
   $ ask 'find_package(quarn REQUIRED COMPONENTS kitchen)'
   There is no component kitchen
   $ ask 'find_package(quarn 2 REQUIRED)'
