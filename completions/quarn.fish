@@ -65,6 +65,7 @@ function __quarn_members_of --argument-names archive
     set archive (string replace -r '^~/' $HOME/ -- "$archive")
     test -f "$archive"; or return
     set -l program (commandline -op)[1]
+    command -q $program; or return
     command $program -t -- $archive 2>/dev/null </dev/null | string match -r . --entire \
         | string replace -ar '\\\\[01][0-7][0-7]|\t' '?' | string replace -r '^-' './-'
 end

@@ -69,16 +69,18 @@ With the cursor in a word, what stands in front of it counts.
   quarn -x lib.a  one.o|
   quarn -t lib.a ./-dash.o \[x\]\*\?.o a\;b\&c\|\(d\).o bell\?.o it\'s.o key=1:2.o money\$x.o one.o say\ \"hi\".o two\ words.o one.o|
 
-A missing or broken archive, a folder or a pipe has no members, and nothing is said.
+A missing or broken archive, a folder or a pipe has no members, nor has a program that is not there, and nothing
+is said.
 
   $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
-  >   'quarn -a '
+  >   'quarn -a ' 'none/quarn -t lib.a '
   quarn -t none.a |
   quarn -t broken.a |
   quarn -t folder |
   quarn -t pipe.a |
   quarn -t lib.a none|
   quarn -a |
+  none/quarn -t lib.a |
 
 The archive: what ends as archives do, and anything where nothing does.
 

@@ -52,16 +52,18 @@ Positions, also where the archive stands behind the cursor.
   quarn -mv lib.a -i on: one.o
   quarn -r lib.a -ao: -aone.o
 
-A missing or broken archive, a folder or a pipe has no members, and nothing is said.
+A missing or broken archive, a folder or a pipe has no members, nor has a program that is not there, and nothing
+is said.
 
   $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
-  >   'quarn -a '
+  >   'quarn -a ' 'none/quarn -t lib.a '
   quarn -t none.a :
   quarn -t broken.a :
   quarn -t folder :
   quarn -t pipe.a :
   quarn -t lib.a none:
   quarn -a :
+  none/quarn -t lib.a :
 
 The archive: what ends as archives do, and anything where nothing does.
 

@@ -67,16 +67,18 @@ With the cursor in a word, what stands in front of it counts.
   quarn -x lib.a  one.o|
   quarn -t lib.a one.o |
 
-A missing or broken archive, a folder or a pipe has no members, and nothing is said.
+A missing or broken archive, a folder or a pipe has no members, nor has a program that is not there, and nothing
+is said.
 
   $ completed 'quarn -t none.a ' 'quarn -t broken.a ' 'quarn -t folder ' 'quarn -t pipe.a ' 'quarn -t lib.a none' \
-  >   'quarn -a '
+  >   'quarn -a ' 'none/quarn -t lib.a '
   quarn -t none.a |
   quarn -t broken.a |
   quarn -t folder |
   quarn -t pipe.a |
   quarn -t lib.a none|
   quarn -a |
+  none/quarn -t lib.a |
 
 The archive: what ends as archives do, and anything where nothing does.
 
