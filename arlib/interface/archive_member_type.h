@@ -7,6 +7,7 @@
 
 #include "arlib/interface/symbol_name_list.h"
 #include "elfext/interface/attribute_text_cache.h"
+#include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/full_attr.h"
 #include "elfext/interface/object_outline.h"
 
@@ -14,10 +15,6 @@
 #include <optional>
 #include <span>
 #include <string>
-
-namespace elfext {
-class ErrorHandler;
-}
 
 namespace arlib {
 
@@ -27,9 +24,11 @@ class ArchiveMember;
 using AttributeRecords = elfext::AttributeTextCache<elfext::FullAttr>;
 
 /// What serves all objects that are read one after the other, for one is like the next. It ends
-/// with the last of them; the records may go on.
+/// with the last of them; the records may go on. What was read last may be asked for more: what
+/// goes wrong then is told to `failure`, too.
 struct ObjectReading {
   AttributeRecords& records;
+  elfext::ElfextErrorStringCapture failure = {};
   elfext::ObjectOutline outline = {};
 };
 

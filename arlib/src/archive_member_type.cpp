@@ -16,7 +16,6 @@
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/debug_section_name.h"
 #include "elfext/interface/elf_constants.h"
-#include "elfext/interface/error_string_capture.h"
 #include "elfext/interface/format_recognizer.h"
 #include "elfext/interface/object_outline.h"
 #include "support/interface/shared_texts.h"
@@ -183,12 +182,12 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, Objec
                                              std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   const bool useObjectAttributes = archiveMember->getArchive()->getUseObjectBuildAttributes();
-  elfext::ElfextErrorStringCapture capture;
+  reading.failure = elfext::ElfextErrorStringCapture();
   elfext::ObjectOutline& outline = reading.outline;
   reason.clear();
   attributes.reset();
-  if (!readOutline(*archiveMember, &capture, useObjectAttributes, outline)) {
-    reason = capture.getText();
+  if (!readOutline(*archiveMember, &reading.failure, useObjectAttributes, outline)) {
+    reason = reading.failure.getText();
     return false;
   }
   const OutlinedSymbols symbols = outline.getSymbols();

@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <cstring>
 #include <map>
+#include <utility>
 
 namespace arlib {
 
@@ -113,6 +114,29 @@ std::vector<VariantGroup> findMinorVariants(std::span<const HostingMember> hosti
   return groups;
 }
 
+elfext::FullAttr computeCommonAttributes(std::span<const elfext::FullAttr> attributes) {
+  elfext::FullAttr common = attributes.front();
+  for (const elfext::FullAttr& other : attributes)
+    common = elfext::intersectFullAttr(common, other);
+  return common;
+}
+
+bool addLibraryAttributes(elfext::FullAttr& attributes, const elfext::FullAttr* library) {
+  return library == nullptr || elfext::mergeFullAttr(attributes, attributes, *library);
+}
+
+std::optional<Decoration> computeDecoration(const elfext::FullAttr& attributes,
+                                            const elfext::FullAttr& common,
+                                            AttributeRecords& records) {
+  if (elfext::isSameBuild(attributes, common)) return std::nullopt;
+  elfext::FullAttr difference;
+  elfext::differenceFullAttr(difference, attributes, common);
+  std::string text = elfext::printAttributeString(difference);
+  elfext::FullAttr restored;
+  elfext::mergeFullAttr(restored, records.get(text), common);
+  return Decoration{std::move(text), elfext::isSameBuild(restored, attributes)};
+}
+
 bool MinorVariants::addSymbols(std::span<const HostingMember> group,
                                elfext::FastArray<SymbolTableEntries>& output) {
   m_Members.clear();
@@ -123,53 +147,40 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
   }
   if (!findCommon()) return false;
   std::vector<const ArchiveMember*> baseVariants;
-  std::string decoration;
   for (size_t i = 0; i < group.size(); ++i) {
-    elfext::FullAttr& attributes = m_Attributes[i];
-    if (!addLibraryAttributes(*group[i].member, attributes)) return false;
-    decoration.clear();
-    if (elfext::isSameBuild(attributes, m_Common))
-      baseVariants.push_back(group[i].member);
-    else if (!decorate(*group[i].member, attributes, decoration))
+    const HostingMember& hosting = group[i];
+    if (!addLibrary(*hosting.member, m_Attributes[i])) return false;
+    const std::optional<Decoration> decoration =
+        computeDecoration(m_Attributes[i], m_Common, m_Records);
+    if (!decoration) {
+      baseVariants.push_back(hosting.member);
+      output.append({hosting.place, hosting.names});
+      continue;
+    }
+    // It stands also where it can't say all of the difference, which is only told of.
+    if (!decoration->isComplete &&
+        !m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, *hosting.member, m_Members))
       return false;
-    output.append({group[i].place, decorateNames(*group[i].names, decoration)});
+    const std::string suffix = std::string(AttributeMarker) + decoration->text;
+    output.append({hosting.place, decorateNames(*hosting.names, suffix)});
   }
   return reportBases(baseVariants);
 }
 
 // What all members need, with what the library needs as a whole.
 bool MinorVariants::findCommon() {
-  m_Common = m_Attributes.front();
-  for (const elfext::FullAttr& attributes : m_Attributes)
-    m_Common = elfext::intersectFullAttr(m_Common, attributes);
-  const elfext::FullAttr* library = m_Archive.getLibraryAttributes();
-  if (library == nullptr || elfext::mergeFullAttr(m_Common, m_Common, *library)) return true;
-  return m_Archive.goOn(&ErrorHandler::reportCommonAttributesIncompatible, m_Members, m_Common);
+  m_Common = computeCommonAttributes(m_Attributes);
+  return addLibraryAttributes(m_Common, m_Archive.getLibraryAttributes()) ||
+         m_Archive.goOn(&ErrorHandler::reportCommonAttributesIncompatible, m_Members, m_Common);
 }
 
-bool MinorVariants::addLibraryAttributes(const ArchiveMember& member,
-                                         elfext::FullAttr& attributes) const {
-  const elfext::FullAttr* library = m_Archive.getLibraryAttributes();
-  if (library == nullptr || elfext::mergeFullAttr(attributes, attributes, *library)) return true;
-  return m_Archive.goOn(&ErrorHandler::reportMemberAttributesIncompatible, member, attributes);
-}
-
-// The decoration stands also where it can't say all of the difference, which is only told of.
-bool MinorVariants::decorate(const ArchiveMember& member, const elfext::FullAttr& attributes,
-                             std::string& decoration) const {
-  elfext::FullAttr difference;
-  elfext::differenceFullAttr(difference, attributes, m_Common);
-  const std::string text = elfext::printAttributeString(difference);
-  decoration = std::string(AttributeMarker) + text;
-  elfext::FullAttr restored;
-  elfext::mergeFullAttr(restored, m_Records.get(text), m_Common);
-  if (elfext::isSameBuild(restored, attributes)) return true;
-  return m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, member, m_Members);
+bool MinorVariants::addLibrary(const ArchiveMember& member, elfext::FullAttr& attributes) const {
+  return addLibraryAttributes(attributes, m_Archive.getLibraryAttributes()) ||
+         m_Archive.goOn(&ErrorHandler::reportMemberAttributesIncompatible, member, attributes);
 }
 
 const SymbolNameList* MinorVariants::decorateNames(const SymbolNameList& names,
                                                    std::string_view decoration) const {
-  if (decoration.empty()) return &names;
   auto* decorated = alloclib::create<SymbolNameList>(m_Region, &m_Region);
   decorated->reserve(names.getSize());
   for (uint32_t i = 0; i < names.getSize(); ++i) {

@@ -1,58 +1,27 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Members that are builds of one module: they define the same symbols, so a plain symbol table
-// could not tell them apart. What all of them need of their target is the base; the names of a
-// member that needs more are published with a decoration that spells the difference out.
+// How the symbol table gets the names of members that are builds of one module, and what is told of
+// them on the way.
 #pragma once
 
 #include "arlib/interface/archive.h"
+#include "arlib/interface/minor_variants.h"
 #include "arlib/interface/symbol_name_list.h"
 #include "elfext/interface/fast_array.h"
 #include "elfext/interface/full_attr.h"
 
-#include <compare>
 #include <cstdint>
 #include <span>
-#include <string>
 #include <string_view>
 #include <vector>
 
 namespace arlib {
-
-// What members with the same names agree in: many others don't, and need not be compared.
-struct NamesKey {
-  // Best taken while the names are still at hand.
-  explicit NamesKey(const SymbolNameList& names);
-  auto operator<=>(const NamesKey&) const = default;
-
-  uint64_t hash = 0; // whatever their order
-  uint32_t count;
-  uint64_t textSize;
-};
-
-// A member with names to publish.
-struct HostingMember {
-  ArchiveMember* member;
-  uint32_t place; // in the archive's list of members
-  const SymbolNameList* names;
-  NamesKey key;
-  elfext::FullAttr attributes = {};
-  bool isForeign = false; // says nothing of builds
-};
 
 // Neighbours in the table to come: names that lead to one member.
 struct SymbolTableEntries {
   uint32_t place; // of the member
   const SymbolNameList* names;
 };
-
-// Indices of hosting members, at least two, in file order.
-using VariantGroup = std::vector<uint32_t>;
-
-// Groups those that have the same names with the same multiplicities, in any order. The groups are
-// in the order of their first members; members that are like no other are in none.
-[[nodiscard]] std::vector<VariantGroup>
-findMinorVariants(std::span<const HostingMember> hostingMembers);
 
 // Publishes the names of one group.
 class MinorVariants {
@@ -68,10 +37,7 @@ public:
 
 private:
   [[nodiscard]] bool findCommon();
-  [[nodiscard]] bool addLibraryAttributes(const ArchiveMember& member,
-                                          elfext::FullAttr& attributes) const;
-  [[nodiscard]] bool decorate(const ArchiveMember& member, const elfext::FullAttr& attributes,
-                              std::string& decoration) const;
+  [[nodiscard]] bool addLibrary(const ArchiveMember& member, elfext::FullAttr& attributes) const;
   [[nodiscard]] const SymbolNameList* decorateNames(const SymbolNameList& names,
                                                     std::string_view decoration) const;
   [[nodiscard]] bool reportBases(const std::vector<const ArchiveMember*>& baseVariants) const;

@@ -66,6 +66,8 @@ public:
                           ErrorHandler* errorHandler, const char* objectName,
                           bool wantsAttributes = false);
 
+  /// Whether nothing is known of what was read last, or nothing was read.
+  [[nodiscard]] bool isEmpty() const { return m_Content == nullptr; }
   /// Texts live until the next read.
   [[nodiscard]] std::vector<OutlinedSection> getSections() const;
   /// The static ones, in their order, without the null symbol; good until the next read.

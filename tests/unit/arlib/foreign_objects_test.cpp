@@ -152,6 +152,27 @@ struct Damage {
   ObjectBuilder builder;
 };
 
+// Bytes that pass for a header of class 64 in all but the magic.
+TEST(ForeignObjects, HaveAnOutlineAndPlainFilesAnEmptyOne) {
+  Library library;
+  library.add("foreign.o", foreignObject({{"f"}}).bytes());
+  library.add("plain.bin", std::string(200, '\2'));
+  AttributeRecords records(elfext::parseAttributeString);
+  ObjectReading reading{records};
+  reading.outline.setMachines(ObjectOutline::Machines::Any);
+  EXPECT_TRUE(reading.outline.isEmpty());
+  alloclib::RegionOwner region(alloclib::RegionGeneral::Create(1024, "names of a test"));
+  SymbolNameList names(region.get());
+  std::optional<elfext::FullAttr> attributes;
+  std::string reason;
+  const auto* type = ElfImageArchiveMemberType::getInstance();
+  const auto members = library.archive.getMembers();
+  EXPECT_TRUE(type->getPublished(members[0], reading, names, attributes, reason));
+  EXPECT_FALSE(reading.outline.isEmpty());
+  EXPECT_TRUE(type->getPublished(members[1], reading, names, attributes, reason));
+  EXPECT_TRUE(reading.outline.isEmpty());
+}
+
 TEST(ForeignObjects, ThatAreDamagedAreToldOfAndPublishNothing) {
   const std::vector<SymbolSpec> symbols = {{.name = "main", .section = 1}};
   std::vector<Damage> damages;

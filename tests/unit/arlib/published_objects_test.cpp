@@ -7,7 +7,7 @@
 
 #include "tests/unit/arlib/archive_fixture.h"
 
-#include "arlib/src/minor_variants.h"
+#include "arlib/interface/minor_variants.h"
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/elf_constants.h"
 #include "elfext/interface/error_string_capture.h"
@@ -250,6 +250,39 @@ TEST_F(MinorVariantsTest, StopAtTheFirstReportThatIsAnsweredSo) {
   EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
   EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
   EXPECT_EQ(handler.take().size(), 1u);
+}
+
+// Which names the table has is told elsewhere; here, that who asks beforehand gets the same answer.
+TEST_F(MinorVariantsTest, HaveADecorationUnlessTheyAreTheBase) {
+  AttributeRecords records(parseAttributeString);
+  const std::vector<FullAttr> builds = {parseAttributeString("$ZEV_ISAv4$IEEE1"),
+                                        parseAttributeString("$ZEV_ISAv5$IEEE1")};
+  const FullAttr common = computeCommonAttributes(builds);
+  EXPECT_FALSE(computeDecoration(builds[0], common, records).has_value());
+  const std::optional<Decoration> decoration = computeDecoration(builds[1], common, records);
+  ASSERT_TRUE(decoration.has_value());
+  EXPECT_EQ(decoration->text, "$ZEV_ISAv5$IEEE1");
+  EXPECT_TRUE(decoration->isComplete);
+}
+
+TEST_F(MinorVariantsTest, SayWhetherADecorationCanTellAllOfTheDifference) {
+  AttributeRecords records(parseAttributeString);
+  const FullAttr builds[] = {parseAttributeString("$J$IEEE1"),
+                             parseAttributeString("$R:L22$IEEE1")};
+  const FullAttr common = computeCommonAttributes(builds);
+  EXPECT_TRUE(computeDecoration(builds[0], common, records)->isComplete);
+  EXPECT_FALSE(computeDecoration(builds[1], common, records)->isComplete);
+}
+
+TEST_F(MinorVariantsTest, TakeWhatTheLibraryNeedsEvenIfNoTargetHasBoth) {
+  FullAttr attributes = parseAttributeString("$IEEE1$STKCKD");
+  EXPECT_TRUE(addLibraryAttributes(attributes, nullptr));
+  EXPECT_EQ(attributes, parseAttributeString("$IEEE1$STKCKD"));
+  const FullAttr possible = parseAttributeString("$IEEE1$J");
+  EXPECT_TRUE(addLibraryAttributes(attributes, &possible));
+  EXPECT_EQ(elfext::printAttributeString(attributes), "$J$IEEE1$STKCKD");
+  const FullAttr impossible = parseAttributeString("$IEEE1$~STKCKD");
+  EXPECT_FALSE(addLibraryAttributes(attributes, &impossible));
 }
 
 TEST_F(MinorVariantsTest, LibraryAttributesStayAndMakeTheTableStale) {
