@@ -5,9 +5,9 @@
 #include "quarn/actions.h"
 
 #include "arlib/interface/archive_member.h"
-#include "elfext/interface/elf_constants.h"
 #include "elfext/interface/object_outline.h"
 #include "elfext/interface/sizes_statistics.h"
+#include "quarn/object_facts.h"
 #include "quarn/reporting.h"
 #include "support/interface/shared_texts.h"
 
@@ -23,17 +23,6 @@ namespace quarn {
 using arlib::ArchiveMember;
 
 namespace {
-
-constexpr uint32_t EntryFlag = 0x10000000; // of sections that the entry point is in
-
-// In bytes, cut to 32 bits.
-struct ObjectSizes {
-  uint32_t code = 0;
-  uint32_t readOnlyData = 0;
-  uint32_t readWriteData = 0;
-  uint32_t zeroInitialised = 0;
-  uint32_t debug = 0;
-};
 
 struct EntryRecord {
   uint32_t offset;
@@ -51,7 +40,7 @@ private:
   [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
   void addMember(ArchiveMember& member);
   void addEntries(const ArchiveMember& member);
-  void addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member);
+  void addSizes(const ObjectSizes& sizes, const ArchiveMember& member);
   void printEntries() const;
 
   arlib::Archive& m_Archive;
@@ -62,9 +51,12 @@ private:
   std::deque<std::string> m_SectionNames;
 };
 
+// The report has room for 32 bits.
 void printRow(const ObjectSizes& sizes, std::string_view name) {
-  messages::listingMessage(messages::SizesRow, sizes.code, sizes.readOnlyData, sizes.readWriteData,
-                           sizes.zeroInitialised, sizes.debug, name);
+  const auto cut = [](uint64_t size) { return static_cast<uint32_t>(size); };
+  messages::listingMessage(messages::SizesRow, cut(sizes.code), cut(sizes.readOnlyData),
+                           cut(sizes.readWriteData), cut(sizes.zeroInitialised), cut(sizes.debug),
+                           name);
 }
 
 void ObjectReport::print() {
@@ -83,31 +75,18 @@ void ObjectReport::addMember(ArchiveMember& member) {
   const std::optional<elfext::SizesStatistics> totals = m_Outline.computeSizes();
   if (!totals) return;
   if (shows(Report_Entries)) addEntries(member);
-  addSizes(*totals, member);
+  addSizes(columnsOf(*totals), member);
 }
 
 void ObjectReport::addEntries(const ArchiveMember& member) {
-  constexpr uint32_t EntryFlags = elfext::SHF_ALLOC | EntryFlag;
-  std::vector<const char*> names;
-  for (const elfext::ObjectOutline::OutlinedSection& section : m_Outline.getSections()) {
-    if (section.type != elfext::SHT_PROGBITS) continue;
-    if ((section.flags & EntryFlags) != EntryFlags) continue;
-    names.push_back(section.name == nullptr ? "" : section.name);
-  }
   const auto copy = [this](std::string_view whole) -> std::string_view {
     return m_SectionNames.emplace_back(whole);
   };
-  for (const std::string_view name : support::copyShared(names, copy))
+  for (const std::string_view name : support::copyShared(entrySectionsOf(m_Outline), copy))
     m_Entries.push_back({static_cast<uint32_t>(m_Outline.getEntry()), name, member.getName()});
 }
 
-void ObjectReport::addSizes(const elfext::SizesStatistics& totals, const ArchiveMember& member) {
-  ObjectSizes sizes;
-  sizes.code = static_cast<uint32_t>(totals.m_Code + totals.m_LiteralPools);
-  sizes.readOnlyData = static_cast<uint32_t>(totals.m_RoData + totals.m_InternalPadding);
-  sizes.readWriteData = static_cast<uint32_t>(totals.m_RwDataUncompressed);
-  sizes.zeroInitialised = static_cast<uint32_t>(totals.m_ZiData);
-  sizes.debug = static_cast<uint32_t>(totals.m_DebugInfo);
+void ObjectReport::addSizes(const ObjectSizes& sizes, const ArchiveMember& member) {
   if (shows(Report_Sizes)) printRow(sizes, member.getName());
   m_Totals.code += sizes.code;
   m_Totals.readOnlyData += sizes.readOnlyData;
