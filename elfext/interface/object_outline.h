@@ -45,8 +45,10 @@ public:
   /// Whose objects are read.
   enum class Machines : uint8_t {
     Own, ///< all others are refused
-    Any, ///< of others the symbols are read, as far as the ELF standard defines them; what is no
-         ///< ELF file at all is an object about which nothing is known, and no error
+    Any, ///< of others the symbols are read, as far as the ELF standard defines them, and of GCC's
+         ///< objects for link-time optimisation alone, of whatever machine, what their records
+         ///< define; what is no ELF file at all is an object about which nothing is known, and no
+         ///< error
   };
 
   ObjectOutline();
@@ -86,6 +88,7 @@ private:
   struct Content;
 
   std::span<const OutlinedSymbol> getForeignSymbols();
+  void takeLtoSymbols();
   bool readForeign(std::unique_ptr<Content> content);
   bool readOwn(std::unique_ptr<Content> content, bool wantsAttributes);
 

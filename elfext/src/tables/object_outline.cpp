@@ -164,7 +164,7 @@ bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t off
 }
 
 bool ObjectOutline::readForeign(std::unique_ptr<Content> content) {
-  if (!checkForeignTables(content->tables)) return false;
+  if (!checkForeignTables(content->tables) || !checkLtoTables(content->tables)) return false;
   m_Content = std::move(content);
   return true;
 }
@@ -172,6 +172,7 @@ bool ObjectOutline::readForeign(std::unique_ptr<Content> content) {
 bool ObjectOutline::readOwn(std::unique_ptr<Content> content, bool wantsAttributes) {
   ObjectTables& tables = content->tables;
   if (!checkTables(tables)) return false;
+  if (m_Machines == Machines::Any && !checkLtoTables(tables)) return false;
   content->attributes.emplace(tables, wantsAttributes);
   content->areAttributesWanted = wantsAttributes;
   if (!readBuildAttributes(tables, *content->attributes)) return false;
@@ -207,7 +208,19 @@ std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
     m_Symbols.push_back({table.nameOf(row), home.category, row.getBinding(),
                          isHosted ? tables.nameOf(home.section) : nullptr});
   });
+  takeLtoSymbols();
   return m_Symbols;
+}
+
+// What they define counts like ELF symbols, in the place of the one that only says that there are
+// no others.
+void ObjectOutline::takeLtoSymbols() {
+  const ObjectTables& tables = m_Content->tables;
+  if (!tables.isSlim) return;
+  std::erase_if(m_Symbols, [](const OutlinedSymbol& symbol) { return isSlimMarker(symbol.name); });
+  m_Symbols.reserve(m_Symbols.size() + tables.ltoDefinitions.size());
+  for (const char* name : tables.ltoDefinitions)
+    m_Symbols.push_back({name, Symbol::Category_Hosted, STB_GLOBAL, nullptr});
 }
 
 // Any section index but that of undefined symbols means a definition; what the reserved ones mean
@@ -223,6 +236,7 @@ std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getForeignSymbols(
       return true;
     });
   }
+  takeLtoSymbols();
   return m_Symbols;
 }
 

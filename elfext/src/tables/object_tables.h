@@ -166,6 +166,10 @@ struct ObjectTables {
   std::optional<VersionTables> versions = {};
   std::vector<PreemptionMapPlace> preemptionMaps = {};
   std::vector<DebugOverlayRow> debugOverlayRows = {};
+  // Whether the object is one for the optimiser of a link alone, and the names that its records
+  // define; asked for by checkLtoTables.
+  bool isSlim = false;
+  std::vector<const char*> ltoDefinitions = {};
   // By section, as a note says; NoSegment for sections of which none says it, and empty without
   // such notes.
   std::vector<uint32_t> notedSegments = {};
@@ -280,6 +284,10 @@ struct ObjectTables {
 [[nodiscard]] bool checkHeaderOfAnyMachine(ObjectTables& tables, bool& isForeign);
 // What follows it in a foreign object: the section headers, and the one symbol table.
 [[nodiscard]] bool checkForeignTables(ObjectTables& tables);
+// Behind either: the records of an object that is for the optimiser of a link alone.
+[[nodiscard]] bool checkLtoTables(ObjectTables& tables);
+// Whether the symbol says that the object is such a one, and nothing more.
+[[nodiscard]] bool isSlimMarker(const char* name);
 // All that the headers lead to, but for build attributes.
 [[nodiscard]] bool checkTables(ObjectTables& tables);
 
@@ -303,6 +311,8 @@ struct ObjectTables {
 
 [[nodiscard]] bool checkTableShape(ObjectTables& tables, uint32_t index);
 [[nodiscard]] bool checkStringTable(ObjectTables& tables, uint32_t index);
+// The section names of an object of which only single tables are looked at.
+[[nodiscard]] bool openSectionNames(ObjectTables& tables);
 [[nodiscard]] bool checkSymbolTableLink(ObjectTables& tables, uint32_t index);
 // Fills the table for its rows to be checked.
 [[nodiscard]] bool openSymbolTable(ObjectTables& tables, uint32_t index, SymbolTable& table);

@@ -236,4 +236,11 @@ bool checkSectionNames(ObjectTables& tables) {
   return true;
 }
 
+// Where nobody has seen to the bytes of all sections.
+bool openSectionNames(ObjectTables& tables) {
+  if (!findNameTable(tables)) return false;
+  const uint32_t table = tables.sectionNameTable;
+  return (table == 0 || checkStringTable(tables, table)) && checkSectionNames(tables);
+}
+
 } // namespace elfext
