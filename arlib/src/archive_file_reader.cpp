@@ -119,6 +119,8 @@ bool ArchiveFileReader::readMembers() {
     ++m_Counter;
   }
   m_Archive.noteTablesUpToDate();
+  // The table that they belong in has yet to be made.
+  if (m_HasFoldersInHeaders) m_Archive.noteEdit(Edit::NewName);
   return true;
 }
 
@@ -233,8 +235,9 @@ bool ArchiveFileReader::findLongNameEnd(std::string_view table, uint32_t index, 
   return true;
 }
 
+// Some archivers write folders of short names here.
 bool ArchiveFileReader::parseShortName(std::string_view field, std::string_view& name) {
-  const size_t slash = field.find('/');
+  const size_t slash = m_Archive.m_KeepFolders ? field.rfind('/') : field.find('/');
   if (slash == std::string_view::npos)
     return m_Archive.goOn(&ErrorHandler::reportNoNameTerminator, m_Offset);
   if (!isBlank(field.substr(slash + 1))) {
@@ -263,6 +266,7 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   std::string_view memberName = m_Archive.memberNameOf(name);
   if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
     memberName = {m_Archive.copyToRegion(memberName), memberName.size()};
+    m_HasFoldersInHeaders |= isLongName(memberName);
   }
   ArchiveMember* member = m_Archive.appendFileMember(memberName, m_File, offset, size);
   member->m_FileNameTableOffset = m_LongNameIndex;

@@ -75,6 +75,7 @@ private:
   bool m_MayBeBlank = false;
   MemberHeaderNumbers m_Numbers;
   uint32_t m_LongNameIndex = ArchiveMember::NoFileNameTableOffset;
+  bool m_HasFoldersInHeaders = false;
 
   // The long-name table's text, and where the last terminator in it starts.
   std::string_view m_LongNames;

@@ -55,6 +55,20 @@ TEST(FolderNames, AreCutElsewhere) {
               ElementsAre("x.o", "x.o", "a_long_name_of_a_file.txt", "plain.o"));
 }
 
+TEST(FolderNames, AreReadWhereOtherArchiversWriteThem) {
+  MemoryHost host;
+  host.addFile("lib.a", archive().member("a/x.o", "1").member("y.o", "2").bytes());
+  Archive read(host);
+  read.setKeepFolders(true);
+  ASSERT_TRUE(readFile("lib.a", read));
+  EXPECT_THAT(namesOf(read), ElementsAre("a/x.o", "y.o"));
+  ASSERT_TRUE(writeFile("lib.a", read));
+  Archive again(host);
+  again.setKeepFolders(true);
+  ASSERT_TRUE(readFile("lib.a", again));
+  EXPECT_THAT(namesOf(again), ElementsAre("", "a/x.o", "y.o"));
+}
+
 TEST(FolderNames, ComeAlongFromAnotherArchive) {
   Folders folders;
   Archive source(folders.host);
