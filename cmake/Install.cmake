@@ -22,11 +22,14 @@ install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
 install(FILES ${CMAKE_CURRENT_LIST_DIR}/QuarnArchiver.cmake ${PROJECT_SOURCE_DIR}/docs/problem-matcher.json
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
-foreach(page IN ITEMS quarn.1 quarn-archive.5 quarn-attributes.7)
+foreach(page IN ITEMS quarn.1 quarn-ar.1 quarn-archive.5 quarn-attributes.7)
   string(REGEX MATCH "[0-9]$" section ${page})
   install(FILES ${PROJECT_SOURCE_DIR}/manual/${page}
     COMPONENT programs DESTINATION ${CMAKE_INSTALL_MANDIR}/man${section})
 endforeach()
+# A page of two names. It is there twice, as no link outlives that pages are compressed.
+install(FILES ${PROJECT_SOURCE_DIR}/manual/quarn-ar.1 RENAME quarn-ranlib.1
+  COMPONENT programs DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
 
 # Shells look for a command's completion under the command's name; zsh reads the names from the file,
 # in another folder of the system's than of anybody else's.

@@ -151,4 +151,16 @@ void add(Names& names, const Names& more) {
   names.insert(more.begin(), more.end());
 }
 
+std::regex patternOf(std::string_view text) {
+  std::string pattern;
+  for (const char character : text.substr(0, text.find('\n'))) {
+    if (std::string_view("\\^$.|?*+()[]{}").find(character) != std::string_view::npos)
+      pattern += '\\';
+    pattern += character;
+  }
+  // An option is shown with its dashes and its "=", which are arguments of the text.
+  pattern = std::regex_replace(pattern, std::regex("(%[sdcu])+"), ".+");
+  return std::regex(std::regex_replace(pattern, std::regex(" +"), " "));
+}
+
 } // namespace manuals

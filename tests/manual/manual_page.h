@@ -4,6 +4,7 @@
 // and the text as a reader sees it, which mandoc makes.
 #pragma once
 
+#include <regex>
 #include <set>
 #include <string>
 #include <string_view>
@@ -40,5 +41,9 @@ Names optionsIn(std::string_view line);
 Names wordsMarked(std::string_view line, std::string_view macro);
 
 void add(Names& names, const Names& more);
+
+// The first line of a message's text as a pattern of what a page may have in the place of its
+// arguments.
+std::regex patternOf(std::string_view text);
 
 } // namespace manuals
