@@ -18,6 +18,11 @@ set(about_arlib "Archives of object code, read and written")
 
 # Programs.
 install(TARGETS quarn quarn-ar COMPONENT programs)
+if(TARGET quarn-json)
+  install(TARGETS quarn-json COMPONENT programs)
+  install(FILES ${PROJECT_SOURCE_DIR}/docs/quarn-json.schema.json
+    COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
+endif()
 install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX}"
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
 install(FILES ${CMAKE_CURRENT_LIST_DIR}/QuarnArchiver.cmake ${PROJECT_SOURCE_DIR}/docs/problem-matcher.json

@@ -6,6 +6,7 @@ An installation goes into any folder, and may be moved afterwards:
   $ (cd other/place && ls -d */* include/quarn/*)
   bin/quarn
   bin/quarn-ar
+  bin/quarn-json
   bin/quarn-ranlib
   include/quarn
   include/quarn/alloclib
@@ -43,6 +44,7 @@ An installation goes into any folder, and may be moved afterwards:
   ./man/man7/quarn-attributes.7
   ./quarn/QuarnArchiver.cmake
   ./quarn/problem-matcher.json
+  ./quarn/quarn-json.schema.json
   ./zsh/site-functions/_quarn
 
 Nothing in it knows where it was built, or installed first:
