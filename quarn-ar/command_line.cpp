@@ -278,6 +278,8 @@ bool CommandLine::takeOperands() {
 void CommandLine::chooseSettings() {
   quarn::Settings& settings = m_Request.settings;
   settings.machines = elfext::ObjectOutline::Machines::Any;
+  // Linkers look for another compiler's intermediate code themselves where there is no table.
+  settings.symbolTableMode = arlib::SymbolTableMode::IfObjects;
   settings.keepFolders = true;
   settings.restoreModes = true;
   const auto operation = m_Request.operation;

@@ -67,7 +67,7 @@ void chooseSymbolTableMode(Run& run) {
   if (run.settings.suppressSymbolTable) {
     run.archive.setSymbolTableMode(arlib::SymbolTableMode::Never);
   } else if (run.settings.accessMode == Access_Write) {
-    run.archive.setSymbolTableMode(arlib::SymbolTableMode::Always);
+    run.archive.setSymbolTableMode(run.settings.symbolTableMode);
   }
 }
 

@@ -3,6 +3,7 @@
 // What one run is to do: the command line as one record. Nothing else holds an option's value.
 #pragma once
 
+#include "arlib/interface/archive.h"
 #include "elfext/interface/object_outline.h"
 
 #include <cstdint>
@@ -68,8 +69,9 @@ struct Settings {
   bool includeDebugSymbols = false;
   bool uniqueSymbolsOnly = false;
   bool useObjectBuildAttributes = false;
-  // The next four are what other tools of the kind do, and no option of this one asks for.
+  // The next five are what other tools of the kind do, and no option of this one asks for.
   elfext::ObjectOutline::Machines machines = elfext::ObjectOutline::Machines::Own;
+  arlib::SymbolTableMode symbolTableMode = arlib::SymbolTableMode::Always; // of a run that writes
   bool keepFolders = false;  // in the names of members
   bool restoreModes = false; // of files that are extracted
   bool restoreDates = false;

@@ -41,6 +41,7 @@ enum class SymbolTableMode : uint32_t {
   Always = 0,    ///< keep a symbol table, even an empty one
   Never = 1,     ///< never keep one
   IfSymbols = 2, ///< keep one only if some member has symbols to publish
+  IfObjects = 3, ///< the same, or if some member is an object, though it publishes nothing
 };
 
 /// What is done to an archive, as far as it makes derived data stale. The table that says which is

@@ -3,11 +3,15 @@
 // The order of the table is the order in which a linker finds a name: builds of one module first,
 // each with its decoration, then all other members in file order. An object that can't be read is
 // told of and publishes nothing; it stays a member, and the others are published as ever.
+//
+// Members that are no objects have nothing to publish, but for what the table that was read says of
+// them, where objects of any machine are taken.
 #include "arlib/src/symbol_table_maker.h"
 
 #include "arlib/interface/archive_format.h"
 #include "elfext/interface/attribute_string.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <optional>
@@ -19,6 +23,11 @@ namespace {
 
 constexpr size_t ScratchRegionSize = 0x100000;
 
+// A plain file that was in the archive before this run.
+bool mayBeKnown(const ArchiveMember* member) {
+  return !member->isModified() && !member->isAuxiliary() && !member->getType()->isObjectModule();
+}
+
 } // namespace
 
 SymbolTableMaker::SymbolTableMaker(Archive& archive)
@@ -29,6 +38,7 @@ SymbolTableMaker::SymbolTableMaker(Archive& archive)
       m_Output(m_Region.get()) {}
 
 bool SymbolTableMaker::collect() {
+  if (!collectKnownNames()) return false;
   collectSymbolHostingMembers();
   if (!isTableWanted()) return true;
   if (!addVariantSymbols()) return false;
@@ -37,34 +47,75 @@ bool SymbolTableMaker::collect() {
 }
 
 bool SymbolTableMaker::isTableWanted() const {
-  return m_SymbolHostingMembers.getSize() != 0 ||
-         m_Archive.getSymbolTableMode() == SymbolTableMode::Always;
+  if (m_SymbolHostingMembers.getSize() != 0) return true;
+  const SymbolTableMode mode = m_Archive.getSymbolTableMode();
+  return mode == SymbolTableMode::Always || (mode == SymbolTableMode::IfObjects && hasObjects());
 }
 
-// A member that can't be read is told of and has no entries. A handler that says to stop there
-// leaves the table with the members collected so far.
+bool SymbolTableMaker::hasObjects() const {
+  const std::span<ArchiveMember* const> members = m_Archive.getMembers();
+  return std::any_of(members.begin(), members.end(), [](const ArchiveMember* member) {
+    return member->getType()->isObjectModule();
+  });
+}
+
+// Another compiler's intermediate code is published by its own tools. What they have said of it is
+// true as long as its bytes are the same. False after a report.
+bool SymbolTableMaker::collectKnownNames() {
+  if (m_Archive.getMachines() != elfext::ObjectOutline::Machines::Any) return true;
+  // Most libraries hold objects and nothing else.
+  const std::span<ArchiveMember* const> members = m_Archive.getMembers();
+  if (!std::any_of(members.begin(), members.end(), mayBeKnown)) return true;
+  return m_Archive.visitSymbols([this](const Symbol& symbol) {
+    const ArchiveMember* member = symbol.getDefiningMember();
+    if (!mayBeKnown(member)) return;
+    if (symbol.hasBuildAttributes() || symbol.getName().empty()) return;
+    SymbolNameList*& names = m_KnownNames[member];
+    if (names == nullptr) names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+    names->add(symbol.getName());
+  });
+}
+
 void SymbolTableMaker::collectSymbolHostingMembers() {
-  const elfext::FullAttr nothingStated = m_Records.get("");
   ObjectReading reading{m_Records};
   reading.outline.setMachines(m_Archive.getMachines());
   QUARN_ASSERT(1, m_SymbolHostingMembers.getSize() == 0);
   const std::span<ArchiveMember* const> members = m_Archive.getMembers();
   for (uint32_t place = 0; place < members.size(); ++place) {
     ArchiveMember* member = members[place];
-    if (!member->getType()->isObjectModule()) continue;
-    const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(member->getType());
-    auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
-    std::optional<elfext::FullAttr> attributes;
-    std::string reason;
-    if (!type->getPublished(member, reading, *names, attributes, reason) &&
-        !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
+    if (!member->getType()->isObjectModule())
+      collectKnown(member, place);
+    else if (!collectObject(member, place, reading))
       return;
-    }
-    if (names->getSize() == 0) continue;
-    m_SymbolHostingMembers.append({member, place, names, NamesKey(*names),
-                                   attributes.value_or(nothingStated),
-                                   reading.outline.isForeign()});
   }
+}
+
+void SymbolTableMaker::collectKnown(ArchiveMember* member, uint32_t place) {
+  const auto known = m_KnownNames.find(member);
+  if (known == m_KnownNames.end()) return;
+  const SymbolNameList* names = known->second;
+  constexpr bool IsForeign = true;
+  m_SymbolHostingMembers.append(
+      {member, place, names, NamesKey(*names), m_Records.get(""), IsForeign});
+}
+
+// A member that can't be read is told of and has no entries. A handler that says to stop there
+// leaves the table with the members collected so far.
+bool SymbolTableMaker::collectObject(ArchiveMember* member, uint32_t place,
+                                     ObjectReading& reading) {
+  const auto* type = static_cast<const ObjectModuleArchiveMemberType*>(member->getType());
+  auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+  std::optional<elfext::FullAttr> attributes;
+  std::string reason;
+  if (!type->getPublished(member, reading, *names, attributes, reason) &&
+      !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
+    return false;
+  }
+  if (names->getSize() == 0) return true;
+  m_SymbolHostingMembers.append({member, place, names, NamesKey(*names),
+                                 attributes.value_or(m_Records.get("")),
+                                 reading.outline.isForeign()});
+  return true;
 }
 
 // They come before all others. A name of theirs may stand in the table more than once, also where

@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <span>
 #include <string_view>
+#include <unordered_map>
 #include <unordered_set>
 #include <vector>
 
@@ -37,7 +38,11 @@ public:
   void fillSymbolTable(std::span<uint8_t> bytes, const MemberLayout& layout) const;
 
 private:
+  [[nodiscard]] bool collectKnownNames();
   void collectSymbolHostingMembers();
+  bool collectObject(ArchiveMember* member, uint32_t place, ObjectReading& reading);
+  void collectKnown(ArchiveMember* member, uint32_t place);
+  [[nodiscard]] bool hasObjects() const;
   bool addVariantSymbols();
   void addPlainSymbols();
   [[nodiscard]] const SymbolNameList* dropSeenNames(const SymbolNameList& names,
@@ -46,6 +51,8 @@ private:
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;
   AttributeRecords m_Records;
+  // What the table that was read says of members that nobody here can look into.
+  std::unordered_map<const ArchiveMember*, SymbolNameList*> m_KnownNames;
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
   // By hosting member: whether it is in a group of minor variants.
   std::vector<bool> m_IsMinorVariant;

@@ -243,6 +243,19 @@ TEST_F(OperationsTest, LeavesTheSymbolTableOutWithS) {
   EXPECT_NE(m_Host.read("lib.a").find("main"), m_Host.read("lib.a").rfind("main"));
 }
 
+// A linker that finds a table looks for nothing that is not in it, and one that finds none looks
+// into the members.
+TEST_F(OperationsTest, LeavesTheSymbolTableOutWhereNoMemberIsAnObject) {
+  m_Host.addFile("a.bc", "no object");
+  EXPECT_EQ(ar({"rcs", "lib.a", "a.bc"}).status, 0);
+  EXPECT_EQ(m_Host.read("lib.a").substr(8, 5), "a.bc/");
+  givenFile("a.o", "object");
+  EXPECT_EQ(ar({"r", "lib.a", "a.o"}).status, 0);
+  EXPECT_EQ(m_Host.read("lib.a").substr(8, 2), "/ ");
+  EXPECT_EQ(ar({"d", "lib.a", "a.o"}).status, 0);
+  EXPECT_EQ(m_Host.read("lib.a").substr(8, 5), "a.bc/");
+}
+
 TEST_F(OperationsTest, NeedAnArchiveUnlessFilesGoIn) {
   for (const Words& words : {Words{"d"}, {"m"}, {"p"}, {"s"}, {"t"}, {"x"}}) {
     expectFailure({words.front(), "lib.a"},
