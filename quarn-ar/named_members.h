@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Which member a word means: the first of exactly that name, letter case counting. A word is cut to
-// what a member made of that file would be called.
+// Which member a word means: the first of exactly that name, letter case counting, and the next one
+// for the same word again. A word is cut to what a member made of that file would be called.
 #pragma once
 
 #include "arlib/interface/archive.h"

@@ -6,6 +6,7 @@
 
 #include "messages/interface/output.h"
 #include "quarn-ar/named_members.h"
+#include "quarn-ar/refusal.h"
 #include "quarn/extraction.h"
 #include "quarn/listing.h"
 #include "quarn/local_dates.h"
@@ -44,12 +45,12 @@ void moveMembers(quarn::Run& run, const Request& request) {
   std::vector<ArchiveMember*> moved;
   for (const std::string& word : request.files) {
     ArchiveMember* member = members.take(word);
-    if (member == nullptr) {
+    if (member != nullptr) {
+      moved.push_back(member);
+      quarn::verboseMessage(request.settings, messages::MovedMember, word);
+    } else if (members.find(word) == nullptr) {
       reportMissing(run, messages::ErrorWord, word);
-      continue;
     }
-    moved.push_back(member);
-    quarn::verboseMessage(request.settings, messages::MovedMember, word);
   }
   const auto place = findPlace(run.archive, request, {moved.begin(), moved.end()});
   if (place) run.archive.moveMembers(moved, *place);
@@ -64,11 +65,11 @@ void forEachMember(quarn::Run& run, const Request& request,
     }
     return;
   }
-  const NamedMembers members(run.archive, request);
+  NamedMembers members(run.archive, request);
   for (const std::string& word : request.files) {
-    if (ArchiveMember* member = members.find(word); member != nullptr)
+    if (ArchiveMember* member = members.take(word); member != nullptr)
       routine(*member);
-    else
+    else if (members.find(word) == nullptr)
       reportMissing(run, messages::ErrorWord, word);
   }
 }
@@ -113,6 +114,18 @@ void extractMembers(quarn::Run& run, const Request& request) {
   forEachMember(run, request, [&](ArchiveMember& member) { extraction(member); });
 }
 
+// Archives of other formats have names in places of their own. What was wrong with each has been
+// told, and the first write would lose them all.
+bool canKeepNames(const quarn::Run& run) {
+  for (const ArchiveMember* member : run.archive.getMembers()) {
+    if (member->isAuxiliary() || !member->getName().empty()) continue;
+    return refuse("'%s' has a member without a name that can be read: archives of other formats "
+                  "are not taken",
+                  run.getArchiveName());
+  }
+  return true;
+}
+
 } // namespace
 
 std::optional<uint32_t> findPlace(const arlib::Archive& archive, const Request& request,
@@ -138,6 +151,7 @@ void doOperation(quarn::Run& run, const Request& request) {
                          quarn::hostErrorText(run.openStatus.errorNumber));
     return;
   }
+  if (!canKeepNames(run)) return;
   switch (operation) {
   case Operation::None:
   case Operation::Index: // the tables are made anew by every run that writes

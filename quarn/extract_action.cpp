@@ -30,7 +30,9 @@ Extraction::Extraction(const Run& run)
 
 // A folder in a name is not followed: an archive must not choose where files are written.
 std::string Extraction::outputName(std::string_view name) const {
-  const std::string_view leaf = support::lastPathComponent(name);
+  // Where names keep their folders, only what the host takes for one ends a folder.
+  const std::string_view leaf =
+      m_Settings.keepFolders ? name.substr(name.rfind('/') + 1) : support::lastPathComponent(name);
   if (!m_Settings.truncateNames) return std::string(leaf);
   return std::string(leaf.substr(0, LongestFileName).substr(0, LongestHostName));
 }

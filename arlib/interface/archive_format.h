@@ -54,7 +54,10 @@ constexpr HeaderField MagicField = {58, 2};
 /// The name fields of the two tables, whole.
 constexpr std::string_view SymbolTableName = "/               ";
 constexpr std::string_view FileNameTableName = "//              ";
+/// A symbol table with numbers of 64 bits, which some tools write for some machines.
+constexpr std::string_view WideSymbolTableName = "/SYM64/         ";
 static_assert(SymbolTableName.size() == NameField.width);
+static_assert(WideSymbolTableName.size() == NameField.width);
 static_assert(FileNameTableName.size() == NameField.width);
 
 /// A member header of a file as text. The view lives as long as the bytes.

@@ -131,9 +131,10 @@ ArchiveFileReader::Pass ArchiveFileReader::readMember() {
   ArchiveMember* member = addMember(name);
   if (member == nullptr) return Pass::Failure;
   const std::string_view nameField = field(NameField);
-  if (m_Counter == 0 && nameField == SymbolTableName) {
+  if (m_Counter == 0 && (nameField == SymbolTableName || m_IsWideSymbolTable)) {
     m_Archive.m_SymbolTable = member;
     member->m_Type = SymbolTableArchiveMemberType::getInstance();
+    m_HasWideSymbols = m_IsWideSymbolTable;
   }
   if (m_Counter <= 1 && nameField == FileNameTableName && m_Archive.m_FileNameTable == nullptr) {
     m_Archive.m_FileNameTable = member;
@@ -169,7 +170,9 @@ ArchiveFileReader::Pass ArchiveFileReader::readHeader() {
 
 bool ArchiveFileReader::parseHeader() {
   const std::string_view name = field(NameField);
-  m_MayBeBlank = name == SymbolTableName || name == FileNameTableName;
+  m_IsWideSymbolTable = m_Counter == 0 && name == WideSymbolTableName &&
+                        m_Archive.getMachines() == elfext::ObjectOutline::Machines::Any;
+  m_MayBeBlank = name == SymbolTableName || name == FileNameTableName || m_IsWideSymbolTable;
   if (field(MagicField) != MemberMagic &&
       !m_Archive.goOn(&ErrorHandler::reportBadMemberMagic, m_Offset)) {
     return false;
@@ -327,6 +330,11 @@ bool ArchiveFileReader::readSymbolTable() {
   m_Archive.m_Symbols.setSize(0);
   m_Archive.noteEdit(Edit::ReadSymbols);
   if (m_Archive.m_SymbolTable == nullptr) return true;
+  if (m_HasWideSymbols) {
+    // Nobody looks into it, and it is never written again.
+    m_Archive.noteEdit(Edit::Publishing);
+    return true;
+  }
   auto table = std::make_unique<ReadSymbolTable>(getSymbolTableSource(), m_Archive.getMembers());
   if (!table->check(m_Archive)) return false;
   m_Archive.m_ReadSymbolTable = std::move(table);

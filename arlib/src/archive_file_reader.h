@@ -65,6 +65,7 @@ private:
   support::ReadWindow m_Window;
   support::FileStatus m_Status; // as the file was when it was opened
   bool m_HostFileIsChecked = false;
+  bool m_HasWideSymbols = false; // the table is none of those that are looked into
 
   // The member being read.
   uint64_t m_Offset = 0; // of its header
@@ -73,6 +74,7 @@ private:
   std::string_view m_Header; // the same, as text
   std::vector<uint8_t> m_FirstBytes;
   bool m_MayBeBlank = false;
+  bool m_IsWideSymbolTable = false;
   MemberHeaderNumbers m_Numbers;
   uint32_t m_LongNameIndex = ArchiveMember::NoFileNameTableOffset;
   bool m_HasFoldersInHeaders = false;

@@ -201,6 +201,27 @@ TEST_F(OperationsTest, ListsAsBuildSystemsReadIt) {
   expectFailure({"t", "lib.a", "none.o"}, "L6831E: 'none.o' not present in archive 'lib.a'");
 }
 
+// As plain archivers have it; a word that comes too often still means a member that is there.
+TEST_F(OperationsTest, TakesTheNextMemberOfANameForEachWord) {
+  givenMembers({{"a.o", "1"}, {"b.o", "2"}, {"a.o", "3"}});
+  const Words three = {"a.o", "d/a.o", "a.o"};
+  const auto words = [&three](const char* letters) {
+    Words all = {letters, "lib.a"};
+    all.insert(all.end(), three.begin(), three.end());
+    return all;
+  };
+  EXPECT_EQ(ar(words("p")).output, objectBytes("1") + objectBytes("3"));
+  EXPECT_EQ(ar(words("t")).output, "a.o\na.o\n");
+  const RunOutcome extraction = ar(words("xv"));
+  EXPECT_EQ(extraction.status, 0);
+  EXPECT_EQ(extraction.output, "x - a.o\nx - a.o\n");
+  EXPECT_EQ(m_Host.read("a.o"), objectBytes("3"));
+  const RunOutcome move = ar(words("mv"));
+  EXPECT_EQ(move.status, 0);
+  EXPECT_EQ(move.output, "m - a.o\nm - d/a.o\n");
+  EXPECT_THAT(texts(), ElementsAre("2", "1", "3"));
+}
+
 TEST_F(OperationsTest, PrintsMembers) {
   givenMembers({{"a.o", "1"}, {"b.o", "2"}});
   EXPECT_EQ(ar({"p", "lib.a", "b.o"}).output, objectBytes("2"));
@@ -233,6 +254,58 @@ TEST_F(OperationsTest, ExtractsIntoTheCurrentFolderAlone) {
   EXPECT_EQ(ar({"x", "lib.a"}).status, 0);
   EXPECT_FALSE(m_Host.has("x/a.o"));
   EXPECT_EQ(m_Host.read("a.o"), objectBytes("1"));
+}
+
+// It is a character like any other here.
+TEST_F(OperationsTest, ExtractsBackslashesAsTheyAre) {
+  givenFile("d/back\\slash.o", "1");
+  EXPECT_EQ(ar({"rc", "lib.a", "d/back\\slash.o"}).status, 0);
+  EXPECT_THAT(names(), ElementsAre("back\\slash.o"));
+  EXPECT_EQ(ar({"x", "lib.a"}).status, 0);
+  EXPECT_EQ(m_Host.read("back\\slash.o"), objectBytes("1"));
+  EXPECT_FALSE(m_Host.has("slash.o"));
+}
+
+// Of another format, or damaged: with the first write the names would be lost.
+TEST_F(OperationsTest, RefusesArchivesWhoseNamesItCannotRead) {
+  const std::string other = "#1/12           ";
+  testsupport::ArchiveBuilder library = testsupport::archive();
+  m_Host.addFile("lib.a", library.member("a.o", objectBytes("1")).bytes());
+  std::string bytes = m_Host.read("lib.a");
+  m_Host.addFile("lib.a", bytes.replace(8, other.size(), other));
+  givenFile("b.o");
+  for (const Words& words : {Words{"r", "lib.a", "b.o"},
+                             {"q", "lib.a", "b.o"},
+                             {"d", "lib.a", "b.o"},
+                             {"m", "lib.a"},
+                             {"s", "lib.a"},
+                             {"t", "lib.a"},
+                             {"p", "lib.a"},
+                             {"x", "lib.a"}}) {
+    EXPECT_THAT(refusal(words), HasSubstr("'lib.a' has a member without a name that can be read: "
+                                          "archives of other formats are not taken"));
+    EXPECT_EQ(m_Host.read("lib.a"), bytes);
+  }
+}
+
+// It is made anew like any other; what is left of the archive is in the common format.
+TEST_F(OperationsTest, TakesAWideSymbolTableForWhatItIs) {
+  const std::string wide = "/SYM64/         ";
+  testsupport::ArchiveBuilder library = testsupport::archive();
+  library.member("table", std::string(8, '\0'));
+  m_Host.addFile("a.o", testsupport::objectThatDefines("main").bytes());
+  library.member("a.o", m_Host.read("a.o"));
+  std::string bytes = library.bytes();
+  m_Host.addFile("lib.a", bytes.replace(8, wide.size(), wide));
+  const RunOutcome listing = ar({"t", "lib.a"});
+  EXPECT_EQ(listing.output, "a.o\n");
+  EXPECT_EQ(listing.errors, "");
+  EXPECT_EQ(ar({"r", "lib.a", "a.o"}).status, 0);
+  EXPECT_EQ(m_Host.read("lib.a").substr(8, 16), "/               ");
+  EXPECT_THAT(names(), ElementsAre("a.o"));
+  m_Host.addFile("lib.a", bytes);
+  EXPECT_EQ(ar({"dS", "lib.a"}).status, 0);
+  EXPECT_EQ(m_Host.read("lib.a").substr(8, 4), "a.o/");
 }
 
 TEST_F(OperationsTest, LeavesTheSymbolTableOutWithS) {
