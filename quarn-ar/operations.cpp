@@ -119,9 +119,7 @@ void extractMembers(quarn::Run& run, const Request& request) {
 bool canKeepNames(const quarn::Run& run) {
   for (const ArchiveMember* member : run.archive.getMembers()) {
     if (member->isAuxiliary() || !member->getName().empty()) continue;
-    return refuse("'%s' has a member without a name that can be read: archives of other formats "
-                  "are not taken",
-                  run.getArchiveName());
+    return refuse("'%s' has a member without a name, as in another format", run.getArchiveName());
   }
   return true;
 }
