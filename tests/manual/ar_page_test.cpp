@@ -42,12 +42,14 @@ Lines itemsUnder(const char* heading) {
   return itemsIn(linesUnder(sourceOf(Page), heading));
 }
 
-// All matches of a pattern's first group in the sources of the programs.
+// All matches of a pattern's first group in the sources of the programs, where a literal of several
+// lines counts as one.
 Names inTheSource(const char* pattern) {
   const std::regex expression(pattern);
   Names found;
   for (const char* file : {"ar_main", "command_line", "insertion", "operations", "response_file"}) {
-    const std::string text = contentsOf("quarn-ar/" + std::string(file) + ".cpp");
+    const std::string text = std::regex_replace(
+        contentsOf("quarn-ar/" + std::string(file) + ".cpp"), std::regex("\"\\s*\n\\s*\""), "");
     for (std::sregex_iterator match(text.begin(), text.end(), expression), end; match != end;
          ++match)
       found.insert((*match)[1]);
