@@ -9,6 +9,8 @@
 #include "quarn-ar/refusal.h"
 #include "quarn/reporting.h"
 
+#include <array>
+
 namespace quarn_ar {
 
 using arlib::ArchiveMember;
@@ -20,6 +22,16 @@ constexpr uint32_t PlainMode = 0644;
 constexpr uint32_t LargestOwner = 999999; // six digits are the room that a header has
 // What ends a name in the long-name table.
 constexpr std::string_view NameEnd = "/\n";
+
+// Why the file can't be a member, as the host's error number, or 0. One that could not be opened is
+// tried again.
+int findFault(const FileProbe& probe) {
+  if (const int error = probe.getRefusal(); error != 0) return error;
+  if (probe.byteCount != 0 || probe.status.size == 0) return 0;
+  std::array<uint8_t, 1> byte;
+  size_t done = 0;
+  return probe.file->readAt(byte, 0, done);
+}
 
 class Insertion {
 public:
@@ -59,6 +71,12 @@ void Insertion::insert(const std::string& file) {
 bool Insertion::canTake(const std::string& file, const FileProbe& probe) const {
   if (!probe.exists()) {
     quarn::reportMessage(messages::ErrorWord, messages::FileDoesNotExist, file);
+    return false;
+  }
+  // The library would tell it of the archive.
+  if (const int error = findFault(probe); error != 0) {
+    quarn::reportMessage(messages::ErrorWord, messages::ReadingFile, file,
+                         quarn::hostErrorText(error));
     return false;
   }
   const auto& own = m_Archive.getOwnFile();

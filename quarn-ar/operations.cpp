@@ -12,6 +12,7 @@
 #include "quarn/local_dates.h"
 #include "quarn/reporting.h"
 
+#include <array>
 #include <functional>
 
 namespace quarn_ar {
@@ -74,6 +75,23 @@ void forEachMember(quarn::Run& run, const Request& request,
   }
 }
 
+// As `ls` shows it: what stands for the right to execute also tells of three more bits.
+std::string modeText(uint32_t mode) {
+  struct Bit {
+    uint32_t bit;
+    size_t position;
+    char letter; // in the place of an x, and as a capital in the place of a dash
+  };
+  constexpr std::array<Bit, 3> Bits = {{{04000, 2, 's'}, {02000, 5, 's'}, {01000, 8, 't'}}};
+  std::string text = quarn::modeText(mode);
+  for (const auto& [bit, position, letter] : Bits) {
+    constexpr char ToCapital = 'A' - 'a';
+    if ((mode & bit) == 0) continue;
+    text[position] = text[position] == 'x' ? letter : static_cast<char>(letter + ToCapital);
+  }
+  return text;
+}
+
 // "Jan  1 00:00 1970", with a blank where a day has one digit.
 std::string dateText(std::string_view date) {
   constexpr size_t DayPosition = 4;
@@ -94,7 +112,7 @@ void listMembers(quarn::Run& run, const Request& request) {
     std::string size = std::to_string(member.getSize());
     constexpr size_t SizeWidth = 6;
     if (size.size() < SizeWidth) size.insert(0, SizeWidth - size.size(), ' ');
-    writeLine(quarn::modeText(member.getMode()) + " " + std::to_string(member.getUid()) + "/" +
+    writeLine(modeText(member.getMode()) + " " + std::to_string(member.getUid()) + "/" +
               std::to_string(member.getGid()) + " " + size + " " +
               dateText(dates.textOf(member.getDate())) + " " + name);
   });

@@ -127,6 +127,12 @@ TEST_F(OperationsTest, RefusesFilesThatCannotBeMembers) {
   givenMembers({{"a.o", "1"}});
   givenFile("d/\nb");
   expectFailure({"r", "lib.a", "gone.o"}, "L6833E: File 'gone.o' does not exist");
+  m_Host.addFile("secret.o", objectBytes("2")).isUnreadable = true;
+  expectFailure({"r", "lib.a", "secret.o"}, "L6835E: Reading file 'secret.o' : Permission denied");
+  m_Host.addDirectory("folder");
+  m_Host.addSpecial("device");
+  expectFailure({"r", "lib.a", "folder"}, "L6835E: Reading file 'folder' : Is a directory");
+  expectFailure({"q", "lib.a", "device"}, "L6835E: Reading file 'device' : Invalid argument");
   expectFailure({"r", "lib.a", "lib.a"},
                 "'lib.a' is the archive itself, and can't be a member of it");
   expectFailure({"rP", "lib.a", "d/\nb"}, "no member can have the name 'd/\nb'");
@@ -220,6 +226,17 @@ TEST_F(OperationsTest, TakesTheNextMemberOfANameForEachWord) {
   EXPECT_EQ(move.status, 0);
   EXPECT_EQ(move.output, "m - a.o\nm - d/a.o\n");
   EXPECT_THAT(texts(), ElementsAre("2", "1", "3"));
+}
+
+TEST_F(OperationsTest, ListsRightsBeyondThoseToReadWriteAndExecute) {
+  Words modes;
+  for (const uint32_t mode : {0104755U, 0104644U, 0102755U, 0102644U, 0101777U, 0101776U}) {
+    m_Host.addFile("x.o", objectBytes("")).mode = mode;
+    EXPECT_EQ(ar({"rcU", "lib.a", "x.o"}).status, 0);
+    modes.push_back(ar({"tv", "lib.a"}).output.substr(0, 9));
+  }
+  EXPECT_THAT(modes, ElementsAre("rwsr-xr-x", "rwSr--r--", "rwxr-sr-x", "rw-r-Sr--", "rwxrwxrwt",
+                                 "rwxrwxrwT"));
 }
 
 TEST_F(OperationsTest, PrintsMembers) {
