@@ -9,8 +9,6 @@
 #include "quarn-ar/refusal.h"
 #include "quarn/reporting.h"
 
-#include <array>
-
 namespace quarn_ar {
 
 using arlib::ArchiveMember;
@@ -24,13 +22,15 @@ constexpr uint32_t LargestOwner = 999999; // six digits are the room that a head
 constexpr std::string_view NameEnd = "/\n";
 
 // Why the file can't be a member, as the host's error number, or 0. One that could not be opened is
-// tried again.
-int findFault(const FileProbe& probe) {
+// tried again: its first bytes tell what
+// it is.
+int findFault(FileProbe& probe) {
   if (const int error = probe.getRefusal(); error != 0) return error;
   if (probe.byteCount != 0 || probe.status.size == 0) return 0;
-  std::array<uint8_t, 1> byte;
   size_t done = 0;
-  return probe.file->readAt(byte, 0, done);
+  const int error = probe.file->readAt(probe.bytes, 0, done);
+  if (error == 0) probe.byteCount = static_cast<uint32_t>(done);
+  return error;
 }
 
 class Insertion {
@@ -42,7 +42,7 @@ public:
   [[nodiscard]] const std::vector<ArchiveMember*>& getAdded() const { return m_Added; }
 
 private:
-  [[nodiscard]] bool canTake(const std::string& file, const FileProbe& probe) const;
+  [[nodiscard]] bool canTake(const std::string& file, FileProbe& probe) const;
   [[nodiscard]] bool add(const std::string& file, const FileProbe& probe);
   [[nodiscard]] bool replace(ArchiveMember& member, const std::string& file,
                              const FileProbe& probe);
@@ -55,7 +55,7 @@ private:
 };
 
 void Insertion::insert(const std::string& file) {
-  const FileProbe probe = arlib::probeFile(m_Archive.getSourceFiles(), file.c_str());
+  FileProbe probe = arlib::probeFile(m_Archive.getSourceFiles(), file.c_str());
   if (!canTake(file, probe)) return;
   ArchiveMember* member =
       m_Request.operation == Operation::Replace ? m_Members.take(file) : nullptr;
@@ -68,7 +68,7 @@ void Insertion::insert(const std::string& file) {
                         member == nullptr ? messages::AddedMember : messages::ReplacedMember, file);
 }
 
-bool Insertion::canTake(const std::string& file, const FileProbe& probe) const {
+bool Insertion::canTake(const std::string& file, FileProbe& probe) const {
   if (!probe.exists()) {
     quarn::reportMessage(messages::ErrorWord, messages::FileDoesNotExist, file);
     return false;

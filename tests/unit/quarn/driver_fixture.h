@@ -82,6 +82,9 @@ protected:
 
   // Any program on the driver's road.
   RunOutcome runWork(Work work, const char* toolName, const Words& words) {
+    return runWork(work, toolName, words, m_Host);
+  }
+  RunOutcome runWork(Work work, const char* toolName, const Words& words, support::Host& host) {
     messages::StringSink output;
     messages::StringSink errors;
     messages::setOutputSinks(&output, &errors);
@@ -89,7 +92,7 @@ protected:
     const Arguments arguments(words);
     RunOutcome outcome;
     outcome.status = statusOf([&] {
-      work(arguments.count(), arguments.values(), toolName, m_Host, *m_Memory);
+      work(arguments.count(), arguments.values(), toolName, host, *m_Memory);
       messages::endProcess(hasErrors() ? 1 : 0);
     });
     messages::flushAll();
