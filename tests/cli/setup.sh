@@ -1,5 +1,5 @@
-# Sourced by every transcript. QUARN_EXAMPLES is the folder of sample objects; the tool under test
-# is first on the PATH; each transcript runs in an empty folder of its own.
+# Sourced by every transcript. QUARN_EXAMPLES is the folder of sample objects; the tools under test
+# are first on the PATH; each transcript runs in an empty folder of its own.
 umask 022
 export TZ=UTC LC_ALL=C
 # Without a leak checker's own exit status and words getting between.
