@@ -22,7 +22,7 @@ __quarn_ar_modifiers='abcCDfilNoPsSTuUvV'
 # Letters that not all operations know, each with those that do.
 __quarn_ar_restricted='a:mr b:mr C:x i:mr N:dx o:x P:dmpqrst S:dmpqrtx T:x u:r'
 __quarn_ar_names='--diag_error= --diag_remark= --diag_style= --diag_suppress= --diag_warning= --help
-  --plugin= --rsp-quoting= --target= --version'
+  --libattrmap= --plugin= --qobix_buildattr --rsp-quoting= --target= --version'
 
 # The words of the line, in $words, with the one at the cursor, up to there, in $cword. The shell divides
 # words at characters such as "=" and ":", which are put together again, and has no word for a cursor between

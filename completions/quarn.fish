@@ -112,7 +112,7 @@ function __quarn_ar_words
     for word in $argv
         if test $is_value = yes
             set is_value no
-        else if string match -qr -- '^--(plugin|target|rsp-quoting|diag_[a-z]+)$' $word
+        else if string match -qr -- '^--(libattrmap|plugin|target|rsp-quoting|diag_[a-z]+)$' $word
             set is_value yes
         else if not string match -q -- '--*' $word
             printf '%s\n' $word
@@ -258,7 +258,9 @@ for name in quarn-ar quarn-ranlib
     complete -c $name -l diag_suppress -x -a '(__quarn_all_warnings)' -d 'Say nothing of warnings'
     complete -c $name -l diag_warning -x -a '(__quarn_all_warnings)' -d 'Make warnings of warnings again'
     complete -c $name -l help -d 'Show the help'
+    complete -c $name -l libattrmap -r -F -d 'Take attributes from a map of library names'
     complete -c $name -l plugin -r -F -d 'Nothing, for compatibility'
+    complete -c $name -l qobix_buildattr -d 'Take attributes from attribute sections too'
     complete -c $name -l rsp-quoting -x -a 'posix windows' -d 'How response files quote'
     complete -c $name -l target -x -a 'default binary' -d 'The format of archives'
     complete -c $name -l version -d 'Show the version'

@@ -127,23 +127,36 @@ bool applySeverity(CommandLine&, std::string_view numbers) {
   return true;
 }
 
+// The words outlive the run.
+bool applyAttributeMap(CommandLine& line, std::string_view value) {
+  line.getRequest().settings.libraryAttributeMap = value.data();
+  return true;
+}
+
+bool applyAttributeSections(CommandLine& line, std::string_view) {
+  line.getRequest().settings.useObjectBuildAttributes = true;
+  return true;
+}
+
 bool acceptValue(CommandLine&, std::string_view) {
   return true;
 }
 
 // clang-format off
 constexpr LongOption LongOptions[] = {
-    {"diag_error",    true,  applySeverity<messages::DiagnosticError>},
-    {"diag_remark",   true,  applySeverity<messages::DiagnosticRemark>},
-    {"diag_style",    true,  applyStyle},
-    {"diag_suppress", true,  applySeverity<messages::DiagnosticSuppress>},
-    {"diag_warning",  true,  applySeverity<messages::DiagnosticWarning>},
-    {"help",          false, [](CommandLine& line, std::string_view) { line.answer(Answer::Help); return true; }},
-    {"plugin",        true,  acceptValue}, // symbols are read without one
-    {"rsp-quoting",   true,  acceptValue}, // done with the response files
-    {"target",        true,  applyTarget},
-    {"thin",          false, [](CommandLine&, std::string_view) { return refuse("thin archives are not made"); }},
-    {"version",       false, [](CommandLine& line, std::string_view) { line.answer(Answer::Version); return true; }},
+    {"diag_error",      true,  applySeverity<messages::DiagnosticError>},
+    {"diag_remark",     true,  applySeverity<messages::DiagnosticRemark>},
+    {"diag_style",      true,  applyStyle},
+    {"diag_suppress",   true,  applySeverity<messages::DiagnosticSuppress>},
+    {"diag_warning",    true,  applySeverity<messages::DiagnosticWarning>},
+    {"help",            false, [](CommandLine& line, std::string_view) { line.answer(Answer::Help); return true; }},
+    {"libattrmap",      true,  applyAttributeMap},
+    {"plugin",          true,  acceptValue}, // symbols are read without one
+    {"qobix_buildattr", false, applyAttributeSections},
+    {"rsp-quoting",     true,  acceptValue}, // done with the response files
+    {"target",          true,  applyTarget},
+    {"thin",            false, [](CommandLine&, std::string_view) { return refuse("thin archives are not made"); }},
+    {"version",         false, [](CommandLine& line, std::string_view) { line.answer(Answer::Version); return true; }},
 };
 // clang-format on
 

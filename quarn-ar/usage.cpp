@@ -48,6 +48,8 @@ Options:
   --rsp-quoting=posix|windows     how words are quoted there
   --plugin=<file>                 nothing; for compatibility
   --target=<format>               elf..., default or binary; nothing else is made
+  --qobix_buildattr               attributes of objects from their attribute sections too
+  --libattrmap=<file>             what all members may need, by the name of the archive
   --diag_style=<style>            list, zev, ide, devstudio or gnu
   --diag_error=<n>,..  --diag_warning=<n>,..  --diag_remark=<n>,..  --diag_suppress=<n>,..
   -h, --help                      show this text

@@ -8,11 +8,18 @@ Builds of one module get the symbol table that the tool gives them, to the byte.
   > }
 
   $ cp "$QUARN_EXAMPLES"/wide_{plain,build_d}.o .
-  $ quarn --create --normalise=0 ours.a wide_plain.o wide_build_d.o
-  Warning: L6876W: Minor variants of archive member 'wide_plain.o' include multiple base variants
-  $ quarn-ar rc lib.a wide_plain.o wide_build_d.o
-  quarn-ar: Warning: L6876W: Minor variants of archive member 'wide_plain.o' include multiple base variants
-  $ sameTable ours.a lib.a
+  $ for option in --diag_suppress=6876,6877 --qobix_buildattr; do
+  >   quarn --create --normalise=0 $option ours.a wide_plain.o wide_build_d.o
+  >   rm -f lib.a; quarn-ar $option rc lib.a wide_plain.o wide_build_d.o; sameTable ours.a lib.a; listed lib.a | grep gcd
+  > done
+  wide_gcd wide_plain.o
+  wide_gcd wide_build_d.o
+  Warning: L6877W: Attribute difference of archive member 'wide_build_d.o' in minor variant group beginning with 'wide_plain.o' includes attribute(s) with no symbol decoration representation
+  quarn-ar: Warning: L6877W: Attribute difference of archive member 'wide_build_d.o' in minor variant group beginning with 'wide_plain.o' includes attribute(s) with no symbol decoration representation
+  wide_gcd wide_plain.o
+  wide_gcd$$BuildAttributes$$ZEV_ISAv3$P$D$K$B$S$IEEE1 wide_build_d.o
+  $ echo 'lib* $ZEV_ISAv7' > map; quarn -s --qobix_buildattr --libattrmap=map --diag_suppress=6974,6877 lib.a; cp lib.a ours.a
+  $ quarn-ranlib --qobix_buildattr --libattrmap map --diag_suppress=6974,6877 lib.a; sameTable ours.a lib.a
 
   $ for text in '$ZEV_ISAv4$IEEE1' '$ZEV_ISAv5$IEEE1' '$ZEV_ISAv4$IEEE1$IW'; do variant $(( ++number )).o "$text"; done
   $ quarn --create --normalise=0 ours.a ?.o; quarn-ar rc other.a ?.o

@@ -144,4 +144,4 @@ The words of ar and ranlib: letters, a place and a count, the archive, and what 
   quarn-ranlib lib.a folder/: 'folder/my lib.a'
   quarn-ranlib --v: --version
   quarn-ranlib --plugin n: new.o
-  quarn-ranlib -: -D -h -t -U -V -v --diag_error --diag_remark --diag_style --diag_suppress --diag_warning --help --plugin --rsp-quoting --target --version
+  quarn-ranlib -: -D -h -t -U -V -v --diag_error --diag_remark --diag_style --diag_suppress --diag_warning --help --libattrmap --plugin --qobix_buildattr --rsp-quoting --target --version

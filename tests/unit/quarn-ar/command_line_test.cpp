@@ -29,6 +29,17 @@ TEST_F(CommandLineTest, KnowsEachOperationWithAndWithoutADash) {
   }
 }
 
+TEST_F(CommandLineTest, TakesWhereAttributesComeFrom) {
+  const Words words = {"--qobix_buildattr", "rc", "--libattrmap", "map", "lib.a", "a.o"};
+  ASSERT_EQ(read(words), Answer::Run);
+  EXPECT_TRUE(m_Request.settings.useObjectBuildAttributes);
+  EXPECT_STREQ(m_Request.settings.libraryAttributeMap, "map");
+  const Words others = {"s", "--libattrmap=other", "lib.a"};
+  ASSERT_EQ(read(others), Answer::Run);
+  EXPECT_FALSE(m_Request.settings.useObjectBuildAttributes);
+  EXPECT_STREQ(m_Request.settings.libraryAttributeMap, "other");
+}
+
 struct Form {
   Words words;
   Operation operation;
