@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The rows are sorted by name, as the look-up wants them, and the compiler checks that they are.
-// Objects of all machines are read: a document that left some out would be of no use to a tool that
-// looks for them.
+// Objects of all machines are read, and names are those of the archive, folders included: a
+// document that left some out would be of no use to a tool that looks for them.
 #include "quarn-json/command_line.h"
 
 #include "quarn/option_reporter.h"
@@ -77,6 +77,7 @@ Answer takeValues(const Parser& parser, Request& request) {
   request.settings.useObjectBuildAttributes = parser.getBoolean(Option_QobixBuildAttributes);
   request.settings.libraryAttributeMap = parser.getText(Option_LibraryAttributeMap);
   request.settings.machines = elfext::ObjectOutline::Machines::Any;
+  request.settings.keepFolders = true;
   return Answer::Run;
 }
 

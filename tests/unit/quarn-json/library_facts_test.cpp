@@ -74,6 +74,12 @@ TEST_F(LibraryFactsTest, HaveNamesOfAnyBytes) {
   EXPECT_EQ(member.at("nameBytes"), "61ff");
 }
 
+// Whose backslashes or folders would be cut off could not be told from others.
+TEST_F(LibraryFactsTest, HaveWholeNames) {
+  const Json member = memberOf(archive().longNames({"d/e\\f.o"}).memberWithNameField("/0", "text"));
+  EXPECT_EQ(member.at("name"), "d/e\\f.o");
+}
+
 TEST_F(LibraryFactsTest, OfAnObjectAreSizesEntryAndAttributes) {
   ObjectBuilder builder = objectWith({"f", "BuildAttributes$$J$IEEE1"});
   builder.header(HeaderField::Entry, 0x8004);
