@@ -21,7 +21,8 @@ set(CPACK_COMPONENT_PROGRAMS_DESCRIPTION "archive tool for object code
 It creates, inspects and maintains static libraries. Of ELF objects it reads
 the symbols and publishes them; members that are builds of one module it tells
 apart by their build attributes. The old archive survives every failure, and
-any number of runs may work on one library at once.")
+any number of runs may work on one library at once. quarn-json tells of
+libraries as JSON, for other programs.")
 
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_NAME quarn-dev)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
