@@ -22,8 +22,7 @@ constexpr uint32_t LargestOwner = 999999; // six digits are the room that a head
 constexpr std::string_view NameEnd = "/\n";
 
 // Why the file can't be a member, as the host's error number, or 0. One that could not be opened is
-// tried again: its first bytes tell what
-// it is.
+// tried again: its first bytes tell what it is.
 int findFault(FileProbe& probe) {
   if (const int error = probe.getRefusal(); error != 0) return error;
   if (probe.byteCount != 0 || probe.status.size == 0) return 0;
