@@ -153,11 +153,19 @@ ToolRun ToolFolder::runOn(support::Host& host, const std::vector<std::string>& w
 }
 
 ToolRun ToolFolder::runProgram(const std::vector<std::string>& words) const {
+  return runFile(QUARN_PROGRAM, words);
+}
+
+ToolRun ToolFolder::runJson(const std::vector<std::string>& words) const {
+  return runFile(QUARN_JSON_PROGRAM, words);
+}
+
+ToolRun ToolFolder::runFile(const char* file, const std::vector<std::string>& words) const {
   std::fflush(nullptr);
   const pid_t process = fork();
   if (process == 0) {
     enter();
-    startProgram(QUARN_PROGRAM, words);
+    startProgram(file, words);
   }
   return collect(process);
 }

@@ -55,6 +55,8 @@ public:
   [[nodiscard]] ToolRun runOn(support::Host& host, const std::vector<std::string>& words) const;
   // The same by the real program, as users start it.
   [[nodiscard]] ToolRun runProgram(const std::vector<std::string>& words) const;
+  // quarn-json, in the same way.
+  [[nodiscard]] ToolRun runJson(const std::vector<std::string>& words) const;
 
   // Several runs of the real program that start at the same moment. What each prints is its own.
   [[nodiscard]] std::vector<ToolRun>
@@ -66,6 +68,7 @@ public:
                                         uint64_t& callCount) const;
 
 private:
+  [[nodiscard]] ToolRun runFile(const char* file, const std::vector<std::string>& words) const;
   // `notes` tells apart what runs at the same time print.
   [[nodiscard]] ToolRun collect(int process, const std::string& notes = "") const;
   void enter(const std::string& notes = "") const;
