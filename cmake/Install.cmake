@@ -18,7 +18,9 @@ set(about_arlib "Archives of object code, read and written")
 
 # Programs.
 install(TARGETS quarn quarn-ar COMPONENT programs)
+set(pages quarn.1 quarn-ar.1 quarn-archive.5 quarn-attributes.7)
 if(TARGET quarn-json)
+  list(APPEND pages quarn-json.1)
   install(TARGETS quarn-json COMPONENT programs)
   install(FILES ${PROJECT_SOURCE_DIR}/docs/quarn-json.schema.json
     COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
@@ -27,7 +29,7 @@ install(FILES "$<TARGET_FILE_DIR:quarn-ar>/quarn-ranlib${CMAKE_EXECUTABLE_SUFFIX
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_BINDIR})
 install(FILES ${CMAKE_CURRENT_LIST_DIR}/QuarnArchiver.cmake ${PROJECT_SOURCE_DIR}/docs/problem-matcher.json
   COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
-foreach(page IN ITEMS quarn.1 quarn-ar.1 quarn-archive.5 quarn-attributes.7)
+foreach(page IN LISTS pages)
   string(REGEX MATCH "[0-9]$" section ${page})
   install(FILES ${PROJECT_SOURCE_DIR}/manual/${page}
     COMPONENT programs DESTINATION ${CMAKE_INSTALL_MANDIR}/man${section})

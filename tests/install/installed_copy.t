@@ -38,6 +38,7 @@ An installation goes into any folder, and may be moved afterwards:
   ./fish/vendor_completions.d/quarn-ranlib.fish
   ./fish/vendor_completions.d/quarn.fish
   ./man/man1/quarn-ar.1
+  ./man/man1/quarn-json.1
   ./man/man1/quarn-ranlib.1
   ./man/man1/quarn.1
   ./man/man5/quarn-archive.5
