@@ -243,7 +243,9 @@ bool ArchiveFileReader::parseShortName(std::string_view field, std::string_view&
   const size_t slash = m_Archive.m_KeepFolders ? field.rfind('/') : field.find('/');
   if (slash == std::string_view::npos)
     return m_Archive.goOn(&ErrorHandler::reportNoNameTerminator, m_Offset);
-  if (!isBlank(field.substr(slash + 1))) {
+  // What ends a long name can't be a part of a name either.
+  const bool hasEndInside = field.substr(0, slash + 1).find(LongNameTerminator) < slash;
+  if (hasEndInside || !isBlank(field.substr(slash + 1))) {
     return m_Archive.goOn(&ErrorHandler::reportTrailingNameCharacter, m_Offset);
   }
   name = untilNul(field.substr(0, slash));

@@ -69,6 +69,19 @@ TEST(FolderNames, AreReadWhereOtherArchiversWriteThem) {
   EXPECT_THAT(namesOf(again), ElementsAre("", "a/x.o", "y.o"));
 }
 
+// The long-name table, where it would stand, ends a name there.
+TEST(FolderNames, AreNoneWithANewlineBehindASlash) {
+  MemoryHost host;
+  host.addFile("lib.a", archive().member("a/\nx.o", "1").bytes());
+  RecordingHandler handler{Answer::GoOnIfTolerable};
+  Archive read(host);
+  read.setErrorHandler(&handler);
+  read.setKeepFolders(true);
+  ASSERT_TRUE(readFile("lib.a", read));
+  EXPECT_THAT(namesOf(read), ElementsAre(""));
+  EXPECT_EQ(handler.reports.size(), 1U);
+}
+
 TEST(FolderNames, ComeAlongFromAnotherArchive) {
   Folders folders;
   Archive source(folders.host);
