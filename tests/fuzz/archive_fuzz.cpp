@@ -15,6 +15,7 @@
 namespace {
 
 using arlib::Archive;
+using Machines = elfext::ObjectOutline::Machines;
 
 // Goes on wherever there is something to go on with.
 class LenientHandler final : public arlib::ErrorHandler {
@@ -33,14 +34,19 @@ std::string describe(const Archive& archive) {
   return text;
 }
 
-void readAndWrite(support::Host& host, arlib::ErrorHandler* handler) {
+void readAndWrite(support::Host& host, arlib::ErrorHandler* handler, Machines machines) {
+  const bool takesAll = machines == Machines::Any;
   Archive archive(host);
   archive.setErrorHandler(handler);
+  archive.setMachines(machines);
+  archive.setKeepFolders(takesAll);
+  archive.setSymbolsWanted(!takesAll);
   if (!arlib::readFile("in.a", archive)) return;
   const std::string before = describe(archive);
   archive.setSymbolTableMode(arlib::SymbolTableMode::Always);
   if (!arlib::writeFile("out.a", archive)) return;
   Archive again(host);
+  again.setKeepFolders(takesAll);
   if (!arlib::readFile("out.a", again) || describe(again) != before) std::abort();
 }
 
@@ -52,9 +58,11 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   LenientHandler lenient;
   for (arlib::ErrorHandler* handler :
        {static_cast<arlib::ErrorHandler*>(&lenient), static_cast<arlib::ErrorHandler*>(nullptr)}) {
-    testsupport::MemoryHost host;
-    host.addFile("in.a", std::vector<uint8_t>(data, data + size));
-    readAndWrite(host, handler);
+    for (const Machines machines : {Machines::Own, Machines::Any}) {
+      testsupport::MemoryHost host;
+      host.addFile("in.a", std::vector<uint8_t>(data, data + size));
+      readAndWrite(host, handler, machines);
+    }
   }
   return 0;
 }

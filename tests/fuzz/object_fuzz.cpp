@@ -2,7 +2,7 @@
 //
 // Any bytes read as an object, from memory and as a member of a file, under a handler that refuses
 // and one that goes on. What was read is counted, validated and looked at, and must be the same in
-// the object's tables.
+// the object's tables. Once more it is read as an object of any machine.
 #include "alloclib/interface/region.h"
 #include "elfext/interface/deferred_contents_selector.h"
 #include "elfext/interface/error_string_capture.h"
@@ -14,9 +14,11 @@
 #include "support/interface/source_file.h"
 #include "tests/support/memory_host.h"
 
+#include <algorithm>
 #include <array>
 #include <bit>
 #include <cstdlib>
+#include <cstring>
 #include <string>
 #include <string_view>
 
@@ -98,6 +100,24 @@ void compareRoads(std::span<const uint8_t> bytes) {
     std::abort();
 }
 
+// Objects of other machines, and what compilers keep for the optimiser of a link, are read for
+// their names alone.
+void readForNames(std::span<const uint8_t> bytes) {
+  testsupport::MemoryHost host;
+  host.addFile("object", bytes);
+  support::SourceFiles files(host);
+  std::shared_ptr<support::SourceFile> file;
+  if (files.open("object", file) != 0) std::abort();
+  ElfextErrorStringCapture handler;
+  ObjectOutline outline;
+  outline.setMachines(ObjectOutline::Machines::Any);
+  if (!outline.read(file, 0, bytes.size(), &handler, nullptr)) return;
+  size_t nameSize = 0;
+  for (const ObjectOutline::OutlinedSymbol& symbol : outline.getSymbols())
+    nameSize = std::max(nameSize, symbol.name == nullptr ? 0 : std::strlen(symbol.name));
+  if (nameSize > bytes.size()) std::abort();
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
@@ -111,5 +131,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     readAsMember({data, size}, *handler);
   }
   compareRoads({data, size});
+  readForNames({data, size});
   return 0;
 }

@@ -14,11 +14,12 @@ namespace quarn_ar {
 namespace {
 
 constexpr int StepsOfASequence = 60;
+constexpr size_t NoMember = SIZE_MAX;
 
 struct ListedMember {
   std::string name;
   std::string text;
-  int number = 0; // since the last step: no two are the same
+  size_t number = 0; // since the last step: no two are the same
   bool operator==(const ListedMember& other) const {
     return name == other.name && text == other.text;
   }
@@ -46,16 +47,17 @@ private:
   }
   static std::string leafOf(const std::string& word) { return word.substr(word.rfind('/') + 1); }
 
-  // The members that the words mean: each takes the next of its name. -1 where there is none left.
-  static std::vector<int> taken(const MemberList& list, const Words& words) {
-    std::vector<int> places;
+  // The members that the words mean: each takes the next of its name. NoMember where there is none
+  // left.
+  static std::vector<size_t> taken(const MemberList& list, const Words& words) {
+    std::vector<size_t> places;
     for (const std::string& word : words) {
-      int place = 0;
-      while (place < std::ssize(list) &&
+      size_t place = 0;
+      while (place < list.size() &&
              (list[place].name != leafOf(word) ||
               std::find(places.begin(), places.end(), place) != places.end()))
         ++place;
-      places.push_back(place == std::ssize(list) ? -1 : place);
+      places.push_back(place == list.size() ? NoMember : place);
     }
     return places;
   }
@@ -65,7 +67,7 @@ private:
   }
 
   // Puts the members with these numbers together, in this order. False if the place is nowhere.
-  static bool gather(MemberList& list, const std::vector<int>& numbers, char side,
+  static bool gather(MemberList& list, const std::vector<size_t>& numbers, char side,
                      const std::string& placeName) {
     const auto isGathered = [&](const ListedMember& member) {
       return std::find(numbers.begin(), numbers.end(), member.number) != numbers.end();
@@ -78,7 +80,7 @@ private:
     const auto inFront = std::count_if(list.begin(), anchor, std::not_fn(isGathered));
     const bool isBehind = side == 'a' && !isGathered(*anchor);
     MemberList gathered;
-    for (const int number : numbers) {
+    for (const size_t number : numbers) {
       gathered.push_back(*std::find_if(list.begin(), list.end(), [&](const ListedMember& member) {
         return member.number == number;
       }));
@@ -92,18 +94,18 @@ private:
   std::optional<MemberList> edited(char operation, char side, const std::string& placeName,
                                    const Words& words) {
     MemberList list = m_List;
-    for (int i = 0; i < std::ssize(list); ++i)
+    for (size_t i = 0; i < list.size(); ++i)
       list[i].number = i;
-    std::vector<int> numbers;
-    const std::vector<int> places = taken(m_List, operation == 'q' ? Words() : words);
+    std::vector<size_t> numbers;
+    const std::vector<size_t> places = taken(m_List, operation == 'q' ? Words() : words);
     for (size_t i = 0; i < words.size(); ++i) {
-      const int place = operation == 'q' ? -1 : places[i];
-      const bool isNew = operation == 'q' || (operation == 'r' && place < 0);
+      const size_t place = operation == 'q' ? NoMember : places[i];
+      const bool isNew = operation == 'q' || (operation == 'r' && place == NoMember);
       if (operation == 'm' && !hasName(m_List, words[i])) return std::nullopt;
-      if (operation == 'r' && place >= 0) list[place].text = m_Host.read(words[i]);
-      if (isNew) list.push_back({leafOf(words[i]), m_Host.read(words[i]), int(list.size())});
-      if (isNew) numbers.push_back(int(list.size()) - 1);
-      if ((operation == 'm' || operation == 'd') && place >= 0) numbers.push_back(place);
+      if (operation == 'r' && !isNew) list[place].text = m_Host.read(words[i]);
+      if (isNew) list.push_back({leafOf(words[i]), m_Host.read(words[i]), list.size()});
+      if (isNew) numbers.push_back(list.size() - 1);
+      if ((operation == 'm' || operation == 'd') && place != NoMember) numbers.push_back(place);
     }
     if (operation == 'd') {
       std::erase_if(list, [&](const ListedMember& member) {
