@@ -54,7 +54,7 @@ private:
     for (const std::string& word : words) {
       size_t place = 0;
       while (place < list.size() &&
-             (list[place].name != leafOf(word) ||
+             (list[static_cast<size_t>(place)].name != leafOf(word) ||
               std::find(places.begin(), places.end(), place) != places.end()))
         ++place;
       places.push_back(place == list.size() ? NoMember : place);
