@@ -9,6 +9,8 @@
 #include "quarn-ar/refusal.h"
 #include "quarn/reporting.h"
 
+#include <algorithm>
+
 namespace quarn_ar {
 
 using arlib::ArchiveMember;
@@ -30,6 +32,13 @@ int findFault(FileProbe& probe) {
   const int error = probe.file->readAt(probe.bytes, 0, done);
   if (error == 0) probe.byteCount = static_cast<uint32_t>(done);
   return error;
+}
+
+// Numbers that go into no header need not fit one; the date is still asked for.
+void fitNumbers(support::FileStatus& status) {
+  status.uid = 0;
+  status.gid = 0;
+  status.modificationTime = std::clamp<int64_t>(status.modificationTime, 0, INT32_MAX);
 }
 
 class Insertion {
@@ -55,6 +64,7 @@ private:
 
 void Insertion::insert(const std::string& file) {
   FileProbe probe = arlib::probeFile(m_Archive.getSourceFiles(), file.c_str());
+  if (!m_Request.realNumbers) fitNumbers(probe.status);
   if (!canTake(file, probe)) return;
   ArchiveMember* member =
       m_Request.operation == Operation::Replace ? m_Members.take(file) : nullptr;

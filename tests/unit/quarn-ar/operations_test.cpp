@@ -57,6 +57,23 @@ TEST_F(OperationsTest, KeepsDateOwnerAndModeOfFilesWithU) {
   EXPECT_EQ(ar({"rc", "lib.a", "a.o"}).status, 0);
 }
 
+// What goes into no header need not fit one.
+TEST_F(OperationsTest, TakesFilesOfAnyDateAndOwnerWithoutU) {
+  auto& file = m_Host.addFile("a.o", testsupport::objectThatDefines("main").bytes());
+  for (const int64_t number : {int64_t{-1}, int64_t{0xFFFFFFFE}, int64_t{1} << 40}) {
+    for (int64_t* field : {&file.modificationTime, &file.uid, &file.gid}) {
+      const int64_t before = *field;
+      *field = number;
+      EXPECT_EQ(ar({"rcu", "lib.a", "a.o"}).status, 0) << number;
+      EXPECT_THAT(numbers(), ElementsAre("0", "0", "0", "644"));
+      EXPECT_EQ(m_Host.read("lib.a").substr(8, 2), "/ ");
+      EXPECT_EQ(ar({"qU", "lib.a", "a.o"}).status, 1) << number;
+      *field = before;
+      EXPECT_EQ(m_Host.remove("lib.a"), 0);
+    }
+  }
+}
+
 TEST_F(OperationsTest, AppendsWithoutALookAtTheNames) {
   givenMembers({{"a.o", "1"}});
   givenFile("a.o", "2");
