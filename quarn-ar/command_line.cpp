@@ -294,6 +294,7 @@ void CommandLine::chooseSettings() {
   // Linkers look for another compiler's intermediate code themselves where there is no table.
   settings.symbolTableMode = arlib::SymbolTableMode::IfObjects;
   settings.keepFolders = true;
+  settings.takeAnyNumbers = true;
   settings.restoreModes = true;
   const auto operation = m_Request.operation;
   const bool writes = operation != Operation::List && operation != Operation::Print &&

@@ -78,6 +78,7 @@ Answer takeValues(const Parser& parser, Request& request) {
   request.settings.libraryAttributeMap = parser.getText(Option_LibraryAttributeMap);
   request.settings.machines = elfext::ObjectOutline::Machines::Any;
   request.settings.keepFolders = true;
+  request.settings.takeAnyNumbers = true;
   return Answer::Run;
 }
 

@@ -126,6 +126,7 @@ RunEnd runOnce(support::Host& host, const char* archiveName, const Settings& set
   archive.setUseObjectBuildAttributes(settings.useObjectBuildAttributes);
   archive.setMachines(settings.machines);
   archive.setKeepFolders(settings.keepFolders);
+  archive.setTakeAnyNumbers(settings.takeAnyNumbers);
   archive.setSymbolsWanted(false);
   setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
   ArchiveOpenStatus openStatus;

@@ -69,11 +69,12 @@ struct Settings {
   bool includeDebugSymbols = false;
   bool uniqueSymbolsOnly = false;
   bool useObjectBuildAttributes = false;
-  // The next five are what other tools of the kind do, and no option of this one asks for.
+  // The next six are what other tools of the kind do, and no option of this one asks for.
   elfext::ObjectOutline::Machines machines = elfext::ObjectOutline::Machines::Own;
   arlib::SymbolTableMode symbolTableMode = arlib::SymbolTableMode::Always; // of a run that writes
-  bool keepFolders = false;  // in the names of members
-  bool restoreModes = false; // of files that are extracted
+  bool keepFolders = false;    // in the names of members
+  bool takeAnyNumbers = false; // for date and owner of the archive's own file
+  bool restoreModes = false;   // of files that are extracted
   bool restoreDates = false;
   std::vector<std::string> fileList; // the file_list words in order, after expansion on disk
 

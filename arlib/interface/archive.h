@@ -90,6 +90,10 @@ public:
   /// Without this, a name is cut to its last component.
   void setKeepFolders(bool keep) { m_KeepFolders = keep; }
 
+  /// Whether the file that is read may have a date, an owner and a group that no header could hold.
+  /// They go into none.
+  void setTakeAnyNumbers(bool take) { m_TakeAnyNumbers = take; }
+
   /// Whether getSymbols and what builds on it will be called, as they may be unless somebody says
   /// no before the read: then the table is checked as ever, and its bytes are not kept.
   void setSymbolsWanted(bool wanted) { m_AreSymbolsWanted = wanted; }
@@ -307,6 +311,7 @@ private:
   bool m_UseObjectBuildAttributes = false;
   bool m_AreSymbolsWanted = true;
   bool m_KeepFolders = false;
+  bool m_TakeAnyNumbers = false;
   elfext::ObjectOutline::Machines m_Machines = elfext::ObjectOutline::Machines::Own;
   std::optional<elfext::FullAttr> m_LibraryAttributes;
 

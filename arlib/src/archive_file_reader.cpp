@@ -257,7 +257,9 @@ bool ArchiveFileReader::parseShortName(std::string_view field, std::string_view&
 bool ArchiveFileReader::checkHostFile() {
   if (m_HostFileIsChecked) return true;
   m_HostFileIsChecked = true;
-  const int error = refusalOf(m_Status);
+  support::FileStatus status = m_Status;
+  if (m_Archive.m_TakeAnyNumbers) status.modificationTime = status.uid = status.gid = 0;
+  const int error = refusalOf(status);
   if (error == 0) return true;
   return m_Archive.stop(&ErrorHandler::reportReadError, m_File->getName(), error);
 }

@@ -74,6 +74,18 @@ TEST_F(OperationsTest, TakesFilesOfAnyDateAndOwnerWithoutU) {
   }
 }
 
+TEST_F(OperationsTest, WorksOnAnArchiveOfAnyDateAndOwner) {
+  givenMembers({{"a.o", "1"}});
+  const std::string bytes = m_Host.read("lib.a");
+  for (const int64_t number : {int64_t{-1}, int64_t{0xFFFFFFFE}, int64_t{1} << 40}) {
+    auto& file = m_Host.addFile("lib.a", bytes);
+    file.modificationTime = file.uid = file.gid = number;
+    EXPECT_EQ(ar({"t", "lib.a"}).output, "a.o\n") << number;
+    EXPECT_EQ(ar({"d", "lib.a", "a.o"}).status, 0) << number;
+    EXPECT_THAT(names(), IsEmpty());
+  }
+}
+
 TEST_F(OperationsTest, AppendsWithoutALookAtTheNames) {
   givenMembers({{"a.o", "1"}});
   givenFile("a.o", "2");
