@@ -18,9 +18,11 @@ set(about_arlib "Archives of object code, read and written")
 
 # Programs.
 install(TARGETS quarn quarn-ar COMPONENT programs)
+set(completed quarn quarn-ar quarn-ranlib)
 set(pages quarn.1 quarn-ar.1 quarn-archive.5 quarn-attributes.7)
 if(TARGET quarn-json)
   list(APPEND pages quarn-json.1)
+  list(APPEND completed quarn-json)
   install(TARGETS quarn-json COMPONENT programs)
   install(FILES ${PROJECT_SOURCE_DIR}/docs/quarn-json.schema.json
     COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/quarn)
@@ -41,7 +43,7 @@ install(FILES ${PROJECT_SOURCE_DIR}/manual/quarn-ar.1 RENAME quarn-ranlib.1
 # Shells look for a command's completion under the command's name; zsh reads the names from the file,
 # in another folder of the system's than of anybody else's.
 set(completions ${PROJECT_SOURCE_DIR}/completions)
-foreach(program IN ITEMS quarn quarn-ar quarn-ranlib)
+foreach(program IN LISTS completed)
   install(FILES ${completions}/quarn.bash COMPONENT programs RENAME ${program}
     DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
   install(FILES ${completions}/quarn.fish COMPONENT programs RENAME ${program}.fish

@@ -1,9 +1,9 @@
 # SPDX-License-Identifier: Apache-2.0
 # shellcheck shell=bash
 #
-# Completion for quarn, quarn-ar and quarn-ranlib in bash: options, their values, letters, the archive, its
-# members, and files. It asks the program itself for the names of members. What can't be read completes to
-# nothing, without a word.
+# Completion for quarn, quarn-ar, quarn-ranlib and quarn-json in bash: options, their values, letters, the
+# archive, its members, and files. It asks the program itself for the names of members. What can't be read
+# completes to nothing, without a word.
 
 __quarn_letters='-a -b -C -c -d -h -i -m -n -p -q -r -s -T -t -u -V -v -x'
 __quarn_names='--create --debug_symbols --entries --help --new_files_only --no_debug_symbols
@@ -23,6 +23,8 @@ __quarn_ar_modifiers='abcCDfilNoPsSTuUvV'
 __quarn_ar_restricted='a:mr b:mr C:x i:mr N:dx o:x P:dmpqrst S:dmpqrtx T:x u:r'
 __quarn_ar_names='--diag_error= --diag_remark= --diag_style= --diag_suppress= --diag_warning= --help
   --libattrmap= --plugin= --qobix_buildattr --rsp-quoting= --target= --version'
+
+__quarn_json_names='--help --libattrmap= --qobix_buildattr --version'
 
 # The words of the line, in $words, with the one at the cursor, up to there, in $cword. The shell divides
 # words at characters such as "=" and ":", which are put together again, and has no word for a cursor between
@@ -353,5 +355,27 @@ _quarn_ar() {
   __quarn_drop_head
 }
 
+# Each word that is no option is a library.
+_quarn_json() {
+  local words cword archive seen option place ended current before='' REPLY
+  COMPREPLY=()
+  __quarn_split
+  __quarn_scan
+  __quarn_unquote "${words[cword]}"
+  current=$REPLY
+  if [[ -z $option && -z $ended && $current = --*=* ]]; then
+    option=${current%%=*} before=$option= current=${current#*=}
+  fi
+  if [[ -n $option ]]; then
+    [[ $option != --libattrmap ]] || __quarn_offer_files
+  elif [[ -z $ended && $current = -* ]]; then
+    __quarn_offer_options "$__quarn_json_names"
+  else
+    __quarn_offer_archives
+  fi
+  __quarn_drop_head
+}
+
 complete -F _quarn quarn
 complete -F _quarn_ar quarn-ar quarn-ranlib
+complete -F _quarn_json quarn-json

@@ -1,8 +1,8 @@
 # SPDX-License-Identifier: Apache-2.0
 #
-# Completion for quarn, quarn-ar and quarn-ranlib in fish: options, their values, letters, the archive, its
-# members, and files. It asks the program itself for the names of members. What can't be read completes to
-# nothing, without a word.
+# Completion for quarn, quarn-ar, quarn-ranlib and quarn-json in fish: options, their values, letters, the
+# archive, its members, and files. It asks the program itself for the names of members. What can't be read
+# completes to nothing, without a word.
 
 # Of the words of a command line the options, or those that are neither options nor values of theirs.
 function __quarn_pick --argument-names kind
@@ -185,6 +185,7 @@ end
 complete -e -c quarn
 complete -e -c quarn-ar
 complete -e -c quarn-ranlib
+complete -e -c quarn-json
 
 complete -c quarn -f
 complete -c quarn -n __quarn_wants_archive -a '(__fish_complete_suffix .a)'
@@ -265,3 +266,9 @@ for name in quarn-ar quarn-ranlib
     complete -c $name -l target -x -a 'default binary' -d 'The format of archives'
     complete -c $name -l version -d 'Show the version'
 end
+
+complete -c quarn-json -f -a '(__fish_complete_suffix .a)'
+complete -c quarn-json -l help -d 'Show the help'
+complete -c quarn-json -l libattrmap -r -F -d 'Take attributes from a map of library names'
+complete -c quarn-json -l qobix_buildattr -d 'Take attributes from attribute sections too'
+complete -c quarn-json -l version -d 'Show the version'

@@ -178,3 +178,18 @@ A letter is offered with an operation if the program takes it there.
   >     [ $taken = $offered ] || echo "$word is taken: $taken, offered: $offered"
   >   done
   > done
+
+Libraries and the options of quarn-json.
+
+  $ completed 'quarn-json ' 'quarn-json lib.a folder/' 'quarn-json --v' $'quarn-json --lib\t' 'quarn-json --libattrmap=n' \
+  >   'quarn-json --libattrmap n' 'quarn-json --libattrmap new.o l' 'quarn-json -- l' 'quarn-json -- --v' 'quarn-json -'
+  quarn-json broken.a folder lib.a odd.a pipe.a |
+  quarn-json lib.a folder/my\ lib.a |
+  quarn-json --version |
+  quarn-json --libattrmap=|
+  quarn-json --libattrmap=new.o |
+  quarn-json --libattrmap new.o |
+  quarn-json --libattrmap new.o lib.a |
+  quarn-json -- lib.a |
+  quarn-json -- --v|
+  quarn-json --help --libattrmap= --qobix_buildattr --version |

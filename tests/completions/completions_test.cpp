@@ -6,6 +6,7 @@
 #include "messages/interface/catalogue.h"
 #include "messages/interface/message_keys.h"
 #include "quarn-ar/usage.h"
+#include "quarn-json/command_line.h"
 #include "quarn/option_table.h"
 
 #include <gtest/gtest.h>
@@ -142,6 +143,20 @@ TEST(Completions, KnowTheOptionsOfQuarnAr) {
       EXPECT_TRUE(std::regex_search(part, std::regex("(--|-l )" + name + "[=\\[ '\\n]")))
           << completion.file << ": " << name;
   }
+}
+
+// Bash and zsh have them behind the name of their own, fish in lines of their own.
+TEST(Completions, KnowTheOptionsOfQuarnJson) {
+  Names names;
+  for (const MatchString& row : quarn_json::getOptionRows()) {
+    if (!row.name.empty()) names.emplace(row.name);
+  }
+  const std::string bash = contentsOf("quarn.bash");
+  const std::string inBash = bash.substr(bash.find("__quarn_json_names="));
+  EXPECT_EQ(groupsOf(inBash.substr(0, inBash.find('\n')), "--([a-z_]+)"), names);
+  const std::string zsh = contentsOf("_quarn");
+  EXPECT_EQ(groupsOf(zsh.substr(zsh.find("_quarn_json()")), Completions[1].name), names);
+  EXPECT_EQ(groupsOf(contentsOf("quarn.fish"), "\ncomplete -c quarn-json -l ([a-z_]+) "), names);
 }
 
 } // namespace

@@ -145,3 +145,17 @@ The words of ar and ranlib: letters, a place and a count, the archive, and what 
   quarn-ranlib --v: --version
   quarn-ranlib --plugin n: new.o
   quarn-ranlib -: -D -h -t -U -V -v --diag_error --diag_remark --diag_style --diag_suppress --diag_warning --help --libattrmap --plugin --qobix_buildattr --rsp-quoting --target --version
+
+Libraries and the options of quarn-json.
+
+  $ completed 'quarn-json l' 'quarn-json lib.a folder/' 'quarn-json --v' 'quarn-json --lib' 'quarn-json --libattrmap=n' \
+  >   'quarn-json --libattrmap n' 'quarn-json --libattrmap new.o l' 'quarn-json -- l' 'quarn-json -'
+  quarn-json l: lib.a
+  quarn-json lib.a folder/: 'folder/my lib.a'
+  quarn-json --v: --version
+  quarn-json --lib: --libattrmap
+  quarn-json --libattrmap=n: --libattrmap=new.o
+  quarn-json --libattrmap n: new.o
+  quarn-json --libattrmap new.o l: lib.a
+  quarn-json -- l: lib.a
+  quarn-json -: --help --libattrmap --qobix_buildattr --version

@@ -162,3 +162,18 @@ The words of ar and ranlib: letters, a place and a count, the archive, and what 
   quarn-ranlib --version |
   quarn-ranlib --plugin new.o |
   quarn-ar rc lib.a @new.o |
+
+Libraries and the options of quarn-json.
+
+  $ completed 'quarn-json ' 'quarn-json lib.a folder/' 'quarn-json --v' $'quarn-json --lib\t' 'quarn-json --libattrmap=n' \
+  >   'quarn-json --libattrmap n' 'quarn-json --libattrmap new.o l' 'quarn-json -- l' 'quarn-json -- --v' 'quarn-json -'
+  quarn-json broken.a folder lib.a odd.a |
+  quarn-json lib.a folder/my\ lib.a |
+  quarn-json --version |
+  quarn-json --libattrmap=|
+  quarn-json --libattrmap=new.o |
+  quarn-json --libattrmap new.o |
+  quarn-json --libattrmap new.o lib.a |
+  quarn-json -- lib.a |
+  quarn-json -- --v|
+  quarn-json --help --libattrmap --qobix_buildattr --version |

@@ -33,8 +33,10 @@ An installation goes into any folder, and may be moved afterwards:
   $ (cd other/place/share && find . -type f | sort)
   ./bash-completion/completions/quarn
   ./bash-completion/completions/quarn-ar
+  ./bash-completion/completions/quarn-json
   ./bash-completion/completions/quarn-ranlib
   ./fish/vendor_completions.d/quarn-ar.fish
+  ./fish/vendor_completions.d/quarn-json.fish
   ./fish/vendor_completions.d/quarn-ranlib.fish
   ./fish/vendor_completions.d/quarn.fish
   ./man/man1/quarn-ar.1
