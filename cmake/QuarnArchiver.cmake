@@ -7,6 +7,19 @@
 #
 # It holds for the folder that includes it and for those below. Diagnostics begin with the archive,
 # as editors want them; QUARN_DIAG_STYLE chooses another style.
+
+# CMake tries compilers in projects of its own, which know none of the settings and want no archiver.
+get_property(_quarn_is_trial GLOBAL PROPERTY IN_TRY_COMPILE)
+if(_quarn_is_trial)
+  return()
+endif()
+
+# In front of the languages: what CMake knows of a compiler replaces the rules for link-time
+# optimisation, and this is read again behind it.
+if(NOT CMAKE_USER_MAKE_RULES_OVERRIDE)
+  set(CMAKE_USER_MAKE_RULES_OVERRIDE "${CMAKE_CURRENT_LIST_FILE}")
+endif()
+
 find_program(QUARN_AR quarn-ar REQUIRED DOC "The archiver"
   HINTS "${CMAKE_CURRENT_LIST_DIR}/../../bin")
 find_program(QUARN_RANLIB quarn-ranlib REQUIRED DOC "The archiver under its other name"
@@ -32,4 +45,5 @@ endforeach()
 set(CMAKE_ASM_CREATE_STATIC_LIBRARY
   "\"${CMAKE_COMMAND}\" -E rm -f <TARGET>" "${_quarn_ar} qc <TARGET> <LINK_FLAGS> <OBJECTS>")
 unset(_quarn_ar)
+unset(_quarn_is_trial)
 unset(_quarn_rule)

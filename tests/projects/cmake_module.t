@@ -18,6 +18,21 @@ The module makes quarn-ar the archiver of an unmodified project, by Ninja and by
   3 quarn-ar --diag_style=gnu qc
   assembled.s.o
 
+Libraries of a target with link-time optimisation are made by it too, wherever it is said:
+
+  $ optimised() {
+  >   rm -rf ipo && cmake -G Ninja -B ipo -DCMAKE_INTERPROCEDURAL_OPTIMIZATION=ON "$@" > log && cmake --build ipo > log
+  >   ipo/shapes
+  >   sed 's/ --diag_style=gnu qc .*/ made/' ipo/CMakeFiles/rules.ninja | grep -o '[^/ "]*ar"* made\|[^/ "]*-ar[-0-9]*"* cr ' |
+  >     tr -d '"' | sort | uniq -c | sed 's/^ *//'
+  > }
+  $ optimised -DCMAKE_PROJECT_TOP_LEVEL_INCLUDES="$QUARN_MODULE"
+  3 corners
+  2 quarn-ar made
+  $ optimised -DCMAKE_TOOLCHAIN_FILE="$QUARN_MODULE"
+  3 corners
+  2 quarn-ar made
+
 Another style is a setting, and a target's own options win:
 
   $ cmake -G Ninja -B out -DCMAKE_PROJECT_TOP_LEVEL_INCLUDES="$QUARN_MODULE" -DQUARN_DIAG_STYLE=ide > log
