@@ -3,7 +3,7 @@
 #
 #   include(QuarnArchiver)                                          behind find_package(quarn)
 #   include(/usr/share/quarn/QuarnArchiver.cmake)                   in a project or a toolchain file
-#   cmake -DCMAKE_PROJECT_TOP_LEVEL_INCLUDES=.../QuarnArchiver.cmake    for a project as it is
+#   cmake -DCMAKE_PROJECT_TOP_LEVEL_INCLUDES=.../QuarnArchiver.cmake    for a project as it is, from CMake 3.24 on
 #
 # It holds for the folder that includes it and for those below. Diagnostics begin with the archive,
 # as editors want them; QUARN_DIAG_STYLE chooses another style.
