@@ -210,6 +210,16 @@ TEST(SourceTree, EveryFileNamesItsLicence) {
   }
 }
 
+TEST(SourceTree, BuildFilesNameTheirLicence) {
+  for (const char* folder : {"cmake", "examples", "packaging", "quarn-ar", "quarn-json", "tests"}) {
+    for (const auto& entry : fs::recursive_directory_iterator(Root / folder)) {
+      const fs::path& file = entry.path();
+      if (file.filename() != "CMakeLists.txt" && file.extension() != ".cmake") continue;
+      EXPECT_TRUE(contentsOf(file).starts_with("# SPDX-License-Identifier: Apache-2.0\n")) << file;
+    }
+  }
+}
+
 // Such files have marks of their own for comments. A shell may want the first line for itself.
 TEST(SourceTree, PagesAndCompletionsNameTheirLicence) {
   const std::regex licence("(#[^\n]*\n)?[.\\\\\"#]+ SPDX-License-Identifier: Apache-2.0\n[^]*");
