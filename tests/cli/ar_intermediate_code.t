@@ -18,3 +18,9 @@ A table that llvm-ar has made is kept as long as it is true.
   [3]
   $ quarn-ar r code.a b.bc; published code.a
   a_sum
+
+Beside an object, which makes a table, it is a member that nobody finds.
+
+  $ echo 'int own(void) { return 4; }' | cc -x c -c - -o own.o
+  $ quarn-ar rc mixed.a own.o b.bc; published mixed.a
+  own
