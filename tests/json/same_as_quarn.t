@@ -67,3 +67,10 @@ What the library's name says is added to all:
   $ field "library['attributes'], library['variantGroups'][0]['attributes']" --libattrmap=map lib.a
   "$J$IEEE1"
   "$ZEV_ISAv4$J$IEEE1"
+
+Another format keeps names in front of the bytes, and objects are not seen behind them:
+
+  $ { printf '!<arch>\n%-16s%-12s%-6s%-6s%-8s%-10s`\nwide' '#1/4' 0 0 0 644 $(( $(stat -c %s wide_plain.o) + 4 ))
+  >   cat wide_plain.o; } > other.a
+  $ field "[[member['name'], member['kind']] for member in library['members']]" other.a 2> /dev/null
+  [["", "file"]]
