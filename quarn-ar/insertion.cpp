@@ -10,6 +10,7 @@
 #include "quarn/reporting.h"
 
 #include <algorithm>
+#include <array>
 
 namespace quarn_ar {
 
@@ -22,6 +23,23 @@ constexpr uint32_t PlainMode = 0644;
 constexpr uint32_t LargestOwner = 999999; // six digits are the room that a header has
 // What ends a name in the long-name table.
 constexpr std::string_view NameEnd = "/\n";
+// How intermediate code begins that compilers write instead of objects.
+constexpr std::array<uint8_t, 4> IntermediateMagic = {'B', 'C', 0xC0, 0xDE};
+
+bool isIntermediateCode(const FileProbe& probe) {
+  const std::span<const uint8_t> bytes = probe.getFirstBytes();
+  return bytes.size() >= IntermediateMagic.size() &&
+         std::equal(IntermediateMagic.begin(), IntermediateMagic.end(), bytes.begin());
+}
+
+// Linkers look into members themselves where there is no table, and nowhere else.
+bool willHaveTable(const arlib::Archive& archive) {
+  const std::span<ArchiveMember* const> members = archive.getMembers();
+  return archive.getSymbolTable() != nullptr ||
+         std::any_of(members.begin(), members.end(), [](const ArchiveMember* member) {
+           return member->getType()->isObjectModule();
+         });
+}
 
 // Why the file can't be a member, as the host's error number, or 0. One that could not be opened is
 // tried again: its first bytes tell what it is.
@@ -47,6 +65,7 @@ public:
       : m_Request(request), m_Archive(run.archive), m_Members(run.archive, request) {}
 
   void insert(const std::string& file);
+  void warnOfIntermediateCode() const;
   [[nodiscard]] const std::vector<ArchiveMember*>& getAdded() const { return m_Added; }
 
 private:
@@ -60,6 +79,7 @@ private:
   arlib::Archive& m_Archive;
   NamedMembers m_Members;
   std::vector<ArchiveMember*> m_Added;
+  std::string m_IntermediateCode; // the first file of its kind
 };
 
 void Insertion::insert(const std::string& file) {
@@ -73,8 +93,17 @@ void Insertion::insert(const std::string& file) {
     return;
   }
   if (!(member == nullptr ? add(file, probe) : replace(*member, file, probe))) return;
+  if (m_IntermediateCode.empty() && isIntermediateCode(probe)) m_IntermediateCode = file;
   quarn::verboseMessage(m_Request.settings,
                         member == nullptr ? messages::AddedMember : messages::ReplacedMember, file);
+}
+
+void Insertion::warnOfIntermediateCode() const {
+  if (m_IntermediateCode.empty() || m_Request.settings.suppressSymbolTable) return;
+  if (!willHaveTable(m_Archive)) return;
+  messages::reportFormat(messages::WarningWord, nullptr,
+                         "'%s' is intermediate code, of which the symbol table tells nothing",
+                         m_IntermediateCode);
 }
 
 bool Insertion::canTake(const std::string& file, FileProbe& probe) const {
@@ -129,6 +158,7 @@ void insertFiles(quarn::Run& run, const Request& request) {
   Insertion insertion(run, request);
   for (const std::string& file : request.files)
     insertion.insert(file);
+  insertion.warnOfIntermediateCode();
   const std::vector<ArchiveMember*>& added = insertion.getAdded();
   if (request.place == Place::End || quarn::hasErrors()) return;
   const auto place = findPlace(run.archive, request, {added.begin(), added.end()});

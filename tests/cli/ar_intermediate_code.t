@@ -17,10 +17,12 @@ A table that llvm-ar has made is kept as long as it is true.
   $ clang -flto -fuse-ld=lld main.bc code.a -o image; ./image
   [3]
   $ quarn-ar r code.a b.bc; published code.a
+  quarn-ar: Warning: 'b.bc' is intermediate code, of which the symbol table tells nothing
   a_sum
 
-Beside an object, which makes a table, it is a member that nobody finds.
+Beside an object, which makes a table, it is a member that nobody finds, and that is told.
 
   $ echo 'int own(void) { return 4; }' | cc -x c -c - -o own.o
-  $ quarn-ar rc mixed.a own.o b.bc; published mixed.a
+  $ quarn-ar rc mixed.a own.o a.bc b.bc; published mixed.a
+  quarn-ar: Warning: 'a.bc' is intermediate code, of which the symbol table tells nothing
   own
