@@ -292,9 +292,8 @@ TEST(SourceTree, TestsAreNamedInCamelCase) {
   }
 }
 
-// Who looks for the test of a promise finds it under the name that the list of promises has.
-TEST(SourceTree, TheListOfPromisesLeadsToTests) {
-  const std::regex quoted("`(\\w+)\\.(\\w+)`");
+// The names of tests and transcripts, as documents give them.
+Names namesOfTests() {
   const std::regex test("\\nT(?:YPED_T)?EST(?:_F|_P)?\\((\\w+),\\s*(\\w+)\\)");
   Names known;
   for (const fs::path& file : sourcesOf("tests")) {
@@ -304,13 +303,40 @@ TEST(SourceTree, TheListOfPromisesLeadsToTests) {
   }
   for (const auto& entry : fs::directory_iterator(treeRoot() / "tests/cli"))
     known.insert(entry.path().filename());
-  const std::string list = contentsOf(treeRoot() / "tests/README.md");
+  return known;
+}
+
+// How many tests a text names; each must be there.
+size_t countNamedTests(const std::string& text, const Names& known) {
+  const std::regex quoted("`(\\w+)\\.(\\w+)`");
   size_t count = 0;
-  for (std::sregex_iterator match(list.begin(), list.end(), quoted), end; match != end; ++match) {
+  for (std::sregex_iterator match(text.begin(), text.end(), quoted), end; match != end; ++match) {
     EXPECT_TRUE(known.contains((*match)[1].str() + "." + (*match)[2].str())) << (*match)[0];
     ++count;
   }
-  EXPECT_GT(count, 20u);
+  return count;
+}
+
+// Who looks for the test of a promise finds it under the name that the list of promises has.
+TEST(SourceTree, TheListOfPromisesLeadsToTests) {
+  EXPECT_GT(countNamedTests(contentsOf(treeRoot() / "tests/README.md"), namesOfTests()), 20U);
+}
+
+// The last heading is of what is not promised.
+TEST(SourceTree, EveryPromiseNamesTheTestsThatHoldIt) {
+  const std::string text = contentsOf(treeRoot() / "docs/reliability.md");
+  const Names known = namesOfTests();
+  const std::string heading = "\n## ";
+  size_t promises = 0;
+  for (size_t place = text.find(heading), next = 0; place != std::string::npos; place = next) {
+    next = text.find(heading, place + 1);
+    if (next == std::string::npos) break;
+    const size_t held = text.find("\n*Held by* ", place);
+    ASSERT_LT(held, next) << text.substr(place, 60);
+    EXPECT_GT(countNamedTests(text.substr(held, text.find('\n', held + 1) - held), known), 2U);
+    ++promises;
+  }
+  EXPECT_EQ(promises, 5U);
 }
 
 TEST(SourceTree, EveryPageAndCompletionIsInstalled) {
