@@ -87,7 +87,6 @@ public:
 private:
   struct Content;
 
-  std::span<const OutlinedSymbol> getForeignSymbols();
   void takeLtoSymbols();
   bool readForeign(std::unique_ptr<Content> content);
   bool readOwn(std::unique_ptr<Content> content, bool wantsAttributes);

@@ -65,6 +65,19 @@ void forEachStaticSymbol(const ObjectTables& tables, Function function) {
   }
 }
 
+size_t countRows(const ObjectTables& tables) {
+  size_t count = 0;
+  for (const SymbolTable& table : tables.symbolTables)
+    count += table.rowCount;
+  return count;
+}
+
+// Any section index but that of undefined symbols means a definition; what the reserved ones mean
+// is each machine's own.
+SymbolHome foreignHomeOf(const SymbolRow& row) {
+  return {row.shndx == SHN_UNDEF ? Symbol::Category_Undefined : Symbol::Category_Hosted, 0};
+}
+
 // Bytes of a section as a model would have them.
 uint64_t sizeOf(const ObjectTables& tables, uint32_t section) {
   if (tables.typeOf(section) == SHT_NULL) return 0;
@@ -199,12 +212,12 @@ std::vector<ObjectOutline::OutlinedSection> ObjectOutline::getSections() const {
 std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getSymbols() {
   m_Symbols.clear();
   if (m_Content == nullptr) return {};
-  if (m_Content->isForeign) return getForeignSymbols();
   const ObjectTables& tables = m_Content->tables;
-  m_Symbols.reserve(m_Content->attributes->getSymbolCount());
+  const bool isForeign = m_Content->isForeign;
+  m_Symbols.reserve(isForeign ? countRows(tables) : m_Content->attributes->getSymbolCount());
   forEachStaticSymbol(tables, [&](const SymbolTable& table, uint32_t index, const SymbolRow& row) {
-    const SymbolHome home = tables.homeOf(table, index, row);
-    const bool isHosted = home.category == Symbol::Category_Hosted;
+    const SymbolHome home = isForeign ? foreignHomeOf(row) : tables.homeOf(table, index, row);
+    const bool isHosted = home.category == Symbol::Category_Hosted && !isForeign;
     m_Symbols.push_back({table.nameOf(row), home.category, row.getBinding(),
                          isHosted ? tables.nameOf(home.section) : nullptr});
   });
@@ -221,23 +234,6 @@ void ObjectOutline::takeLtoSymbols() {
   m_Symbols.reserve(m_Symbols.size() + tables.ltoDefinitions.size());
   for (const char* name : tables.ltoDefinitions)
     m_Symbols.push_back({name, Symbol::Category_Hosted, STB_GLOBAL, nullptr});
-}
-
-// Any section index but that of undefined symbols means a definition; what the reserved ones mean
-// is each machine's own.
-std::span<const ObjectOutline::OutlinedSymbol> ObjectOutline::getForeignSymbols() {
-  const ObjectTables& tables = m_Content->tables;
-  for (const SymbolTable& table : tables.symbolTables) {
-    m_Symbols.reserve(table.rowCount);
-    tables.forEachSymbolRow(table, [&](uint32_t, const SymbolRow& row) {
-      const Symbol::Category category =
-          row.shndx == SHN_UNDEF ? Symbol::Category_Undefined : Symbol::Category_Hosted;
-      m_Symbols.push_back({table.nameOf(row), category, row.getBinding(), nullptr});
-      return true;
-    });
-  }
-  takeLtoSymbols();
-  return m_Symbols;
 }
 
 uint64_t ObjectOutline::getEntry() const {
