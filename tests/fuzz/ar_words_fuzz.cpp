@@ -9,6 +9,7 @@
 #include "quarn-ar/command_line.h"
 #include "quarn-ar/response_file.h"
 #include "quarn/reporting.h"
+#include "tests/fuzz/quoted_words.h"
 #include "tests/support/memory_host.h"
 
 #include <cstdlib>
@@ -38,19 +39,6 @@ bool initialise() {
   return true;
 }
 
-std::string quotedForPosix(const Words& words) {
-  std::string text;
-  for (const std::string& word : words) {
-    text += '"';
-    for (const char character : word) {
-      if (character == '"' || character == '\\') text += '\\';
-      text += character;
-    }
-    text += "\"\n";
-  }
-  return text;
-}
-
 std::string quotedForWindows(const Words& words) {
   std::string text;
   for (const std::string& word : words) {
@@ -69,7 +57,7 @@ std::string quotedForWindows(const Words& words) {
 
 void readBack(std::string_view text) {
   if (const auto words = splitWords(text, Quoting::Posix))
-    expect(splitWords(quotedForPosix(*words), Quoting::Posix) == words);
+    expect(splitWords(fuzzing::quotedWords(*words), Quoting::Posix) == words);
   if (const auto words = splitWords(text, Quoting::Windows))
     expect(splitWords(quotedForWindows(*words), Quoting::Windows) == words);
 }

@@ -10,6 +10,7 @@
 #include "tabledrivenparser/interface/reporter.h"
 #include "tabledrivenparser/interface/via_file.h"
 #include "tests/fuzz/one_file.h"
+#include "tests/fuzz/quoted_words.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -98,19 +99,6 @@ std::string withoutComments(std::string_view text) {
   return kept;
 }
 
-std::string quoted(const std::vector<std::string>& words) {
-  std::string text;
-  for (const std::string& word : words) {
-    text += '"';
-    for (const char character : word) {
-      if (character == '"' || character == '\\') text += '\\';
-      text += character;
-    }
-    text += "\"\n";
-  }
-  return text;
-}
-
 bool isPrefix(const std::vector<std::string>& front, const std::vector<std::string>& whole) {
   return front.size() <= whole.size() && std::equal(front.begin(), front.end(), whole.begin());
 }
@@ -130,6 +118,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     const bool isCut = reading.failure == OptionMessage::ViaFileCommandTooLong;
     expect(isCut ? isPrefix(reading.words, inMemory.words) : reading == inMemory);
   }
-  expect(readText(quoted(reading.words)) == Reading{reading.words, {}});
+  expect(readText(fuzzing::quotedWords(reading.words)) == Reading{reading.words, {}});
   return 0;
 }
