@@ -4,8 +4,10 @@
 #include "quarn-ar/ar_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
+#include "support/interface/program.h"
 
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
-  quarn::startUp(argc, argv, support::getPosixHost(), quarn_ar::arMain);
+  const support::CommandLine line = support::getCommandLine(argc, argv);
+  quarn::startUp(line.argc, line.argv, support::getNativeHost(), quarn_ar::arMain);
 }

@@ -5,10 +5,10 @@
 // document that left some out would be of no use to a tool that looks for them.
 #include "quarn-json/command_line.h"
 
+#include "quarn/host_via_file_reader.h"
 #include "quarn/option_reporter.h"
 #include "quarn/reporting.h"
 #include "tabledrivenparser/interface/parser.h"
-#include "tabledrivenparser/interface/stdio_via_file_reader.h"
 
 #include <array>
 
@@ -84,10 +84,10 @@ Answer takeValues(const Parser& parser, Request& request) {
 
 } // namespace
 
-Answer readCommandLine(int argc, const char* const* argv, alloclib::RegionGeneral& memory,
-                       Request& request) {
+Answer readCommandLine(int argc, const char* const* argv, support::Host& host,
+                       alloclib::RegionGeneral& memory, Request& request) {
   quarn::OptionReporter reporter;
-  StdioViaFileReader viaFiles;
+  quarn::HostViaFileReader viaFiles(host);
   std::array<ValueRecord, Option_Count> values;
   Parser parser({Table, Definitions, values}, nullptr, reporter, viaFiles, memory);
   for (int i = 1; i < argc;)

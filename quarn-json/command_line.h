@@ -26,7 +26,7 @@ enum class Answer {
 };
 
 // Reads the words behind the program's name. One that is no option ends the process.
-[[nodiscard]] Answer readCommandLine(int argc, const char* const* argv,
+[[nodiscard]] Answer readCommandLine(int argc, const char* const* argv, support::Host& host,
                                      alloclib::RegionGeneral& memory, Request& request);
 
 // How options are written, for who compares.

@@ -43,7 +43,7 @@ void jsonMain(int argc, const char* const* argv, const char* toolName, support::
               alloclib::RegionGeneral& memory) {
   messages::setProgramName(toolName);
   Request request;
-  switch (readCommandLine(argc, argv, memory, request)) {
+  switch (readCommandLine(argc, argv, host, memory, request)) {
   case Answer::Refused:
     return;
   case Answer::Help:

@@ -4,7 +4,9 @@
 #include "quarn-json/json_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
+#include "support/interface/program.h"
 
 int main(int argc, char** argv) {
-  quarn::startUp(argc, argv, support::getPosixHost(), quarn_json::jsonMain);
+  const support::CommandLine line = support::getCommandLine(argc, argv);
+  quarn::startUp(line.argc, line.argv, support::getNativeHost(), quarn_json::jsonMain);
 }

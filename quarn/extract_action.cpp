@@ -31,8 +31,10 @@ Extraction::Extraction(const Run& run)
 // A folder in a name is not followed: an archive must not choose where files are written.
 std::string Extraction::outputName(std::string_view name) const {
   // Where names keep their folders, only what the host takes for one ends a folder.
+  const bool isPosixName =
+      m_Settings.keepFolders && m_Host.getPathStyle() == support::PathStyle_Posix;
   const std::string_view leaf =
-      m_Settings.keepFolders ? name.substr(name.rfind('/') + 1) : support::lastPathComponent(name);
+      isPosixName ? name.substr(name.rfind('/') + 1) : support::lastPathComponent(name);
   if (!m_Settings.truncateNames) return std::string(leaf);
   return std::string(leaf.substr(0, LongestFileName).substr(0, LongestHostName));
 }
@@ -50,6 +52,12 @@ void Extraction::operator()(ArchiveMember& member) {
     return;
   }
   const std::string name = outputName(member.getName());
+  // Nor may it open a device, or a stream that no listing of the folder shows.
+  if (!support::isPlainLeaf(name, m_Host.getPathStyle())) {
+    reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
+                  support::hostErrorText(EINVAL));
+    return;
+  }
   if (!mayWrite(name)) {
     reportMessage(messages::ErrorWord, messages::AlreadyExists, name);
     return;

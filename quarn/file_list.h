@@ -13,7 +13,8 @@
 namespace quarn {
 
 // Adds a file_list word. With `expand`, a word whose leaf holds "?" or "*" stands for the files it
-// matches on disk, in byte order of their names; a word that matches nothing stays as it is.
+// matches on disk, in the order of Host::findNames; a word that matches nothing stays as it is. On
+// Windows each word is looked for so, and what is found has "\" between its parts.
 void addFileArgument(support::Host& host, std::string_view word, bool expand,
                      std::vector<std::string>& fileList);
 

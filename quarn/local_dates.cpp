@@ -5,6 +5,8 @@
 // on. A date that the host can't break down is shown as an empty text.
 #include "quarn/local_dates.h"
 
+#include "support/interface/local_time.h"
+
 #include <ctime>
 
 namespace quarn {
@@ -17,9 +19,8 @@ std::string_view LocalDates::textOf(int64_t date) {
 
 LocalDates::Text LocalDates::computeText(int64_t date) {
   Text text;
-  const auto seconds = static_cast<time_t>(date);
-  tm brokenDown = {};
-  if (localtime_r(&seconds, &brokenDown) == nullptr) return text;
+  std::tm brokenDown = {};
+  if (!support::breakDownLocally(date, brokenDown)) return text;
   text.length = strftime(text.bytes.data(), TextSize, "%b %d %H:%M %Y", &brokenDown);
   return text;
 }

@@ -5,8 +5,10 @@
 #include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
+#include "support/interface/program.h"
 
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
-  quarn::startUp(argc, argv, support::getPosixHost(), quarn::quarnMain);
+  const support::CommandLine line = support::getCommandLine(argc, argv);
+  quarn::startUp(line.argc, line.argv, support::getNativeHost(), quarn::quarnMain);
 }

@@ -10,13 +10,13 @@
 #include "quarn/archive_run.h"
 #include "quarn/banner.h"
 #include "quarn/file_list.h"
+#include "quarn/host_via_file_reader.h"
 #include "quarn/option_listeners.h"
 #include "quarn/option_reporter.h"
 #include "quarn/option_table.h"
 #include "quarn/process_options.h"
 #include "quarn/reporting.h"
 #include "tabledrivenparser/interface/parser.h"
-#include "tabledrivenparser/interface/stdio_via_file_reader.h"
 
 #include <string>
 #include <vector>
@@ -88,7 +88,7 @@ void quarnMain(int argc, const char* const* argv, const char* toolName, support:
                alloclib::RegionGeneral& memory) {
   QuarnListener listener;
   OptionReporter reporter;
-  tabledrivenparser::StdioViaFileReader viaFiles;
+  HostViaFileReader viaFiles(host);
   OptionValues values;
   Parser parser({getOptionTable(), getOptionDefinitions(), values}, &listener, reporter, viaFiles,
                 memory);

@@ -4,7 +4,7 @@
 // could stdout take what it was given?
 #include "quarn/reporting.h"
 
-#include <cstring>
+#include "support/interface/host.h"
 
 namespace quarn {
 
@@ -12,10 +12,9 @@ bool hasErrors() {
   return messages::getErrorCount() != 0;
 }
 
-// The process never leaves the C locale, so the text is the same for every user. Where the host has
-// given no number it was not the host that failed.
+// Where the host has given no number it was not the host that failed.
 std::string hostErrorText(int errorNumber) {
-  return errorNumber == 0 ? "Unexpected end of file" : std::strerror(errorNumber);
+  return errorNumber == 0 ? "Unexpected end of file" : support::hostErrorText(errorNumber);
 }
 
 bool flushOutput() {

@@ -5,7 +5,7 @@
 //
 //   int main() {
 //     alloclib::Session session;
-//     arlib::Archive archive(support::getPosixHost());
+//     arlib::Archive archive(support::getNativeHost());
 //     ...
 //   }
 //

@@ -17,13 +17,22 @@
 namespace alloclib {
 namespace {
 
-// The host's heap, which aligns for every fundamental type by itself. Null if it has no memory.
+// The host's heap aligns for every fundamental type by itself.
+bool isPlain(size_t alignment) {
+  return alignment <= alignof(std::max_align_t);
+}
+
+// Null if the host has no memory.
 void* allocateFromHost(size_t size, size_t alignment) {
   // No object of the host is larger; some heaps take such a request for a fault.
   if (size > PTRDIFF_MAX) return nullptr;
-  if (alignment <= alignof(std::max_align_t)) return std::malloc(size);
-  void* block = nullptr;
-  return posix_memalign(&block, alignment, size) == 0 ? block : nullptr;
+  if (isPlain(alignment)) return std::malloc(size);
+  return ::operator new(size, std::align_val_t(alignment), std::nothrow);
+}
+
+void giveBackToHost(void* block, size_t alignment) {
+  if (isPlain(alignment)) return std::free(block);
+  ::operator delete(block, std::align_val_t(alignment));
 }
 
 } // namespace
@@ -43,9 +52,9 @@ void* RegionMallocFree::AllocFull(size_t size, size_t alignment, const char*) {
   return block;
 }
 
-void RegionMallocFree::DiscardFull(void* pointer, size_t size, size_t) {
+void RegionMallocFree::DiscardFull(void* pointer, size_t size, size_t alignment) {
   m_Stats->discarded(pointer, size, 0);
-  std::free(pointer);
+  giveBackToHost(pointer, alignment);
 }
 
 void RegionMallocFree::Destroy(bool freeMemory) {

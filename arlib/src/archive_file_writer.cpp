@@ -96,6 +96,8 @@ private:
   bool replaceTarget();
   // 0 if the file to replace is the one that was read, or the reason not to replace it.
   [[nodiscard]] int checkIsOwnTarget() const;
+  void letGoOfTarget();
+  int replaceWhenFree();
   bool takeName();
   bool removeTemporary();
   void relocateMembers();
@@ -231,13 +233,32 @@ int ArchiveFileWriter::checkIsOwnTarget() const {
   FileStatus now;
   const int error = m_Host.status(m_Target.c_str(), now);
   if (error != 0 && error != ENOENT) return error;
-  return support::isUnchanged(own->getStatus(), now) ? 0 : ESTALE;
+  return support::isUnchanged(own->getStatus(), now) ? 0 : support::FileHasChanged;
+}
+
+// Everything is copied, so what is open can be let go of where it is in the way. The lock goes with
+// it: somebody else may write before the next try, and is noticed there.
+void ArchiveFileWriter::letGoOfTarget() {
+  if (m_Host.replacesOpenFiles(m_Target.c_str())) return;
+  m_Archive.m_SourceFiles.closeAll();
+  if (m_Archive.getOwnFile() != nullptr) m_Archive.getOwnFile()->close();
+}
+
+// Who looks at each file that is new or being read, as a virus scanner does, keeps it for moments.
+int ArchiveFileWriter::replaceWhenFree() {
+  letGoOfTarget();
+  for (const uint32_t wait : {10U, 20U, 40U, 80U, 160U, 320U, 640U, 0U}) {
+    if (const int error = checkIsOwnTarget(); error != 0) return error;
+    const int error = m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
+    if (error != EBUSY || wait == 0) return error;
+    m_Host.pause(wait);
+  }
+  return EBUSY;
 }
 
 bool ArchiveFileWriter::takeName() {
-  const char* temporary = m_TemporaryName.c_str();
-  const int error = m_MustBeNew ? m_Host.renameNew(temporary, m_Target.c_str())
-                                : m_Host.rename(temporary, m_Target.c_str());
+  const int error =
+      m_MustBeNew ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str()) : replaceWhenFree();
   m_WasOvertaken = m_MustBeNew && error == EEXIST;
   if (error == 0 || m_WasOvertaken) return error == 0;
   return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
@@ -248,9 +269,6 @@ bool ArchiveFileWriter::replaceTarget() {
   if (m_OldStatus.kind == FileKind::Directory || m_OldStatus.kind == FileKind::Special) {
     const int reason = m_OldStatus.kind == FileKind::Directory ? EISDIR : EINVAL;
     return m_Archive.fail(&ErrorHandler::reportDeleteError, m_FileName, reason);
-  }
-  if (const int error = checkIsOwnTarget(); error != 0) {
-    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
   }
   return takeName();
 }

@@ -26,7 +26,7 @@ std::string quoted(std::string_view text) {
 std::string hostFailure(const char* what, const char* fileName, int errorNumber) {
   std::string text = std::string("I/O error ") + what + " file";
   if (fileName != nullptr) text += " " + quoted(fileName);
-  if (errorNumber != 0) text += std::string(": ") + std::strerror(errorNumber);
+  if (errorNumber != 0) text += std::string(": ") + support::hostErrorText(errorNumber);
   return text;
 }
 

@@ -61,7 +61,7 @@ std::string symbolIn(const SymbolPlace& place) {
 std::string ioError(std::string_view what, const ObjectModule& module, int errorNumber) {
   std::string whole = text("I/O error ", what, " file");
   if (module.getObjectName() != nullptr) whole += text(" '", module.getObjectName(), "'");
-  if (errorNumber != 0) whole += text(": ", std::strerror(errorNumber));
+  if (errorNumber != 0) whole += text(": ", support::hostErrorText(errorNumber));
   return whole;
 }
 

@@ -18,7 +18,7 @@ int main(int count, char** words) {
   }
 
   const alloclib::Session session; // lives longer than all archives
-  arlib::Archive archive(support::getPosixHost());
+  arlib::Archive archive(support::getNativeHost());
   if (!arlib::readFile(words[1], archive)) {
     std::cerr << words[1] << " can't be read\n";
     return 1;

@@ -31,7 +31,7 @@ int main(int count, char** words) {
 
   const alloclib::Session session; // lives longer than all archives
   Complaints complaints;
-  arlib::Archive archive(support::getPosixHost());
+  arlib::Archive archive(support::getNativeHost());
   archive.setErrorHandler(&complaints);
   if (!arlib::readFile(words[1], archive)) return 1;
 

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A private duplicate of a descriptor as the end of a stream. Why a duplicate: a tool may be
-// started with stdout or stderr closed, and the first file that it opens would get that number, an
-// archive perhaps, and be written into by the next message.
+// A private duplicate of a descriptor as the end of a stream.
 
 #pragma once
 

@@ -12,10 +12,10 @@
 
 #include "messages/src/descriptor_sink.h"
 #include "messages/src/output_buffer.h"
+#include "support/interface/descriptor.h"
 
 #include <cstdint>
 #include <string>
-#include <unistd.h>
 #include <utility>
 #include <vector>
 
@@ -113,8 +113,8 @@ void writeBytes(Stream stream, std::string_view bytes) {
 } // namespace
 
 void openStreams() {
-  outputDescriptor.open(STDOUT_FILENO);
-  errorDescriptor.open(STDERR_FILENO);
+  outputDescriptor.open(support::OutputDescriptor);
+  errorDescriptor.open(support::ErrorDescriptor);
 }
 
 void HeldOutput::hold() {

@@ -4,8 +4,8 @@
 // put another host in its place (a map in memory, a disk that is full, a k-th call that fails).
 //
 // Errors come back as the host's own error number (errno), at once; 0 is success. Nothing is kept
-// in a process-wide error variable between two calls. Names are NUL-terminated byte strings; only
-// "/" separates their parts.
+// in a process-wide error variable between two calls. Names are NUL-terminated byte strings, on
+// Windows in UTF-8; what separates their parts is told by the host's style.
 //
 // Others change the same files meanwhile, and a name may lead to a FIFO, a device, a link or a file
 // that grows: an opening never waits, a status tells what a thing is before it is used, and a
@@ -14,16 +14,26 @@
 
 #pragma once
 
+#include "support/interface/path.h"
+
 #include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace support {
 
 /// The host's error number; 0 means success.
 using HostError = int;
+
+/// A file is not the one that it was (ESTALE, which not every C library has).
+extern const HostError FileHasChanged;
+
+/// The text of an error number: the same words on every host. The process never leaves the C
+/// locale, so they are also the same for every user.
+[[nodiscard]] std::string hostErrorText(HostError error);
 
 /// What a name or an open file stands for, links followed.
 enum class FileKind : uint8_t {
@@ -70,11 +80,22 @@ class Host {
 public:
   virtual ~Host() = default;
 
+  /// By which rules names are read: PathStyle_Posix or PathStyle_Windows.
+  [[nodiscard]] virtual PathStyle getPathStyle() const { return PathStyle_Posix; }
+
   /// Opens an existing file. Never waits, also not on a FIFO.
   [[nodiscard]] virtual HostError openForReading(const char* name, FileHandle& file) = 0;
 
   /// The same for a file that is going to be locked: a host may want the right to write for that.
   [[nodiscard]] virtual HostError openForUpdate(const char* name, FileHandle& file) = 0;
+
+  /// Opens a file that is read from its beginning to its end, with `readNext`: may be a pipe, too,
+  /// and then waits for who writes into it.
+  [[nodiscard]] virtual HostError openSequential(const char* name, FileHandle& file) = 0;
+
+  /// Reads up to bytes.size() bytes behind those that were read before; 0 of them only at the end.
+  [[nodiscard]] virtual HostError readNext(FileHandle file, std::span<uint8_t> bytes,
+                                           size_t& done) = 0;
 
   /// Waits until nobody else holds the lock of the file, and takes it. It is the process's own word
   /// to others who lock: who doesn't ask isn't kept from anything. Closing the handle gives it
@@ -106,11 +127,19 @@ public:
   /// The handle is closed in any case.
   [[nodiscard]] virtual HostError close(FileHandle file) = 0;
 
-  /// Puts `from` in the place of `to` in one step: at no moment is there no `to`.
+  /// Puts `from` in the place of `to` in one step: at no moment is there no `to`. EBUSY where
+  /// somebody has `to` open in a way that keeps it from being replaced, which may pass.
   [[nodiscard]] virtual HostError rename(const char* from, const char* to) = 0;
 
   /// The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
   [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
+
+  /// Whether a file can be replaced while it is open: where not, one's own handle is in the way,
+  /// too.
+  [[nodiscard]] virtual bool replacesOpenFiles(const char*) { return true; }
+
+  /// Does nothing for a while.
+  virtual void pause(uint32_t milliseconds) = 0;
 
   /// Removes a name, and with the last one the file; those who have it open keep it.
   [[nodiscard]] virtual HostError remove(const char* name) = 0;
@@ -136,13 +165,22 @@ public:
   /// All names of a directory but "." and "..", in the host's order.
   [[nodiscard]] virtual HostError listDirectory(const char* name,
                                                 std::vector<std::string>& names) = 0;
+
+  /// The names in a directory that match a leaf with "?" and "*", by the host's rules and in the
+  /// order that it gives them. As it stands here: letter case counts, and the order is that of the
+  /// bytes, so that the same files give the same list whatever order the directory has. `directory`
+  /// ends with a separator; empty is the current one.
+  [[nodiscard]] virtual HostError findNames(std::string_view directory, std::string_view leaf,
+                                            std::vector<std::string>& names);
 };
 
 /// The host that the process runs on.
-[[nodiscard]] Host& getPosixHost();
+[[nodiscard]] Host& getNativeHost();
 
-/// From now on SIGINT, SIGTERM, SIGHUP and SIGPIPE remove the temporaries of getPosixHost() before
-/// they end the process, and a file size limit shows as a failed write instead of a signal.
+/// From now on what ends the process from outside (SIGINT, SIGTERM, SIGHUP and SIGPIPE; on Windows
+/// Ctrl-C, Ctrl-Break, the closing of the console and the end of the session) removes the
+/// temporaries of getNativeHost() first, and a file size limit shows as a failed write instead of a
+/// signal.
 void installSignalCleanUp();
 
 } // namespace support

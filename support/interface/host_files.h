@@ -15,7 +15,8 @@
 
 namespace support {
 
-/// What a name stands for. A name that the host can't tell about counts as nothing.
+/// What a name stands for. A name that the host can't tell about counts as nothing, but for a drive
+/// alone.
 [[nodiscard]] FileKind fileKind(Host& host, const char* name);
 
 /// Modification time in seconds since 1970, or -1 if the host doesn't tell.
@@ -24,14 +25,12 @@ namespace support {
 /// Whether a name or pattern holds "?" or "*".
 [[nodiscard]] bool hasWildcard(std::string_view text);
 
-/// The part of a file word that names the directory, up to and including the last "/"; may be
-/// empty.
+/// The part of a file word that names the directory where "/" alone separates, up to and including
+/// the last "/"; may be empty.
 [[nodiscard]] std::string_view directoryPart(std::string_view word);
 
-/// The names in a directory that match a leaf with "?" and "*", letter case counting, in byte
-/// order, so that the same files give the same list whatever the host's order. `directory` is as
-/// directoryPart gives it; empty is the current one. No match, or a directory that can't be listed,
-/// gives an empty list.
+/// The names in a directory that match a leaf with "?" and "*", as Host::findNames tells them. No
+/// match, or a directory that can't be listed, gives an empty list.
 [[nodiscard]] std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
                                                       std::string_view leaf);
 

@@ -59,6 +59,14 @@ private:
 /// PathStyle_Windows, PathStyle_Posix or PathStyle_Undetermined.
 [[nodiscard]] PathStyle detectPathStyle(std::string_view name);
 
+/// "c:"; a letter, and nothing behind the colon.
+[[nodiscard]] bool isDriveName(std::string_view name);
+
+/// Whether a host of this style takes the leaf for a file of that name in the folder at hand, and
+/// for nothing else: on Windows some names are devices in every folder, ":" leads to a stream
+/// inside a file, and dots and blanks at the end are dropped. On POSIX every leaf is one.
+[[nodiscard]] bool isPlainLeaf(std::string_view leaf, PathStyle style);
+
 /// What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
 [[nodiscard]] std::string_view lastPathComponent(std::string_view name);
 

@@ -62,6 +62,9 @@ public:
   /// allows no more of them, some of these are closed to make room. The host's error number, or 0.
   [[nodiscard]] HostError openOther(const std::function<HostError()>& open);
 
+  /// Closes all of them but those that are kept open. Who reads on opens his again.
+  void closeAll();
+
   /// The first failure of a close that nobody has heard of yet: its error number, or 0, and the
   /// name of the file. Reading went well all the same.
   [[nodiscard]] HostError takeCloseError(std::string& name);

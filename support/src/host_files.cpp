@@ -15,8 +15,10 @@ namespace support {
 
 FileKind fileKind(Host& host, const char* name) {
   FileStatus status;
-  if (host.status(name, status) != 0) return FileKind::Nothing;
-  return status.kind;
+  if (host.status(name, status) == 0) return status.kind;
+  // A drive without a medium is there all the same.
+  const bool isDrive = host.getPathStyle() == PathStyle_Windows && isDriveName(name);
+  return isDrive ? FileKind::Directory : FileKind::Nothing;
 }
 
 int64_t fileTime(Host& host, const char* name) {
@@ -34,15 +36,21 @@ std::string_view directoryPart(std::string_view word) {
   return slash == std::string_view::npos ? std::string_view() : word.substr(0, slash + 1);
 }
 
-std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
-                                        std::string_view leaf) {
+HostError Host::findNames(std::string_view directory, std::string_view leaf,
+                          std::vector<std::string>& names) {
   const std::string place = directory.empty() ? std::string("./") : std::string(directory);
-  std::vector<std::string> names;
-  if (host.listDirectory(place.c_str(), names) != 0) return {};
+  if (const HostError error = listDirectory(place.c_str(), names); error != 0) return error;
   std::erase_if(names,
                 [leaf](const std::string& name) { return !matchesPattern(leaf, name, true); });
   // A host lists a folder in an order of its own, and the members of an archive would follow it.
   std::sort(names.begin(), names.end());
+  return 0;
+}
+
+std::vector<std::string> wildcardSearch(Host& host, std::string_view directory,
+                                        std::string_view leaf) {
+  std::vector<std::string> names;
+  if (host.findNames(directory, leaf, names) != 0) return {};
   return names;
 }
 

@@ -6,7 +6,10 @@
 
 #include "support/interface/path.h"
 
+#include "support/interface/letters.h"
+
 #include <algorithm>
+#include <iterator>
 
 namespace support {
 
@@ -29,6 +32,29 @@ size_t driveLength(std::string_view name) {
   return name.starts_with("\\\\") ? shareLength(name) : 0;
 }
 
+// Devices of the host in every folder, whatever extension is behind. The last three of each row
+// are the superscript digits, which count as digits there.
+constexpr std::string_view Devices[] = {"con", "prn", "aux", "nul", "conin$", "conout$", "clock$"};
+constexpr std::string_view NumberedDevices[] = {"com", "lpt"};
+constexpr std::string_view DeviceNumbers[] = {"0", "1", "2", "3",        "4",        "5",       "6",
+                                              "7", "8", "9", "\xC2\xB9", "\xC2\xB2", "\xC2\xB3"};
+
+bool isNumberedDevice(std::string_view name) {
+  const auto isNumbered = [name](std::string_view device) {
+    return equalIgnoringCase(name.substr(0, device.size()), device) &&
+           std::find(std::begin(DeviceNumbers), std::end(DeviceNumbers),
+                     name.substr(std::min(name.size(), device.size()))) != std::end(DeviceNumbers);
+  };
+  return std::any_of(std::begin(NumberedDevices), std::end(NumberedDevices), isNumbered);
+}
+
+bool isDeviceName(std::string_view leaf) {
+  std::string_view name = leaf.substr(0, leaf.find('.'));
+  name = name.substr(0, name.find_last_not_of(' ') + 1);
+  const auto isName = [name](std::string_view device) { return equalIgnoringCase(name, device); };
+  return std::any_of(std::begin(Devices), std::end(Devices), isName) || isNumberedDevice(name);
+}
+
 std::string takeFront(std::string_view& rest, size_t length) {
   std::string front(rest.substr(0, length));
   rest.remove_prefix(length);
@@ -36,6 +62,19 @@ std::string takeFront(std::string_view& rest, size_t length) {
 }
 
 } // namespace
+
+bool isDriveName(std::string_view name) {
+  return name.size() == 2 && isLetter(name[0]) && name[1] == ':';
+}
+
+bool isPlainLeaf(std::string_view leaf, PathStyle style) {
+  if (style == PathStyle_Posix) return true;
+  // A folder in every folder: nobody can open it for a file.
+  if (leaf == "." || leaf == "..") return true;
+  if (leaf.find(':') != std::string_view::npos) return false;
+  if (leaf.ends_with('.') || leaf.ends_with(' ')) return false;
+  return !isDeviceName(leaf);
+}
 
 PathStyle detectPathStyle(std::string_view name) {
   if (name.size() >= 2 && name[1] == ':') return PathStyle_Windows;

@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <chrono>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
@@ -23,9 +24,16 @@
 #include <memory>
 #include <sys/file.h>
 #include <sys/stat.h>
+#include <thread>
 #include <unistd.h>
 
 namespace support {
+
+const HostError FileHasChanged = ESTALE;
+
+std::string hostErrorText(HostError error) {
+  return std::strerror(error);
+}
 
 namespace {
 
@@ -170,6 +178,19 @@ public:
     return openNative(name, O_RDWR | O_NONBLOCK, file);
   }
 
+  HostError openSequential(const char* name, FileHandle& file) override {
+    return openNative(name, O_RDONLY, file);
+  }
+
+  HostError readNext(FileHandle file, std::span<uint8_t> bytes, size_t& done) override {
+    ssize_t count = 0;
+    do {
+      count = read(file.number, bytes.data(), bytes.size());
+    } while (count < 0 && errno == EINTR);
+    done = count < 0 ? 0 : static_cast<size_t>(count);
+    return count < 0 ? errno : 0;
+  }
+
   HostError lock(FileHandle file) override {
     // There is no bound to the wait: who holds the lock is another run that writes, and it ends.
     while (lockNative(file.number) != 0) {
@@ -252,6 +273,10 @@ public:
     return 0;
   }
 
+  void pause(uint32_t milliseconds) override {
+    std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
+  }
+
   HostError remove(const char* name) override {
     const SignalHold hold;
     if (unlink(name) != 0) return errno;
@@ -316,7 +341,7 @@ public:
 
 } // namespace
 
-Host& getPosixHost() {
+Host& getNativeHost() {
   static PosixHost host;
   return host;
 }

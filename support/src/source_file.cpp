@@ -107,6 +107,11 @@ HostError SourceFiles::openOther(const std::function<HostError()>& open) {
   return m_Shared->openInRoom(open);
 }
 
+void SourceFiles::closeAll() {
+  while (m_Shared->closeOldest()) {
+  }
+}
+
 HostError SourceFiles::takeCloseError(std::string& name) {
   name = m_Shared->closeErrorName;
   return std::exchange(m_Shared->closeError, 0);
@@ -138,7 +143,7 @@ HostError SourceFile::openAgain() {
   if (m_Handle.isOpen()) return 0;
   const FileStatus before = m_Status;
   HostError error = openFirst(false);
-  if (error == 0 && !isUnchanged(before, m_Status)) error = ESTALE;
+  if (error == 0 && !isUnchanged(before, m_Status)) error = FileHasChanged;
   m_Status = before;
   if (error != 0) close();
   return error;
@@ -177,7 +182,7 @@ HostError SourceFile::checkUnchanged() {
   if (const HostError error = openAgain(); error != 0) return error;
   FileStatus now;
   if (const HostError error = m_Shared->host.statusOf(m_Handle, now); error != 0) return error;
-  return isUnchanged(m_Status, now) ? 0 : ESTALE;
+  return isUnchanged(m_Status, now) ? 0 : FileHasChanged;
 }
 
 HostError SourceFile::lock() {

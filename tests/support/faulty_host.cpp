@@ -40,6 +40,18 @@ HostError FaultyHost::openForUpdate(const char* name, FileHandle& file) {
   return remember(error, name, file);
 }
 
+HostError FaultyHost::openSequential(const char* name, FileHandle& file) {
+  if (const HostError error = fault("openSequential", name)) return error;
+  const HostError error = m_Host.openSequential(name, file);
+  return remember(error, name, file);
+}
+
+HostError FaultyHost::readNext(FileHandle file, std::span<uint8_t> bytes, size_t& done) {
+  done = 0;
+  const HostError error = fault("readNext", m_OpenNames[file.number]);
+  return error != 0 ? error : m_Host.readNext(file, bytes, done);
+}
+
 HostError FaultyHost::lock(FileHandle file) {
   const HostError error = fault("lock", m_OpenNames[file.number]);
   return error != 0 ? error : m_Host.lock(file);
@@ -134,6 +146,13 @@ HostError FaultyHost::listDirectory(const char* name, std::vector<std::string>& 
   names.clear();
   const HostError error = fault("listDirectory", name);
   return error != 0 ? error : m_Host.listDirectory(name, names);
+}
+
+HostError FaultyHost::findNames(std::string_view directory, std::string_view leaf,
+                                std::vector<std::string>& names) {
+  names.clear();
+  const HostError error = fault("findNames", std::string(directory));
+  return error != 0 ? error : m_Host.findNames(directory, leaf, names);
 }
 
 } // namespace testsupport

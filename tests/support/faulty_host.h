@@ -52,8 +52,12 @@ public:
   // The file that it was asked for.
   [[nodiscard]] const std::string& getFailedName() const { return m_FailedName; }
 
+  support::PathStyle getPathStyle() const override { return m_Host.getPathStyle(); }
   support::HostError openForReading(const char* name, support::FileHandle& file) override;
   support::HostError openForUpdate(const char* name, support::FileHandle& file) override;
+  support::HostError openSequential(const char* name, support::FileHandle& file) override;
+  support::HostError readNext(support::FileHandle file, std::span<uint8_t> bytes,
+                              size_t& done) override;
   support::HostError lock(support::FileHandle file) override;
   support::HostError createTemporary(const char* name, support::FileHandle& file) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
@@ -68,6 +72,8 @@ public:
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
+  bool replacesOpenFiles(const char* name) override { return m_Host.replacesOpenFiles(name); }
+  void pause(uint32_t milliseconds) override { m_Host.pause(milliseconds); }
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
@@ -76,6 +82,8 @@ public:
   void setTimes(support::FileHandle file, int64_t seconds) override;
   std::string followLinks(const char* name) override { return m_Host.followLinks(name); }
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
+  support::HostError findNames(std::string_view directory, std::string_view leaf,
+                               std::vector<std::string>& names) override;
 
 private:
   // Counts a call; the error that it is to fail with, or 0.

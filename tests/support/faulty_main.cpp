@@ -19,7 +19,7 @@
 namespace {
 
 testsupport::FaultyHost& getFaultyHost() {
-  static testsupport::FaultyHost host(support::getPosixHost());
+  static testsupport::FaultyHost host(support::getNativeHost());
   return host;
 }
 

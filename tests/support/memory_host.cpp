@@ -95,6 +95,17 @@ HostError MemoryHost::openForUpdate(const char* name, FileHandle& file) {
   return openForReading(name, file);
 }
 
+HostError MemoryHost::openSequential(const char* name, FileHandle& file) {
+  return openForReading(name, file);
+}
+
+HostError MemoryHost::readNext(FileHandle file, std::span<uint8_t> bytes, size_t& done) {
+  uint64_t& position = m_Positions[file.number];
+  const HostError error = readAt(file, bytes, position, done);
+  position += done;
+  return error;
+}
+
 HostError MemoryHost::lock(FileHandle) {
   return m_LockAnswer ? m_LockAnswer() : 0;
 }
@@ -162,6 +173,9 @@ HostError MemoryHost::rename(const char* from, const char* to) {
   if (source == m_Files.end()) return ENOENT;
   const auto target = m_Files.find(std::string_view(to));
   if (target != m_Files.end() && target->second->kind == FileKind::Directory) return EISDIR;
+  if (m_WhileWaiting && target != m_Files.end() &&
+      std::find(m_Open.begin(), m_Open.end(), target->second) != m_Open.end())
+    return EBUSY;
   m_Files[to] = source->second;
   m_Files.erase(from);
   return 0;
@@ -169,6 +183,11 @@ HostError MemoryHost::rename(const char* from, const char* to) {
 
 HostError MemoryHost::renameNew(const char* from, const char* to) {
   return has(to) ? EEXIST : rename(from, to);
+}
+
+void MemoryHost::pause(uint32_t milliseconds) {
+  m_TimePaused += milliseconds;
+  if (m_WhileWaiting) m_WhileWaiting();
 }
 
 HostError MemoryHost::remove(const char* name) {

@@ -65,14 +65,29 @@ public:
   // waits for it can be done here, too.
   void setLocks(std::function<support::HostError()> answer) { m_LockAnswer = std::move(answer); }
 
+  // Names are read by the rules of another host from now on.
+  void setPathStyle(support::PathStyle style) { m_PathStyle = style; }
+
+  // From now on a file that is open can't be replaced, as on some disks of Windows; what somebody
+  // else does while one waits for it can be done here.
+  void keepOpenFiles(std::function<void()> whileWaiting = [] {}) {
+    m_WhileWaiting = std::move(whileWaiting);
+  }
+  // In milliseconds, of all pauses together.
+  [[nodiscard]] uint32_t getTimePaused() const { return m_TimePaused; }
+
   // Handles that were opened and not closed.
   [[nodiscard]] size_t openHandles() const;
   // So many bytes have been asked for by readAt, and so many calls were made to it.
   [[nodiscard]] uint64_t getBytesRead() const { return m_BytesRead; }
   [[nodiscard]] uint64_t readCalls() const { return m_ReadCalls; }
 
+  support::PathStyle getPathStyle() const override { return m_PathStyle; }
   support::HostError openForReading(const char* name, support::FileHandle& file) override;
   support::HostError openForUpdate(const char* name, support::FileHandle& file) override;
+  support::HostError openSequential(const char* name, support::FileHandle& file) override;
+  support::HostError readNext(support::FileHandle file, std::span<uint8_t> bytes,
+                              size_t& done) override;
   support::HostError lock(support::FileHandle file) override;
   support::HostError createTemporary(const char* name, support::FileHandle& file) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
@@ -84,6 +99,8 @@ public:
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
+  bool replacesOpenFiles(const char*) override { return !m_WhileWaiting; }
+  void pause(uint32_t milliseconds) override;
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
@@ -102,8 +119,12 @@ private:
   // A file that is replaced or removed lives on for those who have it open.
   std::map<std::string, std::shared_ptr<File>, std::less<>> m_Files;
   std::vector<std::shared_ptr<File>> m_Open; // by handle number; null when closed
+  std::map<int, uint64_t> m_Positions;       // of readNext, by handle number
   std::optional<uint64_t> m_Room;
   std::function<support::HostError()> m_LockAnswer;
+  std::function<void()> m_WhileWaiting; // empty: open files can be replaced
+  support::PathStyle m_PathStyle = support::PathStyle_Posix;
+  uint32_t m_TimePaused = 0;
   uint64_t m_NextInode = 1;
   uint64_t m_NextTemporary = 0;
   uint64_t m_BytesRead = 0;

@@ -136,7 +136,7 @@ ToolRun ToolFolder::collect(int process, const std::string& notes) const {
 }
 
 ToolRun ToolFolder::run(const std::vector<std::string>& words) const {
-  return runOn(support::getPosixHost(), words);
+  return runOn(support::getNativeHost(), words);
 }
 
 ToolRun ToolFolder::runOn(support::Host& host, const std::vector<std::string>& words) const {

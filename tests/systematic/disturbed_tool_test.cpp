@@ -59,7 +59,7 @@ std::string outputOn(ToolFolder& folder, const Words& words, const std::string& 
 // Tells of an archive that is replaced by who has not its turn.
 class WatchingHost final : public FaultyHost {
 public:
-  WatchingHost() : FaultyHost(support::getPosixHost()) {}
+  WatchingHost() : FaultyHost(support::getNativeHost()) {}
 
   support::HostError rename(const char* from, const char* to) override {
     if (!isLocked(to)) std::fputs("Replaced without a turn\n", stderr);

@@ -10,7 +10,7 @@
 
 int main(int, char** arguments) {
   const alloclib::Session session;
-  arlib::Archive archive(support::getPosixHost());
+  arlib::Archive archive(support::getNativeHost());
   if (!arlib::readFile(arguments[1], archive)) return 1;
   std::printf("%zu members\n", archive.getMembers().size());
   return 0;

@@ -104,7 +104,7 @@ protected:
   void SetUp() override {
     m_Module.setErrorHandler(&m_Reports);
     const std::string path = std::string(QUARN_SOURCE_DIR) + "/" + GetParam().name;
-    ASSERT_TRUE(readElfFile(support::getPosixHost(), path.c_str(), m_Module, nullptr))
+    ASSERT_TRUE(readElfFile(support::getNativeHost(), path.c_str(), m_Module, nullptr))
         << testing::PrintToString(m_Reports.m_Texts);
   }
 

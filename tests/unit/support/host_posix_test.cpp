@@ -81,7 +81,7 @@ protected:
   }
 
   fs::path m_Folder;
-  Host& m_Host = getPosixHost();
+  Host& m_Host = getNativeHost();
 };
 
 } // namespace

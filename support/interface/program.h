@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// How a program begins, where hosts differ in it.
+
+#pragma once
+
+namespace support {
+
+/// The words that a program was started with, as `main` has them.
+struct CommandLine {
+  int argc;
+  const char* const* argv;
+};
+
+/// The words in UTF-8: on Windows `main` gets them in the code page of the machine, which has not
+/// every character. They live as long as the process.
+[[nodiscard]] CommandLine getCommandLine(int argc, const char* const* argv);
+
+} // namespace support

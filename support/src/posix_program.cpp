@@ -1,0 +1,13 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Words are bytes here, and a name on disk is the same bytes.
+
+#include "support/interface/program.h"
+
+namespace support {
+
+CommandLine getCommandLine(int argc, const char* const* argv) {
+  return {argc, argv};
+}
+
+} // namespace support
