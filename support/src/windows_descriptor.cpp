@@ -1,0 +1,79 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// Descriptors are the C library's here; what is written goes past it, as it would put a carriage
+// return in front of each line feed. A console takes UTF-16, whatever code page it is set to.
+
+#include "support/interface/descriptor.h"
+
+#include "support/src/windows_names.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdint>
+#include <fcntl.h>
+#include <io.h>
+#include <string>
+#include <windows.h>
+
+// What other code writes to the standard streams is no different.
+extern "C" {
+extern int _CRT_fmode;
+int _CRT_fmode = _O_BINARY;
+}
+
+namespace support {
+
+namespace {
+
+constexpr int LowestDuplicate = ErrorDescriptor + 1;
+constexpr size_t LargestPiece = 0x8000; // that every console takes at once
+
+HANDLE handleOf(int descriptor) {
+  return reinterpret_cast<HANDLE>(_get_osfhandle(descriptor));
+}
+
+bool isConsole(HANDLE handle) {
+  DWORD mode = 0;
+  return GetConsoleMode(handle, &mode) != 0;
+}
+
+HostError writeToConsole(HANDLE console, std::string_view bytes) {
+  const std::wstring text = widenLoosely(bytes);
+  for (size_t at = 0; at < text.size();) {
+    DWORD written = 0;
+    const auto size = static_cast<DWORD>(std::min(text.size() - at, LargestPiece));
+    if (WriteConsoleW(console, text.data() + at, size, &written, nullptr) == 0)
+      return lastHostError();
+    at += written;
+  }
+  return 0;
+}
+
+} // namespace
+
+// The C library gives out its lowest free number.
+int duplicateDescriptor(int descriptor) {
+  const int duplicate = _dup(descriptor);
+  if (duplicate < 0 || duplicate >= LowestDuplicate) return duplicate;
+  const int higher = duplicateDescriptor(descriptor);
+  _close(duplicate);
+  return higher;
+}
+
+HostError writeToDescriptor(int descriptor, std::string_view bytes) {
+  const HANDLE handle = handleOf(descriptor);
+  if (isConsole(handle)) return writeToConsole(handle, bytes);
+  while (!bytes.empty()) {
+    DWORD written = 0;
+    const auto size = static_cast<DWORD>(std::min<size_t>(bytes.size(), INT32_MAX));
+    if (WriteFile(handle, bytes.data(), size, &written, nullptr) == 0) return lastHostError();
+    bytes.remove_prefix(written);
+  }
+  return 0;
+}
+
+HostError closeDescriptor(int descriptor) {
+  return _close(descriptor) == 0 ? 0 : errno;
+}
+
+} // namespace support

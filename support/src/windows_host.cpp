@@ -1,0 +1,524 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// The Windows host. Files are opened so that others may read, write, replace and remove them
+// meanwhile: who has one open keeps it as it is, as on POSIX. What differs:
+//
+// - A file can be replaced while it is open only where the file system can do that (NTFS from
+//   Windows 10 on); elsewhere the caller is told to let go of his own handles first.
+// - A lock keeps others from reading the range that it covers. It is taken far behind the end of
+//   any file, so that it says "I write" to those who ask for it, and nothing to anybody else.
+// - A handler of Ctrl-C and the like runs in a thread of its own. The table of temporaries is
+//   therefore changed together with the disk, under a lock that the handler never gives back.
+
+#include "support/interface/host.h"
+
+#include "support/src/windows_names.h"
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+#include <memory>
+#include <windows.h>
+
+namespace support {
+
+// No number of the C library's of this host is as large.
+const HostError FileHasChanged = 10070;
+
+namespace {
+
+constexpr DWORD ShareAll = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE;
+constexpr DWORD LargestPiece = 0x40000000; // bytes that one call reads or writes
+constexpr uint32_t WritableMode = 0100666;
+constexpr uint32_t ReadOnlyMode = 0100444;
+constexpr uint32_t DirectoryMode = 040777;
+constexpr uint32_t SpecialMode = 020666;
+constexpr uint32_t WriteBits = 0222;
+
+// As on POSIX: one archive is written at a time, and its members rarely have temporaries of their
+// own; what finds no room here is simply not removed.
+constexpr size_t MaximumTemporaries = 16;
+
+struct Temporaries {
+  SRWLOCK lock = SRWLOCK_INIT;
+  std::array<std::wstring, MaximumTemporaries> names; // empty: not used
+};
+
+// Never destroyed: the handler may run while the process ends.
+Temporaries& temporaries() {
+  static Temporaries& all = *new Temporaries;
+  return all;
+}
+
+// Keeps the handler away while the table and the disk disagree.
+class TableHold {
+public:
+  TableHold() { AcquireSRWLockExclusive(&temporaries().lock); }
+  ~TableHold() { ReleaseSRWLockExclusive(&temporaries().lock); }
+  TableHold(const TableHold&) = delete;
+  TableHold& operator=(const TableHold&) = delete;
+
+  void enter(const std::wstring& name) { replace({}, name); }
+  void forget(const std::wstring& name) { replace(name, {}); }
+
+private:
+  static void replace(const std::wstring& before, const std::wstring& after) {
+    auto& names = temporaries().names;
+    const auto slot = std::find(names.begin(), names.end(), before);
+    if (slot != names.end()) *slot = after;
+  }
+};
+
+// The default handler, which comes next, ends the process.
+BOOL WINAPI removeTemporaries(DWORD) {
+  AcquireSRWLockExclusive(&temporaries().lock);
+  for (const std::wstring& name : temporaries().names) {
+    if (!name.empty()) DeleteFileW(name.c_str());
+  }
+  return FALSE;
+}
+
+// 64-bit Windows gives handles of which 32 bits count, so that programs of 32 bits can share them.
+HANDLE handleOf(FileHandle file) {
+  return reinterpret_cast<HANDLE>(static_cast<intptr_t>(file.number));
+}
+
+HostError numberOf(HANDLE handle, FileHandle& file) {
+  file.number =
+      handle == INVALID_HANDLE_VALUE ? -1 : static_cast<int>(reinterpret_cast<intptr_t>(handle));
+  return file.isOpen() ? 0 : lastHostError();
+}
+
+bool isDirectory(HANDLE handle) {
+  BY_HANDLE_FILE_INFORMATION info;
+  return GetFileInformationByHandle(handle, &info) != 0 &&
+         (info.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
+}
+
+bool hasAttribute(const std::wstring& name, DWORD attribute) {
+  const DWORD attributes = GetFileAttributesW(name.c_str());
+  return attributes != INVALID_FILE_ATTRIBUTES && (attributes & attribute) != 0;
+}
+
+// Whether the part in front of the leaf is there, and no directory.
+bool isBelowFile(const std::wstring& name) {
+  const size_t separator = name.find_last_of(L"\\/");
+  if (separator == std::wstring::npos || separator == 0) return false;
+  const DWORD attributes = GetFileAttributesW(name.substr(0, separator).c_str());
+  return attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_DIRECTORY) == 0;
+}
+
+// A call that no directory takes says "access denied" of one, as of much else; and "not found" is
+// said also of a name that goes on behind a file's.
+HostError errorOf(HostError error, const std::wstring& name) {
+  if (error == EACCES && hasAttribute(name, FILE_ATTRIBUTE_DIRECTORY)) return EISDIR;
+  return error == ENOENT && isBelowFile(name) ? ENOTDIR : error;
+}
+
+HostError openNative(const std::wstring& name, DWORD access, DWORD disposition, FileHandle& file,
+                     DWORD flags = 0) {
+  const HANDLE handle = CreateFileW(name.c_str(), access, ShareAll, nullptr, disposition,
+                                    FILE_ATTRIBUTE_NORMAL | flags, nullptr);
+  const HostError error = numberOf(handle, file);
+  return error == 0 ? 0 : errorOf(error, name);
+}
+
+// Directories open, too, and fail when they are read.
+HostError openExisting(const char* name, DWORD access, FileHandle& file) {
+  std::wstring native;
+  if (const HostError error = nativeName(name, native); error != 0) return error;
+  return openNative(native, access, OPEN_EXISTING, file, FILE_FLAG_BACKUP_SEMANTICS);
+}
+
+constexpr int64_t TicksOfSecond = 10'000'000;
+constexpr int64_t SecondsBefore1970 = 11'644'473'600; // since 1601
+
+int64_t joined(DWORD high, DWORD low) {
+  return static_cast<int64_t>(uint64_t{high} << 32 | low);
+}
+
+void setTime(FileStatus& status, const FILETIME& time) {
+  const int64_t ticks = joined(time.dwHighDateTime, time.dwLowDateTime);
+  status.modificationTime = ticks / TicksOfSecond - SecondsBefore1970;
+  status.modificationNanoseconds = static_cast<uint32_t>(ticks % TicksOfSecond * 100);
+}
+
+FileStatus statusFrom(const BY_HANDLE_FILE_INFORMATION& info) {
+  const bool isDirectory = (info.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
+  const bool isReadOnly = (info.dwFileAttributes & FILE_ATTRIBUTE_READONLY) != 0;
+  FileStatus status;
+  status.kind = isDirectory ? FileKind::Directory : FileKind::RegularFile;
+  status.size = joined(info.nFileSizeHigh, info.nFileSizeLow);
+  status.mode = isDirectory ? DirectoryMode : isReadOnly ? ReadOnlyMode : WritableMode;
+  status.device = info.dwVolumeSerialNumber;
+  status.inode = static_cast<uint64_t>(joined(info.nFileIndexHigh, info.nFileIndexLow));
+  setTime(status, info.ftLastWriteTime);
+  return status;
+}
+
+HostError statusOfHandle(HANDLE handle, FileStatus& status) {
+  status = FileStatus();
+  if (GetFileType(handle) != FILE_TYPE_DISK) {
+    status.kind = FileKind::Special;
+    status.mode = SpecialMode;
+    return 0;
+  }
+  BY_HANDLE_FILE_INFORMATION info;
+  if (GetFileInformationByHandle(handle, &info) == 0) return lastHostError();
+  status = statusFrom(info);
+  return 0;
+}
+
+// FILE_RENAME_INFO as it is since Windows 10, with flags in the place of a truth value.
+struct RenameHead {
+  DWORD flags;
+  HANDLE root;
+  DWORD length; // bytes
+};
+constexpr DWORD RenameReplaces = 1;
+constexpr DWORD RenameAsPosix = 2;
+constexpr auto RenameInfoEx = static_cast<FILE_INFO_BY_HANDLE_CLASS>(22);
+constexpr DWORD SupportsPosixRename = 0x400; // of a file system
+
+class OwnedHandle {
+public:
+  explicit OwnedHandle(HANDLE handle) : m_Handle(handle) {}
+  ~OwnedHandle() {
+    if (isOpen()) CloseHandle(m_Handle);
+  }
+  OwnedHandle(const OwnedHandle&) = delete;
+  OwnedHandle& operator=(const OwnedHandle&) = delete;
+
+  [[nodiscard]] bool isOpen() const { return m_Handle != INVALID_HANDLE_VALUE; }
+  [[nodiscard]] HANDLE get() const { return m_Handle; }
+
+private:
+  HANDLE m_Handle;
+};
+
+// One step also where somebody has the old file open.
+bool renameAsPosix(const std::wstring& from, const std::wstring& to) {
+  const OwnedHandle file(CreateFileW(from.c_str(), DELETE | SYNCHRONIZE, ShareAll, nullptr,
+                                     OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr));
+  if (!file.isOpen()) return false;
+  const std::wstring path = wholePath(to);
+  constexpr size_t NamePlace = offsetof(RenameHead, length) + sizeof(DWORD);
+  const size_t nameSize = path.size() * sizeof(wchar_t);
+  // Of the size that the call wants at least, with a NUL behind the name.
+  std::vector<std::byte> bytes(std::max(NamePlace + nameSize, sizeof(RenameHead)) +
+                               sizeof(wchar_t));
+  const RenameHead head = {RenameReplaces | RenameAsPosix, nullptr, static_cast<DWORD>(nameSize)};
+  std::memcpy(bytes.data(), &head, NamePlace);
+  std::memcpy(bytes.data() + NamePlace, path.data(), nameSize);
+  return SetFileInformationByHandle(file.get(), RenameInfoEx, bytes.data(),
+                                    static_cast<DWORD>(bytes.size())) != 0;
+}
+
+// "Access denied" is also the answer where a file that is open would have to go.
+HostError replaceError(const std::wstring& to) {
+  const HostError error = errorOf(lastHostError(), to);
+  const bool isInTheWay = error == EACCES && !hasAttribute(to, FILE_ATTRIBUTE_READONLY);
+  return isInTheWay ? EBUSY : error;
+}
+
+HostError replaceNative(const std::wstring& from, const std::wstring& to) {
+  if (renameAsPosix(from, to)) return 0;
+  if (MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING) != 0) return 0;
+  return replaceError(to);
+}
+
+HostError removeNative(const std::wstring& name) {
+  if (DeleteFileW(name.c_str()) != 0) return 0;
+  const HostError error = errorOf(lastHostError(), name);
+  // A file that may not be written may still be removed, as on POSIX.
+  if (error != EACCES || !hasAttribute(name, FILE_ATTRIBUTE_READONLY)) return error;
+  SetFileAttributesW(name.c_str(), FILE_ATTRIBUTE_NORMAL);
+  return DeleteFileW(name.c_str()) != 0 ? 0 : lastHostError();
+}
+
+// What FindFirstFileW finds, but for the folder itself and the one above.
+HostError findNative(const std::wstring& pattern, std::vector<std::string>& names) {
+  names.clear();
+  WIN32_FIND_DATAW found;
+  const HANDLE search = FindFirstFileW(pattern.c_str(), &found);
+  if (search == INVALID_HANDLE_VALUE) return lastHostError();
+  const std::unique_ptr<void, decltype(&FindClose)> closer(search, FindClose);
+  do {
+    std::string leaf = narrow(found.cFileName);
+    if (leaf != "." && leaf != "..") names.push_back(std::move(leaf));
+  } while (FindNextFileW(search, &found) != 0);
+  return GetLastError() == ERROR_NO_MORE_FILES ? 0 : lastHostError();
+}
+
+class WindowsHost final : public Host {
+public:
+  PathStyle getPathStyle() const override { return PathStyle_Windows; }
+
+  HostError openForReading(const char* name, FileHandle& file) override {
+    return openExisting(name, GENERIC_READ, file);
+  }
+
+  HostError openForUpdate(const char* name, FileHandle& file) override {
+    const HostError error = openExisting(name, GENERIC_READ | GENERIC_WRITE, file);
+    if (error != 0 || !isDirectory(handleOf(file))) return error;
+    CloseHandle(handleOf(file));
+    return EISDIR;
+  }
+
+  HostError openSequential(const char* name, FileHandle& file) override {
+    return openForReading(name, file);
+  }
+
+  HostError readNext(FileHandle file, std::span<uint8_t> bytes, size_t& done) override {
+    DWORD count = 0;
+    const auto size = static_cast<DWORD>(std::min<size_t>(bytes.size(), LargestPiece));
+    const bool isRead = ReadFile(handleOf(file), bytes.data(), size, &count, nullptr) != 0;
+    done = count;
+    // The end of a pipe.
+    return isRead || GetLastError() == ERROR_BROKEN_PIPE ? 0 : readError(file);
+  }
+
+  HostError lock(FileHandle file) override {
+    OVERLAPPED place = {};
+    place.Offset = 0;
+    place.OffsetHigh = 0x7FFFFFFE;
+    return LockFileEx(handleOf(file), LOCKFILE_EXCLUSIVE_LOCK, 0, 1, 0, &place) != 0
+               ? 0
+               : lastHostError();
+  }
+
+  HostError createTemporary(const char* name, FileHandle& file) override {
+    std::wstring native;
+    if (const HostError error = nativeName(name, native); error != 0) return error;
+    TableHold table;
+    const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file);
+    if (error == 0) table.enter(native);
+    return error;
+  }
+
+  HostError createUnnamedTemporary(std::string& name, FileHandle& file) override {
+    std::array<wchar_t, MAX_PATH + 1> place;
+    std::array<wchar_t, MAX_PATH> path;
+    if (GetTempPathW(static_cast<DWORD>(place.size()), place.data()) == 0) return lastHostError();
+    TableHold table;
+    // Makes an empty file with a name that nothing had.
+    if (GetTempFileNameW(place.data(), L"qrn", 0, path.data()) == 0) return lastHostError();
+    const HostError error =
+        openNative(path.data(), GENERIC_READ | GENERIC_WRITE, OPEN_EXISTING, file);
+    name = narrow(path.data());
+    if (error == 0) table.enter(path.data());
+    return error;
+  }
+
+  // Emptied by a second step, as creating anew wants the attributes that the file has.
+  HostError openForWriting(const char* name, FileHandle& file) override {
+    std::wstring native;
+    if (const HostError error = nativeName(name, native); error != 0) return error;
+    if (const HostError error = openNative(native, GENERIC_WRITE, OPEN_ALWAYS, file); error != 0)
+      return error;
+    if (GetFileType(handleOf(file)) != FILE_TYPE_DISK || SetEndOfFile(handleOf(file)) != 0)
+      return 0;
+    const HostError error = lastHostError();
+    CloseHandle(handleOf(file));
+    return error;
+  }
+
+  HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                   size_t& done) override {
+    done = 0;
+    while (done < bytes.size()) {
+      OVERLAPPED place = {};
+      place.Offset = static_cast<DWORD>(offset + done);
+      place.OffsetHigh = static_cast<DWORD>((offset + done) >> 32);
+      DWORD count = 0;
+      const auto size = static_cast<DWORD>(std::min<size_t>(bytes.size() - done, LargestPiece));
+      if (ReadFile(handleOf(file), bytes.data() + done, size, &count, &place) == 0)
+        return GetLastError() == ERROR_HANDLE_EOF ? 0 : readError(file);
+      if (count == 0) break;
+      done += count;
+    }
+    return 0;
+  }
+
+  HostError write(FileHandle file, std::span<const uint8_t> bytes) override {
+    while (!bytes.empty()) {
+      DWORD count = 0;
+      const auto size = static_cast<DWORD>(std::min<size_t>(bytes.size(), LargestPiece));
+      if (WriteFile(handleOf(file), bytes.data(), size, &count, nullptr) == 0)
+        return lastHostError();
+      // No progress and no reason: going on would never end.
+      if (count == 0) return EIO;
+      bytes = bytes.subspan(count);
+    }
+    return 0;
+  }
+
+  // Every write has reached the system when it returns: nothing is held back in the process.
+  HostError flush(FileHandle) override { return 0; }
+
+  HostError close(FileHandle file) override {
+    return CloseHandle(handleOf(file)) != 0 ? 0 : lastHostError();
+  }
+
+  HostError rename(const char* from, const char* to) override {
+    return renameBy(from, to, replaceNative);
+  }
+
+  HostError renameNew(const char* from, const char* to) override {
+    return renameBy(from, to, [](const std::wstring& source, const std::wstring& target) {
+      return MoveFileExW(source.c_str(), target.c_str(), 0) != 0 ? 0 : lastHostError();
+    });
+  }
+
+  bool replacesOpenFiles(const char* name) override {
+    std::wstring native;
+    if (nativeName(name, native) != 0) return true;
+    const OwnedHandle file(CreateFileW(native.c_str(), FILE_READ_ATTRIBUTES, ShareAll, nullptr,
+                                       OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr));
+    DWORD abilities = 0;
+    return !file.isOpen() || (GetVolumeInformationByHandleW(file.get(), nullptr, 0, nullptr,
+                                                            nullptr, &abilities, nullptr, 0) != 0 &&
+                              (abilities & SupportsPosixRename) != 0);
+  }
+
+  void pause(uint32_t milliseconds) override { Sleep(milliseconds); }
+
+  HostError remove(const char* name) override {
+    std::wstring native;
+    if (const HostError error = nativeName(name, native); error != 0) return error;
+    TableHold table;
+    const HostError error = removeNative(native);
+    if (error == 0) table.forget(native);
+    return error;
+  }
+
+  HostError status(const char* name, FileStatus& status) override {
+    status = FileStatus();
+    std::wstring native;
+    if (const HostError error = nativeName(name, native); error != 0) return error;
+    const OwnedHandle file(CreateFileW(native.c_str(), FILE_READ_ATTRIBUTES, ShareAll, nullptr,
+                                       OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
+    return file.isOpen() ? statusOfHandle(file.get(), status) : errorOf(lastHostError(), native);
+  }
+
+  HostError statusOf(FileHandle file, FileStatus& status) override {
+    return statusOfHandle(handleOf(file), status);
+  }
+
+  bool isWritable(const char* name) override {
+    std::wstring native;
+    return nativeName(name, native) == 0 &&
+           GetFileAttributesW(native.c_str()) != INVALID_FILE_ATTRIBUTES &&
+           !hasAttribute(native, FILE_ATTRIBUTE_READONLY);
+  }
+
+  void setPermissions(FileHandle file, uint32_t mode) override {
+    FILE_BASIC_INFO info = {}; // times of 0 stay as they are
+    info.FileAttributes = (mode & WriteBits) == 0 ? FILE_ATTRIBUTE_READONLY : FILE_ATTRIBUTE_NORMAL;
+    SetFileInformationByHandle(handleOf(file), FileBasicInfo, &info, sizeof info);
+  }
+
+  void setTimes(FileHandle file, int64_t seconds) override {
+    const auto ticks = static_cast<uint64_t>((seconds + SecondsBefore1970) * TicksOfSecond);
+    const FILETIME time = {static_cast<DWORD>(ticks), static_cast<DWORD>(ticks >> 32)};
+    SetFileTime(handleOf(file), nullptr, &time, &time);
+  }
+
+  // Where the last link leads nowhere, it is the name that it is.
+  std::string followLinks(const char* name) override {
+    std::wstring native;
+    if (nativeName(name, native) != 0 || !hasAttribute(native, FILE_ATTRIBUTE_REPARSE_POINT))
+      return name;
+    const OwnedHandle file(CreateFileW(native.c_str(), FILE_READ_ATTRIBUTES, ShareAll, nullptr,
+                                       OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
+    if (!file.isOpen()) return name;
+    std::wstring path(GetFinalPathNameByHandleW(file.get(), nullptr, 0, 0), L'\0'); // with the NUL
+    const DWORD written =
+        GetFinalPathNameByHandleW(file.get(), path.data(), static_cast<DWORD>(path.size()), 0);
+    if (written == 0 || written >= path.size()) return name;
+    path.resize(written);
+    return narrow(path);
+  }
+
+  HostError listDirectory(const char* name, std::vector<std::string>& names) override {
+    return findNames(name, "*", names);
+  }
+
+  HostError findNames(std::string_view directory, std::string_view leaf,
+                      std::vector<std::string>& names) override {
+    names.clear();
+    std::wstring native;
+    std::wstring pattern;
+    if (const HostError error = nativeName(directory, native); error != 0) return error;
+    if (!widen(leaf, pattern)) return EILSEQ;
+    // A drive alone is the folder that one is in on that drive.
+    if (isDriveName(directory)) native = wholePath(native);
+    const bool isOpenEnded = !native.empty() && native.back() != L'\\' && native.back() != L'/';
+    if (isOpenEnded) native += L'\\';
+    return findNative(native + pattern, names);
+  }
+
+private:
+  // A directory says "invalid function".
+  static HostError readError(FileHandle file) {
+    const HostError error = lastHostError();
+    return isDirectory(handleOf(file)) ? EISDIR : error;
+  }
+
+  template <class Rename>
+  static HostError renameBy(const char* from, const char* to, const Rename& rename) {
+    std::wstring source;
+    std::wstring target;
+    if (const HostError error = nativeName(from, source); error != 0) return error;
+    if (const HostError error = nativeName(to, target); error != 0) return error;
+    TableHold table;
+    const HostError error = rename(source, target);
+    if (error == 0) table.forget(source);
+    return error;
+  }
+};
+
+struct ErrorText {
+  HostError error;
+  const char* text;
+};
+
+// Where the C library of this host has other words than those of POSIX systems.
+constexpr ErrorText ErrorTexts[] = {
+    {EBUSY, "Device or resource busy"},
+    {EXDEV, "Invalid cross-device link"},
+    {EINVAL, "Invalid argument"},
+    {EFBIG, "File too large"},
+    {EROFS, "Read-only file system"},
+    {ENAMETOOLONG, "File name too long"},
+    {ENOSYS, "Function not implemented"},
+    {ELOOP, "Too many levels of symbolic links"},
+    {EILSEQ, "Invalid or incomplete multibyte or wide character"},
+    {FileHasChanged, "Stale file handle"},
+};
+
+} // namespace
+
+std::string hostErrorText(HostError error) {
+  const auto* row = std::find_if(std::begin(ErrorTexts), std::end(ErrorTexts),
+                                 [error](const ErrorText& r) { return r.error == error; });
+  if (row != std::end(ErrorTexts)) return row->text;
+  const std::string text = std::strerror(error);
+  return text == "Unknown error" ? text + " " + std::to_string(error) : text;
+}
+
+Host& getNativeHost() {
+  static WindowsHost host;
+  return host;
+}
+
+void installSignalCleanUp() {
+  // No box that nobody can answer where a disk is not in its drive.
+  SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX | SEM_NOOPENFILEERRORBOX);
+  SetConsoleCtrlHandler(removeTemporaries, TRUE);
+}
+
+} // namespace support
