@@ -9,7 +9,10 @@ set(target x86_64-w64-mingw32)
 find_program(QUARN_MINGW_CXX NAMES ${target}-g++-posix ${target}-g++ REQUIRED
   DOC "The compiler for Windows (package g++-mingw-w64-x86-64)")
 set(CMAKE_CXX_COMPILER ${QUARN_MINGW_CXX})
+string(REPLACE "g++" "gcc" CMAKE_C_COMPILER ${QUARN_MINGW_CXX}) # tests are built with a library that asks for one
 set(CMAKE_RC_COMPILER ${target}-windres)
+# The compiler's own libraries are on no machine but this one.
+set(CMAKE_EXE_LINKER_FLAGS_INIT "-static")
 
 set(CMAKE_FIND_ROOT_PATH /usr/${target})
 set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)

@@ -495,6 +495,7 @@ constexpr ErrorText ErrorTexts[] = {
     {EROFS, "Read-only file system"},
     {ENAMETOOLONG, "File name too long"},
     {ENOSYS, "Function not implemented"},
+    {EOVERFLOW, "Value too large for defined data type"},
     {ELOOP, "Too many levels of symbolic links"},
     {EILSEQ, "Invalid or incomplete multibyte or wide character"},
     {FileHasChanged, "Stale file handle"},

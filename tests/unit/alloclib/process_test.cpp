@@ -6,13 +6,10 @@
 
 #include "region_fixture.h"
 
-#include <csignal>
-
 namespace alloclib {
 namespace {
 
 using testing::ExitedWithCode;
-using testing::KilledBySignal;
 
 using ProcessTest = RegionTest;
 using ProcessDeathTest = RegionTest;
@@ -142,13 +139,13 @@ TEST_F(ProcessDeathTest, AHandlerThatReturnsEndsInAnAbort) {
         setInternalErrorHandler([](const char*) {});
         internalError("anything");
       },
-      KilledBySignal(SIGABRT), "");
+      testsupport::hasAborted, "");
   EXPECT_EXIT(
       {
         setOutOfMemoryHandler([](size_t, size_t) {});
         outOfMemory(1);
       },
-      KilledBySignal(SIGABRT), "");
+      testsupport::hasAborted, "");
 }
 
 TEST_F(ProcessTest, ANullHandlerBringsTheDefaultBack) {

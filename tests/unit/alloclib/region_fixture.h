@@ -10,17 +10,18 @@
 #include "alloclib/interface/region_large_block.h"
 #include "alloclib/interface/region_malloc_free.h"
 #include "alloclib/interface/region_stats.h"
+#include "tests/support/test_host.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cstdio>
-#include <cstdlib>
+#include <fstream>
+#include <new>
+#include <sstream>
 #include <string>
 #include <vector>
-
-#include <sys/mman.h>
 
 namespace alloclib {
 
@@ -73,18 +74,15 @@ class RecordingRegion final : public Region {
 public:
   void* AllocFull(size_t size, size_t alignment, const char*) override {
     allocations.push_back(size);
-    if (size >= HugeSize)
-      return mmap(nullptr, size, PROT_READ | PROT_WRITE,
-                  MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
-    return std::aligned_alloc(std::max<size_t>(alignment, 16),
-                              roundUp(size, std::max<size_t>(alignment, 16)));
+    if (size >= HugeSize) return testsupport::takeAddresses(size);
+    return ::operator new(size, std::align_val_t(std::max<size_t>(alignment, Alignment)));
   }
-  void DiscardFull(void* pointer, size_t size, size_t) override {
+  void DiscardFull(void* pointer, size_t size, size_t alignment) override {
     discards.push_back(size);
     if (size >= HugeSize)
-      munmap(pointer, size);
+      testsupport::giveAddressesBack(pointer, size);
     else
-      std::free(pointer);
+      ::operator delete(pointer, std::align_val_t(std::max<size_t>(alignment, Alignment)));
   }
   void Destroy(bool) override {}
 
@@ -93,6 +91,7 @@ public:
 
 private:
   static constexpr size_t HugeSize = size_t{1} << 30;
+  static constexpr size_t Alignment = 16;
 };
 
 class RegionTest : public testing::Test {
@@ -107,14 +106,13 @@ protected:
 };
 
 inline std::string getReport(bool includeFinished, bool flagLive) {
-  char* text = nullptr;
-  size_t length = 0;
-  std::FILE* stream = open_memstream(&text, &length);
+  const std::string name = testing::TempDir() + "region_report";
+  std::FILE* stream = std::fopen(name.c_str(), "wb");
   RegionStats::report(stream, includeFinished, flagLive);
   std::fclose(stream);
-  std::string report(text, length);
-  std::free(text);
-  return report;
+  std::stringstream report;
+  report << std::ifstream(name, std::ios::binary).rdbuf();
+  return report.str();
 }
 
 } // namespace alloclib

@@ -188,8 +188,16 @@ std::string traceAll(uint32_t level, bool accurate) {
 
 const std::string Created = "(loud:2) New region (4096) initial_size. Tracing is ACCURATE\n"
                             "(loud:2) region extended\n";
-const std::string Used = "(loud:2) Allocation at (0x1000) (10) bytes (6) padding (unknown) type\n"
-                         "(loud:2) Discarded block at (0x1000) (10) bytes (6) padding\n";
+// As the host's C library writes it.
+std::string pointerText() {
+  char text[32];
+  std::snprintf(text, sizeof text, "%p", reinterpret_cast<void*>(0x1000));
+  return text;
+}
+
+const std::string Used =
+    "(loud:2) Allocation at (" + pointerText() + ") (10) bytes (6) padding (unknown) type\n" +
+    "(loud:2) Discarded block at (" + pointerText() + ") (10) bytes (6) padding\n";
 const std::string Moved = "(loud:2) overhead increased (24) bytes \n"
                           "(loud:2) overhead decreased (20) bytes \n"
                           "(loud:2) fragmentation increased (9) bytes\n"

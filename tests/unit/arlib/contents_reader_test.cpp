@@ -122,7 +122,7 @@ TEST_F(ContentsReaderTest, ReportsAFileThatWasWrittenToMeanwhile) {
   EXPECT_EQ(readAll(reader, *grown), "1234");
   m_Host.at("x").bytes += "5";
   EXPECT_FALSE(reader.finish());
-  EXPECT_EQ(reader.getError(), ESTALE);
+  EXPECT_EQ(reader.getError(), support::FileHasChanged);
   EXPECT_FALSE(reader.start(*rewritten));
   EXPECT_EQ(readAll(reader, *rewritten), "1234");
   m_Host.at("y").modificationTime += 1;

@@ -6,10 +6,11 @@
 
 #include "checking/interface/checking.h"
 
+#include "tests/support/test_host.h"
+
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <string>
@@ -17,7 +18,9 @@
 namespace checking {
 namespace {
 
+using testing::EndsWith;
 using testing::ExitedWithCode;
+using testing::StartsWith;
 
 std::string shownText;
 
@@ -125,10 +128,12 @@ TEST_F(CheckingTest, TextsGoToStandardOutputByDefault) {
 using CheckingDeathTest = CheckingTest;
 
 TEST_F(CheckingDeathTest, AFailureNamesItsPlaceAndExpressionAndExitsWithOne) {
-  const int index = 3;
-  const int m_Used = 2;
-  EXPECT_EXIT(QUARN_ASSERT(1, index < m_Used), ExitedWithCode(1),
-              "^Assertion failed: .*checking_test.cpp line [0-9]+ \\(index < m_Used\\)\n$");
+  static constexpr int index = 3;
+  static constexpr int m_Used = 2;
+  const std::string line = std::to_string(__LINE__ + 1);
+  const auto fail = [] { QUARN_ASSERT(1, index < m_Used); };
+  EXPECT_EXIT(fail(), ExitedWithCode(1),
+              EndsWith("checking_test.cpp line " + line + " (index < m_Used)\n"));
 }
 
 TEST_F(CheckingDeathTest, TheExpressionIsQuotedAsItWasWritten) {
@@ -137,7 +142,8 @@ TEST_F(CheckingDeathTest, TheExpressionIsQuotedAsItWasWritten) {
 }
 
 TEST_F(CheckingDeathTest, ThePathIsRelativeToTheTree) {
-  EXPECT_EXIT(QUARN_ASSERT(1, false), ExitedWithCode(1), "^Assertion failed: [^/]");
+  EXPECT_EXIT(QUARN_ASSERT(1, false), ExitedWithCode(1),
+              StartsWith("Assertion failed: tests/unit/checking/"));
 }
 
 TEST_F(CheckingDeathTest, AnInstalledHandlerGetsTheFailure) {
@@ -159,13 +165,13 @@ TEST_F(CheckingDeathTest, AHandlerThatReturnsEndsInAnAbort) {
         setFailureHandler([](const char*, unsigned, const char*) {});
         QUARN_ASSERT(1, false);
       },
-      testing::KilledBySignal(SIGABRT), "");
+      testsupport::hasAborted, "");
   EXPECT_EXIT(
       {
         setFaultHandler([](const char*) {});
         reportFault("anything");
       },
-      testing::KilledBySignal(SIGABRT), "");
+      testsupport::hasAborted, "");
 }
 
 TEST_F(CheckingDeathTest, AFaultIsPrintedAndExitsWithOne) {

@@ -3,19 +3,14 @@
 // The lines of a table of contents, to the letter, in the short form and the long one: order,
 // columns, permissions, and dates in local time.
 
+#include "tests/support/test_host.h"
 #include "tests/unit/quarn/driver_fixture.h"
-
-#include <cstdlib>
-#include <ctime>
 
 namespace quarn {
 
 class ListingTest : public DriverTest {
 protected:
-  ListingTest() {
-    setenv("TZ", "UTC", 1);
-    tzset();
-  }
+  ListingTest() { testsupport::setTimeZone("UTC"); }
 
   std::string listed(int64_t date, uint32_t uid, uint32_t gid, std::string_view octalMode) {
     m_Host.addFile(
@@ -48,8 +43,7 @@ TEST_F(ListingTest, ShowsPermissionsWithoutTheType) {
 
 TEST_F(ListingTest, ShowsDatesInLocalTime) {
   EXPECT_THAT(listed(0, 0, 0, "644"), HasSubstr(" Jan 01 00:00 1970 "));
-  setenv("TZ", "XYZ-1", 1);
-  tzset();
+  testsupport::setTimeZone("XYZ-1");
   EXPECT_THAT(listed(0, 0, 0, "644"), HasSubstr(" Jan 01 01:00 1970 "));
 }
 

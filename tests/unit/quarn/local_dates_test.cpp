@@ -7,6 +7,8 @@
 
 #include "quarn/local_dates.h"
 
+#include "tests/support/test_host.h"
+
 #include <gtest/gtest.h>
 
 #include <cstdlib>
@@ -24,28 +26,20 @@ class TimeZone {
 public:
   explicit TimeZone(const char* name) {
     if (const char* before = std::getenv("TZ")) m_Before = before;
-    set(name);
+    testsupport::setTimeZone(name);
   }
-  ~TimeZone() { set(m_Before ? m_Before->c_str() : nullptr); }
+  ~TimeZone() { testsupport::setTimeZone(m_Before ? m_Before->c_str() : nullptr); }
 
 private:
-  static void set(const char* name) {
-    if (name == nullptr)
-      unsetenv("TZ");
-    else
-      setenv("TZ", name, 1);
-    tzset();
-  }
-
   std::optional<std::string> m_Before;
 };
 
 std::string byTheHost(int64_t date) {
   const auto seconds = static_cast<time_t>(date);
-  tm brokenDown = {};
-  if (localtime_r(&seconds, &brokenDown) == nullptr) return {};
+  const tm* brokenDown = std::localtime(&seconds);
+  if (brokenDown == nullptr) return {};
   char text[18];
-  return {text, strftime(text, sizeof text, "%b %d %H:%M %Y", &brokenDown)};
+  return {text, strftime(text, sizeof text, "%b %d %H:%M %Y", brokenDown)};
 }
 
 // The offset of this one changes on the second Sunday of March and the first one of November.

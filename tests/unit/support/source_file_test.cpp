@@ -41,7 +41,7 @@ protected:
   SourceFiles m_Files{m_Host, 3};
 };
 
-const std::string Stale = "error " + std::to_string(ESTALE);
+const std::string Stale = "error " + std::to_string(FileHasChanged);
 
 } // namespace
 
@@ -101,10 +101,10 @@ TEST_F(SourceFileTest, NoticesThatItWasWrittenTo) {
   const auto file = open("a", "1234");
   EXPECT_EQ(file->checkUnchanged(), 0);
   m_Disk.at("a").bytes = "12345";
-  EXPECT_EQ(file->checkUnchanged(), ESTALE);
+  EXPECT_EQ(file->checkUnchanged(), FileHasChanged);
   m_Disk.at("a").bytes = "5678";
   m_Disk.at("a").modificationNanoseconds = 1;
-  EXPECT_EQ(file->checkUnchanged(), ESTALE);
+  EXPECT_EQ(file->checkUnchanged(), FileHasChanged);
 }
 
 TEST_F(SourceFileTest, MakesRoomWhereTheHostHasNone) {
@@ -269,7 +269,7 @@ TEST_F(SourceFileTest, IsNotKeptIfItCannotBeReadAsItIs) {
     m_Host.disturbCall(call, [&] { m_Disk.at("a").bytes = "smaller"; });
     ASSERT_EQ(m_Files.openToKeep("a", file), 0);
     EXPECT_FALSE(file->isKept());
-    EXPECT_EQ(file->checkUnchanged(), ESTALE);
+    EXPECT_EQ(file->checkUnchanged(), FileHasChanged);
   }
 }
 

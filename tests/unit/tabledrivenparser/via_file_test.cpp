@@ -281,7 +281,7 @@ protected:
 };
 
 TEST_F(StdioReader, ReadsAFileInBinaryMode) {
-  const std::string path = m_Folder / "a file";
+  const std::string path = (m_Folder / "a file").string();
   std::FILE* file = std::fopen(path.c_str(), "wb");
   std::fputs("one\r\ntwo", file);
   std::fclose(file);
@@ -289,19 +289,19 @@ TEST_F(StdioReader, ReadsAFileInBinaryMode) {
 }
 
 TEST_F(StdioReader, CannotOpenWhatIsNotThere) {
-  const std::string path = m_Folder / "none";
+  const std::string path = (m_Folder / "none").string();
   EXPECT_THAT(reportsOfReading(path),
               ElementsAre("fatal: Could not open via file '" + path + "'."));
 }
 
 TEST_F(StdioReader, CannotReadADirectory) {
-  const std::string path = m_Folder;
+  const std::string path = m_Folder.string();
   EXPECT_THAT(reportsOfReading(path),
               ElementsAre("fatal: Error when reading from via file '" + path + "'."));
 }
 
 TEST_F(StdioReader, StaysInErrorOnceAReadFailed) {
-  void* file = m_Reader.open(m_Folder.c_str());
+  void* file = m_Reader.open(m_Folder.string().c_str());
   ASSERT_NE(file, nullptr);
   char buffer[8];
   EXPECT_EQ(m_Reader.read(file, buffer, sizeof buffer), ViaFileReader::ReadError);
