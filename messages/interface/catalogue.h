@@ -36,18 +36,18 @@ inline constexpr uint32_t CatalogueCount = 2;
 /// the caller. An empty span takes it away.
 void setExternalCatalogue(std::span<const CatalogueRow> rows);
 
-/// Chooses the built-in catalogue and the output code page by a name such as "ja_JP", "ja_JP.UTF-8"
-/// or "UTF-8". False if the name is not valid; then nothing has changed.
+/// Chooses the built-in catalogue and the output code page by a name such as "ja_JP", "UTF-8",
+/// "ja_JP.932" or "1252": a page goes by its number, if the host has it. False if the name is not
+/// valid; then nothing has changed.
 [[nodiscard]] bool setLocale(std::string_view name);
 
-/// For initialise: English, and the host's own encoding.
+/// For initialise: English, in UTF-8.
 void resetLocale();
 
 /// EnglishCatalogue or JapaneseCatalogue.
 [[nodiscard]] uint32_t getCurrentCatalogue();
 
-/// The code page by its number: 65001 is UTF-8, the default. Texts leave in UTF-8 whatever it is,
-/// as a host without code pages has nothing to convert to.
+/// The code page of the output by its number: 65001 is UTF-8, the default.
 [[nodiscard]] uint32_t getOutputCodePage();
 
 } // namespace messages

@@ -32,7 +32,8 @@ void closeStreams();
 void setOutputSinks(OutputSink* output, OutputSink* error);
 
 /// Writes a text with its control bytes as backslash and three octal digits, other than tab and
-/// line feed. Bytes above 127 pass as they are.
+/// line feed, in the code page of the locale. In UTF-8 bytes above 127 pass as they are; in any
+/// other page "?" stands for characters that it lacks, and for bytes that are no UTF-8.
 void writeText(Stream stream, std::string_view text);
 
 /// Writes bytes to stdout unchanged.

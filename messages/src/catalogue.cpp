@@ -8,9 +8,12 @@
 #include "messages/interface/catalogue.h"
 
 #include "messages/src/catalogues.h"
+#include "messages/src/output_page.h"
 
 #include <algorithm>
+#include <charconv>
 #include <cstdio>
+#include <optional>
 
 namespace messages {
 
@@ -26,22 +29,17 @@ constexpr NamedCatalogue Catalogues[CatalogueCount] = {
     {"ja_JP", getJapaneseCatalogue},
 };
 
-struct CodePage {
+struct NamedCodePage {
   std::string_view name;
   uint32_t number;
 };
 
-constexpr uint32_t Utf8CodePage = 65001;
-
-// A host without code pages writes UTF-8 as it is, so no other number passes a conversion test.
-constexpr CodePage CodePages[] = {
-    {"UTF-8", Utf8CodePage}, {"utf-8", Utf8CodePage}, {"UTF8", Utf8CodePage},
-    {"utf8", Utf8CodePage},  {"65001", Utf8CodePage}, {"gb2312", 20936},
-    {"20936", 20936},
+// All others go by their numbers alone.
+constexpr NamedCodePage CodePages[] = {
+    {"UTF-8", 65001}, {"utf-8", 65001}, {"UTF8", 65001}, {"utf8", 65001}, {"gb2312", 20936},
 };
 
 uint32_t catalogueIndex = EnglishCatalogue;
-uint32_t codePageNumber = Utf8CodePage;
 std::span<const CatalogueRow> externalCatalogue;
 size_t lastIndex = 0; // of the built-in row that was said last
 
@@ -76,6 +74,17 @@ const Row* findByName(std::span<const Row> rows, std::string_view name) {
   return row != rows.end() ? &*row : nullptr;
 }
 
+// Nothing if the text is neither a name nor a number.
+std::optional<uint32_t> codePageNumber(std::string_view text) {
+  if (const auto* const page = findByName(std::span<const NamedCodePage>(CodePages), text))
+    return page->number;
+  uint32_t number = 0;
+  const char* const end = text.data() + text.size();
+  const auto [stop, error] = std::from_chars(text.data(), end, number);
+  if (error != std::errc() || stop != end) return std::nullopt;
+  return number;
+}
+
 } // namespace
 
 std::span<const CatalogueRow> getCatalogueRows(uint32_t index) {
@@ -108,19 +117,17 @@ bool setLocale(std::string_view name) {
   const bool hasDot = dot != std::string_view::npos;
   const NamedCatalogue* catalogue =
       findByName(std::span<const NamedCatalogue>(Catalogues), name.substr(0, dot));
-  const CodePage* codePage =
-      findByName(std::span<const CodePage>(CodePages), hasDot ? name.substr(dot + 1) : name);
-  const bool isValid = hasDot ? catalogue && codePage : catalogue || codePage;
-  if (!isValid) return false;
-  // Only now, when all of the name has been found good.
+  const std::optional<uint32_t> codePage = codePageNumber(hasDot ? name.substr(dot + 1) : name);
+  const bool isKnown = hasDot ? catalogue && codePage : catalogue || codePage;
+  // The page first, as it may turn out that the host lacks it.
+  if (!isKnown || (codePage && !setOutputPage(*codePage))) return false;
   if (catalogue) catalogueIndex = static_cast<uint32_t>(catalogue - Catalogues);
-  if (codePage) codePageNumber = codePage->number;
   return true;
 }
 
 void resetLocale() {
   catalogueIndex = EnglishCatalogue;
-  codePageNumber = Utf8CodePage;
+  resetOutputPage();
 }
 
 uint32_t getCurrentCatalogue() {
@@ -128,7 +135,7 @@ uint32_t getCurrentCatalogue() {
 }
 
 uint32_t getOutputCodePage() {
-  return codePageNumber;
+  return getOutputPage();
 }
 
 } // namespace messages

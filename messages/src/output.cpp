@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The two streams, and the one routine that every text passes. The way of a text: control bytes
-// escaped, held back while a run may yet be dropped, then into the buffer of stdout or straight to
-// stderr. stdout is flushed before each write to stderr, so that on a terminal a complaint comes
-// behind the lines that were listed before it.
+// escaped, then into the code page of the output, held back while a run may yet be dropped, then
+// into the buffer of stdout or straight to stderr. stdout is flushed before each write to stderr,
+// so that on a terminal a complaint comes behind the lines that were listed before it.
 //
 // A failure of stdout is remembered and told by the driver as an error of the run; one of stderr
 // can't be told to anybody.
@@ -12,6 +12,7 @@
 
 #include "messages/src/descriptor_sink.h"
 #include "messages/src/output_buffer.h"
+#include "messages/src/output_page.h"
 #include "support/interface/descriptor.h"
 
 #include <cstdint>
@@ -145,10 +146,10 @@ void setOutputSinks(OutputSink* output, OutputSink* error) {
 
 void writeText(Stream stream, std::string_view text) {
   if (hasBytesToEscape(text)) {
-    writeBytes(stream, escaped(text));
+    writeBytes(stream, inOutputPage(escaped(text)));
     return;
   }
-  writeBytes(stream, text);
+  writeBytes(stream, inOutputPage(text));
 }
 
 void writeRaw(std::string_view bytes) {

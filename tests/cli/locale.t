@@ -24,7 +24,7 @@ Names of languages and of codes that are taken.
 
 All others end the run.
 
-  $ for name in fr_FR fr_FR.UTF-8 en_US. en_US.latin1 C '' EN_US ja_JP.sjis 1252 932 65001x utf .UTF-8 en_US.UTF-8.x; do
+  $ for name in fr_FR fr_FR.UTF-8 en_US. en_US.latin1 C '' EN_US ja_JP.sjis cp932 65001x 65002 1 1200 65000 500 +932 0x3a4 99999999999999999999 en_US.1200 utf .UTF-8 en_US.UTF-8.x; do
   >   both quarn "--message_locale=$name" -t lib.a
   > done
   err: Fatal error: L9780E: Could not initialise message locale fr_FR
@@ -43,11 +43,27 @@ All others end the run.
   status 1
   err: Fatal error: L9780E: Could not initialise message locale ja_JP.sjis
   status 1
-  err: Fatal error: L9780E: Could not initialise message locale 1252
-  status 1
-  err: Fatal error: L9780E: Could not initialise message locale 932
+  err: Fatal error: L9780E: Could not initialise message locale cp932
   status 1
   err: Fatal error: L9780E: Could not initialise message locale 65001x
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 65002
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 1
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 1200
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 65000
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 500
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale +932
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 0x3a4
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale 99999999999999999999
+  status 1
+  err: Fatal error: L9780E: Could not initialise message locale en_US.1200
   status 1
   err: Fatal error: L9780E: Could not initialise message locale utf
   status 1

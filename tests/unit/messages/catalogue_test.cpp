@@ -434,11 +434,49 @@ TEST_F(CatalogueTest, ACodePageAloneLeavesTheTable) {
 
 TEST_F(CatalogueTest, ABadLocaleNameChangesNothing) {
   for (const char* name : {"fr_FR.UTF-8", "en_US.", "en_US.latin1", "C", "", ".", ".UTF-8",
-                           "ja_JP.1252", "1252", "Utf-8", "en_US.UTF-8.x", "EN_US"}) {
+                           "ja_JP.1200", "1200", "Utf-8", "en_US.UTF-8.x", "EN_US"}) {
     EXPECT_FALSE(setLocale(name)) << name;
   }
   EXPECT_EQ(getCurrentCatalogue(), EnglishCatalogue);
   EXPECT_EQ(getOutputCodePage(), 65001u);
+}
+
+TEST_F(CatalogueTest, APageOfTheHostGoesByItsNumber) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  EXPECT_EQ(getOutputCodePage(), 1252u);
+  EXPECT_EQ(getCurrentCatalogue(), EnglishCatalogue);
+  EXPECT_TRUE(setLocale("ja_JP.20127"));
+  EXPECT_EQ(getOutputCodePage(), 20127u);
+  EXPECT_EQ(getCurrentCatalogue(), JapaneseCatalogue);
+  EXPECT_TRUE(setLocale("en_US"));
+  EXPECT_EQ(getOutputCodePage(), 20127u);
+}
+
+TEST_F(CatalogueTest, APageIsANumberInPlainDigits) {
+  for (const char* name : {"+1252", "-1", " 1252", "1252 ", "0x4e4", "1252x", "1252.0", "cp1252",
+                           "4294968548", "18446744073709552868", "99999999999999999999"}) {
+    EXPECT_FALSE(setLocale(name)) << name;
+    EXPECT_FALSE(setLocale(std::string("ja_JP.") + name)) << name;
+  }
+  EXPECT_EQ(getCurrentCatalogue(), EnglishCatalogue);
+  EXPECT_EQ(getOutputCodePage(), 65001u);
+}
+
+TEST_F(CatalogueTest, ALocaleThatIsRefusedLeavesThePage) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  for (const char* name : {"fr_FR", "ja_JP.1200", "65002", "fr_FR.UTF-8"})
+    EXPECT_FALSE(setLocale(name)) << name;
+  EXPECT_EQ(getOutputCodePage(), 1252u);
+  writeText(Stream::Output, "\u00e9");
+  EXPECT_EQ(outputText(), "\xe9");
+}
+
+TEST_F(CatalogueTest, AFreshStartIsUtf8) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  resetLocale();
+  EXPECT_EQ(getOutputCodePage(), 65001u);
+  writeText(Stream::Output, "\u00e9");
+  EXPECT_EQ(outputText(), "\u00e9");
 }
 
 } // namespace messages

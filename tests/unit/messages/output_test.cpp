@@ -4,6 +4,7 @@
 
 #include "messages/interface/output.h"
 
+#include "messages/interface/catalogue.h"
 #include "tests/support/messages_fixture.h"
 
 #include <cerrno>
@@ -68,6 +69,53 @@ TEST_F(OutputTest, TextIsEscapedOnBothStreams) {
   writeText(Stream::Error, text);
   EXPECT_EQ(outputText(), "\\000\\037 ~\\177\x80\t\n");
   EXPECT_EQ(getErrorText(), outputText());
+}
+
+TEST_F(OutputTest, TextLeavesInTheCodePageOnBothStreams) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  const std::string text("caf\u00e9 \u3042 \xff \001\u00e9\n");
+  writeText(Stream::Output, text);
+  writeText(Stream::Error, text);
+  EXPECT_EQ(outputText(), "caf\xe9 ? ? \\001\xe9\n");
+  EXPECT_EQ(getErrorText(), outputText());
+}
+
+TEST_F(OutputTest, TextsOfOneRunDoNotMixInTheCodePage) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  HeldOutput held;
+  held.hold();
+  writeText(Stream::Output, "\u00e9\n");
+  writeText(Stream::Output, "a\n");
+  writeText(Stream::Output, "\u00fc\n");
+  held.release();
+  EXPECT_EQ(outputText(), "\xe9\na\n\xfc\n");
+}
+
+TEST_F(OutputTest, RawBytesPassUnchangedInAnyCodePage) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  writeRaw("\u00e9\xff\001");
+  EXPECT_EQ(outputText(), "\u00e9\xff\001");
+}
+
+TEST_F(OutputTest, MessagesAndMembersNamesLeaveInTheCodePage) {
+  if (!setLocale("1252")) GTEST_SKIP() << "a host without code pages";
+  listingMessage(ListedMember, "\u00e9.o");
+  report(ErrorWord, nullptr, FileDoesNotExist, "\u30a2");
+  EXPECT_EQ(outputText(), "\xe9.o\n");
+  EXPECT_EQ(getErrorText(), "Error: L6833E: File '?' does not exist\n");
+}
+
+TEST_F(OutputTest, InUtf8TextPassesAsItIs) {
+  ASSERT_TRUE(setLocale("65001"));
+  writeText(Stream::Output, "\u00e9\xff\u0080\n");
+  EXPECT_EQ(outputText(), "\u00e9\xff\u0080\n");
+}
+
+TEST_F(OutputTest, TheChineseCodePageIsTakenOnAnyHost) {
+  ASSERT_TRUE(setLocale("gb2312"));
+  writeText(Stream::Output, "\u4e2d\n");
+  const std::string text = outputText();
+  EXPECT_TRUE(text == "\xd6\xd0\n" || text == "\u4e2d\n") << text;
 }
 
 TEST_F(OutputTest, AByteIsEscapedWhereverItStands) {
