@@ -21,7 +21,7 @@ bool hasAborted(int status) {
 }
 
 void* takeAddresses(size_t size) {
-  return VirtualAlloc(nullptr, size, MEM_RESERVE, PAGE_READWRITE);
+  return VirtualAlloc(nullptr, size, MEM_RESERVE | MEM_COMMIT, PAGE_READWRITE);
 }
 
 void giveAddressesBack(void* addresses, size_t) {
