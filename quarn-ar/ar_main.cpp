@@ -67,6 +67,7 @@ void arMain(int argc, const char* const* argv, const char* toolName, support::Ho
   const std::optional<Quoting> quoting = findQuoting(words);
   if (!quoting || !expandResponseFiles(host, *quoting, words)) return;
   Request request;
+  request.pathStyle = host.getPathStyle();
   switch (readCommandLine(program, words, request)) {
   case Answer::Refused:
     return;

@@ -18,8 +18,7 @@ constexpr size_t ShortName = 15;
 } // namespace
 
 std::string_view memberNameOf(std::string_view file, const Request& request) {
-  std::string_view name = file;
-  if (!request.fullNames) name.remove_prefix(name.rfind('/') + 1);
+  const std::string_view name = request.fullNames ? file : support::leafOf(file, request.pathStyle);
   return request.shortNames ? name.substr(0, ShortName) : name;
 }
 

@@ -35,6 +35,7 @@ struct Request {
   bool shortNames = false;  // names are cut to the characters that a header has room for
   bool realNumbers = false; // date, owner and mode of a file go into its member
   bool newerOnly = false;   // a member is replaced by a newer file only
+  support::PathStyle pathStyle = support::PathStyle_Posix; // of the words that name files
   quarn::Settings settings; // the rest, which the libraries and the driver's road understand
   std::vector<std::string> archives; // several for an index alone
   std::vector<std::string> files;

@@ -33,8 +33,8 @@ std::string Extraction::outputName(std::string_view name) const {
   // Where names keep their folders, only what the host takes for one ends a folder.
   const bool isPosixName =
       m_Settings.keepFolders && m_Host.getPathStyle() == support::PathStyle_Posix;
-  const std::string_view leaf =
-      isPosixName ? name.substr(name.rfind('/') + 1) : support::lastPathComponent(name);
+  const std::string_view leaf = isPosixName ? support::leafOf(name, support::PathStyle_Posix)
+                                            : support::lastPathComponent(name);
   if (!m_Settings.truncateNames) return std::string(leaf);
   return std::string(leaf.substr(0, LongestFileName).substr(0, LongestHostName));
 }

@@ -105,8 +105,9 @@ void Insertion::insertMemberOf(const ArchiveMember& source) {
 }
 
 void Insertion::insertPlainFile(const std::string& word, const FileProbe& probe) {
+  const std::string_view name = support::withoutDrive(word, m_Archive.getHost().getPathStyle());
   const std::string_view leaf =
-      support::lastPathComponent(word).substr(0, support::LongestPathComponent);
+      support::lastPathComponent(name).substr(0, support::LongestPathComponent);
   if (ArchiveMember* existing = m_Names.findUnmodified(leaf); existing != nullptr) {
     const int64_t time = probe.status.modificationTime;
     if (time > 0 && !mayReplace(m_Run.settings.updateMode, existing->getDate(), time)) {

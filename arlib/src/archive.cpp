@@ -269,7 +269,8 @@ ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe&
     fail(&ErrorHandler::reportReadError, fileName, error);
     return nullptr;
   }
-  const std::string_view name = memberNameOf(fileName);
+  const support::PathStyle style = getHost().getPathStyle();
+  const std::string_view name = memberNameOf(support::withoutDrive(fileName, style));
   ArchiveMember* member = appendFileMember({copyToRegion(name), name.size()}, probe.file, 0,
                                            static_cast<uint32_t>(probe.status.size));
   member->m_Type = ArchiveMemberType::decide(probe.getFirstBytes());

@@ -67,6 +67,12 @@ private:
 /// inside a file, and dots and blanks at the end are dropped. On POSIX every leaf is one.
 [[nodiscard]] bool isPlainLeaf(std::string_view leaf, PathStyle style);
 
+/// The name without the drive in front, on a host that has drives: "c:x.o" leads to "x.o".
+[[nodiscard]] std::string_view withoutDrive(std::string_view name, PathStyle style);
+
+/// What a host of this style takes for the last part of a file's name; a view into it.
+[[nodiscard]] std::string_view leafOf(std::string_view name, PathStyle style);
+
 /// What stands behind the last "/" or "\" of the name; a view into it, perhaps empty.
 [[nodiscard]] std::string_view lastPathComponent(std::string_view name);
 

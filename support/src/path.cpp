@@ -83,6 +83,16 @@ PathStyle detectPathStyle(std::string_view name) {
   return name.find('\\') == std::string_view::npos ? PathStyle_Undetermined : PathStyle_Windows;
 }
 
+std::string_view withoutDrive(std::string_view name, PathStyle style) {
+  const bool hasDrive = style == PathStyle_Windows && isDriveName(name.substr(0, 2));
+  return hasDrive ? name.substr(2) : name;
+}
+
+std::string_view leafOf(std::string_view name, PathStyle style) {
+  if (style == PathStyle_Posix) return name.substr(name.rfind('/') + 1);
+  return lastPathComponent(withoutDrive(name, style));
+}
+
 std::string_view lastPathComponent(std::string_view name) {
   return name.substr(name.find_last_of(AnySeparator) + 1);
 }

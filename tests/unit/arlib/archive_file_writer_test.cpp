@@ -7,6 +7,7 @@
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>
+#include <utility>
 
 namespace arlib {
 
@@ -334,6 +335,69 @@ TEST_F(ArchiveFileWriterTest, LeavesTheArchiveAsItWasWhenItFails) {
   EXPECT_EQ(written(), archive().member("old", "x").member("a.o", "new").bytes());
 }
 
+// A disk on which nobody can replace a file that somebody has open.
+class BusyTarget : public ArchiveFileWriterTest {
+protected:
+  BusyTarget() {
+    m_Host.addFile("lib.a", m_Old);
+    m_Host.addFile("a.o", "new");
+    m_Host.keepOpenFiles();
+    m_Archive.setErrorHandler(&m_Handler);
+    EXPECT_TRUE(readFile("lib.a", m_Archive));
+    m_Archive.addMemberFromFile("a.o");
+  }
+
+  // Somebody else opens the archive, and lets go of it at the end of the test at the latest.
+  void openElsewhere() { ASSERT_EQ(m_Host.openForReading("lib.a", m_Other), 0); }
+  void TearDown() override {
+    if (m_Other.isOpen()) static_cast<void>(m_Host.close(m_Other));
+  }
+
+  support::FileHandle m_Other;
+  const std::string m_Old = archive().member("old", "x").bytes();
+  const std::string m_New = archive().member("old", "x").member("a.o", "new").bytes();
+};
+
+TEST_F(BusyTarget, IsReplacedOnceTheOwnFilesAreLetGoOf) {
+  EXPECT_TRUE(write());
+  EXPECT_EQ(written(), m_New);
+  EXPECT_EQ(m_Host.getTimePaused(), 0u);
+}
+
+TEST_F(BusyTarget, IsReplacedWhenSomebodyElseLetsGoOfIt) {
+  openElsewhere();
+  int pauses = 0;
+  m_Host.keepOpenFiles([&] {
+    if (++pauses != 3) return;
+    EXPECT_EQ(m_Host.close(std::exchange(m_Other, {})), 0);
+  });
+  EXPECT_TRUE(write());
+  EXPECT_EQ(written(), m_New);
+  EXPECT_EQ(m_Host.getTimePaused(), 70u);
+}
+
+TEST_F(BusyTarget, StaysAsItIsAfterAWhile) {
+  openElsewhere();
+  EXPECT_FALSE(write());
+  EXPECT_EQ(m_Host.getTimePaused(), 1270u);
+  EXPECT_THAT(m_Handler.reports,
+              ElementsAre("0 I/O error writing file 'lib.a': Device or resource busy"));
+  EXPECT_EQ(written(), m_Old);
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
+}
+
+// The lock had to be let go of, and somebody came in.
+TEST_F(BusyTarget, IsNotReplacedWhenSomebodyElseHasWrittenMeanwhile) {
+  openElsewhere();
+  const std::string others = archive().member("old", "x").member("b.o", "other").bytes();
+  m_Host.keepOpenFiles([&] { m_Host.addFile("lib.a", others); });
+  EXPECT_FALSE(write());
+  EXPECT_THAT(m_Handler.reports,
+              ElementsAre("0 I/O error writing file 'lib.a': Stale file handle"));
+  EXPECT_EQ(written(), others);
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
+}
+
 TEST_F(FailingWrite, AtTheAccessTestCountsAsReadOnly) {
   EXPECT_FALSE(writeFailing("isWritable", 1, EIO));
   EXPECT_THAT(m_Handler.reports, ElementsAre("0 Output file 'lib.a' is read-only"));
@@ -374,8 +438,7 @@ TEST_F(FailingWrite, AtAWriteRemovesTheTemporary) {
 
 TEST_F(FailingWrite, AtTheFlushCountsAsAWrite) {
   EXPECT_FALSE(writeFailing("flush", 1, EFBIG));
-  EXPECT_THAT(m_Handler.reports,
-              ElementsAre("0 I/O error writing file 'lib.a.0': File too large"));
+  EXPECT_THAT(m_Handler.reports, ElementsAre("0 I/O error writing file 'lib.a.0': File too large"));
   expectOldArchive();
 }
 

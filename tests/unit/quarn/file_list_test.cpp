@@ -46,6 +46,31 @@ TEST_F(FileListTest, KeepsAPatternWhereItMeansMembers) {
   EXPECT_THAT(filesOf({"*.o"}, false), ElementsAre("*.o"));
 }
 
+class WindowsFileListTest : public FileListTest {
+protected:
+  WindowsFileListTest() {
+    m_Host.setPathStyle(support::PathStyle_Windows);
+    for (const char* name : {"out\\c.o", "out\\d.o", "c:e.o", "c:\\x\\f.o", "\\\\s\\h\\g.o"})
+      m_Host.addFile(name, "");
+  }
+};
+
+TEST_F(WindowsFileListTest, PutsOneKindOfSeparatorInWhatIsFound) {
+  EXPECT_THAT(filesOf({"out/*.o"}), ElementsAre("out\\c.o", "out\\d.o"));
+  EXPECT_THAT(filesOf({"out/c.o", "a.o"}), ElementsAre("out\\c.o", "a.o"));
+}
+
+TEST_F(WindowsFileListTest, KeepsDrivesAndShares) {
+  EXPECT_THAT(filesOf({"c:?.o", "c:/x/*", "//s/h/*"}),
+              ElementsAre("c:e.o", "c:\\x\\f.o", "\\\\s\\h\\g.o"));
+}
+
+TEST_F(WindowsFileListTest, LeavesAWordAsItIsThatMeansNoFile) {
+  EXPECT_THAT(filesOf({"out/none.o", "*/x", "out/", ".", "..", "c:"}),
+              ElementsAre("out/none.o", "*/x", "out/", ".", "..", "c:"));
+  EXPECT_THAT(filesOf({"out/*.o"}, false), ElementsAre("out/*.o"));
+}
+
 TEST_F(FileListTest, TakesWildcardsInFoldersAsTheyStand) {
   EXPECT_THAT(filesOf({"o*/c.o"}), ElementsAre("o*/c.o"));
 }

@@ -47,6 +47,16 @@ TEST(HostFiles, CountForNothingWhereTheHostDoesNotTell) {
   EXPECT_EQ(fileTime(host, "file"), -1);
 }
 
+TEST(HostFiles, TakeADriveForAFolderWhereThereAreDrives) {
+  MemoryHost host;
+  EXPECT_EQ(fileKind(host, "c:"), FileKind::Nothing);
+  host.setPathStyle(PathStyle_Windows);
+  EXPECT_EQ(fileKind(host, "c:"), FileKind::Directory);
+  EXPECT_EQ(fileKind(host, "c:\\"), FileKind::Nothing);
+  host.addFile("d:", "");
+  EXPECT_EQ(fileKind(host, "d:"), FileKind::RegularFile);
+}
+
 TEST(HostFiles, TellTheirTime) {
   MemoryHost host;
   host.addFile("file", "").modificationTime = 77;

@@ -86,6 +86,50 @@ TEST(Path, CutsALeafBeyondTheLongestComponent) {
   EXPECT_EQ(name.getLeaf(), std::string(LongestPathComponent, 'x'));
 }
 
+TEST(DriveName, IsALetterAndAColon) {
+  for (const char* name : {"c:", "Z:"})
+    EXPECT_TRUE(isDriveName(name)) << name;
+  for (const char* name : {"", "c", ":", "1:", "c:/", "c:x", "cc:"})
+    EXPECT_FALSE(isDriveName(name)) << name;
+}
+
+TEST(WithoutDrive, CutsOneOnHostsThatHaveThem) {
+  EXPECT_EQ(withoutDrive("c:x.o", PathStyle_Windows), "x.o");
+  EXPECT_EQ(withoutDrive("c:\\x.o", PathStyle_Windows), "\\x.o");
+  EXPECT_EQ(withoutDrive("1:x.o", PathStyle_Windows), "1:x.o");
+  EXPECT_EQ(withoutDrive("c:x.o", PathStyle_Posix), "c:x.o");
+}
+
+TEST(LeafOf, GoesByTheHost) {
+  EXPECT_EQ(leafOf("d/a\\b.o", PathStyle_Posix), "a\\b.o");
+  EXPECT_EQ(leafOf("d/a\\b.o", PathStyle_Windows), "b.o");
+  EXPECT_EQ(leafOf("c:b.o", PathStyle_Posix), "c:b.o");
+  EXPECT_EQ(leafOf("c:b.o", PathStyle_Windows), "b.o");
+}
+
+TEST(PlainLeaf, IsEveryOneOnPosix) {
+  for (const char* leaf : {"con", "a:b", "x.", "x ", ""})
+    EXPECT_TRUE(isPlainLeaf(leaf, PathStyle_Posix)) << leaf;
+}
+
+TEST(PlainLeaf, IsNoDeviceOnWindows) {
+  for (const char* leaf :
+       {"con", "CON", "nul", "Nul.o", "aux.tar.gz", "prn .txt", "com1", "COM9.x", "lpt0", "lpt3 ",
+        "com\xC2\xB9", "LPT\xC2\xB3.o", "conin$", "CONOUT$.o", "clock$"})
+    EXPECT_FALSE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
+  for (const char* leaf :
+       {"cons", "com", "com10", "com\xC2\xB4", "xcon", "a.nul", "lptx", "conin", "co", "nul_.o"})
+    EXPECT_TRUE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
+}
+
+TEST(PlainLeaf, IsNoStreamAndNoNameWithAnEndThatIsDroppedOnWindows) {
+  for (const char* leaf : {"a:b", "c:", ":x", "x.", "x ", "x. .", "...", " "})
+    EXPECT_FALSE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
+  // Folders in every folder, which can't be opened for files.
+  for (const char* leaf : {".", "..", ".x", " x", "a b.o"})
+    EXPECT_TRUE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
+}
+
 TEST(LastPathComponent, StandsBehindTheLastSeparatorOfEitherKind) {
   EXPECT_EQ(lastPathComponent("a/b\\c.o"), "c.o");
   EXPECT_EQ(lastPathComponent("a\\b/c.o"), "c.o");
