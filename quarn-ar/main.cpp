@@ -9,5 +9,5 @@
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
   const support::CommandLine line = support::getCommandLine(argc, argv);
-  quarn::startUp(line.argc, line.argv, support::getNativeHost(), quarn_ar::arMain);
+  quarn::startUp(line.argc, line.argv, support::getProgramHost(), quarn_ar::arMain);
 }

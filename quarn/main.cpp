@@ -10,5 +10,5 @@
 int main(int argc, char** argv) {
   support::installSignalCleanUp();
   const support::CommandLine line = support::getCommandLine(argc, argv);
-  quarn::startUp(line.argc, line.argv, support::getNativeHost(), quarn::quarnMain);
+  quarn::startUp(line.argc, line.argv, support::getProgramHost(), quarn::quarnMain);
 }

@@ -10,4 +10,9 @@ CommandLine getCommandLine(int argc, const char* const* argv) {
   return {argc, argv};
 }
 
+// Names have one form here: there is nothing to convert.
+Host& getProgramHost() {
+  return getNativeHost();
+}
+
 } // namespace support

@@ -6,9 +6,14 @@
 
 #include "support/interface/program.h"
 
+#include "support/interface/converting_host.h"
+#include "support/interface/path_converter.h"
+#include "support/src/windows_converter_process.h"
 #include "support/src/windows_names.h"
 
+#include <cstdlib>
 #include <memory>
+#include <string>
 #include <vector>
 #include <windows.h>
 
@@ -38,6 +43,18 @@ CommandLine getCommandLine(int argc, const char* const* argv) {
   }
   pointers.push_back(nullptr);
   return {count, pointers.data()};
+}
+
+// Nothing of it is ever destroyed: the process may end from anywhere, and takes a converter with
+// it.
+Host& getProgramHost() {
+  const wchar_t* program = _wgetenv(L"CYGPATH");
+  if (program == nullptr || *program == L'\0') return getNativeHost();
+  static ConverterProcess& process = *makeConverterProcess(program).release();
+  static PathConverter& converter = *new PathConverter(process);
+  static ConvertingHost& host = *new ConvertingHost(
+      getNativeHost(), [](std::string_view name) { return converter.convert(name); });
+  return host;
 }
 
 } // namespace support
