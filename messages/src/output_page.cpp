@@ -6,6 +6,7 @@
 #include "messages/src/output_page.h"
 
 #include "support/interface/code_page.h"
+#include "support/interface/descriptor.h"
 
 #include <algorithm>
 #include <string>
@@ -44,12 +45,14 @@ bool setOutputPage(uint32_t number) {
   if (!isOpened && number != Gb2312CodePage) return false;
   if (!isOpened) page.close();
   if (isOpened) pageLine().reserve(LineCapacity);
+  support::setConsolePage(isOpened ? number : support::Utf8CodePage);
   pageNumber = number;
   return true;
 }
 
 void resetOutputPage() {
   page.close();
+  support::setConsolePage(support::Utf8CodePage);
   pageNumber = support::Utf8CodePage;
 }
 

@@ -8,6 +8,7 @@
 
 #include "support/interface/host.h"
 
+#include <cstdint>
 #include <string_view>
 
 namespace support {
@@ -20,8 +21,12 @@ inline constexpr int ErrorDescriptor = 2;
 [[nodiscard]] int duplicateDescriptor(int descriptor);
 
 /// Writes until all is out, in binary: interrupted calls, short writes and a full pipe that doesn't
-/// block are no failures. On a console of Windows the bytes are text in UTF-8.
+/// block are no failures. On a console of Windows the bytes are text.
 [[nodiscard]] HostError writeToDescriptor(int descriptor, std::string_view bytes);
+
+/// The code page of the texts that go to a console of Windows from now on; UTF-8 at first. One
+/// write must not end inside a character.
+void setConsolePage(uint32_t number);
 
 [[nodiscard]] HostError closeDescriptor(int descriptor);
 

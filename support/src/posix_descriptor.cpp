@@ -44,6 +44,9 @@ HostError writeToDescriptor(int descriptor, std::string_view bytes) {
   return 0;
 }
 
+// A terminal takes bytes as anything else does.
+void setConsolePage(uint32_t) {}
+
 HostError closeDescriptor(int descriptor) {
   return ::close(descriptor) == 0 || errno == EINTR ? 0 : errno;
 }

@@ -5,6 +5,8 @@
 
 #include "support/interface/descriptor.h"
 
+#include "support/interface/code_page.h"
+#include "support/src/windows_code_page.h"
 #include "support/src/windows_names.h"
 
 #include <algorithm>
@@ -28,6 +30,8 @@ namespace {
 constexpr int LowestDuplicate = ErrorDescriptor + 1;
 constexpr size_t LargestPiece = 0x8000; // that every console takes at once
 
+constinit uint32_t consolePage = Utf8CodePage;
+
 HANDLE handleOf(int descriptor) {
   return reinterpret_cast<HANDLE>(_get_osfhandle(descriptor));
 }
@@ -38,7 +42,7 @@ bool isConsole(HANDLE handle) {
 }
 
 HostError writeToConsole(HANDLE console, std::string_view bytes) {
-  const std::wstring text = widenLoosely(bytes);
+  const std::wstring text = wideFromPage(consolePage, bytes);
   for (size_t at = 0; at < text.size();) {
     DWORD written = 0;
     const auto size = static_cast<DWORD>(std::min(text.size() - at, LargestPiece));
@@ -70,6 +74,10 @@ HostError writeToDescriptor(int descriptor, std::string_view bytes) {
     bytes.remove_prefix(written);
   }
   return 0;
+}
+
+void setConsolePage(uint32_t number) {
+  consolePage = number;
 }
 
 HostError closeDescriptor(int descriptor) {

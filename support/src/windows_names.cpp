@@ -75,14 +75,6 @@ int lengthOf(std::string_view text) {
   return static_cast<int>(text.size());
 }
 
-// Empty if the flags forbid what is in the text.
-std::wstring convert(std::string_view text, DWORD flags) {
-  const int length = MultiByteToWideChar(CP_UTF8, flags, text.data(), lengthOf(text), nullptr, 0);
-  std::wstring wide(static_cast<size_t>(std::max(length, 0)), L'\0');
-  MultiByteToWideChar(CP_UTF8, flags, text.data(), lengthOf(text), wide.data(), length);
-  return wide;
-}
-
 } // namespace
 
 HostError hostErrorFrom(unsigned long windowsError) {
@@ -97,12 +89,12 @@ HostError lastHostError() {
 }
 
 bool widen(std::string_view text, std::wstring& wide) {
-  wide = convert(text, MB_ERR_INVALID_CHARS);
-  return text.empty() || !wide.empty();
-}
-
-std::wstring widenLoosely(std::string_view text) {
-  return convert(text, 0);
+  const int length =
+      MultiByteToWideChar(CP_UTF8, MB_ERR_INVALID_CHARS, text.data(), lengthOf(text), nullptr, 0);
+  wide.assign(static_cast<size_t>(std::max(length, 0)), L'\0');
+  MultiByteToWideChar(CP_UTF8, MB_ERR_INVALID_CHARS, text.data(), lengthOf(text), wide.data(),
+                      length);
+  return text.empty() || length > 0;
 }
 
 std::string narrow(std::wstring_view wide) {

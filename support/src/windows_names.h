@@ -20,8 +20,6 @@ namespace support {
 
 /// False if the text is not UTF-8.
 [[nodiscard]] bool widen(std::string_view text, std::wstring& wide);
-/// What is not UTF-8 becomes U+FFFD.
-[[nodiscard]] std::wstring widenLoosely(std::string_view text);
 /// What UTF-16 can't say becomes U+FFFD.
 [[nodiscard]] std::string narrow(std::wstring_view wide);
 
