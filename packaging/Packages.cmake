@@ -1,4 +1,18 @@
 # SPDX-License-Identifier: Apache-2.0
+# For Windows one folder in a zip file, programs and pages, to be unpacked anywhere.
+if(WIN32)
+  set(CPACK_GENERATOR ZIP)
+  set(CPACK_COMPONENTS_ALL programs)
+  set(CPACK_ARCHIVE_COMPONENT_INSTALL ON)
+  set(CPACK_COMPONENTS_GROUPING ALL_COMPONENTS_IN_ONE)
+  set(CPACK_PACKAGE_FILE_NAME "quarn-${PROJECT_VERSION}-windows-x86_64")
+  set(CPACK_INCLUDE_TOPLEVEL_DIRECTORY ON)
+  set(CPACK_COMPONENT_INCLUDE_TOPLEVEL_DIRECTORY ON)
+  set(CPACK_PRE_BUILD_SCRIPTS ${CMAKE_CURRENT_LIST_DIR}/windows_files.cmake)
+  include(CPack)
+  return()
+endif()
+
 # Packages for Debian and its kin: `quarn`, the programs with their pages, and `quarn-dev`, what
 # programs that link the libraries are built with. scripts/package makes and checks them.
 set(QUARN_CONTACT "The maintainers of quarn <quarn@example.org>" CACHE STRING "Who answers for the packages")

@@ -340,7 +340,8 @@ TEST(SourceTree, EveryPromiseNamesTheTestsThatHoldIt) {
 }
 
 TEST(SourceTree, EveryPageAndCompletionIsInstalled) {
-  const std::string rules = contentsOf(Root / "cmake/Install.cmake");
+  const std::string rules =
+      contentsOf(Root / "cmake/Install.cmake") + contentsOf(Root / "cmake/InstallPages.cmake");
   for (const char* folder : {"manual", "completions"}) {
     for (const auto& entry : fs::directory_iterator(Root / folder)) {
       const std::string name = entry.path().filename();
