@@ -151,6 +151,7 @@ bool ArchiveMember::flushContents() {
   const std::span<const uint8_t> bytes = getContents();
   int writeError = host.write(file, bytes.first(std::min<size_t>(m_Size, bytes.size())));
   support::FileStatus status;
+  if (writeError == 0) writeError = host.flush(file);
   if (writeError == 0) writeError = host.statusOf(file, status);
   const int closeError = host.close(file);
   if (writeError == 0 && closeError == 0) {

@@ -113,7 +113,8 @@ public:
   [[nodiscard]] virtual HostError openForWriting(const char* name, FileHandle& file) = 0;
 
   /// Reads up to bytes.size() bytes at `offset`; `done` is how many there were. Fewer than asked
-  /// for with a result of 0 means that the file ends there.
+  /// for with a result of 0 means that the file ends there. On some hosts it moves the place where
+  /// `readNext` and `write` go on: a file that was written is read when it is whole.
   [[nodiscard]] virtual HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                                          size_t& done) = 0;
 
@@ -121,7 +122,7 @@ public:
   [[nodiscard]] virtual HostError write(FileHandle file, std::span<const uint8_t> bytes) = 0;
 
   /// Hands over what the host has held back of earlier writes, so that a full disk shows here and
-  /// not at the close.
+  /// not at the close, and the time of the last change is what it will be when the file is closed.
   [[nodiscard]] virtual HostError flush(FileHandle file) = 0;
 
   /// The handle is closed in any case.
@@ -155,7 +156,7 @@ public:
   virtual void setPermissions(FileHandle file, uint32_t mode) = 0;
 
   /// Best effort: when the file was last changed and used, in seconds since 1970. What is written
-  /// later changes it again.
+  /// later may change it again.
   virtual void setTimes(FileHandle file, int64_t seconds) = 0;
 
   /// The name that a chain of symbolic links leads to, also when nothing is there. A name that is

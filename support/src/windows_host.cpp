@@ -103,12 +103,15 @@ bool hasAttribute(const std::wstring& name, DWORD attribute) {
   return attributes != INVALID_FILE_ATTRIBUTES && (attributes & attribute) != 0;
 }
 
-// Whether the part in front of the leaf is there, and no directory.
-bool isBelowFile(const std::wstring& name) {
-  const size_t separator = name.find_last_of(L"\\/");
-  if (separator == std::wstring::npos || separator == 0) return false;
-  const DWORD attributes = GetFileAttributesW(name.substr(0, separator).c_str());
-  return attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_DIRECTORY) == 0;
+// Whether a part in front of the leaf is there, and no directory.
+bool isBelowFile(std::wstring name) {
+  for (;;) {
+    const size_t separator = name.find_last_of(L"\\/");
+    if (separator == std::wstring::npos || separator == 0) return false;
+    name.resize(separator);
+    const DWORD attributes = GetFileAttributesW(name.c_str());
+    if (attributes != INVALID_FILE_ATTRIBUTES) return (attributes & FILE_ATTRIBUTE_DIRECTORY) == 0;
+  }
 }
 
 // A call that no directory takes says "access denied" of one, as of much else; and "not found" is
@@ -129,6 +132,7 @@ HostError openNative(const std::wstring& name, DWORD access, DWORD disposition, 
 // Directories open, too, and fail when they are read.
 HostError openExisting(const char* name, DWORD access, FileHandle& file) {
   std::wstring native;
+  file = {};
   if (const HostError error = nativeName(name, native); error != 0) return error;
   return openNative(native, access, OPEN_EXISTING, file, FILE_FLAG_BACKUP_SEMANTICS);
 }
@@ -140,8 +144,10 @@ int64_t joined(DWORD high, DWORD low) {
   return static_cast<int64_t>(uint64_t{high} << 32 | low);
 }
 
+// 0 is how a file system says that it knows no time.
 void setTime(FileStatus& status, const FILETIME& time) {
   const int64_t ticks = joined(time.dwHighDateTime, time.dwLowDateTime);
+  if (ticks == 0) return;
   status.modificationTime = ticks / TicksOfSecond - SecondsBefore1970;
   status.modificationNanoseconds = static_cast<uint32_t>(ticks % TicksOfSecond * 100);
 }
@@ -159,9 +165,25 @@ FileStatus statusFrom(const BY_HANDLE_FILE_INFORMATION& info) {
   return status;
 }
 
+// ReFS numbers its files with 128 bits, and has no 64 bits that tell them all apart; elsewhere the
+// upper half is 0.
+void setIdentity(FileStatus& status, HANDLE handle) {
+  FILE_ID_INFO info;
+  if (GetFileInformationByHandleEx(handle, FileIdInfo, &info, sizeof info) == 0) return;
+  std::array<uint64_t, 2> halves;
+  static_assert(sizeof halves == sizeof info.FileId);
+  std::memcpy(halves.data(), &info.FileId, sizeof halves);
+  constexpr uint64_t Spread = 0x9E3779B97F4A7C15; // odd: no two upper halves become one
+  status.device = info.VolumeSerialNumber;
+  status.inode = halves[0] ^ halves[1] * Spread;
+}
+
 HostError statusOfHandle(HANDLE handle, FileStatus& status) {
   status = FileStatus();
-  if (GetFileType(handle) != FILE_TYPE_DISK) {
+  SetLastError(NO_ERROR);
+  const DWORD type = GetFileType(handle);
+  if (type == FILE_TYPE_UNKNOWN && GetLastError() != NO_ERROR) return lastHostError();
+  if (type != FILE_TYPE_DISK) {
     status.kind = FileKind::Special;
     status.mode = SpecialMode;
     return 0;
@@ -169,6 +191,7 @@ HostError statusOfHandle(HANDLE handle, FileStatus& status) {
   BY_HANDLE_FILE_INFORMATION info;
   if (GetFileInformationByHandle(handle, &info) == 0) return lastHostError();
   status = statusFrom(info);
+  setIdentity(status, handle);
   return 0;
 }
 
@@ -217,11 +240,18 @@ bool renameAsPosix(const std::wstring& from, const std::wstring& to) {
                                     static_cast<DWORD>(bytes.size())) != 0;
 }
 
+// Whether the right to do so is there; who has the file open may keep it from happening.
+bool mayDelete(const std::wstring& name) {
+  if (hasAttribute(name, FILE_ATTRIBUTE_READONLY)) return false;
+  const OwnedHandle file(CreateFileW(name.c_str(), DELETE, ShareAll, nullptr, OPEN_EXISTING,
+                                     FILE_FLAG_OPEN_REPARSE_POINT, nullptr));
+  return file.isOpen() || GetLastError() == ERROR_SHARING_VIOLATION;
+}
+
 // "Access denied" is also the answer where a file that is open would have to go.
 HostError replaceError(const std::wstring& to) {
   const HostError error = errorOf(lastHostError(), to);
-  const bool isInTheWay = error == EACCES && !hasAttribute(to, FILE_ATTRIBUTE_READONLY);
-  return isInTheWay ? EBUSY : error;
+  return error == EACCES && mayDelete(to) ? EBUSY : error;
 }
 
 HostError replaceNative(const std::wstring& from, const std::wstring& to) {
@@ -239,12 +269,16 @@ HostError removeNative(const std::wstring& name) {
   return DeleteFileW(name.c_str()) != 0 ? 0 : lastHostError();
 }
 
-// What FindFirstFileW finds, but for the folder itself and the one above.
+// What FindFirstFileW finds, but for the folder itself and the one above. A folder in which nothing
+// fits is no failure: only the search of the top of a drive ends so with "*", too.
 HostError findNative(const std::wstring& pattern, std::vector<std::string>& names) {
-  names.clear();
   WIN32_FIND_DATAW found;
   const HANDLE search = FindFirstFileW(pattern.c_str(), &found);
-  if (search == INVALID_HANDLE_VALUE) return lastHostError();
+  if (search == INVALID_HANDLE_VALUE) {
+    const bool isEmpty = GetLastError() == ERROR_FILE_NOT_FOUND;
+    const HostError error = errorOf(lastHostError(), pattern);
+    return isEmpty && error == ENOENT ? 0 : error;
+  }
   const std::unique_ptr<void, decltype(&FindClose)> closer(search, FindClose);
   do {
     std::string leaf = narrow(found.cFileName);
@@ -265,6 +299,7 @@ public:
     const HostError error = openExisting(name, GENERIC_READ | GENERIC_WRITE, file);
     if (error != 0 || !isDirectory(handleOf(file))) return error;
     CloseHandle(handleOf(file));
+    file = {};
     return EISDIR;
   }
 
@@ -292,6 +327,7 @@ public:
 
   HostError createTemporary(const char* name, FileHandle& file) override {
     std::wstring native;
+    file = {};
     if (const HostError error = nativeName(name, native); error != 0) return error;
     TableHold table;
     const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file);
@@ -300,22 +336,22 @@ public:
   }
 
   HostError createUnnamedTemporary(std::string& name, FileHandle& file) override {
-    std::array<wchar_t, MAX_PATH + 1> place;
-    std::array<wchar_t, MAX_PATH> path;
-    if (GetTempPathW(static_cast<DWORD>(place.size()), place.data()) == 0) return lastHostError();
-    TableHold table;
-    // Makes an empty file with a name that nothing had.
-    if (GetTempFileNameW(place.data(), L"qrn", 0, path.data()) == 0) return lastHostError();
-    const HostError error =
-        openNative(path.data(), GENERIC_READ | GENERIC_WRITE, OPEN_EXISTING, file);
-    name = narrow(path.data());
-    if (error == 0) table.enter(path.data());
+    std::wstring place(GetTempPathW(0, nullptr), L'\0'); // with the NUL
+    place.resize(GetTempPathW(static_cast<DWORD>(place.size()), place.data()));
+    const std::string beginning =
+        narrow(place) + "quarn." + std::to_string(GetCurrentProcessId()) + ".";
+    HostError error = EEXIST;
+    while (error == EEXIST) {
+      name = beginning + std::to_string(m_UnnamedTemporaries++);
+      error = createTemporary(name.c_str(), file);
+    }
     return error;
   }
 
   // Emptied by a second step, as creating anew wants the attributes that the file has.
   HostError openForWriting(const char* name, FileHandle& file) override {
     std::wstring native;
+    file = {};
     if (const HostError error = nativeName(name, native); error != 0) return error;
     if (const HostError error = openNative(native, GENERIC_WRITE, OPEN_ALWAYS, file); error != 0)
       return error;
@@ -323,6 +359,7 @@ public:
       return 0;
     const HostError error = lastHostError();
     CloseHandle(handleOf(file));
+    file = {};
     return error;
   }
 
@@ -356,8 +393,14 @@ public:
     return 0;
   }
 
-  // Every write has reached the system when it returns: nothing is held back in the process.
-  HostError flush(FileHandle) override { return 0; }
+  // Every write has reached the system when it returns: nothing is held back in the process but the
+  // time of the last one, which NTFS enters at the close, unless it was told one.
+  HostError flush(FileHandle file) override {
+    FILETIME now;
+    GetSystemTimeAsFileTime(&now);
+    SetFileTime(handleOf(file), nullptr, nullptr, &now);
+    return 0;
+  }
 
   HostError close(FileHandle file) override {
     return CloseHandle(handleOf(file)) != 0 ? 0 : lastHostError();
@@ -408,11 +451,16 @@ public:
     return statusOfHandle(handleOf(file), status);
   }
 
+  // The attribute is asked for by itself, as not all that runs programs for Windows heeds it. Who
+  // has the file open in a way that keeps others out says nothing of rights.
   bool isWritable(const char* name) override {
+    FileStatus own;
     std::wstring native;
-    return nativeName(name, native) == 0 &&
-           GetFileAttributesW(native.c_str()) != INVALID_FILE_ATTRIBUTES &&
-           !hasAttribute(native, FILE_ATTRIBUTE_READONLY);
+    if (status(name, own) != 0 || (own.mode & WriteBits) == 0 || nativeName(name, native) != 0)
+      return false;
+    const OwnedHandle file(CreateFileW(native.c_str(), FILE_WRITE_DATA, ShareAll, nullptr,
+                                       OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
+    return file.isOpen() || GetLastError() == ERROR_SHARING_VIOLATION;
   }
 
   void setPermissions(FileHandle file, uint32_t mode) override {
@@ -422,6 +470,8 @@ public:
   }
 
   void setTimes(FileHandle file, int64_t seconds) override {
+    if (seconds < -SecondsBefore1970 || seconds > INT64_MAX / TicksOfSecond - SecondsBefore1970)
+      return;
     const auto ticks = static_cast<uint64_t>((seconds + SecondsBefore1970) * TicksOfSecond);
     const FILETIME time = {static_cast<DWORD>(ticks), static_cast<DWORD>(ticks >> 32)};
     SetFileTime(handleOf(file), nullptr, &time, &time);
@@ -452,12 +502,13 @@ public:
     names.clear();
     std::wstring native;
     std::wstring pattern;
-    if (const HostError error = nativeName(directory, native); error != 0) return error;
     if (!widen(leaf, pattern)) return EILSEQ;
+    const std::string_view place = directory.empty() ? "." : directory;
+    if (const HostError error = nativeName(place, native, pattern.size() + 1); error != 0)
+      return error;
     // A drive alone is the folder that one is in on that drive.
     if (isDriveName(directory)) native = wholePath(native);
-    const bool isOpenEnded = !native.empty() && native.back() != L'\\' && native.back() != L'/';
-    if (isOpenEnded) native += L'\\';
+    if (native.back() != L'\\' && native.back() != L'/') native += L'\\';
     return findNative(native + pattern, names);
   }
 
@@ -479,6 +530,8 @@ private:
     if (error == 0) table.forget(source);
     return error;
   }
+
+  uint64_t m_UnnamedTemporaries = 0; // of this process, so far
 };
 
 struct ErrorText {
@@ -488,6 +541,7 @@ struct ErrorText {
 
 // Where the C library of this host has other words than those of POSIX systems.
 constexpr ErrorText ErrorTexts[] = {
+    {ENOMEM, "Cannot allocate memory"},
     {EBUSY, "Device or resource busy"},
     {EXDEV, "Invalid cross-device link"},
     {EINVAL, "Invalid argument"},

@@ -18,6 +18,8 @@ namespace {
 constexpr size_t LongestPlainName = 247; // UTF-16 units
 constexpr size_t LongestPart = 255;      // of a name, on every file system of the host
 
+constexpr DWORD DiskQuotaExceeded = 1295; // not every collection of headers names it
+
 struct ErrorNumber {
   DWORD windows;
   HostError host;
@@ -30,6 +32,7 @@ constexpr ErrorNumber ErrorNumbers[] = {
     {ERROR_ACCESS_DENIED, EACCES},
     {ERROR_INVALID_HANDLE, EBADF},
     {ERROR_NOT_ENOUGH_MEMORY, ENOMEM},
+    {ERROR_OUTOFMEMORY, ENOMEM},
     {ERROR_INVALID_DRIVE, ENOENT},
     {ERROR_NOT_SAME_DEVICE, EXDEV},
     {ERROR_WRITE_PROTECT, EROFS},
@@ -38,26 +41,42 @@ constexpr ErrorNumber ErrorNumbers[] = {
     {ERROR_HANDLE_DISK_FULL, ENOSPC},
     {ERROR_NOT_SUPPORTED, ENOSYS},
     {ERROR_BAD_NETPATH, ENOENT},
+    {ERROR_DEV_NOT_EXIST, ENOENT},
+    {ERROR_NETWORK_ACCESS_DENIED, EACCES},
     {ERROR_BAD_NET_NAME, ENOENT},
     {ERROR_FILE_EXISTS, EEXIST},
-    {ERROR_BROKEN_PIPE, EPIPE},
+    {ERROR_CANNOT_MAKE, EACCES},
     {ERROR_INVALID_PARAMETER, EINVAL},
+    {ERROR_BROKEN_PIPE, EPIPE},
+    {ERROR_BUFFER_OVERFLOW, ENAMETOOLONG},
     {ERROR_DISK_FULL, ENOSPC},
     {ERROR_CALL_NOT_IMPLEMENTED, ENOSYS},
     {ERROR_INVALID_NAME, ENOENT},
     {ERROR_BAD_PATHNAME, ENOENT},
     {ERROR_ALREADY_EXISTS, EEXIST},
     {ERROR_FILENAME_EXCED_RANGE, ENAMETOOLONG},
+    {ERROR_FILE_TOO_LARGE, EFBIG},
+    {ERROR_PIPE_BUSY, EBUSY},
     {ERROR_NO_DATA, EPIPE},
     {ERROR_DIRECTORY, ENOTDIR},
     {ERROR_DELETE_PENDING, EBUSY},
     {ERROR_NO_UNICODE_TRANSLATION, EILSEQ},
-    {ERROR_FILE_TOO_LARGE, EFBIG},
+    {ERROR_USER_MAPPED_FILE, EBUSY},
+    {DiskQuotaExceeded, ENOSPC},
+    {ERROR_PRIVILEGE_NOT_HELD, EPERM},
+    {ERROR_NO_SYSTEM_RESOURCES, ENOMEM},
+    {ERROR_COMMITMENT_LIMIT, ENOMEM},
+    {ERROR_CANT_ACCESS_FILE, ENXIO},
     {ERROR_CANT_RESOLVE_FILENAME, ELOOP},
 };
 
 bool hasPrefix(const std::wstring& name, const wchar_t* prefix) {
   return name.starts_with(prefix);
+}
+
+// The forms that lead past drives and shares, the one without a limit among them.
+bool isForDevices(const std::wstring& name) {
+  return hasPrefix(name, L"\\\\?\\") || hasPrefix(name, L"\\\\.\\");
 }
 
 // Windows says of such a name what it says of any that can't be.
@@ -114,13 +133,17 @@ std::wstring wholePath(const std::wstring& name) {
   return path;
 }
 
-HostError nativeName(std::string_view name, std::wstring& native) {
+HostError nativeName(std::string_view name, std::wstring& native, size_t room) {
   if (!widen(name, native)) return EILSEQ;
   if (hasLongPart(native)) return ENAMETOOLONG;
-  if (native.empty() || hasPrefix(native, L"\\\\?\\") || hasPrefix(native, L"\\\\.\\")) return 0;
+  if (native.empty() || isForDevices(native)) return 0;
   const std::wstring path = wholePath(native);
-  if (path.size() <= LongestPlainName) return 0;
-  native = hasPrefix(path, L"\\\\") ? L"\\\\?\\UNC" + path.substr(1) : L"\\\\?\\" + path;
+  if (path.size() + room <= LongestPlainName) return 0;
+  // With "/" such a form was not told above.
+  if (isForDevices(path))
+    native = path;
+  else
+    native = hasPrefix(path, L"\\\\") ? L"\\\\?\\UNC" + path.substr(1) : L"\\\\?\\" + path;
   return 0;
 }
 

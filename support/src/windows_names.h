@@ -25,8 +25,8 @@ namespace support {
 
 /// A name for the calls of Windows; EILSEQ if it is not UTF-8. One that is too long for them, as it
 /// stands or from the current folder on, is given with its whole path in the form that has no
-/// limit.
-[[nodiscard]] HostError nativeName(std::string_view name, std::wstring& native);
+/// limit; `room` is for what is going to be put behind it, in UTF-16 units.
+[[nodiscard]] HostError nativeName(std::string_view name, std::wstring& native, size_t room = 0);
 
 /// The whole path of a name, without links followed; empty if there is none.
 [[nodiscard]] std::wstring wholePath(const std::wstring& name);

@@ -12,11 +12,19 @@
 
 namespace testsupport {
 
-void setTimeZone(const char* name) {
-  if (name == nullptr)
-    unsetenv("TZ");
+void setEnvironment(const char* name, const char* value) {
+  if (value == nullptr)
+    unsetenv(name);
   else
-    setenv("TZ", name, 1);
+    setenv(name, value, 1);
+}
+
+void setTemporaryPlace(const char* folder) {
+  setEnvironment("TMPDIR", folder);
+}
+
+void setTimeZone(const char* name) {
+  setEnvironment("TZ", name);
   tzset();
 }
 

@@ -11,6 +11,12 @@ namespace testsupport {
 // The local time of the process from now on, as TZ names it; null for that of the machine.
 void setTimeZone(const char* name);
 
+// A variable of the environment; null takes it away.
+void setEnvironment(const char* name, const char* value);
+
+// The folder for temporaries, in UTF-8, as the host's users name it; null for that of the machine.
+void setTemporaryPlace(const char* folder);
+
 // Whether a process with this status, as death tests see it, was ended by std::abort.
 bool hasAborted(int status);
 

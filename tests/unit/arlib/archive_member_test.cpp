@@ -165,11 +165,14 @@ TEST_F(FailingContents, LeaveNoTemporaryFileBehind) {
   EXPECT_FALSE(m_InMemory->flushContents());
   m_Host.failCall(4, EIO);
   EXPECT_FALSE(m_InMemory->flushContents());
+  m_Host.failCall(5, EIO);
+  EXPECT_FALSE(m_InMemory->flushContents());
   EXPECT_THAT(m_Handler.reports,
               ElementsAre("0 I/O error writing file '': Permission denied",
                           "0 I/O error writing file '/tmp/quarn.0': No space left on device",
                           "0 I/O error writing file '/tmp/quarn.1': Input/output error",
-                          "0 I/O error closing file '/tmp/quarn.2': Input/output error"));
+                          "0 I/O error writing file '/tmp/quarn.2': Input/output error",
+                          "0 I/O error closing file '/tmp/quarn.3': Input/output error"));
   EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o"));
   m_Archive.closeFiles();
   EXPECT_EQ(m_Disk.openHandles(), 0u);
