@@ -12,6 +12,7 @@
 #include <array>
 #include <cerrno>
 #include <cstring>
+#include <functional>
 #include <string>
 #include <utility>
 #include <vector>
@@ -96,8 +97,10 @@ private:
   bool replaceTarget();
   // 0 if the file to replace is the one that was read, or the reason not to replace it.
   [[nodiscard]] int checkIsOwnTarget() const;
-  void letGoOfTarget();
-  int replaceWhenFree();
+  void letGoOfFiles();
+  // Does it until it doesn't give EBUSY any more, but not for ever.
+  int takeStep(const std::function<int()>& step);
+  int replaceOwnTarget();
   bool takeName();
   bool removeTemporary();
   void relocateMembers();
@@ -238,27 +241,36 @@ int ArchiveFileWriter::checkIsOwnTarget() const {
 
 // Everything is copied, so what is open can be let go of where it is in the way. The lock goes with
 // it: somebody else may write before the next try, and is noticed there.
-void ArchiveFileWriter::letGoOfTarget() {
-  if (m_Host.replacesOpenFiles(m_Target.c_str())) return;
+void ArchiveFileWriter::letGoOfFiles() {
   m_Archive.m_SourceFiles.closeAll();
   if (m_Archive.getOwnFile() != nullptr) m_Archive.getOwnFile()->close();
 }
 
-// Who looks at each file that is new or being read, as a virus scanner does, keeps it for moments.
-int ArchiveFileWriter::replaceWhenFree() {
-  letGoOfTarget();
-  for (const uint32_t wait : {10U, 20U, 40U, 80U, 160U, 320U, 640U, 0U}) {
-    if (const int error = checkIsOwnTarget(); error != 0) return error;
-    const int error = m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
-    if (error != EBUSY || wait == 0) return error;
+// Not every disk replaces a file that somebody has open: first of all oneself. And who looks at
+// each file that is new or being read, as a virus scanner does, keeps it for moments.
+int ArchiveFileWriter::takeStep(const std::function<int()>& step) {
+  int error = step();
+  if (error != EBUSY) return error;
+  letGoOfFiles();
+  error = step();
+  for (const uint32_t wait : {10U, 20U, 40U, 80U, 160U, 320U, 640U}) {
+    if (error != EBUSY) return error;
     m_Host.pause(wait);
+    error = step();
   }
-  return EBUSY;
+  return error;
+}
+
+int ArchiveFileWriter::replaceOwnTarget() {
+  if (const int error = checkIsOwnTarget(); error != 0) return error;
+  return m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
 }
 
 bool ArchiveFileWriter::takeName() {
-  const int error =
-      m_MustBeNew ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str()) : replaceWhenFree();
+  const int error = takeStep([this] {
+    return m_MustBeNew ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str())
+                       : replaceOwnTarget();
+  });
   m_WasOvertaken = m_MustBeNew && error == EEXIST;
   if (error == 0 || m_WasOvertaken) return error == 0;
   return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
@@ -276,7 +288,8 @@ bool ArchiveFileWriter::replaceTarget() {
 // The one way out of every failure. What made it necessary has been reported, so a temporary that
 // can't be removed is not told of as well.
 bool ArchiveFileWriter::removeTemporary() {
-  [[maybe_unused]] const int error = m_Host.remove(m_TemporaryName.c_str());
+  [[maybe_unused]] const int error =
+      takeStep([this] { return m_Host.remove(m_TemporaryName.c_str()); });
   return false;
 }
 

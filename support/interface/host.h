@@ -129,15 +129,13 @@ public:
   [[nodiscard]] virtual HostError close(FileHandle file) = 0;
 
   /// Puts `from` in the place of `to` in one step: at no moment is there no `to`. EBUSY where
-  /// somebody has `to` open in a way that keeps it from being replaced, which may pass.
+  /// somebody has one of them open in a way that keeps it from being renamed or replaced, which may
+  /// pass. Where the file system replaces no open file, one's own handle of `to` is in the way,
+  /// too.
   [[nodiscard]] virtual HostError rename(const char* from, const char* to) = 0;
 
   /// The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
   [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
-
-  /// Whether a file can be replaced while it is open: where not, one's own handle is in the way,
-  /// too.
-  [[nodiscard]] virtual bool replacesOpenFiles(const char*) { return true; }
 
   /// Does nothing for a while.
   virtual void pause(uint32_t milliseconds) = 0;

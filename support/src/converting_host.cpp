@@ -55,10 +55,6 @@ HostError ConvertingHost::renameNew(const char* from, const char* to) {
   return m_Host.renameNew(m_Convert(from).c_str(), m_Convert(to).c_str());
 }
 
-bool ConvertingHost::replacesOpenFiles(const char* name) {
-  return m_Host.replacesOpenFiles(m_Convert(name).c_str());
-}
-
 HostError ConvertingHost::remove(const char* name) {
   return m_Host.remove(m_Convert(name).c_str());
 }

@@ -4,7 +4,8 @@
 // meanwhile: who has one open keeps it as it is, as on POSIX. What differs:
 //
 // - A file can be replaced while it is open only where the file system can do that (NTFS from
-//   Windows 10 on); elsewhere the caller is told to let go of his own handles first.
+//   Windows 10 on, but not over a network); elsewhere the answer is EBUSY. What a file system says
+//   of itself is not asked: a share tells of the abilities of the disk behind it.
 // - A lock keeps others from reading the range that it covers. It is taken far behind the end of
 //   any file, so that it says "I write" to those who ask for it, and nothing to anybody else.
 // - A handler of Ctrl-C and the like runs in a thread of its own. The table of temporaries is
@@ -204,7 +205,6 @@ struct RenameHead {
 constexpr DWORD RenameReplaces = 1;
 constexpr DWORD RenameAsPosix = 2;
 constexpr auto RenameInfoEx = static_cast<FILE_INFO_BY_HANDLE_CLASS>(22);
-constexpr DWORD SupportsPosixRename = 0x400; // of a file system
 
 class OwnedHandle {
 public:
@@ -414,17 +414,6 @@ public:
     return renameBy(from, to, [](const std::wstring& source, const std::wstring& target) {
       return MoveFileExW(source.c_str(), target.c_str(), 0) != 0 ? 0 : lastHostError();
     });
-  }
-
-  bool replacesOpenFiles(const char* name) override {
-    std::wstring native;
-    if (nativeName(name, native) != 0) return true;
-    const OwnedHandle file(CreateFileW(native.c_str(), FILE_READ_ATTRIBUTES, ShareAll, nullptr,
-                                       OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr));
-    DWORD abilities = 0;
-    return !file.isOpen() || (GetVolumeInformationByHandleW(file.get(), nullptr, 0, nullptr,
-                                                            nullptr, &abilities, nullptr, 0) != 0 &&
-                              (abilities & SupportsPosixRename) != 0);
   }
 
   void pause(uint32_t milliseconds) override { Sleep(milliseconds); }

@@ -194,6 +194,10 @@ HostError MemoryHost::remove(const char* name) {
   const auto target = m_Files.find(std::string_view(name));
   if (target == m_Files.end()) return ENOENT;
   if (target->second->kind == FileKind::Directory) return EISDIR;
+  if (m_BusyRemovals > 0) {
+    --m_BusyRemovals;
+    return EBUSY;
+  }
   m_Files.erase(target);
   return 0;
 }

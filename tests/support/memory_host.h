@@ -73,6 +73,8 @@ public:
   void keepOpenFiles(std::function<void()> whileWaiting = [] {}) {
     m_WhileWaiting = std::move(whileWaiting);
   }
+  // The next calls that remove a file find somebody else at it.
+  void keepRemovedFiles(uint32_t calls) { m_BusyRemovals = calls; }
   // In milliseconds, of all pauses together.
   [[nodiscard]] uint32_t getTimePaused() const { return m_TimePaused; }
 
@@ -99,7 +101,6 @@ public:
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
-  bool replacesOpenFiles(const char*) override { return !m_WhileWaiting; }
   void pause(uint32_t milliseconds) override;
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
@@ -125,6 +126,7 @@ private:
   std::function<void()> m_WhileWaiting; // empty: open files can be replaced
   support::PathStyle m_PathStyle = support::PathStyle_Posix;
   uint32_t m_TimePaused = 0;
+  uint32_t m_BusyRemovals = 0;
   uint64_t m_NextInode = 1;
   uint64_t m_NextTemporary = 0;
   uint64_t m_BytesRead = 0;

@@ -456,6 +456,37 @@ TEST_F(FailingWrite, AtTheRenameNamesTheArchiveAndKeepsIt) {
   expectOldArchive();
 }
 
+// Somebody looks at the new file for a moment.
+TEST_F(FailingWrite, AtABusyRenameIsTriedAgain) {
+  EXPECT_TRUE(writeFailing("rename", 1, EBUSY));
+  EXPECT_THAT(m_Handler.reports, IsEmpty());
+  EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o", "lib.a"));
+}
+
+TEST_F(FailingWrite, AtABusyNewNameIsTriedAgain) {
+  std::string failed = "none";
+  for (uint64_t call = 1; failed != "renameNew" && !failed.empty(); ++call) {
+    static_cast<void>(m_Disk.remove("new.a"));
+    Archive archive(m_Host);
+    archive.setErrorHandler(&m_Handler);
+    m_Host.failCall(call, EBUSY);
+    const NewFile result = writeNewFile("new.a", archive);
+    failed = m_Host.getFailedOperation();
+    EXPECT_TRUE(failed != "renameNew" || result == NewFile::Written);
+  }
+  EXPECT_EQ(failed, "renameNew");
+  EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o", "lib.a", "new.a"));
+}
+
+// A disk that is full, and somebody who looks at what has arrived.
+TEST_F(BusyTarget, LeavesNoTemporaryThatIsBusyForAMoment) {
+  m_Host.setRoom(100);
+  m_Host.keepRemovedFiles(2);
+  EXPECT_FALSE(write());
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
+  EXPECT_EQ(m_Host.getTimePaused(), 10u);
+}
+
 TEST_F(FailingWrite, AtThePermissionsIsNoFailure) {
   EXPECT_TRUE(writeFailing("setPermissions", 1, EPERM));
   EXPECT_THAT(m_Handler.reports, IsEmpty());
