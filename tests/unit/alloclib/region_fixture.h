@@ -72,26 +72,28 @@ public:
 // is address space without memory.
 class RecordingRegion final : public Region {
 public:
-  void* AllocFull(size_t size, size_t alignment, const char*) override {
+  void* AllocFull(size_t size, size_t, const char*) override {
     allocations.push_back(size);
     if (size >= HugeSize) return testsupport::takeAddresses(size);
-    return ::operator new(size, std::align_val_t(std::max<size_t>(alignment, Alignment)));
+    return ::operator new(size, Alignment);
   }
-  void DiscardFull(void* pointer, size_t size, size_t alignment) override {
+  void DiscardFull(void* pointer, size_t size, size_t) override {
     discards.push_back(size);
     if (size >= HugeSize)
       testsupport::giveAddressesBack(pointer, size);
     else
-      ::operator delete(pointer, std::align_val_t(std::max<size_t>(alignment, Alignment)));
+      release(pointer);
   }
   void Destroy(bool) override {}
+  // What nobody has given back; not of the largest.
+  static void release(void* pointer) { ::operator delete(pointer, Alignment); }
 
   std::vector<size_t> allocations;
   std::vector<size_t> discards;
 
 private:
   static constexpr size_t HugeSize = size_t{1} << 30;
-  static constexpr size_t Alignment = 16;
+  static constexpr std::align_val_t Alignment{4096}; // more than anybody asks for
 };
 
 class RegionTest : public testing::Test {

@@ -304,8 +304,8 @@ TEST_F(RegionGeneralTest, DestroyingWithFalseFreesNothing) {
   auto* large = static_cast<char*>(doomed->allocate(20000)) - 24;
   doomed->Destroy(false);
   EXPECT_TRUE(other.discards.empty());
-  std::free(large);
-  std::free(reinterpret_cast<char*>(doomed) - 16);
+  RecordingRegion::release(large);
+  RecordingRegion::release(reinterpret_cast<char*>(doomed) - 16);
 }
 
 TEST_F(RegionGeneralTest, TracingSendsEachAllocationTheSlowWay) {

@@ -194,8 +194,8 @@ TEST_F(RegionLargeBlockTest, DestroyingWithFalseFreesNothing) {
   doomed->Destroy(false);
   EXPECT_TRUE(other.discards.empty());
   for (RegionLargeBlock* region : {overflow, doomed}) {
-    std::free(RegionLargeBlockPeer::getChunk(region, 0));
-    std::free(region);
+    RecordingRegion::release(RegionLargeBlockPeer::getChunk(region, 0));
+    RecordingRegion::release(region);
   }
 }
 

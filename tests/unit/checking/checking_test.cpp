@@ -18,8 +18,10 @@
 namespace checking {
 namespace {
 
+using testing::AllOf;
 using testing::EndsWith;
 using testing::ExitedWithCode;
+using testing::Not;
 using testing::StartsWith;
 
 std::string shownText;
@@ -143,7 +145,7 @@ TEST_F(CheckingDeathTest, TheExpressionIsQuotedAsItWasWritten) {
 
 TEST_F(CheckingDeathTest, ThePathIsRelativeToTheTree) {
   EXPECT_EXIT(QUARN_ASSERT(1, false), ExitedWithCode(1),
-              StartsWith("Assertion failed: tests/unit/checking/"));
+              AllOf(StartsWith("Assertion failed: "), Not(StartsWith("Assertion failed: /"))));
 }
 
 TEST_F(CheckingDeathTest, AnInstalledHandlerGetsTheFailure) {
