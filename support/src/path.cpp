@@ -55,6 +55,13 @@ bool isDeviceName(std::string_view leaf) {
   return std::any_of(std::begin(Devices), std::end(Devices), isName) || isNumberedDevice(name);
 }
 
+// In no name of a file there: wildcards, what command lines mean something by, the mark of a
+// stream.
+bool isForbidden(char character) {
+  const auto byte = static_cast<unsigned char>(character);
+  return byte < 0x20 || std::string_view("<>:\"|?*").find(character) != std::string_view::npos;
+}
+
 std::string takeFront(std::string_view& rest, size_t length) {
   std::string front(rest.substr(0, length));
   rest.remove_prefix(length);
@@ -71,7 +78,7 @@ bool isPlainLeaf(std::string_view leaf, PathStyle style) {
   if (style == PathStyle_Posix) return true;
   // A folder in every folder: nobody can open it for a file.
   if (leaf == "." || leaf == "..") return true;
-  if (leaf.find(':') != std::string_view::npos) return false;
+  if (std::any_of(leaf.begin(), leaf.end(), isForbidden)) return false;
   if (leaf.ends_with('.') || leaf.ends_with(' ')) return false;
   return !isDeviceName(leaf);
 }

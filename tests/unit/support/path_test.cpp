@@ -130,6 +130,13 @@ TEST(PlainLeaf, IsNoStreamAndNoNameWithAnEndThatIsDroppedOnWindows) {
     EXPECT_TRUE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
 }
 
+TEST(PlainLeaf, HasNoCharacterThatNamesCannotHaveOnWindows) {
+  for (const char* leaf : {"a*b", "?", "a<b", "a>b", "a|b", "\"a\"", "a\tb", "\x01", "a\n"}) {
+    EXPECT_FALSE(isPlainLeaf(leaf, PathStyle_Windows)) << leaf;
+    EXPECT_TRUE(isPlainLeaf(leaf, PathStyle_Posix)) << leaf;
+  }
+}
+
 TEST(LastPathComponent, StandsBehindTheLastSeparatorOfEitherKind) {
   EXPECT_EQ(lastPathComponent("a/b\\c.o"), "c.o");
   EXPECT_EQ(lastPathComponent("a\\b/c.o"), "c.o");
