@@ -36,6 +36,13 @@ HANDLE handleOf(int descriptor) {
   return reinterpret_cast<HANDLE>(_get_osfhandle(descriptor));
 }
 
+// In a program that is started without output the C library has the number of a descriptor all the
+// same, with a handle behind it that stands for something else.
+bool isOpen(int descriptor) {
+  SetLastError(NO_ERROR);
+  return GetFileType(handleOf(descriptor)) != FILE_TYPE_UNKNOWN || GetLastError() == NO_ERROR;
+}
+
 bool isConsole(HANDLE handle) {
   DWORD mode = 0;
   return GetConsoleMode(handle, &mode) != 0;
@@ -53,25 +60,37 @@ HostError writeToConsole(HANDLE console, std::string_view bytes) {
   return 0;
 }
 
-} // namespace
-
-// The C library gives out its lowest free number.
-int duplicateDescriptor(int descriptor) {
+// The C library gives out its lowest free number, and lets children have it.
+int duplicateAbove(int descriptor) {
   const int duplicate = _dup(descriptor);
-  if (duplicate < 0 || duplicate >= LowestDuplicate) return duplicate;
-  const int higher = duplicateDescriptor(descriptor);
+  if (duplicate < 0) return duplicate;
+  SetHandleInformation(handleOf(duplicate), HANDLE_FLAG_INHERIT, 0);
+  if (duplicate >= LowestDuplicate) return duplicate;
+  const int higher = duplicateAbove(descriptor);
   _close(duplicate);
   return higher;
+}
+
+} // namespace
+
+int duplicateDescriptor(int descriptor) {
+  return isOpen(descriptor) ? duplicateAbove(descriptor) : -1;
 }
 
 HostError writeToDescriptor(int descriptor, std::string_view bytes) {
   const HANDLE handle = handleOf(descriptor);
   if (isConsole(handle)) return writeToConsole(handle, bytes);
+  size_t largest = INT32_MAX;
   while (!bytes.empty()) {
     DWORD written = 0;
-    const auto size = static_cast<DWORD>(std::min<size_t>(bytes.size(), INT32_MAX));
+    const auto size = static_cast<DWORD>(std::min(bytes.size(), largest));
     if (WriteFile(handle, bytes.data(), size, &written, nullptr) == 0) return lastHostError();
     bytes.remove_prefix(written);
+    if (written > 0) continue;
+    // A pipe that doesn't block, and has no room for so much.
+    if (GetFileType(handle) != FILE_TYPE_PIPE) return EIO;
+    largest = std::max<size_t>(size / 2, 1);
+    Sleep(1);
   }
   return 0;
 }

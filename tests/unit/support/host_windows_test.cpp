@@ -3,6 +3,7 @@
 // What the Windows host does with its own kinds of names, attributes, shares and endings, which no
 // other host has.
 
+#include "support/src/windows_names.h"
 #include "tests/support/bytes.h"
 #include "tests/unit/support/host_fixture.h"
 
@@ -201,6 +202,32 @@ TEST_F(WindowsHostTest, TellsThatAFileIsInUse) {
   CloseHandle(handle);
   EXPECT_EQ(m_Host.rename(at("new").c_str(), at("file").c_str()), 0);
   EXPECT_EQ(read("file"), "new");
+}
+
+TEST(WindowsErrors, HaveTheNumbersOfTheCLibrary) {
+  const struct {
+    DWORD windows;
+    HostError host;
+  } rows[] = {{ERROR_PATH_NOT_FOUND, ENOENT},
+              {ERROR_ACCESS_DENIED, EACCES},
+              {ERROR_SHARING_VIOLATION, EBUSY},
+              {ERROR_USER_MAPPED_FILE, EBUSY},
+              {ERROR_PIPE_BUSY, EBUSY},
+              {ERROR_DISK_FULL, ENOSPC},
+              {1295 /* disk quota */, ENOSPC},
+              {ERROR_BUFFER_OVERFLOW, ENAMETOOLONG},
+              {ERROR_BROKEN_PIPE, EPIPE},
+              {ERROR_NO_DATA, EPIPE},
+              {ERROR_PIPE_NOT_CONNECTED, EPIPE},
+              {ERROR_OUTOFMEMORY, ENOMEM},
+              {ERROR_NO_SYSTEM_RESOURCES, ENOMEM},
+              {ERROR_CANT_ACCESS_FILE, ENXIO},
+              {ERROR_CANT_RESOLVE_FILENAME, ELOOP},
+              {ERROR_WRITE_PROTECT, EROFS},
+              {ERROR_NETWORK_ACCESS_DENIED, EACCES},
+              {ERROR_CRC, EIO}};
+  for (const auto& row : rows)
+    EXPECT_EQ(hostErrorFrom(row.windows), row.host) << row.windows;
 }
 
 TEST_F(WindowsHostTest, HasSpecialFiles) {
