@@ -86,10 +86,10 @@ HostError writeToDescriptor(int descriptor, std::string_view bytes) {
     const auto size = static_cast<DWORD>(std::min(bytes.size(), largest));
     if (WriteFile(handle, bytes.data(), size, &written, nullptr) == 0) return lastHostError();
     bytes.remove_prefix(written);
+    largest = std::max<size_t>(written > 0 ? size_t{written} * 2 : size / 2, 1);
     if (written > 0) continue;
     // A pipe that doesn't block, and has no room for so much.
     if (GetFileType(handle) != FILE_TYPE_PIPE) return EIO;
-    largest = std::max<size_t>(size / 2, 1);
     Sleep(1);
   }
   return 0;

@@ -13,6 +13,7 @@
 
 #include "support/interface/host.h"
 
+#include "support/src/windows_links.h"
 #include "support/src/windows_names.h"
 
 #include <algorithm>
@@ -21,6 +22,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <functional>
 #include <memory>
 #include <windows.h>
 
@@ -166,17 +168,29 @@ FileStatus statusFrom(const BY_HANDLE_FILE_INFORMATION& info) {
   return status;
 }
 
+// Some shares number no file, and say 0 or the largest number of each: there the whole path, with
+// links followed and in the letters of the disk, has to stand for the file.
+void setIdentityFromPath(FileStatus& status, HANDLE handle) {
+  if (status.inode != 0 && status.inode != UINT64_MAX) return;
+  std::wstring path(GetFinalPathNameByHandleW(handle, nullptr, 0, 0), L'\0'); // with the NUL
+  if (GetFinalPathNameByHandleW(handle, path.data(), static_cast<DWORD>(path.size()), 0) == 0)
+    return;
+  status.inode = std::hash<std::wstring>()(path);
+}
+
 // ReFS numbers its files with 128 bits, and has no 64 bits that tell them all apart; elsewhere the
 // upper half is 0.
 void setIdentity(FileStatus& status, HANDLE handle) {
   FILE_ID_INFO info;
-  if (GetFileInformationByHandleEx(handle, FileIdInfo, &info, sizeof info) == 0) return;
+  if (GetFileInformationByHandleEx(handle, FileIdInfo, &info, sizeof info) == 0)
+    return setIdentityFromPath(status, handle);
   std::array<uint64_t, 2> halves;
   static_assert(sizeof halves == sizeof info.FileId);
   std::memcpy(halves.data(), &info.FileId, sizeof halves);
   constexpr uint64_t Spread = 0x9E3779B97F4A7C15; // odd: no two upper halves become one
   status.device = info.VolumeSerialNumber;
   status.inode = halves[0] ^ halves[1] * Spread;
+  setIdentityFromPath(status, handle);
 }
 
 HostError statusOfHandle(HANDLE handle, FileStatus& status) {
@@ -225,7 +239,7 @@ private:
 // One step also where somebody has the old file open.
 bool renameAsPosix(const std::wstring& from, const std::wstring& to) {
   const OwnedHandle file(CreateFileW(from.c_str(), DELETE | SYNCHRONIZE, ShareAll, nullptr,
-                                     OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr));
+                                     OPEN_EXISTING, FILE_FLAG_OPEN_REPARSE_POINT, nullptr));
   if (!file.isOpen()) return false;
   const std::wstring path = wholePath(to);
   constexpr size_t NamePlace = offsetof(RenameHead, length) + sizeof(DWORD);
@@ -267,6 +281,16 @@ HostError removeNative(const std::wstring& name) {
   if (error != EACCES || !hasAttribute(name, FILE_ATTRIBUTE_READONLY)) return error;
   SetFileAttributesW(name.c_str(), FILE_ATTRIBUTE_NORMAL);
   return DeleteFileW(name.c_str()) != 0 ? 0 : lastHostError();
+}
+
+// Where a link leads: a text without a drive starts from that of the link, and mostly also from its
+// folder.
+std::string placeOfLink(const std::string& link, const std::string& text) {
+  const path from(link, PathStyle_Windows);
+  const path to(text, PathStyle_Windows);
+  if (!to.getDrive().empty()) return text;
+  const bool isFromTheTop = to.getDirectory().starts_with('\\');
+  return from.getDrive() + (isFromTheTop ? "" : from.getDirectory()) + text;
 }
 
 // What FindFirstFileW finds, but for the folder itself and the one above. A folder in which nothing
@@ -330,9 +354,12 @@ public:
     file = {};
     if (const HostError error = nativeName(name, native); error != 0) return error;
     TableHold table;
-    const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file);
+    // A link that leads nowhere would be followed, and the file made where it leads.
+    const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file,
+                                       FILE_FLAG_OPEN_REPARSE_POINT);
     if (error == 0) table.enter(native);
-    return error;
+    // A folder in the place is said to deny access.
+    return error == EISDIR ? EEXIST : error;
   }
 
   HostError createUnnamedTemporary(std::string& name, FileHandle& file) override {
@@ -466,20 +493,18 @@ public:
     SetFileTime(handleOf(file), nullptr, &time, &time);
   }
 
-  // Where the last link leads nowhere, it is the name that it is.
   std::string followLinks(const char* name) override {
-    std::wstring native;
-    if (nativeName(name, native) != 0 || !hasAttribute(native, FILE_ATTRIBUTE_REPARSE_POINT))
-      return name;
-    const OwnedHandle file(CreateFileW(native.c_str(), FILE_READ_ATTRIBUTES, ShareAll, nullptr,
-                                       OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
-    if (!file.isOpen()) return name;
-    std::wstring path(GetFinalPathNameByHandleW(file.get(), nullptr, 0, 0), L'\0'); // with the NUL
-    const DWORD written =
-        GetFinalPathNameByHandleW(file.get(), path.data(), static_cast<DWORD>(path.size()), 0);
-    if (written == 0 || written >= path.size()) return name;
-    path.resize(written);
-    return narrow(path);
+    constexpr int MaximumLinks = 63; // as the system: a longer chain is a circle
+    std::string place = name;
+    for (int i = 0; i < MaximumLinks; ++i) {
+      std::wstring native;
+      if (nativeName(place, native) != 0 || !hasAttribute(native, FILE_ATTRIBUTE_REPARSE_POINT))
+        return place;
+      const std::wstring text = readLink(native);
+      if (text.empty()) return place;
+      place = placeOfLink(place, narrow(text));
+    }
+    return name;
   }
 
   HostError listDirectory(const char* name, std::vector<std::string>& names) override {
