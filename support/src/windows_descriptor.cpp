@@ -1,12 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Descriptors are the C library's here; what is written goes past it, as it would put a carriage
-// return in front of each line feed. A console takes UTF-16, whatever code page it is set to.
+// return in front of each line feed. A console takes UTF-16, whatever code page it is set to. Who
+// writes to a pipe that nobody reads any more ends, as by the signal that POSIX systems have for
+// it.
 
 #include "support/interface/descriptor.h"
 
 #include "support/interface/code_page.h"
 #include "support/src/windows_code_page.h"
+#include "support/src/windows_host.h"
 #include "support/src/windows_names.h"
 
 #include <algorithm>
@@ -84,7 +87,11 @@ HostError writeToDescriptor(int descriptor, std::string_view bytes) {
   while (!bytes.empty()) {
     DWORD written = 0;
     const auto size = static_cast<DWORD>(std::min(bytes.size(), largest));
-    if (WriteFile(handle, bytes.data(), size, &written, nullptr) == 0) return lastHostError();
+    if (WriteFile(handle, bytes.data(), size, &written, nullptr) == 0) {
+      const HostError error = lastHostError();
+      if (error == EPIPE) endWithoutReader();
+      return error;
+    }
     bytes.remove_prefix(written);
     largest = std::max<size_t>(written > 0 ? size_t{written} * 2 : size / 2, 1);
     if (written > 0) continue;

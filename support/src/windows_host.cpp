@@ -13,6 +13,7 @@
 
 #include "support/interface/host.h"
 
+#include "support/src/windows_host.h"
 #include "support/src/windows_links.h"
 #include "support/src/windows_names.h"
 
@@ -21,6 +22,7 @@
 #include <cerrno>
 #include <cstddef>
 #include <cstdint>
+#include <cstdlib>
 #include <cstring>
 #include <functional>
 #include <memory>
@@ -83,6 +85,8 @@ BOOL WINAPI removeTemporaries(DWORD) {
   }
   return FALSE;
 }
+
+bool isCleanUpInstalled = false;
 
 // 64-bit Windows gives handles of which 32 bits count, so that programs of 32 bits can share them.
 HANDLE handleOf(FileHandle file) {
@@ -579,6 +583,12 @@ std::string hostErrorText(HostError error) {
   return text == "Unknown error" ? text + " " + std::to_string(error) : text;
 }
 
+void endWithoutReader() {
+  if (!isCleanUpInstalled) return;
+  removeTemporaries(CTRL_CLOSE_EVENT);
+  TerminateProcess(GetCurrentProcess(), EXIT_FAILURE);
+}
+
 Host& getNativeHost() {
   static WindowsHost host;
   return host;
@@ -587,7 +597,7 @@ Host& getNativeHost() {
 void installSignalCleanUp() {
   // No box that nobody can answer where a disk is not in its drive.
   SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX | SEM_NOOPENFILEERRORBOX);
-  SetConsoleCtrlHandler(removeTemporaries, TRUE);
+  isCleanUpInstalled = SetConsoleCtrlHandler(removeTemporaries, TRUE) != 0;
 }
 
 } // namespace support
