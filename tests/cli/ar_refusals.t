@@ -104,9 +104,6 @@ Members and files.
 
 The name in front of a diagnostic is the program's; its form and severity can be chosen.
 
-  $ ln -s "$(command -v quarn-ar)" cross-ranlib; both ./cross-ranlib none.a
-  err: cross-ranlib: Error: L6832E: Archive 'none.a' not found : No such file or directory
-  status 1
   $ refused d --diag_error=6831 lib.a b.txt
   err: quarn-ar: Error: L6831E: 'b.txt' not present in archive 'lib.a'
   status 1

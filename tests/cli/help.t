@@ -62,19 +62,6 @@ All ways to it give the same.
   $ quarn -h | cmp - help
   $ quarn | cmp - help
 
-Only the tool's name in the examples changes with the name it is called by.
-
-  $ (exec -a /usr/bin/zqbookkeeper.exe quarn) | grep bookkeeper
-  bookkeeper options archive [ file_list ]
-          bookkeeper -r  mylib.a obj1 obj2 obj3...
-          bookkeeper -x  mylib.a ?sort*
-          bookkeeper -d  mylib.a hash.o
-          bookkeeper -tv ansilib.a
-  $ (exec -a /usr/bin/zqbookkeeper.exe quarn) | sed 's/bookkeeper/quarn/' | cmp - help
-  $ (exec -a '' quarn) > unnamed; echo $?; sed -n 9p unnamed
-  0
-   options archive [ file_list ]
-
 Whatever the diagnostics do, help does not change.
 
   $ quarn --diag_style=ide --diag_suppress=warning -h | cmp - help

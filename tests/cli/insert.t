@@ -86,17 +86,15 @@ A file named twice is two members. On a later run each word takes the first one 
   d.txt
   d.txt
 
-The name of a member is the last part of the file's name, also behind a backslash.
+The name of a member is the last part of the file's name.
 
-  $ mkdir -p sub/deep; file sub/deep/e.txt e; file 'odd\f.txt' f; file ./g.txt g
-  $ insert -v -c parts.a sub/deep/e.txt 'odd\f.txt' ./g.txt "$PWD/a.txt"
+  $ mkdir -p sub/deep; file sub/deep/e.txt e; file ./g.txt g
+  $ insert -v -c parts.a sub/deep/e.txt ./g.txt "$PWD/a.txt"
   a - e.txt
-  a - f.txt
   a - g.txt
   a - a.txt
   $ quarn -t parts.a
   e.txt
-  f.txt
   g.txt
   a.txt
 
@@ -122,13 +120,6 @@ Of several names that differ only in case the first in the archive is replaced.
   FOO.o
   foo.o
   22b
-
-The file's own time, owner and mode are taken.
-
-  $ file h.txt h; chmod 751 h.txt
-  $ quarn -rc --diag_suppress=L6875 own.a h.txt
-  $ quarn -tv own.a | sed "s#^\(.........\) *$(id -u)/ *$(id -g) #\1 own/own #"
-  rwxr-x--x own/own      1 Sep 09 01:46 2001 h.txt (offset     72)
 
 The warning on a member that is not ELF comes once a run, for the first one, with the verbose line behind it.
 
@@ -175,7 +166,6 @@ It can be silenced, lowered, or made an error, which keeps the old archive.
   case.a
   cases.a
   lib.a
-  own.a
   parts.a
   sub
   twice.a

@@ -1,4 +1,5 @@
-Names are bytes: whatever they hold, they go through every action and every message.
+Names go through every action and every message, whatever they hold. What only some hosts have in
+names of files is in a transcript of its own.
 
   $ . "$TESTDIR/setup.sh"
   $ round() {
@@ -22,19 +23,6 @@ Names are bytes: whatever they hold, they go through every action and every mess
   Warning: L6875W: Adding non-ELF object 'two words' to archive 'lib.a'
   r - two words
   d - two words
-  $ round ' lead and trail '
-  a -  lead and trail 
-   lead and trail 
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970  lead and trail  (offset    150)
-  x -  lead and trail 
-  
-  < lead and trail >
-  
-  x
-  m -  lead and trail 
-  Warning: L6875W: Adding non-ELF object ' lead and trail ' to archive 'lib.a'
-  r -  lead and trail 
-  d -  lead and trail 
   $ round '%s%n%d'
   a - %s%n%d
   %s%n%d
@@ -74,80 +62,6 @@ Names are bytes: whatever they hold, they go through every action and every mess
   Warning: L6875W: Adding non-ELF object 'caf\xc3\xa9' to archive 'lib.a' (esc)
   r - caf\xc3\xa9 (esc)
   d - caf\xc3\xa9 (esc)
-  $ round "$(printf 'bad\377\376')"
-  a - bad\xff\xfe (esc)
-  bad\xff\xfe (esc)
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 bad\xff\xfe (offset     72) (esc)
-  x - bad\xff\xfe (esc)
-  
-  <bad\xff\xfe> (esc)
-  
-  x
-  m - bad\xff\xfe (esc)
-  Warning: L6875W: Adding non-ELF object 'bad\xff\xfe' to archive 'lib.a' (esc)
-  r - bad\xff\xfe (esc)
-  d - bad\xff\xfe (esc)
-  $ round "$(printf 'bell\007')"
-  a - bell\007
-  bell\007
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 bell\007 (offset     72)
-  x - bell\007
-  
-  <bell\007>
-  
-  x
-  m - bell\007
-  Warning: L6875W: Adding non-ELF object 'bell\007' to archive 'lib.a'
-  r - bell\007
-  d - bell\007
-  $ round "$(printf 'cr\015del\177')"
-  a - cr\015del\177
-  cr\015del\177
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 cr\015del\177 (offset     72)
-  x - cr\015del\177
-  
-  <cr\015del\177>
-  
-  x
-  m - cr\015del\177
-  Warning: L6875W: Adding non-ELF object 'cr\015del\177' to archive 'lib.a'
-  r - cr\015del\177
-  d - cr\015del\177
-  $ round "$(printf 'tab\tx')"
-  a - tab\tx (esc)
-  tab\tx (esc)
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 tab\tx (offset     72) (esc)
-  x - tab\tx (esc)
-  
-  <tab\tx> (esc)
-  
-  x
-  m - tab\tx (esc)
-  Warning: L6875W: Adding non-ELF object 'tab\tx' to archive 'lib.a' (esc)
-  r - tab\tx (esc)
-  d - tab\tx (esc)
-  $ round "$(printf 'line\nx')"
-  a - line
-  x
-  line
-  x
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 line
-  x (offset     72)
-  x - line
-  x
-  
-  <line
-  x>
-  
-  x
-  m - line
-  x
-  Warning: L6875W: Adding non-ELF object 'line
-  x' to archive 'lib.a'
-  r - line
-  x
-  d - line
-  x
   $ round "it's"
   a - it's
   it's
@@ -161,32 +75,6 @@ Names are bytes: whatever they hold, they go through every action and every mess
   Warning: L6875W: Adding non-ELF object 'it's' to archive 'lib.a'
   r - it's
   d - it's
-  $ round 'a"b'
-  a - a"b
-  a"b
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 a"b (offset     72)
-  x - a"b
-  
-  <a"b>
-  
-  x
-  m - a"b
-  Warning: L6875W: Adding non-ELF object 'a"b' to archive 'lib.a'
-  r - a"b
-  d - a"b
-  $ round "$(printf 'an_extremely_long_name_with_\303\251_and_\001_and_%%s')"
-  a - an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
-  an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
-  rw-r--r--     0/     0      1 Jan 01 00:00 1970 an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (offset    178) (esc)
-  x - an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
-  
-  <an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s> (esc)
-  
-  x
-  m - an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
-  Warning: L6875W: Adding non-ELF object 'an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s' to archive 'lib.a' (esc)
-  r - an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
-  d - an_extremely_long_name_with_\xc3\xa9_and_\\001_and_%s (esc)
 
 Not found, they are shown as they are; only control bytes become numbers.
 
@@ -212,19 +100,15 @@ The archive may have such a name, also in reports on its contents.
   Error: L6829E: 'per%scent.a': malformed archive: End of file in the middle of archive member header starting at offset 8
   [1]
   $ file a.o a
-  $ library "$(printf 'esc\033.a')" a.o; quarn -t "$(printf 'esc\033.a')" none
-  Error: L6831E: 'none' not present in archive 'esc\033.a'
-  [1]
 
 Names of any length are shown whole.
 
-  $ for length in 1000 10000 20000 100000; do
+  $ for length in 1000 10000 20000; do
   >   quarn -t lib.a "$(printf 'n%.0s' $(seq $length))" 2>&1 | wc -c
   > done
   1049
   10049
   20049
-  100049
 
 Contents are no text: they come out of -p unchanged.
 

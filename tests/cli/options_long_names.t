@@ -159,6 +159,3 @@ Words that name no option at all.
   $ quarn --zebra lib.a
   Fatal error: L3900U: Unrecognized option '--zebra'.
   [1]
-  $ quarn "-$(printf '\351')" lib.a
-  Fatal error: L3900U: Unrecognized option '-\xe9'. (esc)
-  [1]

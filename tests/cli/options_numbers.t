@@ -106,12 +106,3 @@ The twin with "no" takes a number as well. Of both, the last one counts.
   $ quarn --no_normalise
   Fatal error: L3901U: Missing argument for option 'no_normalise'.
   [1]
-
-The number 0 leaves the file's own time and mode.
-
-  $ chmod 640 a.txt
-  $ quarn --normalise=7 --no_normalise=0 --create --diag_suppress=L6875 lib.a a.txt
-  $ dd if=lib.a bs=1 skip=88 count=12 status=none; echo
-  1000000000  
-  $ dd if=lib.a bs=1 skip=112 count=8 status=none; echo
-  100640  

@@ -1,4 +1,4 @@
-Folders, pipes and devices are neither archives nor members.
+Pipes and devices are neither archives nor members.
 
   $ . "$TESTDIR/setup.sh"
   $ file a.o a; library lib.a a.o; cp lib.a before.a
@@ -6,18 +6,6 @@ Folders, pipes and devices are neither archives nor members.
 
 As the archive: an error, at once.
 
-  $ both timeout 5 quarn -t folder
-  err: Error: L6835E: Reading file 'folder' : Is a directory
-  status 1
-  $ both timeout 5 quarn -r folder a.o
-  err: Error: L6835E: Reading file 'folder' : Is a directory
-  status 1
-  $ both timeout 5 quarn -s folder
-  err: Error: L6835E: Reading file 'folder' : Is a directory
-  status 1
-  $ both timeout 5 quarn -t folder/
-  err: Error: L6835E: Reading file 'folder/' : Is a directory
-  status 1
   $ both timeout 5 quarn -t pipe
   err: Error: L6835E: Reading file 'pipe' : Invalid argument
   status 1
@@ -42,9 +30,6 @@ As the archive: an error, at once.
 
 With --create they are refused when it comes to writing, and stay.
 
-  $ both timeout 5 quarn --create --diag_suppress=L6875 folder a.o
-  err: Error: L6978E: Deleting file 'folder' : Is a directory
-  status 1
   $ both timeout 5 quarn --create --diag_suppress=L6875 pipe a.o
   err: Error: L6978E: Deleting file 'pipe' : Invalid argument
   status 1
@@ -57,9 +42,6 @@ With --create they are refused when it comes to writing, and stay.
 
 As a file to put in: an error for each, the others are looked at, nothing is written.
 
-  $ both timeout 5 quarn -rv lib.a folder
-  err: Error: L6835E: Reading file 'lib.a' : Is a directory
-  status 1
   $ both timeout 5 quarn -rv lib.a pipe
   err: Error: L6835E: Reading file 'lib.a' : Invalid argument
   status 1
@@ -76,9 +58,6 @@ As a file to put in: an error for each, the others are looked at, nothing is wri
 In the place of a member of the same name, too.
 
   $ mkdir sub; mkdir sub/a.o; mkfifo sub/b.o
-  $ both timeout 5 quarn -rv lib.a sub/a.o
-  err: Error: L6835E: Reading file 'lib.a' : Is a directory
-  status 1
   $ both timeout 5 quarn -ruv lib.a sub/a.o sub/b.o
   err: Error: L6835E: Reading file 'lib.a' : Is a directory
   err: Error: L6835E: Reading file 'lib.a' : Invalid argument

@@ -1,0 +1,57 @@
+Closed streams, and devices in their place.
+
+  $ . "$TESTDIR/setup.sh"
+  $ printf 'one\n' > a.o; printf 'two\n' > b.o; touch -d @1000000000 a.o b.o; library lib.a a.o b.o
+
+A closed stream is no reason to fail; nothing goes where it should not.
+
+  $ quarn -t lib.a >&-; echo $?
+  0
+  $ quarn -t lib.a none 2>&-; echo $?
+  1
+  $ quarn -t lib.a none >&- 2>&-; echo $?
+  1
+  $ quarn -t lib.a none <&- >&- 2>&-; echo $?
+  1
+  $ quarn -p lib.a >&-; echo $?
+  0
+  $ quarn --help >&-; echo $?
+  0
+  $ quarn --version_number >&-; echo $?
+  0
+  $ quarn --vsn >&- 2>&-; echo $?
+  0
+  $ quarn -k 2>&-; echo $?
+  1
+  $ cp lib.a before.a
+  $ quarn -rv --diag_suppress=6875 lib.a a.o >&- 2>&- <&-; echo $?
+  0
+  $ quarn -t lib.a
+  a.o
+  b.o
+  $ quarn -d lib.a none >&- 2>&-; echo $?; quarn -t lib.a
+  0
+  a.o
+  b.o
+  $ quarn -rc lib2.a a.o >&- 2>&-; echo $?; quarn -t lib2.a
+  0
+  a.o
+  $ quarn -x lib.a >&- 2>&-; cat a.o b.o
+  one
+  two
+
+A full device on stdout is told of, and does not harm the archive.
+
+  $ for words in --version_number --vsn --help "-t lib.a"; do quarn $words > /dev/full; echo $?; done
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  $ cp lib.a before.a; quarn -t -s lib.a > /dev/full 2> /dev/null; cmp lib.a before.a; ls *.a
+  before.a
+  lib.a
+  lib2.a
