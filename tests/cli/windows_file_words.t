@@ -314,7 +314,7 @@ An archive is replaced that the same run reads its members from.
 
 The name of the tool is that of its file, without a folder and an extension of programs.
 
-  $ called() { cp "$QUARN_FILE" "Sub/$1"; LC_ALL=C.UTF-8 wine "Sub/$1" --show_cmdline -t new.a a.o; }
+  $ called() { cp "$QUARN_FILE" "Sub/$1"; env -u TMPDIR LC_ALL=C.UTF-8 wine "Sub/$1" --show_cmdline -t new.a a.o; }
   $ for name in zqtool.exe tool.EXE a.b.exe x.dll.exe abcdefghijklmnopqrstuvwxyz0123456789.exe アーカイブ.exe; do
   >   called $name
   > done
