@@ -52,9 +52,9 @@ Both separators are one; more than one in a row, too.
 A drive has a folder that one is in. Its name alone is that folder.
 
   $ create z:a.o 'z:Sub\b.o' 'Z:?.txt'
-  a - z:a.o
+  a - a.o
   a - b.o
-  a - Z:C.txt
+  a - C.txt
   $ create z:none.o c:none.o 'c:\none.o' q:none.o 'q:\*.o'
   Error: L6833E: File 'z:none.o' does not exist
   Error: L6833E: File 'c:none.o' does not exist
@@ -245,11 +245,11 @@ Nor what it can't have in a name. The rest of a name behind a backslash is one.
 
   $ devices 'a*b' 'a?b' 'a<b>' 'a|b' 'a"b' | grep -v '^out: x - a'
   out: x - last.o
-  err: Error: L6843E: Writing file 'a*b' : No such file or directory
-  err: Error: L6843E: Writing file 'a?b' : No such file or directory
-  err: Error: L6843E: Writing file 'a<b>' : No such file or directory
-  err: Error: L6843E: Writing file 'a|b' : No such file or directory
-  err: Error: L6843E: Writing file 'a"b' : No such file or directory
+  err: Error: L6843E: Writing file 'a*b' : Invalid argument
+  err: Error: L6843E: Writing file 'a?b' : Invalid argument
+  err: Error: L6843E: Writing file 'a<b>' : Invalid argument
+  err: Error: L6843E: Writing file 'a|b' : Invalid argument
+  err: Error: L6843E: Writing file 'a"b' : Invalid argument
   status 1
   last.o
   ok
