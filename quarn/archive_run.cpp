@@ -79,19 +79,17 @@ RunEnd writeArchive(Run& run) {
   }
   run.archive.updateAuxiliaryMembers();
   if (hasErrors()) return RunEnd::Done;
-  if (!isNew || run.openStatus.errorNumber == 0) {
-    arlib::writeFile(run.getArchiveName(), run.archive);
-    return RunEnd::Done;
-  }
-  const arlib::NewFile newFile = arlib::writeNewFile(run.getArchiveName(), run.archive);
-  return newFile == arlib::NewFile::Exists ? RunEnd::Overtaken : RunEnd::Done;
+  const bool mayReplace = !isNew || run.openStatus.errorNumber == 0;
+  const arlib::WriteEnd end = mayReplace ? arlib::writeInTurn(run.getArchiveName(), run.archive)
+                                         : arlib::writeNewFile(run.getArchiveName(), run.archive);
+  return end == arlib::WriteEnd::Overtaken ? RunEnd::Overtaken : RunEnd::Done;
 }
 
 RunEnd openActAndWrite(Run& run, const char* archiveName, const RunAction& action,
                        messages::HeldOutput& output) {
   const bool isOpen = openArchive(run, archiveName);
-  // Nobody can overtake who has his turn.
-  if (!run.openStatus.missing) output.release();
+  // Nobody can overtake who keeps his turn to the end.
+  if (!run.openStatus.missing && run.archive.getHost().keepsLocks()) output.release();
   if (!isOpen || hasErrors()) return RunEnd::Done;
   if (run.settings.accessMode == Access_Write && run.archive.isReadOnly()) {
     reportMessage(messages::ErrorWord, messages::OutputReadOnly, archiveName);

@@ -18,13 +18,18 @@ class Archive;
 /// with ESTALE.
 bool writeFile(const char* fileName, Archive& archive);
 
-enum class NewFile {
+enum class WriteEnd {
   Written,
-  Failed, ///< after a report
-  Exists, ///< a file has appeared at the name: it is left as it is, and nothing is reported
+  Failed,    ///< after a report
+  Overtaken, ///< somebody else has been faster: his file is left as it is, and nothing is reported
 };
 
-/// The same for an archive that must not replace anything.
-[[nodiscard]] NewFile writeNewFile(const char* fileName, Archive& archive);
+/// The same for an archive that must not replace anything; a file that appears at the name
+/// overtakes it.
+[[nodiscard]] WriteEnd writeNewFile(const char* fileName, Archive& archive);
+
+/// The same for one whose lock is held (see writer_turn.h): it can be overtaken where a disk
+/// replaces no open file, since the lock goes with the handle.
+[[nodiscard]] WriteEnd writeInTurn(const char* fileName, Archive& archive);
 
 } // namespace arlib

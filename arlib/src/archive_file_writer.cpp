@@ -78,15 +78,22 @@ std::string nameField(const ArchiveMember& member) {
 
 class ArchiveFileWriter {
 public:
-  ArchiveFileWriter(const char* fileName, Archive& archive, bool mustBeNew)
+  // What becomes of a file that somebody else has put in the place meanwhile.
+  enum class Others { AreReported, Overtake, OvertakeIfThereIsAny };
+
+  ArchiveFileWriter(const char* fileName, Archive& archive, Others others)
       : m_FileName(fileName), m_Archive(archive), m_Host(archive.getHost()),
-        m_Target(m_Host.followLinks(fileName)), m_Contents(archive), m_MustBeNew(mustBeNew) {}
+        m_Target(m_Host.followLinks(fileName)), m_Contents(archive), m_Others(others) {}
 
   bool write();
-  // Whether somebody else has made the file that had to be new; that has not been reported.
-  [[nodiscard]] bool wasOvertaken() const { return m_WasOvertaken; }
+  [[nodiscard]] WriteEnd writeToTheEnd() {
+    if (write()) return WriteEnd::Written;
+    return m_WasOvertaken ? WriteEnd::Overtaken : WriteEnd::Failed;
+  }
 
 private:
+  [[nodiscard]] bool mustBeNew() const { return m_Others == Others::OvertakeIfThereIsAny; }
+  [[nodiscard]] bool isOvertaken(int error) const;
   bool checkTarget();
   bool createTemporary();
   bool writeTemporary();
@@ -117,20 +124,32 @@ private:
   std::string m_TemporaryName;
   support::FileHandle m_Temporary;
   ContentsReader m_Contents;
-  bool m_MustBeNew;
-  bool m_WasOvertaken = false;
+  Others m_Others;
+  bool m_HasLetGo = false;
+  bool m_WasOvertaken = false; // which has not been reported
 };
 
 bool writeFile(const char* fileName, Archive& archive) {
   QUARN_ASSERT(1, fileName != NULL);
-  return ArchiveFileWriter(fileName, archive, false).write();
+  return ArchiveFileWriter(fileName, archive, ArchiveFileWriter::Others::AreReported).write();
 }
 
-NewFile writeNewFile(const char* fileName, Archive& archive) {
+WriteEnd writeNewFile(const char* fileName, Archive& archive) {
   QUARN_ASSERT(1, fileName != NULL);
-  ArchiveFileWriter writer(fileName, archive, true);
-  if (writer.write()) return NewFile::Written;
-  return writer.wasOvertaken() ? NewFile::Exists : NewFile::Failed;
+  constexpr auto Others = ArchiveFileWriter::Others::OvertakeIfThereIsAny;
+  return ArchiveFileWriter(fileName, archive, Others).writeToTheEnd();
+}
+
+WriteEnd writeInTurn(const char* fileName, Archive& archive) {
+  QUARN_ASSERT(1, fileName != NULL);
+  constexpr auto Others = ArchiveFileWriter::Others::Overtake;
+  return ArchiveFileWriter(fileName, archive, Others).writeToTheEnd();
+}
+
+// Whether a name that is taken, or a file that is another one, is somebody else's good work.
+bool ArchiveFileWriter::isOvertaken(int error) const {
+  if (mustBeNew()) return error == EEXIST;
+  return m_Others == Others::Overtake && m_HasLetGo && error == support::FileHasChanged;
 }
 
 bool ArchiveFileWriter::checkTarget() {
@@ -139,7 +158,7 @@ bool ArchiveFileWriter::checkTarget() {
   if (statusError != 0 && statusError != ENOENT) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, statusError);
   }
-  m_WasOvertaken = m_MustBeNew && statusError == 0;
+  m_WasOvertaken = mustBeNew() && statusError == 0;
   if (m_WasOvertaken) return false;
   if (statusError == 0 && !m_Host.isWritable(m_Target.c_str())) {
     return m_Archive.fail(&ErrorHandler::reportReadOnlyOutput, m_FileName);
@@ -242,6 +261,7 @@ int ArchiveFileWriter::checkIsOwnTarget() const {
 // Everything is copied, so what is open can be let go of where it is in the way. The lock goes with
 // it: somebody else may write before the next try, and is noticed there.
 void ArchiveFileWriter::letGoOfFiles() {
+  m_HasLetGo = true;
   m_Archive.m_SourceFiles.closeAll();
   if (m_Archive.getOwnFile() != nullptr) m_Archive.getOwnFile()->close();
 }
@@ -268,10 +288,10 @@ int ArchiveFileWriter::replaceOwnTarget() {
 
 bool ArchiveFileWriter::takeName() {
   const int error = takeStep([this] {
-    return m_MustBeNew ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str())
+    return mustBeNew() ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str())
                        : replaceOwnTarget();
   });
-  m_WasOvertaken = m_MustBeNew && error == EEXIST;
+  m_WasOvertaken = isOvertaken(error);
   if (error == 0 || m_WasOvertaken) return error == 0;
   return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
 }

@@ -45,6 +45,7 @@ public:
   HostError close(FileHandle file) override { return m_Host.close(file); }
   HostError rename(const char* from, const char* to) override;
   HostError renameNew(const char* from, const char* to) override;
+  bool keepsLocks() const override { return m_Host.keepsLocks(); }
   void pause(uint32_t milliseconds) override { m_Host.pause(milliseconds); }
   HostError remove(const char* name) override;
   HostError status(const char* name, FileStatus& status) override;

@@ -137,6 +137,10 @@ public:
   /// The same where there must be no `to` yet (else EEXIST), in one step as far as the host can.
   [[nodiscard]] virtual HostError renameNew(const char* from, const char* to) = 0;
 
+  /// Whether who has the lock of a file keeps it until he has put another in its place: not where
+  /// the handle that it comes with may have to be closed first.
+  [[nodiscard]] virtual bool keepsLocks() const { return true; }
+
   /// Does nothing for a while.
   virtual void pause(uint32_t milliseconds) = 0;
 

@@ -447,6 +447,9 @@ public:
     });
   }
 
+  // It depends on the disk, and not every disk tells.
+  bool keepsLocks() const override { return false; }
+
   void pause(uint32_t milliseconds) override { Sleep(milliseconds); }
 
   HostError remove(const char* name) override {

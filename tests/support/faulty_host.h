@@ -72,6 +72,7 @@ public:
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
+  bool keepsLocks() const override { return m_Host.keepsLocks(); }
   void pause(uint32_t milliseconds) override { m_Host.pause(milliseconds); }
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;

@@ -101,6 +101,7 @@ public:
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
+  bool keepsLocks() const override { return !m_WhileWaiting; }
   void pause(uint32_t milliseconds) override;
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;

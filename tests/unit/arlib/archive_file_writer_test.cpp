@@ -398,6 +398,24 @@ TEST_F(BusyTarget, IsNotReplacedWhenSomebodyElseHasWrittenMeanwhile) {
   EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
 }
 
+TEST_F(BusyTarget, IsLeftToWhoWasFasterByOneWhoseTurnItWas) {
+  openElsewhere();
+  const std::string others = archive().member("b.o", "other").bytes();
+  m_Host.keepOpenFiles([&] { m_Host.addFile("lib.a", others); });
+  EXPECT_EQ(writeInTurn("lib.a", m_Archive), WriteEnd::Overtaken);
+  EXPECT_THAT(m_Handler.reports, IsEmpty());
+  EXPECT_EQ(written(), others);
+  EXPECT_THAT(m_Host.getNames(), ElementsAre("a.o", "lib.a"));
+}
+
+// The lock was kept, so this one has not waited for it.
+TEST_F(BusyTarget, IsReportedWhereNothingHadToBeLetGoOf) {
+  m_Host.addFile("lib.a", archive().member("b.o", "other").bytes());
+  EXPECT_EQ(writeInTurn("lib.a", m_Archive), WriteEnd::Failed);
+  EXPECT_THAT(m_Handler.reports,
+              ElementsAre("0 I/O error writing file 'lib.a': Stale file handle"));
+}
+
 TEST_F(FailingWrite, AtTheAccessTestCountsAsReadOnly) {
   EXPECT_FALSE(writeFailing("isWritable", 1, EIO));
   EXPECT_THAT(m_Handler.reports, ElementsAre("0 Output file 'lib.a' is read-only"));
@@ -470,9 +488,9 @@ TEST_F(FailingWrite, AtABusyNewNameIsTriedAgain) {
     Archive archive(m_Host);
     archive.setErrorHandler(&m_Handler);
     m_Host.failCall(call, EBUSY);
-    const NewFile result = writeNewFile("new.a", archive);
+    const WriteEnd result = writeNewFile("new.a", archive);
     failed = m_Host.getFailedOperation();
-    EXPECT_TRUE(failed != "renameNew" || result == NewFile::Written);
+    EXPECT_TRUE(failed != "renameNew" || result == WriteEnd::Written);
   }
   EXPECT_EQ(failed, "renameNew");
   EXPECT_THAT(m_Disk.getNames(), ElementsAre("a.o", "lib.a", "new.a"));

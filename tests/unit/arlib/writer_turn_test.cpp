@@ -166,9 +166,9 @@ TEST_F(WriterTurnTest, FindsItsMembersInTheFileThatItHasWritten) {
 
 TEST_F(WriterTurnTest, MakesANewArchiveWhereThereIsNone) {
   add("a.o", "x");
-  EXPECT_EQ(writeNewFile("lib.a", m_Archive), NewFile::Written);
+  EXPECT_EQ(writeNewFile("lib.a", m_Archive), WriteEnd::Written);
   EXPECT_EQ(m_Host.read("lib.a"), archive().member("a.o", "x").bytes());
-  EXPECT_EQ(writeNewFile("lib.a", m_Archive), NewFile::Exists);
+  EXPECT_EQ(writeNewFile("lib.a", m_Archive), WriteEnd::Overtaken);
   EXPECT_THAT(reports(), IsEmpty());
 }
 
@@ -184,14 +184,14 @@ TEST_F(WriterTurnTest, NeverReplacesAnArchiveThatHasAppeared) {
     mine.setErrorHandler(&m_Handler);
     mine.addMemberFromFile("a.o");
     host.disturbCall(call, [&] { disk.addFile("lib.a", others); });
-    const NewFile result = writeNewFile("lib.a", mine);
+    const WriteEnd result = writeNewFile("lib.a", mine);
     const bool isLate = host.getFailedOperation().empty();
-    if (result == NewFile::Exists) {
+    if (result == WriteEnd::Overtaken) {
       ++appearances;
       EXPECT_EQ(disk.read("lib.a"), others);
       EXPECT_THAT(disk.getNames(), ElementsAre("a.o", "lib.a"));
     }
-    EXPECT_NE(result, NewFile::Failed);
+    EXPECT_NE(result, WriteEnd::Failed);
     if (isLate) break;
   }
   EXPECT_GT(appearances, 5u);
@@ -201,7 +201,7 @@ TEST_F(WriterTurnTest, NeverReplacesAnArchiveThatHasAppeared) {
 TEST_F(WriterTurnTest, ReportsANewFileThatCannotBeMade) {
   m_Host.setRoom(0);
   add("a.o", "x");
-  EXPECT_EQ(writeNewFile("lib.a", m_Archive), NewFile::Failed);
+  EXPECT_EQ(writeNewFile("lib.a", m_Archive), WriteEnd::Failed);
   EXPECT_THAT(reports(),
               ElementsAre("0 I/O error writing file 'lib.a.0': No space left on device"));
 }

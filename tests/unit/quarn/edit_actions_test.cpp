@@ -5,6 +5,8 @@
 
 #include "tests/unit/quarn/driver_fixture.h"
 
+#include <utility>
+
 namespace quarn {
 
 class MoveActionTest : public DriverTest {
@@ -101,6 +103,45 @@ TEST_F(WrittenTableTest, IsLeftOutOnDemand) {
   EXPECT_TRUE(hasTable());
   ASSERT_EQ(run({"-n", "-s", "lib.a"}).status, 0);
   EXPECT_FALSE(hasTable());
+}
+
+// ---- Turns, where a disk replaces no open file
+
+class LostTurnTest : public DriverTest {
+protected:
+  // Somebody else has the archive open, and has added a member to it when this run tries again.
+  void givenSomebodyFaster() {
+    ASSERT_EQ(m_Host.openForReading("lib.a", m_Other), 0);
+    m_Host.keepOpenFiles([this] {
+      if (!m_Other.isOpen()) return;
+      EXPECT_EQ(m_Host.close(std::exchange(m_Other, {})), 0);
+      givenLibrary({"a.o", "theirs.o"});
+    });
+  }
+
+private:
+  support::FileHandle m_Other;
+};
+
+TEST_F(LostTurnTest, BeginsTheRunAnewAndSaysItOnce) {
+  givenLibrary({"a.o"});
+  givenFile("mine.o");
+  givenSomebodyFaster();
+  const RunOutcome outcome = run({"-rv", "lib.a", "mine.o"});
+  EXPECT_EQ(outcome.status, 0);
+  EXPECT_EQ(outcome.output, "a - mine.o\n");
+  EXPECT_EQ(outcome.errors, "");
+  EXPECT_THAT(names(), ElementsAre("a.o", "theirs.o", "mine.o"));
+}
+
+TEST_F(LostTurnTest, TellsOfWhatTheOtherHasLeft) {
+  givenLibrary({"a.o", "old.o"});
+  givenSomebodyFaster();
+  const RunOutcome outcome = run({"-dv", "lib.a", "old.o"});
+  EXPECT_EQ(outcome.status, 0);
+  EXPECT_EQ(outcome.output, "");
+  EXPECT_THAT(outcome.errors, HasSubstr("'old.o' not present in archive 'lib.a'"));
+  EXPECT_THAT(names(), ElementsAre("a.o", "theirs.o"));
 }
 
 } // namespace quarn
