@@ -282,8 +282,11 @@ int ArchiveFileWriter::takeStep(const std::function<int()>& step) {
 }
 
 int ArchiveFileWriter::replaceOwnTarget() {
-  if (const int error = checkIsOwnTarget(); error != 0) return error;
-  return m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
+  const support::SourceFile* own = m_Archive.getOwnFile().get();
+  return m_Host.replaceAlone(own != nullptr ? own->getStatus() : m_OldStatus, [this] {
+    const int error = checkIsOwnTarget();
+    return error != 0 ? error : m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
+  });
 }
 
 bool ArchiveFileWriter::takeName() {

@@ -46,6 +46,9 @@ public:
   HostError rename(const char* from, const char* to) override;
   HostError renameNew(const char* from, const char* to) override;
   bool keepsLocks() const override { return m_Host.keepsLocks(); }
+  HostError replaceAlone(const FileStatus& file, const std::function<HostError()>& step) override {
+    return m_Host.replaceAlone(file, step);
+  }
   void pause(uint32_t milliseconds) override { m_Host.pause(milliseconds); }
   HostError remove(const char* name) override;
   HostError status(const char* name, FileStatus& status) override;

@@ -18,6 +18,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -140,6 +141,13 @@ public:
   /// Whether who has the lock of a file keeps it until he has put another in its place: not where
   /// the handle that it comes with may have to be closed first.
   [[nodiscard]] virtual bool keepsLocks() const { return true; }
+
+  /// Takes a step that looks at a file and then replaces it. Where the lock may be gone by then,
+  /// nobody on this machine who replaces the same file in this way comes in between.
+  [[nodiscard]] virtual HostError replaceAlone(const FileStatus&,
+                                               const std::function<HostError()>& step) {
+    return step();
+  }
 
   /// Does nothing for a while.
   virtual void pause(uint32_t milliseconds) = 0;

@@ -240,6 +240,11 @@ private:
   HANDLE m_Handle;
 };
 
+// Some calls say "no handle" with another number.
+HANDLE orInvalid(HANDLE handle) {
+  return handle == nullptr ? INVALID_HANDLE_VALUE : handle;
+}
+
 // One step also where somebody has the old file open.
 bool renameAsPosix(const std::wstring& from, const std::wstring& to) {
   const OwnedHandle file(CreateFileW(from.c_str(), DELETE | SYNCHRONIZE, ShareAll, nullptr,
@@ -449,6 +454,18 @@ public:
 
   // It depends on the disk, and not every disk tells.
   bool keepsLocks() const override { return false; }
+
+  // A mutex with the name of the file that goes: who has read another one has another.
+  HostError replaceAlone(const FileStatus& file, const std::function<HostError()>& step) override {
+    const std::wstring name =
+        L"Global\\quarn-" + std::to_wstring(file.device) + L"-" + std::to_wstring(file.inode);
+    const OwnedHandle mutex(orInvalid(CreateMutexW(nullptr, FALSE, name.c_str())));
+    // One that ended without giving it back leaves nothing half done.
+    const bool isHeld = mutex.isOpen() && WaitForSingleObject(mutex.get(), INFINITE) != WAIT_FAILED;
+    const HostError error = step();
+    if (isHeld) ReleaseMutex(mutex.get());
+    return error;
+  }
 
   void pause(uint32_t milliseconds) override { Sleep(milliseconds); }
 

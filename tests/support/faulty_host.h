@@ -73,6 +73,10 @@ public:
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;
   bool keepsLocks() const override { return m_Host.keepsLocks(); }
+  support::HostError replaceAlone(const support::FileStatus& file,
+                                  const std::function<support::HostError()>& step) override {
+    return m_Host.replaceAlone(file, step);
+  }
   void pause(uint32_t milliseconds) override { m_Host.pause(milliseconds); }
   support::HostError remove(const char* name) override;
   support::HostError status(const char* name, support::FileStatus& status) override;
