@@ -64,8 +64,8 @@ private:
 
 /// Whether a host of this style takes the leaf for a file of that name in the folder at hand, and
 /// for nothing else: on Windows some names are devices in every folder, ":" leads to a stream
-/// inside a file, wildcards and
-/// controls are in no name, and dots and blanks at the end are dropped. On POSIX every leaf is one.
+/// inside a file, wildcards and controls are in no name, and dots and blanks at the end are
+/// dropped. On POSIX every leaf is one.
 [[nodiscard]] bool isPlainLeaf(std::string_view leaf, PathStyle style);
 
 /// The name without the drive in front, on a host that has drives: "c:x.o" leads to "x.o".
