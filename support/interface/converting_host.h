@@ -45,7 +45,7 @@ public:
   HostError close(FileHandle file) override { return m_Host.close(file); }
   HostError rename(const char* from, const char* to) override;
   HostError renameNew(const char* from, const char* to) override;
-  bool keepsLocks() const override { return m_Host.keepsLocks(); }
+  [[nodiscard]] bool keepsLocks() const override { return m_Host.keepsLocks(); }
   HostError replaceAlone(const FileStatus& file, const std::function<HostError()>& step) override {
     return m_Host.replaceAlone(file, step);
   }
