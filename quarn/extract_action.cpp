@@ -100,14 +100,11 @@ void Extraction::write(const ArchiveMember& member, const std::string& name,
   const bool isRead = copy(member, file, error);
   if (error == 0) error = m_Host.flush(file);
   restoreStatus(member, file);
-  const int closeError = m_Host.close(file);
+  const int closeError = m_Host.endWriting(file, name.c_str(), isRead && error == 0);
   if (error == 0) error = closeError;
-  if (isRead && error == 0) return;
-  if (isRead) {
-    reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
-                  hostErrorText(error));
-  }
-  [[maybe_unused]] const int removeError = m_Host.remove(name.c_str());
+  if (!isRead || error == 0) return;
+  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
+                hostErrorText(error));
 }
 
 void ContentsPrinter::print(const ArchiveMember& member) {

@@ -12,6 +12,7 @@
 #include "messages/interface/output.h"
 #include "messages/interface/process_end.h"
 #include "quarn/reporting.h"
+#include "support/interface/host.h"
 #include "support/interface/tool_name.h"
 
 #include <array>
@@ -26,10 +27,12 @@ constexpr size_t DriverRegionSize = 1024;
 // Never destroyed: the process may end anywhere, with regions alive.
 alloclib::Session* session = nullptr;
 alloclib::RegionGeneral* driverRegion = nullptr;
+support::Host* usedHost = nullptr;
 
 } // namespace
 
 void startUp(int argc, const char* const* argv, support::Host& host, Work work) {
+  usedHost = &host;
   session = new alloclib::Session;
   driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
   messages::initialise();
@@ -42,8 +45,9 @@ void startUp(int argc, const char* const* argv, support::Host& host, Work work) 
 }
 
 // Objects of the work may still be alive where a message ends the run, so what the regions hold is
-// left to the host.
+// left to the host. Half a file is not: it looks like a whole one to whoever finds it.
 void shutDown(int code) {
+  if (usedHost != nullptr) usedHost->removeUnfinished();
   messages::closeStreams();
   if (driverRegion != nullptr) {
     driverRegion->Destroy(false);

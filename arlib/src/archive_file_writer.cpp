@@ -8,7 +8,9 @@
 #include "arlib/interface/archive_format.h"
 #include "arlib/interface/contents_reader.h"
 #include "arlib/src/read_symbol_table.h"
+#include "support/interface/path.h"
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <cstring>
@@ -26,6 +28,24 @@ using support::FileStatus;
 
 // Small pieces are gathered up to this size; what is larger is written as it is.
 constexpr size_t BufferSize = 0x40000;
+
+// Permission bits that a file begins with, of which the user's mask takes some away.
+constexpr uint32_t UsualMode = 0666;
+constexpr uint32_t PrivateMode = 0600;
+
+// Without so many bytes of its leaf that any number finds room, and no half of a character at the
+// end.
+std::string_view withoutEnd(std::string_view name, support::PathStyle style) {
+  constexpr size_t LongestNumber = sizeof ".4294967295";
+  constexpr int LongestRest = 3; // of a character in UTF-8
+  size_t size = name.size() - std::min(LongestNumber, support::leafOf(name, style).size() / 2);
+  const auto isInside = [&] {
+    return size > 0 && (static_cast<uint8_t>(name[size]) & 0xC0) == 0x80;
+  };
+  for (int i = 0; i < LongestRest && isInside(); ++i)
+    --size;
+  return name.substr(0, size);
+}
 
 // Collects small pieces and writes large ones.
 class GatheringOutput {
@@ -95,7 +115,9 @@ private:
   [[nodiscard]] bool mustBeNew() const { return m_Others == Others::OvertakeIfThereIsAny; }
   [[nodiscard]] bool isOvertaken(int error) const;
   bool checkTarget();
+  bool tryNames(const std::function<int(const char*)>& step);
   bool createTemporary();
+  bool nameTemporary();
   bool writeTemporary();
   bool writeMember(GatheringOutput& output, const ArchiveMember& member);
   static int writeHeader(GatheringOutput& output, const ArchiveMember& member);
@@ -122,7 +144,8 @@ private:
   FileStatus m_OldStatus;
   FileStatus m_NewStatus; // of the complete temporary
   std::string m_TemporaryName;
-  support::FileHandle m_Temporary;
+  uint32_t m_TemporaryNumber = 0; // of the next name that is tried
+  support::TemporaryFile m_Temporary;
   ContentsReader m_Contents;
   Others m_Others;
   bool m_HasLetGo = false;
@@ -175,7 +198,7 @@ bool ArchiveFileWriter::write() {
   }
   if (!createTemporary()) return false;
   if (!writeTemporary()) {
-    [[maybe_unused]] const int error = m_Host.close(m_Temporary);
+    [[maybe_unused]] const int error = m_Host.close(m_Temporary.handle);
     return removeTemporary();
   }
   if (!closeTemporary() || !replaceTarget()) return removeTemporary();
@@ -185,19 +208,40 @@ bool ArchiveFileWriter::write() {
 }
 
 // The first free name of lib.a.0, lib.a.1 and so on, beside the target, so that the rename stays
-// within one file system.
-bool ArchiveFileWriter::createTemporary() {
+// within one file system. A name of almost the greatest length has room for a number only when it
+// loses its end.
+bool ArchiveFileWriter::tryNames(const std::function<int(const char*)>& step) {
+  std::string_view beginning = m_Target;
   int error = EEXIST;
-  for (uint32_t number = 0; error == EEXIST; ++number) {
-    m_TemporaryName = m_Target + "." + std::to_string(number);
-    error = m_Archive.m_SourceFiles.openOther(
-        [this] { return m_Host.createTemporary(m_TemporaryName.c_str(), m_Temporary); });
+  while (error == EEXIST) {
+    m_TemporaryName = std::string(beginning) + "." + std::to_string(m_TemporaryNumber++);
+    error = step(m_TemporaryName.c_str());
+    if (error != ENAMETOOLONG || beginning.size() < m_Target.size()) continue;
+    beginning = withoutEnd(beginning, m_Host.getPathStyle());
+    error = EEXIST;
+    m_TemporaryNumber = 0;
   }
   return error == 0 || failToWrite(error);
 }
 
+// What takes the place of an old archive is nobody else's to read before it is as protected as that
+// one was.
+bool ArchiveFileWriter::createTemporary() {
+  const uint32_t mode = m_OldStatus.kind == FileKind::RegularFile ? PrivateMode : UsualMode;
+  return tryNames([&](const char* name) {
+    return m_Archive.m_SourceFiles.openOther(
+        [&] { return m_Host.createTemporary(name, mode, m_Temporary); });
+  });
+}
+
+bool ArchiveFileWriter::nameTemporary() {
+  const int error = m_Host.giveName(m_Temporary, m_TemporaryName.c_str());
+  if (error != EEXIST) return error == 0 || failToWrite(error);
+  return tryNames([this](const char* name) { return m_Host.giveName(m_Temporary, name); });
+}
+
 bool ArchiveFileWriter::writeTemporary() {
-  GatheringOutput output(m_Host, m_Temporary);
+  GatheringOutput output(m_Host, m_Temporary.handle);
   if (const int error = output.write(asBytes(ArchiveMagic)); error != 0) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
   }
@@ -207,8 +251,8 @@ bool ArchiveFileWriter::writeTemporary() {
   if (!m_Contents.finish()) return failToWrite(m_Contents.getError());
   int error = m_Archive.closeInputs();
   if (error == 0) error = output.drain();
-  if (error == 0) error = m_Host.flush(m_Temporary);
-  if (error == 0) error = m_Host.statusOf(m_Temporary, m_NewStatus);
+  if (error == 0) error = m_Host.flush(m_Temporary.handle);
+  if (error == 0) error = m_Host.statusOf(m_Temporary.handle, m_NewStatus);
   return error == 0 || failToWrite(error);
 }
 
@@ -240,10 +284,13 @@ bool ArchiveFileWriter::writeContents(GatheringOutput& output, const ArchiveMemb
 }
 
 bool ArchiveFileWriter::closeTemporary() {
-  if (m_OldStatus.kind == FileKind::RegularFile) {
-    m_Host.setPermissions(m_Temporary, m_OldStatus.mode);
+  if (!nameTemporary()) {
+    [[maybe_unused]] const int error = m_Host.close(m_Temporary.handle);
+    return false;
   }
-  const int error = m_Host.close(m_Temporary);
+  if (m_OldStatus.kind == FileKind::RegularFile)
+    m_Host.copyProtection(m_Target.c_str(), m_OldStatus, m_Temporary.handle);
+  const int error = m_Host.close(m_Temporary.handle);
   if (error == 0) return true;
   return m_Archive.fail(&ErrorHandler::reportCloseError, m_TemporaryName.c_str(), error);
 }
@@ -311,6 +358,7 @@ bool ArchiveFileWriter::replaceTarget() {
 // The one way out of every failure. What made it necessary has been reported, so a temporary that
 // can't be removed is not told of as well.
 bool ArchiveFileWriter::removeTemporary() {
+  if (!m_Temporary.hasName) return false;
   [[maybe_unused]] const int error =
       takeStep([this] { return m_Host.remove(m_TemporaryName.c_str()); });
   return false;

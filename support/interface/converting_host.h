@@ -34,10 +34,13 @@ public:
   HostError openSequential(const char* name, FileHandle& file) override;
   HostError readNext(FileHandle file, std::span<uint8_t> bytes, size_t& done) override;
   HostError lock(FileHandle file) override { return m_Host.lock(file); }
-  HostError createTemporary(const char* name, FileHandle& file) override;
+  HostError createTemporary(const char* name, uint32_t mode, TemporaryFile& file) override;
+  HostError giveName(TemporaryFile& file, const char* name) override;
   /// The name is one of the host's behind, and must be its own conversion.
   HostError createUnnamedTemporary(std::string& name, FileHandle& file) override;
   HostError openForWriting(const char* name, FileHandle& file) override;
+  HostError endWriting(FileHandle file, const char* name, bool isWhole) override;
+  void removeUnfinished() override { m_Host.removeUnfinished(); }
   HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                    size_t& done) override;
   HostError write(FileHandle file, std::span<const uint8_t> bytes) override;
@@ -55,6 +58,7 @@ public:
   HostError statusOf(FileHandle file, FileStatus& status) override;
   bool isWritable(const char* name) override;
   void setPermissions(FileHandle file, uint32_t mode) override;
+  void copyProtection(const char* from, const FileStatus& status, FileHandle file) override;
   void setTimes(FileHandle file, int64_t seconds) override;
   /// The name as it was given where it is no link, else one of the host's behind.
   std::string followLinks(const char* name) override;

@@ -75,6 +75,13 @@ struct FileHandle {
   [[nodiscard]] bool isOpen() const { return number >= 0; }
 };
 
+/// A file that is going to be put in another's place when it is whole. Where the host can have such
+/// files it has no name until it is given one, and goes with its handle whatever ends the process.
+struct TemporaryFile {
+  FileHandle handle;
+  bool hasName = false;
+};
+
 /// All file operations of a process. Objects that are given one keep a reference: it outlives them.
 /// Texts are views for the call.
 class Host {
@@ -103,15 +110,28 @@ public:
   /// back. An error means that the host or the file system has no locks.
   [[nodiscard]] virtual HostError lock(FileHandle file) = 0;
 
-  /// Creates a file that must not exist yet (else EEXIST). It is a temporary: should a signal end
-  /// the process before `rename` or `remove` was called with its name, the host removes it.
-  [[nodiscard]] virtual HostError createTemporary(const char* name, FileHandle& file) = 0;
+  /// Creates a file for a name at which nothing must stand yet (else EEXIST), with permission bits
+  /// that the user's mask still cuts. It is unfinished until it is renamed or removed.
+  [[nodiscard]] virtual HostError createTemporary(const char* name, uint32_t mode,
+                                                  TemporaryFile& file) = 0;
+
+  /// Lets a temporary that has no name so far stand at that one, if nothing has come to stand there
+  /// meanwhile (else EEXIST). Before it is closed.
+  [[nodiscard]] virtual HostError giveName(TemporaryFile&, const char*) { return 0; }
 
   /// Creates a temporary with a name of the host's choice in a writable place, and stores the name.
   [[nodiscard]] virtual HostError createUnnamedTemporary(std::string& name, FileHandle& file) = 0;
 
-  /// Creates a file, or empties the one that is there.
+  /// Creates a file, or empties the one that is there. It is unfinished until `endWriting`.
   [[nodiscard]] virtual HostError openForWriting(const char* name, FileHandle& file) = 0;
+
+  /// Closes what `openForWriting` has opened under that name. Unless all has arrived in it, and the
+  /// close goes well, too, the file is removed: a regular one alone, and only where it still
+  /// stands; never a device or a FIFO, and of a link the file that it leads to.
+  [[nodiscard]] virtual HostError endWriting(FileHandle file, const char* name, bool isWhole);
+
+  /// Removes all files of this process that are unfinished, before it ends.
+  virtual void removeUnfinished() {}
 
   /// Reads up to bytes.size() bytes at `offset`; `done` is how many there were. Fewer than asked
   /// for with a result of 0 means that the file ends there. On some hosts it moves the place where
@@ -165,6 +185,11 @@ public:
   /// Best effort: the permission bits of `mode`.
   virtual void setPermissions(FileHandle file, uint32_t mode) = 0;
 
+  /// Best effort: makes a file as protected as the one of that name with that status: permission
+  /// bits, and where the host has them owner, group, access lists, and attributes that users set.
+  /// A file that comes to belong to somebody else never runs with the rights of its owner.
+  virtual void copyProtection(const char* from, const FileStatus& status, FileHandle file);
+
   /// Best effort: when the file was last changed and used, in seconds since 1970. What is written
   /// later may change it again.
   virtual void setTimes(FileHandle file, int64_t seconds) = 0;
@@ -188,10 +213,10 @@ public:
 /// The host that the process runs on.
 [[nodiscard]] Host& getNativeHost();
 
-/// From now on what ends the process from outside (SIGINT, SIGTERM, SIGHUP and SIGPIPE; on Windows
-/// Ctrl-C, Ctrl-Break, the closing of the console and the end of the session) removes the
-/// temporaries of getNativeHost() first, and a file size limit shows as a failed write instead of a
-/// signal.
+/// From now on what ends the process against its will (on POSIX all signals that do and can be
+/// caught, its own faults among them; on Windows Ctrl-C, Ctrl-Break, the closing of the console and
+/// the end of the session) removes the unfinished files of getNativeHost() first, and a file size
+/// limit shows as a failed write instead of a signal.
 void installSignalCleanUp();
 
 } // namespace support

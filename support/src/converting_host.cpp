@@ -26,8 +26,12 @@ HostError ConvertingHost::readNext(FileHandle file, std::span<uint8_t> bytes, si
   return m_Host.readNext(file, bytes, done);
 }
 
-HostError ConvertingHost::createTemporary(const char* name, FileHandle& file) {
-  return m_Host.createTemporary(m_Convert(name).c_str(), file);
+HostError ConvertingHost::createTemporary(const char* name, uint32_t mode, TemporaryFile& file) {
+  return m_Host.createTemporary(m_Convert(name).c_str(), mode, file);
+}
+
+HostError ConvertingHost::giveName(TemporaryFile& file, const char* name) {
+  return m_Host.giveName(file, m_Convert(name).c_str());
 }
 
 HostError ConvertingHost::createUnnamedTemporary(std::string& name, FileHandle& file) {
@@ -36,6 +40,10 @@ HostError ConvertingHost::createUnnamedTemporary(std::string& name, FileHandle& 
 
 HostError ConvertingHost::openForWriting(const char* name, FileHandle& file) {
   return m_Host.openForWriting(m_Convert(name).c_str(), file);
+}
+
+HostError ConvertingHost::endWriting(FileHandle file, const char* name, bool isWhole) {
+  return m_Host.endWriting(file, m_Convert(name).c_str(), isWhole);
 }
 
 HostError ConvertingHost::readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
@@ -73,6 +81,10 @@ bool ConvertingHost::isWritable(const char* name) {
 
 void ConvertingHost::setPermissions(FileHandle file, uint32_t mode) {
   m_Host.setPermissions(file, mode);
+}
+
+void ConvertingHost::copyProtection(const char* from, const FileStatus& status, FileHandle file) {
+  m_Host.copyProtection(m_Convert(from).c_str(), status, file);
 }
 
 void ConvertingHost::setTimes(FileHandle file, int64_t seconds) {

@@ -36,6 +36,23 @@ std::string_view directoryPart(std::string_view word) {
   return slash == std::string_view::npos ? std::string_view() : word.substr(0, slash + 1);
 }
 
+HostError Host::endWriting(FileHandle file, const char* name, bool isWhole) {
+  FileStatus written;
+  const bool isKnown = statusOf(file, written) == 0 && written.kind == FileKind::RegularFile;
+  const HostError error = close(file);
+  if (!isKnown || (isWhole && error == 0)) return error;
+  const std::string place = followLinks(name);
+  FileStatus now;
+  // What can't be removed stays: why the file is not whole is known already.
+  if (status(place.c_str(), now) == 0 && now.isSameFile(written)) [[maybe_unused]]
+    const HostError removeError = remove(place.c_str());
+  return error;
+}
+
+void Host::copyProtection(const char*, const FileStatus& status, FileHandle file) {
+  setPermissions(file, status.mode);
+}
+
 HostError Host::findNames(std::string_view directory, std::string_view leaf,
                           std::vector<std::string>& names) {
   const std::string place = directory.empty() ? std::string("./") : std::string(directory);

@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The POSIX host. One thing here is more than one call each: a file made by createTemporary stands
-// in a small table until it is renamed or removed. The signal handler walks that table with
-// `unlink` alone, which is allowed in a handler; the signals are held back while the table and the
-// disk disagree.
+// The POSIX host. One thing here is more than one call each: what is not finished yet stands in a
+// table (posix_unfinished.h), unless it has no name at all. The signals are held back while the
+// table and the disk disagree.
 //
 // Opens, locks, reads and writes that a signal interrupts are made again, and short ones go on
 // where they stopped, so that callers see only whole results and true failures. Descriptors are
@@ -11,11 +10,14 @@
 
 #include "support/interface/host.h"
 
+#include "support/interface/host_files.h"
+#include "support/src/posix_protection.h"
+#include "support/src/posix_unfinished.h"
+
 #include <algorithm>
 #include <array>
 #include <cerrno>
 #include <chrono>
-#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -37,64 +39,6 @@ std::string hostErrorText(HostError error) {
 
 namespace {
 
-constexpr std::array<int, 4> EndingSignals = {SIGINT, SIGTERM, SIGHUP, SIGPIPE};
-
-// One archive is written at a time, and its members rarely have temporaries of their own; what
-// finds no room here is simply not removed by a signal.
-constexpr size_t MaximumTemporaries = 16;
-constexpr size_t MaximumTemporaryName = 4096;
-
-struct TemporarySlot {
-  volatile sig_atomic_t isUsed = 0;
-  char name[MaximumTemporaryName] = {};
-};
-
-std::array<TemporarySlot, MaximumTemporaries> temporarySlots;
-
-// Holds the ending signals back while it lives.
-class SignalHold {
-public:
-  SignalHold() {
-    sigset_t ending;
-    sigemptyset(&ending);
-    for (const int signal : EndingSignals)
-      sigaddset(&ending, signal);
-    sigprocmask(SIG_BLOCK, &ending, &m_Before);
-  }
-  ~SignalHold() { sigprocmask(SIG_SETMASK, &m_Before, nullptr); }
-  SignalHold(const SignalHold&) = delete;
-  SignalHold& operator=(const SignalHold&) = delete;
-
-private:
-  sigset_t m_Before;
-};
-
-void enterTemporary(const char* name) {
-  const size_t length = std::strlen(name);
-  if (length >= MaximumTemporaryName) return;
-  for (TemporarySlot& slot : temporarySlots) {
-    if (slot.isUsed != 0) continue;
-    std::memcpy(slot.name, name, length + 1);
-    slot.isUsed = 1;
-    return;
-  }
-}
-
-void forgetTemporary(const char* name) {
-  for (TemporarySlot& slot : temporarySlots) {
-    if (slot.isUsed != 0 && std::strcmp(slot.name, name) == 0) slot.isUsed = 0;
-  }
-}
-
-extern "C" void removeTemporariesAndEnd(int signal) {
-  for (TemporarySlot& slot : temporarySlots) {
-    if (slot.isUsed != 0) unlink(slot.name);
-  }
-  // The process ends by the signal itself, so that the caller's shell sees what has ended it.
-  std::signal(signal, SIG_DFL);
-  std::raise(signal);
-}
-
 FileKind kindOf(mode_t mode) {
   if (S_ISREG(mode)) return FileKind::RegularFile;
   if (S_ISDIR(mode)) return FileKind::Directory;
@@ -115,13 +59,65 @@ FileStatus statusFrom(const struct stat& native) {
   return status;
 }
 
-HostError openNative(const char* name, int flags, FileHandle& file) {
+constexpr mode_t UsualMode = 0666; // which the user's mask cuts
+constexpr size_t CopiedPiece = 0x40000;
+constexpr size_t LongestLink = 4096;
+
+HostError openNative(const char* name, int flags, FileHandle& file, mode_t mode = UsualMode) {
   do {
-    // 0666 is cut by the user's mask; what an archive shall have at the end is set from the old
-    // one.
-    file.number = ::open(name, flags | O_CLOEXEC, 0666);
+    file.number = ::open(name, flags | O_CLOEXEC, mode);
   } while (file.number < 0 && errno == EINTR);
   return file.isOpen() ? 0 : errno;
+}
+
+// A device or a FIFO is never one.
+void enterIfRegular(const char* name, FileHandle file, int descriptor = NoDescriptor) {
+  struct stat native;
+  if (fstat(file.number, &native) == 0 && S_ISREG(native.st_mode))
+    enterUnfinished(name, native, descriptor);
+}
+
+#ifdef O_TMPFILE
+
+// The one way to name a file that has none which needs no rights of an administrator. Where it
+// isn't there (a process that sees no /proc) the file could never get a name.
+std::string ownName(FileHandle file) {
+  return "/proc/self/fd/" + std::to_string(file.number);
+}
+
+// False where the file system, or the process, can't have files without names.
+bool openWithoutName(std::string_view name, mode_t mode, FileHandle& file) {
+  const std::string_view directory = directoryPart(name);
+  if (directory.size() == name.size()) return false;
+  const std::string place(directory.empty() ? "." : directory);
+  if (openNative(place.c_str(), O_RDWR | O_TMPFILE, file, mode) != 0) return false;
+  if (access(ownName(file).c_str(), F_OK) == 0) return true;
+  ::close(file.number);
+  return false;
+}
+
+HostError linkOwn(FileHandle file, const char* name) {
+  return linkat(AT_FDCWD, ownName(file).c_str(), AT_FDCWD, name, AT_SYMLINK_FOLLOW) == 0 ? 0
+                                                                                         : errno;
+}
+
+#else
+
+bool openWithoutName(std::string_view, mode_t, FileHandle&) {
+  return false;
+}
+
+HostError linkOwn(FileHandle, const char*) {
+  return ENOSYS;
+}
+
+#endif
+
+// Whether anything stands there, also a link that leads nowhere; an error if the host can't tell.
+HostError checkIsFree(const char* name) {
+  struct stat native;
+  if (lstat(name, &native) == 0) return EEXIST;
+  return errno == ENOENT ? 0 : errno;
 }
 
 // The lock belongs to the opening, not to the process: closing another handle of the same file
@@ -160,7 +156,7 @@ HostError renameNewNative(const char* from, const char* to) {
 
 // One step of followLinks: the text of a link, or empty if the name is no link.
 std::string linkText(const std::string& name) {
-  std::array<char, MaximumTemporaryName> text;
+  std::array<char, LongestLink> text;
   const ssize_t length = readlink(name.c_str(), text.data(), text.size());
   if (length <= 0 || static_cast<size_t>(length) == text.size()) return {};
   return std::string(text.data(), static_cast<size_t>(length));
@@ -199,10 +195,23 @@ public:
     return 0;
   }
 
-  HostError createTemporary(const char* name, FileHandle& file) override {
+  HostError createTemporary(const char* name, uint32_t mode, TemporaryFile& file) override {
+    if (const HostError error = checkIsFree(name); error != 0) return error;
+    file.hasName = !openWithoutName(name, mode, file.handle);
+    if (!file.hasName) return 0;
     const SignalHold hold;
-    const HostError error = openNative(name, O_WRONLY | O_CREAT | O_EXCL, file);
-    if (error == 0) enterTemporary(name);
+    const HostError error = openNative(name, O_WRONLY | O_CREAT | O_EXCL, file.handle, mode);
+    if (error == 0) enterIfRegular(name, file.handle);
+    return error;
+  }
+
+  HostError giveName(TemporaryFile& file, const char* name) override {
+    if (file.hasName) return 0;
+    const SignalHold hold;
+    HostError error = linkOwn(file.handle, name);
+    if (error != 0 && error != EEXIST) error = moveToNamed(file.handle, name);
+    file.hasName = error == 0;
+    if (file.hasName) enterIfRegular(name, file.handle);
     return error;
   }
 
@@ -213,13 +222,29 @@ public:
     const SignalHold hold;
     file.number = mkostemp(name.data(), O_CLOEXEC);
     if (!file.isOpen()) return errno;
-    enterTemporary(name.c_str());
+    enterIfRegular(name.c_str(), file);
     return 0;
   }
 
   HostError openForWriting(const char* name, FileHandle& file) override {
-    return openNative(name, O_WRONLY | O_CREAT | O_TRUNC | O_NONBLOCK, file);
+    constexpr int Flags = O_WRONLY | O_CREAT | O_TRUNC | O_NONBLOCK;
+    const SignalHold hold;
+    HostError error = openNative(name, Flags | O_NOFOLLOW, file);
+    const bool isLink = error == ELOOP || error == EMLINK;
+    const std::string place = isLink ? followLinks(name) : name;
+    if (isLink) error = openNative(place.c_str(), Flags, file);
+    if (error == 0) enterIfRegular(place.c_str(), file, file.number);
+    return error;
   }
+
+  HostError endWriting(FileHandle file, const char*, bool isWhole) override {
+    const SignalHold hold;
+    const HostError error = close(file);
+    endUnfinished(file.number, isWhole && error == 0);
+    return error;
+  }
+
+  void removeUnfinished() override { removeUnfinishedFiles(); }
 
   HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                    size_t& done) override {
@@ -262,14 +287,14 @@ public:
   HostError rename(const char* from, const char* to) override {
     const SignalHold hold;
     if (std::rename(from, to) != 0) return errno;
-    forgetTemporary(from);
+    forgetUnfinished(from);
     return 0;
   }
 
   HostError renameNew(const char* from, const char* to) override {
     const SignalHold hold;
     if (const HostError error = renameNewNative(from, to); error != 0) return error;
-    forgetTemporary(from);
+    forgetUnfinished(from);
     return 0;
   }
 
@@ -280,7 +305,7 @@ public:
   HostError remove(const char* name) override {
     const SignalHold hold;
     if (unlink(name) != 0) return errno;
-    forgetTemporary(name);
+    forgetUnfinished(name);
     return 0;
   }
 
@@ -304,6 +329,10 @@ public:
 
   void setPermissions(FileHandle file, uint32_t mode) override {
     [[maybe_unused]] const int result = fchmod(file.number, mode & 07777);
+  }
+
+  void copyProtection(const char* from, const FileStatus& status, FileHandle file) override {
+    copyProtectionTo(file.number, from, status);
   }
 
   void setTimes(FileHandle file, int64_t seconds) override {
@@ -337,6 +366,35 @@ public:
       if (leaf != "." && leaf != "..") names.push_back(leaf);
     }
   }
+
+private:
+  // Who keeps a process from naming its files in that way (a profile of the machine, an emulated
+  // root) lets it create others: the handle is one of a copy from now on.
+  HostError moveToNamed(FileHandle file, const char* name) {
+    struct stat native;
+    if (fstat(file.number, &native) != 0) return errno;
+    FileHandle named;
+    HostError error =
+        openNative(name, O_RDWR | O_CREAT | O_EXCL, named, native.st_mode & UsualMode);
+    if (error != 0) return error;
+    error = copyAll(file, named);
+    if (error == 0 && dup2(named.number, file.number) < 0) error = errno;
+    if (error == 0) fcntl(file.number, F_SETFD, FD_CLOEXEC);
+    if (error != 0) unlink(name);
+    ::close(named.number);
+    return error;
+  }
+
+  HostError copyAll(FileHandle from, FileHandle to) {
+    std::vector<uint8_t> piece(CopiedPiece);
+    for (uint64_t offset = 0;;) {
+      size_t done = 0;
+      if (const HostError error = readAt(from, piece, offset, done); error != 0) return error;
+      if (done == 0) return 0;
+      if (const HostError error = write(to, std::span(piece).first(done)); error != 0) return error;
+      offset += done;
+    }
+  }
 };
 
 } // namespace
@@ -344,17 +402,6 @@ public:
 Host& getNativeHost() {
   static PosixHost host;
   return host;
-}
-
-void installSignalCleanUp() {
-  for (const int signal : EndingSignals) {
-    struct sigaction before;
-    // A signal that the parent process ignores (a job in the background) stays ignored.
-    if (sigaction(signal, nullptr, &before) == 0 && before.sa_handler == SIG_IGN) continue;
-    std::signal(signal, removeTemporariesAndEnd);
-  }
-  // The write then fails with EFBIG, and the clean-up of a failed write runs as for a full disk.
-  std::signal(SIGXFSZ, SIG_IGN);
 }
 
 } // namespace support

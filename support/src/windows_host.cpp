@@ -68,6 +68,12 @@ public:
 
   void enter(const std::wstring& name) { replace({}, name); }
   void forget(const std::wstring& name) { replace(name, {}); }
+  static void removeAll() {
+    for (std::wstring& name : temporaries().names) {
+      if (!name.empty()) DeleteFileW(name.c_str());
+      name.clear();
+    }
+  }
 
 private:
   static void replace(const std::wstring& before, const std::wstring& after) {
@@ -80,9 +86,7 @@ private:
 // The default handler, which comes next, ends the process.
 BOOL WINAPI removeTemporaries(DWORD) {
   AcquireSRWLockExclusive(&temporaries().lock);
-  for (const std::wstring& name : temporaries().names) {
-    if (!name.empty()) DeleteFileW(name.c_str());
-  }
+  TableHold::removeAll();
   return FALSE;
 }
 
@@ -358,17 +362,10 @@ public:
                : lastHostError();
   }
 
-  HostError createTemporary(const char* name, FileHandle& file) override {
-    std::wstring native;
-    file = {};
-    if (const HostError error = nativeName(name, native); error != 0) return error;
-    TableHold table;
-    // A link that leads nowhere would be followed, and the file made where it leads.
-    const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file,
-                                       FILE_FLAG_OPEN_REPARSE_POINT);
-    if (error == 0) table.enter(native);
-    // A folder in the place is said to deny access.
-    return error == EISDIR ? EEXIST : error;
+  // Who may read a file is a matter of its folder here, not of a mode.
+  HostError createTemporary(const char* name, uint32_t, TemporaryFile& file) override {
+    file.hasName = true;
+    return createNew(name, file.handle);
   }
 
   HostError createUnnamedTemporary(std::string& name, FileHandle& file) override {
@@ -379,7 +376,7 @@ public:
     HostError error = EEXIST;
     while (error == EEXIST) {
       name = beginning + std::to_string(m_UnnamedTemporaries++);
-      error = createTemporary(name.c_str(), file);
+      error = createNew(name.c_str(), file);
     }
     return error;
   }
@@ -389,14 +386,30 @@ public:
     std::wstring native;
     file = {};
     if (const HostError error = nativeName(name, native); error != 0) return error;
+    TableHold table;
     if (const HostError error = openNative(native, GENERIC_WRITE, OPEN_ALWAYS, file); error != 0)
       return error;
-    if (GetFileType(handleOf(file)) != FILE_TYPE_DISK || SetEndOfFile(handleOf(file)) != 0)
+    if (GetFileType(handleOf(file)) != FILE_TYPE_DISK) return 0;
+    if (SetEndOfFile(handleOf(file)) != 0) {
+      table.enter(nativePlace(name));
       return 0;
+    }
     const HostError error = lastHostError();
     CloseHandle(handleOf(file));
     file = {};
     return error;
+  }
+
+  HostError endWriting(FileHandle file, const char* name, bool isWhole) override {
+    const std::wstring native = nativePlace(name);
+    const HostError error = Host::endWriting(file, name, isWhole);
+    TableHold().forget(native);
+    return error;
+  }
+
+  void removeUnfinished() override {
+    const TableHold table;
+    TableHold::removeAll();
   }
 
   HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
@@ -551,6 +564,26 @@ public:
   }
 
 private:
+  // Where links lead; empty for a name that no file has.
+  std::wstring nativePlace(const char* name) {
+    std::wstring native;
+    if (nativeName(followLinks(name), native) != 0) native.clear();
+    return native;
+  }
+
+  static HostError createNew(const char* name, FileHandle& file) {
+    std::wstring native;
+    file = {};
+    if (const HostError error = nativeName(name, native); error != 0) return error;
+    TableHold table;
+    // A link that leads nowhere would be followed, and the file made where it leads.
+    const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file,
+                                       FILE_FLAG_OPEN_REPARSE_POINT);
+    if (error == 0) table.enter(native);
+    // A folder in the place is said to deny access.
+    return error == EISDIR ? EEXIST : error;
+  }
+
   // A directory says "invalid function".
   static HostError readError(FileHandle file) {
     const HostError error = lastHostError();

@@ -13,6 +13,7 @@ namespace testsupport {
 using support::FileHandle;
 using support::FileStatus;
 using support::HostError;
+using support::TemporaryFile;
 
 HostError FaultyHost::fault(const char* operation, const std::string& name) {
   if (++m_Calls != m_FailingCall) return 0;
@@ -57,10 +58,15 @@ HostError FaultyHost::lock(FileHandle file) {
   return error != 0 ? error : m_Host.lock(file);
 }
 
-HostError FaultyHost::createTemporary(const char* name, FileHandle& file) {
+HostError FaultyHost::createTemporary(const char* name, uint32_t mode, TemporaryFile& file) {
   if (const HostError error = fault("createTemporary", name)) return error;
-  const HostError error = m_Host.createTemporary(name, file);
-  return remember(error, name, file);
+  const HostError error = m_Host.createTemporary(name, mode, file);
+  return remember(error, name, file.handle);
+}
+
+HostError FaultyHost::giveName(TemporaryFile& file, const char* name) {
+  const HostError error = fault("giveName", name);
+  return error != 0 ? error : m_Host.giveName(file, name);
 }
 
 HostError FaultyHost::createUnnamedTemporary(std::string& name, FileHandle& file) {
@@ -73,6 +79,13 @@ HostError FaultyHost::openForWriting(const char* name, FileHandle& file) {
   if (const HostError error = fault("openForWriting", name)) return error;
   const HostError error = m_Host.openForWriting(name, file);
   return remember(error, name, file);
+}
+
+HostError FaultyHost::endWriting(FileHandle file, const char* name, bool isWhole) {
+  const HostError error = fault("close", name);
+  m_OpenNames.erase(file.number);
+  const HostError closeError = m_Host.endWriting(file, name, isWhole && error == 0);
+  return error != 0 ? error : closeError;
 }
 
 HostError FaultyHost::readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
@@ -136,6 +149,11 @@ bool FaultyHost::isWritable(const char* name) {
 
 void FaultyHost::setPermissions(FileHandle file, uint32_t mode) {
   if (fault("setPermissions", m_OpenNames[file.number]) == 0) m_Host.setPermissions(file, mode);
+}
+
+void FaultyHost::copyProtection(const char* from, const FileStatus& status, FileHandle file) {
+  if (fault("copyProtection", m_OpenNames[file.number]) == 0)
+    m_Host.copyProtection(from, status, file);
 }
 
 void FaultyHost::setTimes(FileHandle file, int64_t seconds) {

@@ -59,9 +59,14 @@ public:
   support::HostError readNext(support::FileHandle file, std::span<uint8_t> bytes,
                               size_t& done) override;
   support::HostError lock(support::FileHandle file) override;
-  support::HostError createTemporary(const char* name, support::FileHandle& file) override;
+  support::HostError createTemporary(const char* name, uint32_t mode,
+                                     support::TemporaryFile& file) override;
+  support::HostError giveName(support::TemporaryFile& file, const char* name) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
+  // What goes wrong is the close.
+  support::HostError endWriting(support::FileHandle file, const char* name, bool isWhole) override;
+  void removeUnfinished() override { m_Host.removeUnfinished(); }
   // Half of the bytes arrive before the failure.
   support::HostError readAt(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                             size_t& done) override;
@@ -83,6 +88,8 @@ public:
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
   bool isWritable(const char* name) override;
   void setPermissions(support::FileHandle file, uint32_t mode) override;
+  void copyProtection(const char* from, const support::FileStatus& status,
+                      support::FileHandle file) override;
   void setTimes(support::FileHandle file, int64_t seconds) override;
   std::string followLinks(const char* name) override { return m_Host.followLinks(name); }
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;

@@ -17,6 +17,7 @@ using support::FileHandle;
 using support::FileKind;
 using support::FileStatus;
 using support::HostError;
+using support::TemporaryFile;
 
 MemoryHost::File& MemoryHost::enter(std::string_view name, FileKind kind) {
   auto& slot = m_Files[std::string(name)];
@@ -110,16 +111,31 @@ HostError MemoryHost::lock(FileHandle) {
   return m_LockAnswer ? m_LockAnswer() : 0;
 }
 
-HostError MemoryHost::createTemporary(const char* name, FileHandle& file) {
+HostError MemoryHost::createTemporary(const char* name, uint32_t mode, TemporaryFile& file) {
+  constexpr uint32_t UsersMask = 022;
+  if (std::strlen(name) > m_LongestName) return ENAMETOOLONG;
   if (has(name)) return EEXIST;
-  enter(name, FileKind::RegularFile);
-  open(find(name), file);
+  enter(name, FileKind::RegularFile).mode = 0100000 | (mode & ~UsersMask);
+  open(find(name), file.handle);
+  file.hasName = !m_HidesTemporaries;
+  if (m_HidesTemporaries) m_Files.erase(name);
+  return 0;
+}
+
+HostError MemoryHost::giveName(TemporaryFile& file, const char* name) {
+  if (file.hasName) return 0;
+  if (std::strlen(name) > m_LongestName) return ENAMETOOLONG;
+  if (has(name)) return EEXIST;
+  m_Files[name] = m_Open.at(static_cast<size_t>(file.handle.number));
+  file.hasName = true;
   return 0;
 }
 
 HostError MemoryHost::createUnnamedTemporary(std::string& name, FileHandle& file) {
   name = "/tmp/quarn." + std::to_string(m_NextTemporary++);
-  return createTemporary(name.c_str(), file);
+  enter(name, FileKind::RegularFile);
+  open(find(name), file);
+  return 0;
 }
 
 HostError MemoryHost::openForWriting(const char* name, FileHandle& file) {
@@ -232,6 +248,13 @@ HostError MemoryHost::statusOf(FileHandle file, FileStatus& status) {
 bool MemoryHost::isWritable(const char* name) {
   const std::shared_ptr<File> file = find(name);
   return file != nullptr && !file->isReadOnly;
+}
+
+void MemoryHost::copyProtection(const char* from, const FileStatus& status, FileHandle file) {
+  File& target = *m_Open.at(static_cast<size_t>(file.number));
+  Host::copyProtection(from, status, file);
+  target.uid = status.uid;
+  target.gid = status.gid;
 }
 
 void MemoryHost::setPermissions(FileHandle file, uint32_t mode) {

@@ -75,6 +75,10 @@ public:
   }
   // The next calls that remove a file find somebody else at it.
   void keepRemovedFiles(uint32_t calls) { m_BusyRemovals = calls; }
+  // From now on temporaries have no name until they are given one.
+  void hideTemporaries() { m_HidesTemporaries = true; }
+  // No name that is longer is taken from now on; there are no folders in it.
+  void setLongestName(size_t bytes) { m_LongestName = bytes; }
   // In milliseconds, of all pauses together.
   [[nodiscard]] uint32_t getTimePaused() const { return m_TimePaused; }
 
@@ -91,7 +95,9 @@ public:
   support::HostError readNext(support::FileHandle file, std::span<uint8_t> bytes,
                               size_t& done) override;
   support::HostError lock(support::FileHandle file) override;
-  support::HostError createTemporary(const char* name, support::FileHandle& file) override;
+  support::HostError createTemporary(const char* name, uint32_t mode,
+                                     support::TemporaryFile& file) override;
+  support::HostError giveName(support::TemporaryFile& file, const char* name) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
   support::HostError readAt(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
@@ -108,6 +114,8 @@ public:
   support::HostError statusOf(support::FileHandle file, support::FileStatus& status) override;
   bool isWritable(const char* name) override;
   void setPermissions(support::FileHandle file, uint32_t mode) override;
+  void copyProtection(const char* from, const support::FileStatus& status,
+                      support::FileHandle file) override;
   void setTimes(support::FileHandle file, int64_t seconds) override;
   std::string followLinks(const char* name) override;
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
@@ -128,6 +136,8 @@ private:
   support::PathStyle m_PathStyle = support::PathStyle_Posix;
   uint32_t m_TimePaused = 0;
   uint32_t m_BusyRemovals = 0;
+  bool m_HidesTemporaries = false;
+  size_t m_LongestName = SIZE_MAX;
   uint64_t m_NextInode = 1;
   uint64_t m_NextTemporary = 0;
   uint64_t m_BytesRead = 0;

@@ -216,6 +216,106 @@ TEST_F(ArchiveFileWriterTest, KeepsThePermissionsOfTheOldFile) {
   EXPECT_EQ(m_Host.at("new.a").mode, 0100644u);
 }
 
+TEST_F(ArchiveFileWriterTest, KeepsOwnerAndGroupOfTheOldFile) {
+  m_Host.addFile("out.a", "").uid = 77;
+  m_Host.at("out.a").gid = 78;
+  ASSERT_TRUE(writeFile("out.a", m_Archive));
+  EXPECT_EQ(m_Host.at("out.a").uid, 77);
+  EXPECT_EQ(m_Host.at("out.a").gid, 78);
+}
+
+// Somebody looks at what is being written, at any moment of it.
+TEST_F(ArchiveFileWriterTest, KeepsWhatItWritesFromOthersUntilItIsComplete) {
+  FaultyHost host(m_Host);
+  bool isSeen = false;
+  for (uint64_t call = 1;; ++call) {
+    m_Host.addFile("lib.a", archive().member("a.o", "secret").bytes()).mode = 0100600;
+    Archive secret(host);
+    host.disturbCall(call, [&] {
+      if (!m_Host.has("lib.a.0")) return;
+      isSeen = true;
+      EXPECT_EQ(m_Host.at("lib.a.0").mode & 0777U, 0600U) << call;
+    });
+    ASSERT_TRUE(readFile("lib.a", secret));
+    ASSERT_TRUE(writeFile("lib.a", secret));
+    if (host.getFailedOperation().empty()) break;
+  }
+  EXPECT_TRUE(isSeen);
+}
+
+TEST_F(ArchiveFileWriterTest, GivesANewFileTheUsualPermissions) {
+  ASSERT_TRUE(writeFile("new.a", m_Archive));
+  EXPECT_EQ(m_Host.at("new.a").mode, 0100644U);
+}
+
+TEST_F(ArchiveFileWriterTest, GivesTheFileANameOnlyWhenItIsComplete) {
+  m_Host.hideTemporaries();
+  FaultyHost host(m_Host);
+  std::vector<std::string> named;
+  for (uint64_t call = 1;; ++call) {
+    m_Host.addFile("lib.a", archive().member("a.o", "text").bytes());
+    Archive copy(host);
+    host.disturbCall(call, [&] {
+      if (m_Host.has("lib.a.0")) named.push_back(host.getFailedOperation());
+    });
+    ASSERT_TRUE(readFile("lib.a", copy));
+    ASSERT_TRUE(writeFile("lib.a", copy));
+    if (host.getFailedOperation().empty()) break;
+  }
+  EXPECT_THAT(named, ElementsAre("copyProtection", "close", "status", "rename"));
+}
+
+TEST_F(ArchiveFileWriterTest, TakesAnotherNameWhereOneIsTakenMeanwhile) {
+  m_Host.hideTemporaries();
+  FaultyHost host(m_Host);
+  std::string operation;
+  for (uint64_t call = 1; operation != "giveName"; ++call) {
+    static_cast<void>(m_Host.remove("lib.a.0"));
+    m_Host.addFile("lib.a", archive().member("a.o", "text").bytes());
+    Archive copy(host);
+    host.disturbCall(call, [&] { m_Host.addFile("lib.a.0", "somebody's"); });
+    ASSERT_TRUE(readFile("lib.a", copy));
+    ASSERT_TRUE(writeFile("lib.a", copy));
+    operation = host.getFailedOperation();
+    ASSERT_NE(operation, "");
+  }
+  EXPECT_EQ(m_Host.read("lib.a.0"), "somebody's");
+  EXPECT_THAT(m_Host.getNames(), testing::Not(testing::Contains("lib.a.1")));
+}
+
+TEST_F(ArchiveFileWriterTest, RemovesNothingWhereItsFileHasNoName) {
+  m_Host.hideTemporaries();
+  m_Host.setRoom(20);
+  m_Host.addFile("lib.a", archive().member("a.o", "text").bytes());
+  FaultyHost host(m_Host);
+  Archive copy(host);
+  ASSERT_TRUE(readFile("lib.a", copy));
+  host.disturbCall(host.getCallCount() + 1, [&] { m_Host.addFile("lib.a.0", "somebody's"); });
+  EXPECT_FALSE(writeFile("lib.a", copy));
+  EXPECT_EQ(m_Host.read("lib.a.0"), "somebody's");
+}
+
+TEST_F(ArchiveFileWriterTest, CutsANameThatLeavesNoRoomForANumber) {
+  m_Host.setLongestName(20);
+  m_Host.setRoom(0);
+  const auto temporaryOf = [this](const std::string& name) {
+    EXPECT_FALSE(writeFile(name.c_str(), m_Archive));
+    const std::string report = m_Handler.take().at(0);
+    const size_t start = report.find('\'') + 1;
+    return report.substr(start, report.find('\'', start) - start);
+  };
+  EXPECT_EQ(temporaryOf("abcdefghijklmnop.a"), "abcdefghijklmnop.a.0");
+  EXPECT_EQ(temporaryOf("abcdefghijklmnopq.a"), "abcdefghij.0");
+  EXPECT_EQ(temporaryOf("abcdefghijklmnopqr.a"), "abcdefghij.0");
+  // Each of these characters is three bytes.
+  EXPECT_EQ(
+      temporaryOf("\xE8\xA1\xA8\xE8\xA1\xA8\xE8\xA1\xA8\xE8\xA1\xA8\xE8\xA1\xA8\xE8\xA1\xA8.a"),
+      "\xE8\xA1\xA8\xE8\xA1\xA8\xE8\xA1\xA8.0");
+  // The folder is never cut: it would be another one.
+  m_Host.setLongestName(9);
+  EXPECT_EQ(temporaryOf("folder/ab"), "folder/a.0");
+}
+
 TEST_F(ArchiveFileWriterTest, WritesThroughALink) {
   m_Host.addLink("link.a", "dir/real.a");
   m_Host.addFile("dir/real.a", "!<arch>\n");
@@ -506,7 +606,7 @@ TEST_F(BusyTarget, LeavesNoTemporaryThatIsBusyForAMoment) {
 }
 
 TEST_F(FailingWrite, AtThePermissionsIsNoFailure) {
-  EXPECT_TRUE(writeFailing("setPermissions", 1, EPERM));
+  EXPECT_TRUE(writeFailing("copyProtection", 1, EPERM));
   EXPECT_THAT(m_Handler.reports, IsEmpty());
 }
 

@@ -81,9 +81,21 @@ TEST_F(ConvertingHostTest, OpensForWriting) {
   EXPECT_EQ(m_Disk.read("disk/new"), "new");
 }
 
+TEST_F(ConvertingHostTest, RemovesWhatIsNotWhole) {
+  ASSERT_EQ(m_Host.openForWriting("/m/new", m_File), 0);
+  EXPECT_EQ(m_Host.endWriting(m_File, "/m/new", false), 0);
+  EXPECT_FALSE(m_Disk.has("disk/new"));
+}
+
 TEST_F(ConvertingHostTest, PutsATemporaryInTheFilesPlace) {
-  ASSERT_EQ(m_Host.createTemporary("/m/new", m_File), 0);
-  m_Host.setPermissions(m_File, 0100600);
+  m_Disk.hideTemporaries();
+  TemporaryFile temporary;
+  ASSERT_EQ(m_Host.createTemporary("/m/new", 0666, temporary), 0);
+  ASSERT_EQ(m_Host.giveName(temporary, "/m/new"), 0);
+  m_File = temporary.handle;
+  FileStatus model;
+  model.mode = 0100600;
+  m_Host.copyProtection("/m/a", model, m_File);
   m_Host.setTimes(m_File, 77);
   writeTo(m_File);
   EXPECT_EQ(m_Host.rename("/m/new", "/m/a"), 0);

@@ -80,6 +80,16 @@ protected:
     return status.kind;
   }
 
+  // A temporary that stands at its name from the beginning.
+  HostError createNamed(const std::string& name, FileHandle& file) {
+    constexpr uint32_t Mode = 0600;
+    TemporaryFile temporary;
+    HostError error = m_Host.createTemporary(name.c_str(), Mode, temporary);
+    if (error == 0) error = m_Host.giveName(temporary, name.c_str());
+    file = temporary.handle;
+    return error;
+  }
+
   // What can be read from there on, at most 4 bytes.
   std::string readAt(FileHandle file, uint64_t offset) {
     std::array<uint8_t, 4> bytes;

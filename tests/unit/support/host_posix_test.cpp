@@ -17,6 +17,7 @@
 #include <sys/stat.h>
 #include <sys/un.h>
 #include <sys/wait.h>
+#include <sys/xattr.h>
 #include <unistd.h>
 
 namespace support {
@@ -40,6 +41,19 @@ protected:
     waitpid(child, &state, 0);
     return state;
   }
+
+  // A sanitizer takes faults for its own; the tool's process has none of its handlers.
+  static void forgetSanitizers() {
+    for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGTRAP})
+      std::signal(signal, SIG_DFL);
+  }
+
+  // Ends by a full stack.
+  static int fillStack(int depth) { // NOLINT(misc-no-recursion)
+    volatile char filler[1024] = {};
+    filler[0] = static_cast<char>(depth);
+    return depth < 0 ? filler[0] : fillStack(depth + 1) + filler[0];
+  }
 };
 
 } // namespace
@@ -62,7 +76,8 @@ TEST_F(PosixHostTest, TellsThatADiskIsFull) {
 TEST_F(PosixHostTest, MakesNoTemporaryThroughALink) {
   fs::create_symlink("nowhere", at("link"));
   FileHandle file;
-  EXPECT_EQ(m_Host.createTemporary(at("link").c_str(), file), EEXIST);
+  EXPECT_EQ(createNamed(at("link"), file), EEXIST);
+  EXPECT_THAT(leaves(), testing::ElementsAre("link"));
 }
 
 TEST_F(PosixHostTest, HasAPlaceForTemporariesThatNobodyNames) {
@@ -126,6 +141,96 @@ TEST_F(PosixHostTest, SetsPermissionBitsAlone) {
   EXPECT_EQ(m_Host.close(file), 0);
 }
 
+TEST_F(PosixHostTest, MakesAFileAsProtectedAsAnother) {
+  make("old", "");
+  make("new", "");
+  chmod(at("old").c_str(), 0640);
+  const bool hasAttributes = setxattr(at("old").c_str(), "user.note", "text", 4, 0) == 0;
+  FileStatus status;
+  ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("new").c_str(), file), 0);
+  m_Host.copyProtection(at("old").c_str(), status, file);
+  EXPECT_EQ(m_Host.endWriting(file, at("new").c_str(), true), 0);
+  ASSERT_EQ(m_Host.status(at("new").c_str(), status), 0);
+  EXPECT_EQ(status.mode & 07777U, 0640U);
+  char note[8] = {};
+  EXPECT_EQ(getxattr(at("new").c_str(), "user.note", note, sizeof note), hasAttributes ? 4 : -1);
+  EXPECT_STREQ(note, hasAttributes ? "text" : "");
+}
+
+TEST_F(PosixHostTest, KeepsAccessLists) {
+  make("old", "");
+  make("new", "");
+  constexpr const char* Name = "system.posix_acl_access";
+  std::vector<uint8_t> list = {2, 0, 0, 0}; // the version
+  const auto add = [&list](uint8_t tag, uint8_t rights, uint32_t id) {
+    list.insert(list.end(), {tag, 0, rights, 0});
+    for (int shift = 0; shift < 32; shift += 8)
+      list.push_back(static_cast<uint8_t>(id >> shift));
+  };
+  constexpr uint32_t Nobody = 0xFFFFFFFF;
+  add(0x01, 6, Nobody); // the owner reads and writes,
+  add(0x02, 4, 77);     // somebody else reads,
+  add(0x04, 0, Nobody); // the group does nothing,
+  add(0x10, 4, Nobody); // nobody but the owner ever does more than read,
+  add(0x20, 0, Nobody); // and all others do nothing
+  if (setxattr(at("old").c_str(), Name, list.data(), list.size(), 0) != 0)
+    GTEST_SKIP() << "this file system has no access lists";
+  FileStatus status;
+  ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("new").c_str(), file), 0);
+  m_Host.copyProtection(at("old").c_str(), status, file);
+  EXPECT_EQ(m_Host.endWriting(file, at("new").c_str(), true), 0);
+  std::vector<uint8_t> copied(2 * list.size());
+  const ssize_t size = getxattr(at("new").c_str(), Name, copied.data(), copied.size());
+  copied.resize(size < 0 ? 0 : static_cast<size_t>(size));
+  EXPECT_EQ(copied, list);
+}
+
+// An administrator may give a file away; nobody else may, and then it must not run as another user.
+TEST_F(PosixHostTest, KeepsTheOwnerWhereItMay) {
+  make("old", "");
+  FileStatus status;
+  ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
+  status.uid = 77;
+  status.gid = 78;
+  status.mode = 0106755;
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("new").c_str(), file), 0);
+  m_Host.copyProtection(at("old").c_str(), status, file);
+  FileStatus now;
+  ASSERT_EQ(m_Host.statusOf(file, now), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("new").c_str(), true), 0);
+  if (getuid() == 0) {
+    EXPECT_EQ(now.uid, 77);
+    EXPECT_EQ(now.gid, 78);
+    EXPECT_EQ(now.mode & 07777U, 06755U);
+  } else {
+    EXPECT_EQ(now.mode & 07777U, 0755U);
+  }
+}
+
+TEST_F(PosixHostTest, GivesNobodyElsesRightsAway) {
+  if (getuid() != 0) GTEST_SKIP() << "the test above has shown it";
+  fs::permissions(m_Folder, fs::perms::all);
+  make("old", "");
+  FileStatus status;
+  ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
+  status.mode = 0106755;
+  runApart([&] {
+    FileHandle file;
+    if (setgid(77) != 0 || setuid(77) != 0) _exit(1);
+    if (m_Host.openForWriting(at("new").c_str(), file) != 0) _exit(2);
+    m_Host.copyProtection(at("old").c_str(), status, file);
+    if (m_Host.endWriting(file, at("new").c_str(), true) != 0) _exit(3);
+  });
+  ASSERT_EQ(m_Host.status(at("new").c_str(), status), 0);
+  EXPECT_EQ(status.uid, 77);
+  EXPECT_EQ(status.mode & 07777U, 0755U);
+}
+
 TEST_F(PosixHostTest, FollowsLinksToTheirEnd) {
   fs::create_directory(at("dir"));
   make("file", "");
@@ -163,24 +268,118 @@ TEST_F(PosixHostTest, FindsNamesInTheOrderOfTheirBytes) {
   EXPECT_THAT(names, testing::ElementsAre("B.o", "a.o", "b.o"));
 }
 
-TEST_F(PosixHostTest, LosesNoTemporaryToASignal) {
-  for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE}) {
+TEST_F(PosixHostTest, LeavesNothingUnfinishedBehindASignal) {
+  for (const int signal :
+       {SIGINT, SIGTERM, SIGHUP, SIGPIPE, SIGQUIT, SIGXCPU, SIGALRM, SIGVTALRM, SIGPROF, SIGUSR1,
+        SIGUSR2, SIGABRT, SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGSYS, SIGTRAP}) {
     const int state = runApart([&] {
+      forgetSanitizers();
       installSignalCleanUp();
       FileHandle file;
       for (const char* leaf : {"one", "two", "three", "four"})
-        if (m_Host.createTemporary(at(leaf).c_str(), file) != 0) _exit(1);
-      // What was renamed or removed is no temporary any more.
+        if (createNamed(at(leaf), file) != 0) _exit(1);
+      if (m_Host.openForWriting(at("half").c_str(), file) != 0) _exit(1);
+      // What was renamed or removed is not unfinished any more.
       if (m_Host.rename(at("two").c_str(), at("kept").c_str()) != 0) _exit(1);
       if (m_Host.remove(at("three").c_str()) != 0) _exit(1);
       make("three", "somebody's");
       std::raise(signal);
     });
-    EXPECT_TRUE(WIFSIGNALED(state) && WTERMSIG(state) == signal) << signal;
-    EXPECT_THAT(leaves(), testing::ElementsAre("kept", "three"));
+    EXPECT_TRUE(WIFSIGNALED(state) && WTERMSIG(state) == signal) << signal << " " << state;
+    EXPECT_THAT(leaves(), testing::ElementsAre("kept", "three")) << signal;
     fs::remove(at("kept"));
     fs::remove(at("three"));
   }
+}
+
+// The way out must work also where there is no stack left for it.
+TEST_F(PosixHostTest, LeavesNothingUnfinishedBehindItsOwnFault) {
+  const int state = runApart([&] {
+    forgetSanitizers();
+    installSignalCleanUp();
+    FileHandle file;
+    if (createNamed(at("one"), file) != 0) _exit(1);
+    fillStack(0);
+  });
+  EXPECT_TRUE(WIFSIGNALED(state) && WTERMSIG(state) == SIGSEGV) << state;
+  EXPECT_THAT(leaves(), testing::IsEmpty());
+}
+
+TEST_F(PosixHostTest, RemovesNothingThatSomebodyElseHasPutInThePlace) {
+  FileHandle file;
+  ASSERT_EQ(createNamed(at("one"), file), 0);
+  EXPECT_EQ(m_Host.close(file), 0);
+  make("other", "somebody's");
+  fs::rename(at("other"), at("one"));
+  m_Host.removeUnfinished();
+  EXPECT_THAT(leaves(), testing::ElementsAre("one"));
+}
+
+TEST_F(PosixHostTest, RemovesTheFileBehindALinkAndNotTheLink) {
+  make("file", "old");
+  fs::create_symlink("file", at("link"));
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("link").c_str(), file), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("link").c_str(), false), 0);
+  EXPECT_THAT(leaves(), testing::ElementsAre("link"));
+}
+
+TEST_F(PosixHostTest, RemovesNoDevice) {
+  fs::create_symlink("/dev/full", at("link"));
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("link").c_str(), file), 0);
+  EXPECT_EQ(m_Host.write(file, bytesOf("x")), ENOSPC);
+  EXPECT_EQ(m_Host.endWriting(file, at("link").c_str(), false), 0);
+  EXPECT_TRUE(fs::exists("/dev/full"));
+  EXPECT_THAT(leaves(), testing::ElementsAre("link"));
+}
+
+// What has no name goes with the process, also by a signal that nobody can catch.
+TEST_F(PosixHostTest, LeavesNoTemporaryBehindAKill) {
+  TemporaryFile probe;
+  ASSERT_EQ(m_Host.createTemporary(at("probe").c_str(), 0600, probe), 0);
+  if (probe.hasName) GTEST_SKIP() << "this file system has no files without names";
+  EXPECT_EQ(m_Host.close(probe.handle), 0);
+  runApart([&] {
+    TemporaryFile file;
+    if (m_Host.createTemporary(at("new").c_str(), 0600, file) != 0) _exit(1);
+    std::raise(SIGKILL);
+  });
+  EXPECT_THAT(leaves(), testing::IsEmpty());
+}
+
+TEST_F(PosixHostTest, GivesNoNameThatIsTakenMeanwhile) {
+  TemporaryFile file;
+  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
+  if (file.hasName) GTEST_SKIP() << "this file system has no files without names";
+  make("new", "somebody's");
+  EXPECT_EQ(m_Host.giveName(file, at("new").c_str()), EEXIST);
+  EXPECT_EQ(m_Host.giveName(file, at("newer").c_str()), 0);
+  EXPECT_EQ(m_Host.close(file.handle), 0);
+  EXPECT_EQ(read("new"), "somebody's");
+  EXPECT_EQ(m_Host.remove(at("newer").c_str()), 0);
+}
+
+// Another disk can't have a second name of the file, as a guarded process can't give one.
+TEST_F(PosixHostTest, CopiesAFileThatItMayNotName) {
+  const std::string elsewhere = "/dev/shm/quarn-host." + std::to_string(getpid());
+  FileStatus here;
+  FileStatus there;
+  ASSERT_EQ(m_Host.status(getFolder().c_str(), here), 0);
+  if (m_Host.status("/dev/shm", there) != 0 || here.device == there.device)
+    GTEST_SKIP() << "there is one file system alone";
+  TemporaryFile file;
+  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
+  if (file.hasName) GTEST_SKIP() << "this file system has no files without names";
+  const std::string text(1'000'000, 'x');
+  EXPECT_EQ(m_Host.write(file.handle, bytesOf(text)), 0);
+  EXPECT_EQ(m_Host.giveName(file, elsewhere.c_str()), 0);
+  m_Host.setPermissions(file.handle, 0640);
+  EXPECT_EQ(m_Host.close(file.handle), 0);
+  ASSERT_EQ(m_Host.status(elsewhere.c_str(), there), 0);
+  EXPECT_EQ(there.size, 1'000'000);
+  EXPECT_EQ(there.mode & 0777U, 0640U);
+  EXPECT_EQ(m_Host.remove(elsewhere.c_str()), 0);
 }
 
 TEST_F(PosixHostTest, KeepsIgnoringWhatItsParentIgnores) {

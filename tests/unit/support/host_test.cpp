@@ -85,11 +85,11 @@ TEST_F(HostTest, FailsToOpenWithTheErrorNumber) {
   EXPECT_EQ(m_Host.openForWriting(at("dir").c_str(), file), EISDIR);
   EXPECT_EQ(m_Host.openForWriting(".", file), EISDIR);
   EXPECT_EQ(m_Host.openForWriting(at("no/such").c_str(), file), ENOENT);
-  EXPECT_EQ(m_Host.createTemporary(at("no/such").c_str(), file), ENOENT);
+  EXPECT_EQ(createNamed(at("no/such"), file), ENOENT);
   for (const char* below : {"file/x", "file/x/y"}) {
     EXPECT_EQ(m_Host.openForReading(at(below).c_str(), file), ENOTDIR) << below;
     EXPECT_EQ(m_Host.openForWriting(at(below).c_str(), file), ENOTDIR) << below;
-    EXPECT_EQ(m_Host.createTemporary(at(below).c_str(), file), ENOTDIR) << below;
+    EXPECT_EQ(createNamed(at(below), file), ENOTDIR) << below;
   }
 }
 
@@ -102,7 +102,7 @@ TEST_F(HostTest, LeavesNoHandleBehindAFailure) {
     EXPECT_NE(m_Host.openForUpdate(name.c_str(), file), 0);
     EXPECT_FALSE(file.isOpen()) << name;
     file = NoHandle;
-    EXPECT_NE(m_Host.createTemporary(name.c_str(), file), 0);
+    EXPECT_NE(createNamed(name, file), 0);
     EXPECT_FALSE(file.isOpen()) << name;
   }
 }
@@ -114,7 +114,7 @@ TEST_F(HostTest, RefusesNamesThatAreTooLong) {
   std::vector<std::string> names;
   EXPECT_EQ(m_Host.openForReading(name.c_str(), file), ENAMETOOLONG);
   EXPECT_EQ(m_Host.openForWriting(name.c_str(), file), ENAMETOOLONG);
-  EXPECT_EQ(m_Host.createTemporary(name.c_str(), file), ENAMETOOLONG);
+  EXPECT_EQ(createNamed(name, file), ENAMETOOLONG);
   EXPECT_EQ(m_Host.status(name.c_str(), status), ENAMETOOLONG);
   EXPECT_EQ(m_Host.listDirectory(name.c_str(), names), ENAMETOOLONG);
   EXPECT_EQ(m_Host.remove(name.c_str()), ENAMETOOLONG);
@@ -176,14 +176,58 @@ TEST_F(HostTest, MakesATemporaryOnlyWhereNothingIs) {
   make("file", "somebody's");
   fs::create_directory(pathOf("dir"));
   FileHandle file;
-  EXPECT_EQ(m_Host.createTemporary(at("file").c_str(), file), EEXIST);
-  EXPECT_EQ(m_Host.createTemporary(at("dir").c_str(), file), EEXIST);
+  EXPECT_EQ(createNamed(at("file"), file), EEXIST);
+  EXPECT_EQ(createNamed(at("dir"), file), EEXIST);
   EXPECT_EQ(read("file"), "somebody's");
-  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), file), 0);
+  ASSERT_EQ(createNamed(at("new"), file), 0);
   EXPECT_EQ(m_Host.write(file, bytesOf("text")), 0);
   EXPECT_EQ(m_Host.close(file), 0);
   EXPECT_EQ(read("new"), "text");
   EXPECT_EQ(m_Host.remove(at("new").c_str()), 0);
+}
+
+// Whatever it was in between: when it is whole others find it.
+TEST_F(HostTest, GivesATemporaryItsName) {
+  TemporaryFile file;
+  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
+  EXPECT_EQ(leaves().size(), file.hasName ? 1U : 0U);
+  EXPECT_EQ(m_Host.write(file.handle, bytesOf("text")), 0);
+  EXPECT_EQ(m_Host.giveName(file, at("new").c_str()), 0);
+  EXPECT_TRUE(file.hasName);
+  EXPECT_EQ(m_Host.close(file.handle), 0);
+  EXPECT_EQ(read("new"), "text");
+  EXPECT_EQ(m_Host.rename(at("new").c_str(), at("old").c_str()), 0);
+  EXPECT_THAT(leaves(), testing::ElementsAre("old"));
+}
+
+TEST_F(HostTest, KeepsAFileThatIsWhole) {
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("file").c_str(), file), 0);
+  EXPECT_EQ(m_Host.write(file, bytesOf("text")), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("file").c_str(), true), 0);
+  EXPECT_EQ(read("file"), "text");
+  m_Host.removeUnfinished();
+  EXPECT_THAT(leaves(), testing::ElementsAre("file"));
+}
+
+TEST_F(HostTest, RemovesAFileThatIsNotWhole) {
+  make("file", "old text");
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("file").c_str(), file), 0);
+  EXPECT_EQ(m_Host.write(file, bytesOf("te")), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("file").c_str(), false), 0);
+  EXPECT_THAT(leaves(), testing::IsEmpty());
+}
+
+TEST_F(HostTest, RemovesWhatIsUnfinishedWhereTheProcessEnds) {
+  FileHandle temporary;
+  FileHandle output;
+  ASSERT_EQ(createNamed(at("temporary"), temporary), 0);
+  ASSERT_EQ(m_Host.openForWriting(at("output").c_str(), output), 0);
+  m_Host.removeUnfinished();
+  EXPECT_EQ(m_Host.close(temporary), 0);
+  EXPECT_EQ(m_Host.close(output), 0);
+  EXPECT_THAT(leaves(), testing::IsEmpty());
 }
 
 TEST_F(HostTest, FindsANameForATemporaryByItself) {
@@ -216,7 +260,7 @@ TEST_F(HostTest, FindsANameForATemporaryByItself) {
 TEST_F(HostTest, WorksWithMoreTemporariesThanItCanRemember) {
   for (int i = 0; i < 40; ++i) {
     FileHandle file;
-    ASSERT_EQ(m_Host.createTemporary(at(std::to_string(i)).c_str(), file), 0);
+    ASSERT_EQ(createNamed(at(std::to_string(i)), file), 0);
     EXPECT_EQ(m_Host.close(file), 0);
   }
   for (int i = 0; i < 40; ++i)
@@ -320,7 +364,7 @@ TEST_F(HostTest, TellsWhatAFileIs) {
 
 TEST_F(HostTest, TellsWhatAFileWillBeWhenItIsClosed) {
   FileHandle file;
-  ASSERT_EQ(m_Host.createTemporary(at("file").c_str(), file), 0);
+  ASSERT_EQ(createNamed(at("file"), file), 0);
   ASSERT_EQ(m_Host.write(file, bytesOf("text")), 0);
   std::this_thread::sleep_for(std::chrono::milliseconds(50));
   ASSERT_EQ(m_Host.flush(file), 0);
@@ -371,7 +415,7 @@ TEST_F(HostTest, TakesTheRightToWriteAndGivesItBack) {
 
 TEST_F(HostTest, RemovesAndReplacesWhatMayNotBeWritten) {
   FileHandle file;
-  ASSERT_EQ(m_Host.createTemporary(at("file").c_str(), file), 0);
+  ASSERT_EQ(createNamed(at("file"), file), 0);
   m_Host.setPermissions(file, 0444);
   EXPECT_EQ(m_Host.close(file), 0);
   EXPECT_EQ(m_Host.rename(at("file").c_str(), at("renamed").c_str()), 0);
@@ -465,7 +509,7 @@ TEST_F(HostTest, TakesAnyNameThatIsUtf8) {
                                   std::string("\xF0\x9F\x98\x80.a"), std::string("a  b")}) {
     FileHandle file;
     FileStatus status;
-    ASSERT_EQ(m_Host.createTemporary(at(leaf).c_str(), file), 0);
+    ASSERT_EQ(createNamed(at(leaf), file), 0);
     EXPECT_EQ(m_Host.write(file, bytesOf("text")), 0);
     EXPECT_EQ(m_Host.close(file), 0);
     EXPECT_EQ(read(leaf), "text");

@@ -47,7 +47,7 @@ TEST_F(WindowsHostTest, RefusesNamesThatAreNotUtf8) {
   EXPECT_EQ(m_Host.openForReading("a\xFF", file), EILSEQ);
   EXPECT_EQ(m_Host.openForUpdate("a\xFF", file), EILSEQ);
   EXPECT_EQ(m_Host.openForWriting("a\xFF", file), EILSEQ);
-  EXPECT_EQ(m_Host.createTemporary("a\xFF", file), EILSEQ);
+  EXPECT_EQ(createNamed("a\xFF", file), EILSEQ);
   EXPECT_FALSE(file.isOpen());
   EXPECT_EQ(m_Host.status("a\xFF", status), EILSEQ);
   EXPECT_EQ(m_Host.rename("a\xFF", "b"), EILSEQ);
@@ -70,7 +70,7 @@ TEST_F(WindowsHostTest, TakesNamesOfAnyLength) {
       FileHandle file;
       FileStatus status;
       std::vector<std::string> names;
-      ASSERT_EQ(m_Host.createTemporary(name.c_str(), file), 0) << length;
+      ASSERT_EQ(createNamed(name, file), 0) << length;
       EXPECT_EQ(m_Host.write(file, bytesOf("text")), 0);
       EXPECT_EQ(m_Host.close(file), 0);
       EXPECT_EQ(m_Host.findNames(folder + "\\", "*.o", names), 0);
@@ -82,7 +82,7 @@ TEST_F(WindowsHostTest, TakesNamesOfAnyLength) {
       EXPECT_EQ(m_Host.status(name.c_str(), status), 0);
       EXPECT_TRUE(m_Host.isWritable(name.c_str()));
       EXPECT_EQ(m_Host.rename(name.c_str(), other.c_str()), 0);
-      ASSERT_EQ(m_Host.createTemporary(name.c_str(), file), 0);
+      ASSERT_EQ(createNamed(name, file), 0);
       EXPECT_EQ(m_Host.close(file), 0);
       EXPECT_EQ(m_Host.rename(other.c_str(), name.c_str()), 0);
       EXPECT_EQ(m_Host.renameNew(name.c_str(), other.c_str()), 0);
@@ -281,15 +281,18 @@ namespace {
 [[noreturn]] void makeTemporariesAndEnd(Host& host, const std::string& folder) {
   installSignalCleanUp();
   const auto at = [&folder](const char* leaf) { return folder + "\\" + leaf; };
+  constexpr uint32_t Mode = 0600;
   FileHandle file;
-  FileHandle three;
+  TemporaryFile temporary;
   for (const char* leaf : {"one", "two", "four"})
-    if (host.createTemporary(at(leaf).c_str(), file) != 0) std::_Exit(1);
-  if (host.createTemporary(at("three").c_str(), three) != 0) std::_Exit(1);
+    if (host.createTemporary(at(leaf).c_str(), Mode, temporary) != 0) std::_Exit(1);
+  if (host.createTemporary(at("three").c_str(), Mode, temporary) != 0) std::_Exit(1);
   if (host.rename(at("two").c_str(), at("kept").c_str()) != 0) std::_Exit(2);
   // The name of what is open may stay until it is closed.
-  if (host.close(three) != 0 || host.remove(at("three").c_str()) != 0) std::_Exit(3);
+  if (host.close(temporary.handle) != 0 || host.remove(at("three").c_str()) != 0) std::_Exit(3);
   if (host.openForWriting(at("three").c_str(), file) != 0) std::_Exit(4);
+  if (host.endWriting(file, at("three").c_str(), true) != 0) std::_Exit(4);
+  if (host.openForWriting(at("half").c_str(), file) != 0) std::_Exit(5);
   pressCtrlC();
 }
 
@@ -300,7 +303,7 @@ bool wasEndedFromOutside(int status) {
 
 } // namespace
 
-TEST_F(WindowsHostTest, LosesNoTemporaryToTheEndOfTheProcess) {
+TEST_F(WindowsHostTest, LeavesNothingUnfinishedAtTheEndOfTheProcess) {
   EXPECT_EXIT(makeTemporariesAndEnd(m_Host, getFolder()), wasEndedFromOutside, "");
   EXPECT_THAT(leaves(), testing::ElementsAre("kept", "three"));
 }

@@ -102,7 +102,7 @@ TEST_F(WindowsLinkTest, AreFollowedToTheirEnd) {
   EXPECT_TRUE(through.isSameFile(status));
   EXPECT_EQ(m_Host.status((folder + "a").c_str(), status), ELOOP);
   FileHandle handle;
-  EXPECT_EQ(m_Host.createTemporary((folder + "dangling").c_str(), handle), EEXIST);
+  EXPECT_EQ(createNamed(folder + "dangling", handle), EEXIST);
 }
 
 } // namespace support
