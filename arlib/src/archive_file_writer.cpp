@@ -114,11 +114,13 @@ public:
 private:
   [[nodiscard]] bool mustBeNew() const { return m_Others == Others::OvertakeIfThereIsAny; }
   [[nodiscard]] bool isOvertaken(int error) const;
+  [[nodiscard]] bool replacesFile() const { return m_OldStatus.kind == FileKind::RegularFile; }
   bool checkTarget();
   bool tryNames(const std::function<int(const char*)>& step);
   bool createTemporary();
   bool nameTemporary();
   bool writeTemporary();
+  int flushToDisk();
   bool writeMember(GatheringOutput& output, const ArchiveMember& member);
   static int writeHeader(GatheringOutput& output, const ArchiveMember& member);
   bool writeContents(GatheringOutput& output, const ArchiveMember& member);
@@ -227,7 +229,7 @@ bool ArchiveFileWriter::tryNames(const std::function<int(const char*)>& step) {
 // What takes the place of an old archive is nobody else's to read before it is as protected as that
 // one was.
 bool ArchiveFileWriter::createTemporary() {
-  const uint32_t mode = m_OldStatus.kind == FileKind::RegularFile ? PrivateMode : UsualMode;
+  const uint32_t mode = replacesFile() ? PrivateMode : UsualMode;
   return tryNames([&](const char* name) {
     return m_Archive.m_SourceFiles.openOther(
         [&] { return m_Host.createTemporary(name, mode, m_Temporary); });
@@ -252,8 +254,16 @@ bool ArchiveFileWriter::writeTemporary() {
   int error = m_Archive.closeInputs();
   if (error == 0) error = output.drain();
   if (error == 0) error = m_Host.flush(m_Temporary.handle);
+  if (error == 0) error = flushToDisk();
   if (error == 0) error = m_Host.statusOf(m_Temporary.handle, m_NewStatus);
   return error == 0 || failToWrite(error);
+}
+
+// Names may be on the disk before the bytes are: a power failure would then leave an empty file
+// where the old archive was, and with it members that are nowhere else. What a new archive is made
+// of is still there.
+int ArchiveFileWriter::flushToDisk() {
+  return replacesFile() ? m_Host.flushToDisk(m_Temporary.handle) : 0;
 }
 
 bool ArchiveFileWriter::writeMember(GatheringOutput& output, const ArchiveMember& member) {
@@ -288,8 +298,7 @@ bool ArchiveFileWriter::closeTemporary() {
     [[maybe_unused]] const int error = m_Host.close(m_Temporary.handle);
     return false;
   }
-  if (m_OldStatus.kind == FileKind::RegularFile)
-    m_Host.copyProtection(m_Target.c_str(), m_OldStatus, m_Temporary.handle);
+  if (replacesFile()) m_Host.copyProtection(m_Target.c_str(), m_OldStatus, m_Temporary.handle);
   const int error = m_Host.close(m_Temporary.handle);
   if (error == 0) return true;
   return m_Archive.fail(&ErrorHandler::reportCloseError, m_TemporaryName.c_str(), error);

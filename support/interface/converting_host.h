@@ -45,6 +45,7 @@ public:
                    size_t& done) override;
   HostError write(FileHandle file, std::span<const uint8_t> bytes) override;
   HostError flush(FileHandle file) override { return m_Host.flush(file); }
+  HostError flushToDisk(FileHandle file) override { return m_Host.flushToDisk(file); }
   HostError close(FileHandle file) override { return m_Host.close(file); }
   HostError rename(const char* from, const char* to) override;
   HostError renameNew(const char* from, const char* to) override;

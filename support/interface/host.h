@@ -146,6 +146,10 @@ public:
   /// not at the close, and the time of the last change is what it will be when the file is closed.
   [[nodiscard]] virtual HostError flush(FileHandle file) = 0;
 
+  /// Waits until the bytes are on the disk, so that a power failure later on finds them there. Some
+  /// failures of a disk show nowhere else. 0 where the host has no such step for the file.
+  [[nodiscard]] virtual HostError flushToDisk(FileHandle file) = 0;
+
   /// The handle is closed in any case.
   [[nodiscard]] virtual HostError close(FileHandle file) = 0;
 

@@ -279,6 +279,15 @@ public:
   // Every write has reached the kernel when it returns: nothing is held back in the process.
   HostError flush(FileHandle) override { return 0; }
 
+  HostError flushToDisk(FileHandle file) override {
+    while (fsync(file.number) != 0) {
+      // Not every file system has disks behind it.
+      if (errno == EINVAL || errno == ENOSYS || errno == EROFS || errno == ENOTSUP) return 0;
+      if (errno != EINTR) return errno;
+    }
+    return 0;
+  }
+
   HostError close(FileHandle file) override {
     // The descriptor is gone also when the call was interrupted, so there is no second try.
     return ::close(file.number) == 0 || errno == EINTR ? 0 : errno;

@@ -451,6 +451,12 @@ public:
     return 0;
   }
 
+  // A share that knows no such step says that the call is none.
+  HostError flushToDisk(FileHandle file) override {
+    if (FlushFileBuffers(handleOf(file)) != 0 || GetLastError() == ERROR_INVALID_FUNCTION) return 0;
+    return lastHostError();
+  }
+
   HostError close(FileHandle file) override {
     return CloseHandle(handleOf(file)) != 0 ? 0 : lastHostError();
   }

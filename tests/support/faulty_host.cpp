@@ -109,6 +109,11 @@ HostError FaultyHost::flush(FileHandle file) {
   return error != 0 ? error : m_Host.flush(file);
 }
 
+HostError FaultyHost::flushToDisk(FileHandle file) {
+  const HostError error = fault("flushToDisk", m_OpenNames[file.number]);
+  return error != 0 ? error : m_Host.flushToDisk(file);
+}
+
 HostError FaultyHost::close(FileHandle file) {
   const HostError error = fault("close", m_OpenNames[file.number]);
   m_OpenNames.erase(file.number);

@@ -73,6 +73,7 @@ public:
   // Half of the bytes are written before the failure.
   support::HostError write(support::FileHandle file, std::span<const uint8_t> bytes) override;
   support::HostError flush(support::FileHandle file) override;
+  support::HostError flushToDisk(support::FileHandle file) override;
   // The file is closed also when the call fails.
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;

@@ -168,12 +168,18 @@ HostError MemoryHost::write(FileHandle file, std::span<const uint8_t> bytes) {
   File& target = *m_Open.at(static_cast<size_t>(file.number));
   // What fits is written, as a disk does that fills up in the middle of a write.
   const uint64_t fitting = std::min<uint64_t>(bytes.size(), m_Room.value_or(bytes.size()));
+  target.isOnDisk = false;
   target.bytes.append(reinterpret_cast<const char*>(bytes.data()), static_cast<size_t>(fitting));
   if (m_Room) *m_Room -= fitting;
   return fitting == bytes.size() ? 0 : ENOSPC;
 }
 
 HostError MemoryHost::flush(FileHandle) {
+  return 0;
+}
+
+HostError MemoryHost::flushToDisk(FileHandle file) {
+  m_Open.at(static_cast<size_t>(file.number))->isOnDisk = true;
   return 0;
 }
 

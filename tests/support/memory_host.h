@@ -36,6 +36,7 @@ public:
     uint32_t mode = 0100644;
     bool isReadOnly = false;
     bool isUnreadable = false;
+    bool isOnDisk = false;           // a power failure would leave it
     std::optional<int64_t> toldSize; // what `status` says instead of the size
     uint64_t inode = 0;
   };
@@ -104,6 +105,7 @@ public:
                             size_t& done) override;
   support::HostError write(support::FileHandle file, std::span<const uint8_t> bytes) override;
   support::HostError flush(support::FileHandle file) override;
+  support::HostError flushToDisk(support::FileHandle file) override;
   support::HostError close(support::FileHandle file) override;
   support::HostError rename(const char* from, const char* to) override;
   support::HostError renameNew(const char* from, const char* to) override;

@@ -243,6 +243,19 @@ TEST_F(ArchiveFileWriterTest, KeepsWhatItWritesFromOthersUntilItIsComplete) {
   EXPECT_TRUE(isSeen);
 }
 
+// Else a power failure could leave neither.
+TEST_F(ArchiveFileWriterTest, ReplacesAFileOnlyByOneThatIsOnTheDisk) {
+  m_Host.addFile("out.a", "!<arch>\n");
+  add("a.o", "x");
+  ASSERT_TRUE(writeFile("out.a", m_Archive));
+  EXPECT_TRUE(m_Host.at("out.a").isOnDisk);
+}
+
+TEST_F(ArchiveFileWriterTest, DoesNotWaitForTheDiskWhereNothingIsReplaced) {
+  ASSERT_TRUE(writeFile("new.a", m_Archive));
+  EXPECT_FALSE(m_Host.at("new.a").isOnDisk);
+}
+
 TEST_F(ArchiveFileWriterTest, GivesANewFileTheUsualPermissions) {
   ASSERT_TRUE(writeFile("new.a", m_Archive));
   EXPECT_EQ(m_Host.at("new.a").mode, 0100644U);
@@ -557,6 +570,13 @@ TEST_F(FailingWrite, AtAWriteRemovesTheTemporary) {
 TEST_F(FailingWrite, AtTheFlushCountsAsAWrite) {
   EXPECT_FALSE(writeFailing("flush", 1, EFBIG));
   EXPECT_THAT(m_Handler.reports, ElementsAre("0 I/O error writing file 'lib.a.0': File too large"));
+  expectOldArchive();
+}
+
+TEST_F(FailingWrite, OnTheWayToTheDiskCountsAsAWrite) {
+  EXPECT_FALSE(writeFailing("flushToDisk", 1, EIO));
+  EXPECT_THAT(m_Handler.reports,
+              ElementsAre("0 I/O error writing file 'lib.a.0': Input/output error"));
   expectOldArchive();
 }
 

@@ -44,6 +44,7 @@ protected:
     const std::array<uint8_t, 3> bytes = {'n', 'e', 'w'};
     EXPECT_EQ(m_Host.write(file, bytes), 0);
     EXPECT_EQ(m_Host.flush(file), 0);
+    EXPECT_EQ(m_Host.flushToDisk(file), 0);
     EXPECT_EQ(m_Host.close(file), 0);
   }
 

@@ -160,6 +160,7 @@ TEST_F(HostTest, WritesAllBytes) {
   EXPECT_EQ(m_Host.write(file, {}), 0);
   EXPECT_EQ(m_Host.write(file, bytesOf("def")), 0);
   EXPECT_EQ(m_Host.flush(file), 0);
+  EXPECT_EQ(m_Host.flushToDisk(file), 0);
   EXPECT_EQ(m_Host.close(file), 0);
   EXPECT_EQ(read("file"), "a\ncdef");
 }
