@@ -1,10 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Sorted once, so that a run with 10,000 words on a library of 10,000 members looks each up in a
-// few steps. A library may hold one name thousands of times, and each word takes the next of them.
+// Letter case counts. A library may hold one name thousands of times, and each word takes the next
+// of them.
 #include "quarn-ar/named_members.h"
-
-#include <algorithm>
 
 namespace quarn_ar {
 
@@ -15,6 +13,10 @@ namespace {
 // What a header has room for.
 constexpr size_t ShortName = 15;
 
+int compareNames(std::string_view left, std::string_view right) {
+  return left.compare(right);
+}
+
 } // namespace
 
 std::string_view memberNameOf(std::string_view file, const Request& request) {
@@ -23,44 +25,23 @@ std::string_view memberNameOf(std::string_view file, const Request& request) {
 }
 
 NamedMembers::NamedMembers(const arlib::Archive& archive, const Request& request)
-    : m_Request(request) {
-  for (ArchiveMember* member : archive.getMembers()) {
-    if (!member->isAuxiliary()) m_Members.push_back(member);
-  }
-  std::stable_sort(m_Members.begin(), m_Members.end(),
-                   [](const ArchiveMember* left, const ArchiveMember* right) {
-                     return left->getName() < right->getName();
-                   });
-  m_Taken.resize(m_Members.size());
-}
-
-size_t NamedMembers::placeOf(std::string_view name) const {
-  const auto first =
-      std::partition_point(m_Members.begin(), m_Members.end(), [name](const ArchiveMember* member) {
-        return member->getName() < name;
-      });
-  return static_cast<size_t>(first - m_Members.begin());
-}
-
-ArchiveMember* NamedMembers::memberAt(size_t place, std::string_view name) const {
-  if (place >= m_Members.size() || m_Members[place]->getName() != name) return nullptr;
-  return m_Members[place];
-}
+    : m_Request(request), m_Index(arlib::getNamedMembers(archive.getMembers()), compareNames),
+      m_Taken(archive.getMembers().size()) {}
 
 ArchiveMember* NamedMembers::find(std::string_view word) const {
-  const std::string_view name = memberNameOf(word, m_Request);
+  const std::span<ArchiveMember* const> named =
+      m_Index.getMembers(m_Index.find(memberNameOf(word, m_Request)));
   const uint32_t before = m_Request.instance == 0 ? 0 : m_Request.instance - 1;
-  return memberAt(placeOf(name) + before, name);
+  return before < named.size() ? named[before] : nullptr;
 }
 
 ArchiveMember* NamedMembers::take(std::string_view word) {
   if (m_Request.instance != 0) return find(word);
-  const std::string_view name = memberNameOf(word, m_Request);
-  const size_t first = placeOf(name);
-  if (first >= m_Members.size()) return nullptr;
-  ArchiveMember* member = memberAt(first + m_Taken[first], name);
-  if (member != nullptr) ++m_Taken[first];
-  return member;
+  const arlib::NameIndex::Range range = m_Index.find(memberNameOf(word, m_Request));
+  const std::span<ArchiveMember* const> named = m_Index.getMembers(range);
+  if (named.empty()) return nullptr;
+  uint32_t& taken = m_Taken[range.first];
+  return taken < named.size() ? named[taken++] : nullptr;
 }
 
 } // namespace quarn_ar

@@ -5,6 +5,7 @@
 #pragma once
 
 #include "arlib/interface/archive.h"
+#include "arlib/interface/name_index.h"
 #include "quarn-ar/request.h"
 
 #include <cstdint>
@@ -29,13 +30,9 @@ public:
   [[nodiscard]] arlib::ArchiveMember* take(std::string_view word);
 
 private:
-  // The first of the name, in the sorted list.
-  [[nodiscard]] size_t placeOf(std::string_view name) const;
-  [[nodiscard]] arlib::ArchiveMember* memberAt(size_t place, std::string_view name) const;
-
   const Request& m_Request;
-  std::vector<arlib::ArchiveMember*> m_Members; // by name, then in file order
-  std::vector<uint32_t> m_Taken;                // at a name's first member: how many are
+  arlib::NameIndex m_Index;
+  std::vector<uint32_t> m_Taken; // at a name's first member: how many are
 };
 
 } // namespace quarn_ar

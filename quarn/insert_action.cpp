@@ -8,6 +8,7 @@
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/file_probe.h"
 #include "checking/interface/checking.h"
+#include "quarn/long_name_matches.h"
 #include "quarn/member_names.h"
 #include "quarn/reporting.h"
 #include "support/interface/path.h"
@@ -38,6 +39,12 @@ bool mayReplace(UpdateMode mode, int64_t memberTime, int64_t newTime) {
   return false;
 }
 
+// Of an archive that is inserted.
+struct SourceNames {
+  arlib::CopiedNames copied;
+  LongNameMatches matches;
+};
+
 class Insertion {
 public:
   explicit Insertion(Run& run)
@@ -49,7 +56,8 @@ public:
 
 private:
   bool insertArchive(const FileProbe& probe);
-  void insertMemberOf(const ArchiveMember& source);
+  ArchiveMember* findUnmodified(std::string_view name, SourceNames& names);
+  void insertMemberOf(const ArchiveMember& source, SourceNames& names);
   void insertPlainFile(const std::string& word, const FileProbe& probe);
   ArchiveMember* addPlainFile(const std::string& word, const FileProbe& probe);
   bool replacePlainFile(ArchiveMember& member, const std::string& word, const FileProbe& probe);
@@ -81,20 +89,26 @@ void Insertion::insert(const std::string& word) {
 bool Insertion::insertArchive(const FileProbe& probe) {
   arlib::Archive source(m_Archive.getHost());
   if (!arlib::readFile(probe.file, source)) return false;
+  SourceNames names = {arlib::CopiedNames(source), LongNameMatches(m_Archive, source)};
   for (const ArchiveMember* member : source.getMembers()) {
-    if (!member->isAuxiliary()) insertMemberOf(*member);
+    if (!member->isAuxiliary()) insertMemberOf(*member, names);
   }
   return true;
 }
 
+ArchiveMember* Insertion::findUnmodified(std::string_view name, SourceNames& names) {
+  if (LongNameMatches::isForThese(name)) return names.matches.findUnmodified(name);
+  return m_Names.findUnmodified(name);
+}
+
 // Of a member that is too new to be replaced the header's numbers still become those of the source.
-void Insertion::insertMemberOf(const ArchiveMember& source) {
-  ArchiveMember* target = m_Names.findUnmodified(source.getName());
+void Insertion::insertMemberOf(const ArchiveMember& source, SourceNames& names) {
+  ArchiveMember* target = findUnmodified(source.getName(), names);
   const bool isNew = target == nullptr;
   const bool isKept =
       !isNew && !mayReplace(m_Run.settings.updateMode, target->getDate(), source.getDate());
   if (isNew) {
-    target = m_Archive.addMemberFromMember(source);
+    target = m_Archive.addMemberFromMember(source, names.copied);
   } else if (isKept) {
     target->takeHeaderNumbers(source);
   } else {

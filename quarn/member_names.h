@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A sorted view of the members' names as they are now, for runs that look many of them up.
+// The members' names as they are now, for runs that look many of them up.
 #pragma once
 
 #include "arlib/interface/archive.h"
+#include "arlib/interface/name_index.h"
 
 #include <cstdint>
 #include <span>
@@ -25,13 +26,7 @@ public:
   [[nodiscard]] arlib::ArchiveMember* findUnmodified(std::string_view name);
 
 private:
-  struct Range {
-    size_t first;
-    size_t last;
-  };
-  [[nodiscard]] Range rangeOf(std::string_view name) const;
-
-  std::vector<arlib::ArchiveMember*> m_Members; // by name, then by position
+  arlib::NameIndex m_Index;
   std::vector<uint32_t> m_Skip; // at a name's first member: how many of the name are modified
 };
 

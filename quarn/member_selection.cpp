@@ -20,8 +20,10 @@ std::string_view leafOf(std::string_view name) {
   return support::lastPathComponent(name).substr(0, support::LongestPathComponent);
 }
 
+// The archives of this program keep no folders: a name is all leaf, and not searched for one.
 bool leafMatches(std::string_view pattern, const ArchiveMember& member) {
-  return support::matchesPattern(pattern, leafOf(member.getName()), false);
+  const std::string_view leaf = member.getName().substr(0, support::LongestPathComponent);
+  return support::matchesPattern(pattern, leaf, false);
 }
 
 } // namespace

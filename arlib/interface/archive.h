@@ -13,6 +13,7 @@
 #include "arlib/interface/archive_member.h"
 #include "arlib/interface/error_handler.h"
 #include "arlib/interface/file_probe.h"
+#include "arlib/interface/name_index.h"
 #include "arlib/interface/result_list.h"
 #include "arlib/interface/symbol.h"
 #include "checking/interface/checking.h"
@@ -57,6 +58,20 @@ enum class Edit : uint8_t {
   Removal,
   ReadSymbols, ///< another symbol table was read
   TableChange, ///< a table comes or goes
+};
+
+/// The names of one archive's long-name table that another one has taken over. Thousands of names
+/// may share their bytes there: they do so in the copy, too. The source must
+/// outlive the copying.
+class CopiedNames {
+public:
+  CopiedNames() = default; ///< each name is copied for itself
+  explicit CopiedNames(const Archive& source);
+
+private:
+  friend class Archive;
+  std::string_view m_Table; ///< the source's
+  const char* m_Copy = nullptr;
 };
 
 class Archive {
@@ -172,8 +187,10 @@ public:
                                          std::optional<std::string_view> reportedName);
 
   /// Appends a member with the bytes and the header's numbers of a member of another archive, which
-  /// are read through the file that that archive was read from.
+  /// are read through the file that that archive was read from. Who takes many members of one
+  /// archive has their names copied together.
   ArchiveMember* addMemberFromMember(const ArchiveMember& source);
+  ArchiveMember* addMemberFromMember(const ArchiveMember& source, CopiedNames& names);
 
   /// Removes a member, and its symbols from the list of symbols; the order of the rest stays.
   void removeMember(ArchiveMember* archiveMember);
@@ -273,7 +290,6 @@ private:
   void noteTablesUpToDate();
   [[nodiscard]] Symbol symbolOf(std::string_view name, ArchiveMember* member) const;
   void makeSymbols() const;
-  void sortMembers();
   void sortSymbols();
   void groupSymbols();
   void takeOut(std::span<ArchiveMember* const> sortedMembers);
@@ -290,6 +306,7 @@ private:
   void putTablesInPlace();
   void forgetTable(ArchiveMember*& table);
   const char* copyToRegion(std::string_view text);
+  [[nodiscard]] std::string_view copyName(std::string_view name, CopiedNames& names);
   static std::span<Symbol* const> symbolsOf(const elfext::FastArray<Symbol*>& symbols,
                                             const ArchiveMember* archiveMember);
 
@@ -321,7 +338,7 @@ private:
   std::vector<ArchiveMember*> m_ForgottenTables;
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
-  elfext::FastArray<ArchiveMember*> m_SortedArchiveMembers;
+  NameIndex m_MembersByName;
   /// The table that was read, until its symbols are made, and then these.
   mutable std::unique_ptr<ReadSymbolTable> m_ReadSymbolTable;
   mutable elfext::FastArray<Symbol*> m_Symbols;
@@ -331,7 +348,7 @@ private:
   ArchiveMember* m_SymbolTable = nullptr;
 
   /// Cleared by noteEdit, and set by who brings it up to date.
-  bool m_SortedArchiveMembersUpToDate = true; ///< findMembers
+  bool m_MembersByNameUpToDate = true;        ///< findMembers
   bool m_SortedSymbolsUpToDate = true;        ///< findSymbols
   bool m_DefinedSymbolsUpToDate = true;       ///< getDefinedSymbols
   bool m_ArchiveMemberOffsetsUpToDate = true; ///< updateAuxiliaryMembers, as the next two

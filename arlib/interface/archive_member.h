@@ -160,6 +160,7 @@ private:
   Archive* m_Archive;
   std::optional<Contents> m_Contents;
   std::optional<ContentsLocation> m_ContentsLocation;
+  bool m_NameIsLeaf = false; ///< known without a look at the name
   bool m_Modified = false;
   bool m_ContentsAreViewed = false; ///< names or symbols are views of the bytes: never free them
 };

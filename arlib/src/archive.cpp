@@ -36,7 +36,7 @@ constexpr size_t InitialRegionSize = 1024;
 // bytes has nothing to publish, and its offset is computed with the tables.
 struct StaleRow {
   Edit edit;
-  bool sortedMembers;  // findMembers
+  bool membersByName;  // findMembers
   bool sortedSymbols;  // findSymbols
   bool definedSymbols; // getDefinedSymbols
   bool offsets;        // updateAuxiliaryMembers, as the next two
@@ -48,8 +48,8 @@ struct StaleRow {
 constexpr bool Yes = true;
 constexpr bool No = false;
 constexpr StaleRow StaleRows[] = {
-    //                   sorted   sorted   defined           long     symbol
-    //                   members  symbols  symbols  offsets  names    table
+    //                   members  sorted   defined           long     symbol
+    //                   by name  symbols  symbols  offsets  names    table
     {Edit::Publishing,   No,      No,      No,      No,      No,      Yes},
     {Edit::EmptyMember,  Yes,     No,      No,      No,      Yes,     Yes},
     {Edit::FileMember,   Yes,     No,      No,      Yes,     Yes,     Yes},
@@ -71,22 +71,12 @@ consteval bool isInOrder(std::span<const StaleRow> rows) {
 }
 static_assert(isInOrder(StaleRows), "an edit's row is found by its number");
 
-// Copies the equal range of a sorted view into a list.
-template <class Element, class List, class Compare>
-bool fillFromSorted(const elfext::FastArray<Element*>& sorted, std::string_view name, List& list,
-                    Compare compareNames) {
-  const auto first =
-      std::partition_point(sorted.begin(), sorted.end(), [&](const Element* element) {
-        return compareNames(element->getName(), name) < 0;
-      });
-  const auto last = std::partition_point(first, sorted.end(), [&](const Element* element) {
-    return compareNames(element->getName(), name) == 0;
-  });
-  const auto count = static_cast<uint32_t>(last - first);
-  list.setSize(count);
-  for (uint32_t i = 0; i < count; ++i)
-    list.set(i, first[i]);
-  return count != 0;
+template <class Element, class List>
+bool fill(std::span<Element* const> elements, List& list) {
+  list.setSize(static_cast<uint32_t>(elements.size()));
+  for (uint32_t i = 0; i < list.getSize(); ++i)
+    list.set(i, elements[i]);
+  return !elements.empty();
 }
 
 template <class T>
@@ -105,8 +95,8 @@ Archive::Archive(support::Host& host)
                                InitialRegionSize, "arlib::Archive::ObjectRegion")),
       m_ContainerRegion(
           alloclib::RegionGeneral::Create(InitialRegionSize, "arlib::Archive::ContainerRegion")),
-      m_ArchiveMembers(m_ContainerRegion.get()), m_SortedArchiveMembers(m_ContainerRegion.get()),
-      m_Symbols(m_ContainerRegion.get()), m_SortedSymbols(m_ContainerRegion.get()),
+      m_ArchiveMembers(m_ContainerRegion.get()), m_Symbols(m_ContainerRegion.get()),
+      m_SortedSymbols(m_ContainerRegion.get()),
       m_DefinedSymbols{elfext::FastArray<Symbol*>(m_ContainerRegion.get()),
                        elfext::FastArray<Symbol*>(m_ContainerRegion.get())} {}
 
@@ -151,7 +141,7 @@ void Archive::clear() {
   m_HeldFiles.clear();
   m_OwnFile.reset();
   m_ArchiveMembers.setSize(0);
-  m_SortedArchiveMembers.setSize(0);
+  m_MembersByName = {};
   m_ReadSymbolTable.reset();
   m_Symbols.setSize(0);
   m_SortedSymbols.setSize(0);
@@ -163,7 +153,7 @@ void Archive::clear() {
 
 void Archive::noteEdit(Edit edit) {
   const StaleRow& stale = StaleRows[static_cast<size_t>(edit)];
-  m_SortedArchiveMembersUpToDate &= !stale.sortedMembers;
+  m_MembersByNameUpToDate &= !stale.membersByName;
   m_SortedSymbolsUpToDate &= !stale.sortedSymbols;
   m_DefinedSymbolsUpToDate &= !stale.definedSymbols;
   m_ArchiveMemberOffsetsUpToDate &= !stale.offsets;
@@ -298,10 +288,33 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   return member;
 }
 
+CopiedNames::CopiedNames(const Archive& source) {
+  const ArchiveMember* table = source.getFileNameTable();
+  if (table == nullptr || !table->hasContents()) return;
+  const std::span<const uint8_t> bytes = table->getContents();
+  m_Table = {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+}
+
+std::string_view Archive::copyName(std::string_view name, CopiedNames& names) {
+  const std::less_equal<> isInFront;
+  const char* table = names.m_Table.data();
+  const char* tableEnd = table + names.m_Table.size();
+  if (!isInFront(table, name.data()) || !isInFront(name.data() + name.size(), tableEnd))
+    return {copyToRegion(name), name.size()};
+  if (names.m_Copy == nullptr) names.m_Copy = copyToRegion(names.m_Table);
+  return {names.m_Copy + (name.data() - table), name.size()};
+}
+
 ArchiveMember* Archive::addMemberFromMember(const ArchiveMember& source) {
+  CopiedNames none;
+  return addMemberFromMember(source, none);
+}
+
+ArchiveMember* Archive::addMemberFromMember(const ArchiveMember& source, CopiedNames& names) {
   QUARN_ASSERT(1, !m_ReadOnly);
-  const std::string_view name = memberNameOf(source.getName());
-  ArchiveMember* member = appendMember({copyToRegion(name), name.size()});
+  const std::string_view name =
+      source.m_NameIsLeaf ? source.getName() : memberNameOf(source.getName());
+  ArchiveMember* member = appendMember(copyName(name, names));
   member->setContentsFromMember(source);
   noteEdit(Edit::FileMember);
   return member;
@@ -425,19 +438,13 @@ uint32_t Archive::getSymbolIndex(const Symbol* symbol) const {
   return found == symbols.end() ? NotFound : static_cast<uint32_t>(found - symbols.begin());
 }
 
-void Archive::sortMembers() {
-  if (m_SortedArchiveMembersUpToDate) return;
-  m_SortedArchiveMembers.assign(m_ArchiveMembers);
-  elfext::mergeSort(m_SortedArchiveMembers.getSpan(),
-                    [](const ArchiveMember* left, const ArchiveMember* right) {
-                      return compareIgnoringCase(left->m_Name, right->m_Name);
-                    });
-  m_SortedArchiveMembersUpToDate = true;
-}
-
 bool Archive::findMembers(std::string_view name, ArchiveMemberList& list) {
-  sortMembers();
-  return fillFromSorted(m_SortedArchiveMembers, name, list, compareIgnoringCase);
+  if (!m_MembersByNameUpToDate) {
+    const std::span<ArchiveMember* const> members = getMembers();
+    m_MembersByName = NameIndex({members.begin(), members.end()}, compareIgnoringCase);
+    m_MembersByNameUpToDate = true;
+  }
+  return fill(m_MembersByName.getMembers(m_MembersByName.find(name)), list);
 }
 
 void Archive::sortSymbols() {
@@ -452,8 +459,13 @@ void Archive::sortSymbols() {
 
 bool Archive::findSymbols(std::string_view name, SymbolList& list) {
   sortSymbols();
-  return fillFromSorted(m_SortedSymbols, name, list,
-                        [](std::string_view a, std::string_view b) { return a.compare(b); });
+  const auto first =
+      std::partition_point(m_SortedSymbols.begin(), m_SortedSymbols.end(),
+                           [name](const Symbol* symbol) { return symbol->getName() < name; });
+  const auto last =
+      std::partition_point(first, m_SortedSymbols.end(),
+                           [name](const Symbol* symbol) { return symbol->getName() == name; });
+  return fill(std::span<Symbol* const>(first, last), list);
 }
 
 void Archive::groupSymbols() {

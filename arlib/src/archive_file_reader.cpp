@@ -218,23 +218,12 @@ bool ArchiveFileReader::parseLongName(std::string_view digits, std::string_view&
     return m_Archive.goOn(&ErrorHandler::reportBadLongNameIndex, m_Offset, untilNul(digits));
   }
   m_LongNameIndex = index;
-  size_t end = 0;
-  if (!findLongNameEnd(m_LongNames, index, end)) {
+  const std::optional<std::string_view> found = m_LongNames.nameAt(index);
+  if (!found) {
     return m_Archive.goOn(&ErrorHandler::reportLongNameIndexOutOfRange, m_Offset, index,
-                          static_cast<uint32_t>(m_LongNames.size()));
+                          static_cast<uint32_t>(m_LongNames.getSize()));
   }
-  name = untilNul(m_LongNames.substr(index, end - index));
-  return true;
-}
-
-// An index is out of range behind the table, on an entry's newline, or where no entry ends behind
-// it. The last terminator is known beforehand, so that a table without one is not searched again
-// for each member.
-bool ArchiveFileReader::findLongNameEnd(std::string_view table, uint32_t index, size_t& end) const {
-  if (index >= table.size()) return false;
-  if (index > 0 && table[index] == '\n' && table[index - 1] == '/') return false;
-  if (m_LastTerminator == std::string_view::npos || index > m_LastTerminator) return false;
-  end = table.find(LongNameTerminator, index);
+  name = *found;
   return true;
 }
 
@@ -269,13 +258,8 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   auto offset = static_cast<uint32_t>(m_Offset + MemberHeaderSize);
   uint32_t size = m_Numbers.size;
   if (!m_Archive.cutToFile(m_File->getName(), name, offset, size, m_Status.size)) return nullptr;
-  // A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
-  std::string_view memberName = m_Archive.memberNameOf(name);
-  if (m_LongNameIndex == ArchiveMember::NoFileNameTableOffset) {
-    memberName = {m_Archive.copyToRegion(memberName), memberName.size()};
-    m_HasFoldersInHeaders |= isLongName(memberName);
-  }
-  ArchiveMember* member = m_Archive.appendFileMember(memberName, m_File, offset, size);
+  ArchiveMember* member = m_Archive.appendFileMember(memberNameOf(name), m_File, offset, size);
+  member->m_NameIsLeaf = !m_Archive.m_KeepFolders;
   member->m_FileNameTableOffset = m_LongNameIndex;
   member->m_Date = m_Numbers.date;
   member->m_Uid = m_Numbers.uid;
@@ -286,6 +270,15 @@ ArchiveMember* ArchiveFileReader::addMember(std::string_view name) {
   const std::span<const uint8_t> first = m_FirstBytes;
   member->m_Type = ArchiveMemberType::decide(first.first(std::min<size_t>(first.size(), size)));
   return member;
+}
+
+// A long name is a view of the table, which stays; a short one stands in a buffer that doesn't.
+std::string_view ArchiveFileReader::memberNameOf(std::string_view name) {
+  if (m_LongNameIndex != ArchiveMember::NoFileNameTableOffset)
+    return m_Archive.m_KeepFolders ? name : m_LongNames.leafOf(name);
+  const std::string_view memberName = m_Archive.memberNameOf(name);
+  m_HasFoldersInHeaders |= isLongName(memberName);
+  return {m_Archive.copyToRegion(memberName), memberName.size()};
 }
 
 bool ArchiveFileReader::areContentsTaken(const ArchiveMember* member) const {
@@ -301,10 +294,7 @@ bool ArchiveFileReader::takeAuxiliaryContents(ArchiveMember* member) {
   if (error != 0 || done < m_Numbers.size) {
     return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
-  if (member == m_Archive.m_FileNameTable) {
-    m_LongNames = asText(bytes);
-    m_LastTerminator = m_LongNames.rfind(LongNameTerminator);
-  }
+  if (member == m_Archive.m_FileNameTable) m_LongNames = LongNames(asText(bytes));
   return true;
 }
 

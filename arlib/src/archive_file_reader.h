@@ -6,6 +6,7 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
+#include "arlib/src/long_names.h"
 #include "arlib/src/table_cursor.h"
 #include "support/interface/read_window.h"
 
@@ -43,9 +44,9 @@ private:
   bool parseName(std::string_view& name);
   bool parseLongName(std::string_view digits, std::string_view& name);
   bool parseShortName(std::string_view field, std::string_view& name);
-  bool findLongNameEnd(std::string_view table, uint32_t index, size_t& end) const;
   bool checkHostFile();
   ArchiveMember* addMember(std::string_view name);
+  std::string_view memberNameOf(std::string_view name);
   [[nodiscard]] bool areContentsTaken(const ArchiveMember* member) const;
   bool takeAuxiliaryContents(ArchiveMember* member);
   bool skipContents();
@@ -79,9 +80,7 @@ private:
   uint32_t m_LongNameIndex = ArchiveMember::NoFileNameTableOffset;
   bool m_HasFoldersInHeaders = false;
 
-  // The long-name table's text, and where the last terminator in it starts.
-  std::string_view m_LongNames;
-  size_t m_LastTerminator = std::string_view::npos;
+  LongNames m_LongNames; // of the table that has passed by
 };
 
 } // namespace arlib

@@ -62,6 +62,7 @@ void ArchiveMember::setName(std::string_view name) {
   QUARN_ASSERT(1, !isAuxiliary());
   if (name == m_Name) return;
   m_Name = std::string_view(m_Archive->copyToRegion(name), name.size());
+  m_NameIsLeaf = false;
   m_Archive->noteEdit(Edit::NewName);
 }
 
