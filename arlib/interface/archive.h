@@ -34,6 +34,7 @@
 namespace arlib {
 
 class ReadSymbolTable;
+class TableText;
 struct DerivedTable;
 struct DerivedTables;
 struct MemberLayout;
@@ -300,8 +301,9 @@ private:
   [[nodiscard]] bool rebuildLongNames(DerivedTables& tables);
   [[nodiscard]] bool rebuildSymbols(DerivedTables& tables);
   [[nodiscard]] bool isLaidOutAs(const MemberLayout& layout) const;
-  void takeTables(const DerivedTables& tables);
-  void takeTable(ArchiveMember*& table, const ArchiveMemberType* type, const DerivedTable& derived);
+  void takeTables(DerivedTables& tables);
+  void takeTable(ArchiveMember*& table, const ArchiveMemberType* type, DerivedTable& derived);
+  void dropMadeTables();
   void takeLayout(const MemberLayout& layout);
   void putTablesInPlace();
   void forgetTable(ArchiveMember*& table);
@@ -336,6 +338,8 @@ private:
   std::vector<std::span<uint8_t>> m_ViewedBytes;
   /// Tables that a rebuild has taken out of the list; clients may still hold them.
   std::vector<ArchiveMember*> m_ForgottenTables;
+  /// What the bytes of tables are made from that a rebuild has made, until they are written.
+  std::vector<std::unique_ptr<TableText>> m_MadeTables;
 
   elfext::FastArray<ArchiveMember*> m_ArchiveMembers;
   NameIndex m_MembersByName;

@@ -22,12 +22,15 @@ namespace arlib {
 
 class Archive;
 class Symbol;
+class TableText;
 struct FileProbe;
 
 /// Lives in the archive's object region. It is never freed by itself; what it holds outside the
 /// region (a temporary file) is released by releaseContentsLocation.
 ///
 /// It always has contents in memory, or a contents location, or both, and if both, the same bytes.
+/// Only a table that updateAuxiliaryMembers has made may have neither until it is written:
+/// loadContents gives its bytes nevertheless.
 class ArchiveMember {
 public:
   /// Where the bytes lie on disk; their number is the member's size.
@@ -126,6 +129,7 @@ private:
   friend class Archive;
   friend class ArchiveFileReader;
   friend class ArchiveFileWriter;
+  friend class ContentsReader;
   friend class ElfImageArchiveMemberType;
 
   struct Contents {
@@ -137,8 +141,8 @@ private:
   /// Uninitialised bytes in the archive's container region; the old ones are freed, except those of
   /// a table that came from the file, into which names point: they go when the archive is cleared.
   std::span<uint8_t> replaceContents(uint32_t size);
-  /// The same with bytes of that region which are filled already.
-  void takeContents(std::span<uint8_t> bytes);
+  /// The bytes are those of a table that the archive holds.
+  void takeMade(const TableText* made);
   void freeContents();
   /// The archive holds the file from now on.
   void setLocation(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
@@ -160,7 +164,8 @@ private:
   Archive* m_Archive;
   std::optional<Contents> m_Contents;
   std::optional<ContentsLocation> m_ContentsLocation;
-  bool m_NameIsLeaf = false; ///< known without a look at the name
+  const TableText* m_Made = nullptr; ///< of a table that has not been written yet
+  bool m_NameIsLeaf = false;         ///< known without a look at the name
   bool m_Modified = false;
   bool m_ContentsAreViewed = false; ///< names or symbols are views of the bytes: never free them
 };

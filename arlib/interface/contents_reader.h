@@ -43,6 +43,8 @@ public:
   [[nodiscard]] int getError() const { return m_Error; }
 
 private:
+  struct MadePieces;
+
   /// Large enough that the number of host calls doesn't matter, small enough for a processor's
   /// cache. Copying inside the kernel was measured, and is no faster than this.
   static constexpr uint64_t PieceSize = 0x40000;
@@ -53,8 +55,9 @@ private:
   Archive& m_Archive;
   support::SourceFile* m_File = nullptr; ///< that was read last, and is still to be looked at
   std::unique_ptr<support::ReadWindow> m_Window;
-  const uint8_t* m_Memory = nullptr; ///< the rest of a member that is in memory
-  uint64_t m_Offset = 0;             ///< of the rest of a member that is on disk
+  const uint8_t* m_Memory = nullptr;  ///< the rest of a member that is in memory
+  std::unique_ptr<MadePieces> m_Made; ///< the rest of a table that is made piece by piece
+  uint64_t m_Offset = 0;              ///< of the rest of a member that is on disk
   uint64_t m_Remaining = 0;
   int m_Error = 0;
 };

@@ -8,6 +8,7 @@
 #include "elfext/interface/fast_array.h"
 
 #include <cstdint>
+#include <span>
 #include <string_view>
 
 namespace arlib {
@@ -41,6 +42,9 @@ public:
 
   [[nodiscard]] uint32_t getSize() const { return m_Names.getSize(); }
   [[nodiscard]] std::string_view operator[](uint32_t index) const { return m_Names[index]; }
+  [[nodiscard]] std::span<const std::string_view> getNames() const {
+    return {m_Names.begin(), m_Names.getSize()};
+  }
   /// Of all names, in bytes.
   [[nodiscard]] uint64_t getTextSize() const { return m_TextSize; }
   void clear() {

@@ -135,6 +135,7 @@ void Archive::clear() {
   letGo(getMembers());
   letGo(m_ForgottenTables);
   m_ForgottenTables.clear();
+  m_MadeTables.clear();
   for (const std::span<uint8_t> bytes : m_ViewedBytes)
     m_ContainerRegion->discard(bytes.data(), bytes.size());
   m_ViewedBytes.clear();
@@ -510,21 +511,23 @@ std::span<Symbol* const> Archive::getSortedDefinedSymbols(const ArchiveMember* a
 }
 
 // Names and symbols may be views of the bytes of a table that is replaced: they are brought in, to
-// stay. Bytes that nobody wanted at the read are not read to be replaced.
+// stay. Bytes that nobody wanted at the read are not read to be replaced, nor are those of a table
+// that was made itself.
 bool Archive::rebuildLongNames(DerivedTables& tables) {
-  if (!makeLongNameTable(*this, *m_ContainerRegion, tables)) return false;
+  if (!makeLongNameTable(*this, tables)) return false;
   // A table without names goes at once: the reports of the next step count members without it.
   if (tables.longNames.fate == DerivedTable::Fate::Dropped) forgetTable(m_FileNameTable);
   const bool isReplaced =
       m_FileNameTable != nullptr && tables.longNames.fate == DerivedTable::Fate::Made;
-  return !isReplaced || m_FileNameTable->loadContents();
+  return !isReplaced || m_FileNameTable->m_Made != nullptr || m_FileNameTable->loadContents();
 }
 
 bool Archive::rebuildSymbols(DerivedTables& tables) {
-  if (!makeSymbolTable(*this, *m_ContainerRegion, tables)) return false;
+  if (!makeSymbolTable(*this, tables)) return false;
   const bool isReplaced =
       m_SymbolTable != nullptr && tables.symbols.fate == DerivedTable::Fate::Made;
-  return !isReplaced || !m_AreSymbolsWanted || m_SymbolTable->loadContents();
+  return !isReplaced || !m_AreSymbolsWanted || m_SymbolTable->m_Made != nullptr ||
+         m_SymbolTable->loadContents();
 }
 
 // A long-name table that comes, goes or changes its size shifts all members behind it, and with
@@ -553,7 +556,7 @@ bool Archive::updateAuxiliaryMembers() {
   return true;
 }
 
-void Archive::takeTables(const DerivedTables& tables) {
+void Archive::takeTables(DerivedTables& tables) {
   auto nameOffset = tables.nameOffsets.begin();
   for (ArchiveMember* member : m_ArchiveMembers) {
     if (nameOffset == tables.nameOffsets.end()) break;
@@ -570,7 +573,7 @@ void Archive::takeTables(const DerivedTables& tables) {
 }
 
 void Archive::takeTable(ArchiveMember*& table, const ArchiveMemberType* type,
-                        const DerivedTable& derived) {
+                        DerivedTable& derived) {
   if (derived.fate == DerivedTable::Fate::Kept) return;
   if (derived.fate == DerivedTable::Fate::Dropped) return forgetTable(table);
   if (table == nullptr) {
@@ -578,7 +581,22 @@ void Archive::takeTable(ArchiveMember*& table, const ArchiveMemberType* type,
     table->m_Type = type;
     noteEdit(Edit::TableChange);
   }
-  table->takeContents(derived.bytes);
+  const TableText* former = table->m_Made;
+  table->takeMade(derived.text.get());
+  std::erase_if(m_MadeTables, [former](const auto& text) { return text.get() == former; });
+  m_MadeTables.push_back(std::move(derived.text));
+}
+
+// Once they are written, their bytes are in the file.
+void Archive::dropMadeTables() {
+  for (ArchiveMember* table : {m_SymbolTable, m_FileNameTable}) {
+    if (table != nullptr) table->m_Made = nullptr;
+  }
+  // Of a table that has left the list nobody else has the bytes.
+  std::erase_if(m_MadeTables, [this](const auto& text) {
+    return std::none_of(m_ForgottenTables.begin(), m_ForgottenTables.end(),
+                        [&](const ArchiveMember* table) { return table->m_Made == text.get(); });
+  });
 }
 
 // The object is only forgotten until the archive is cleared: names and symbols may be views of its

@@ -383,6 +383,7 @@ void ArchiveFileWriter::relocateMembers() {
     member->setLocation(file, static_cast<uint32_t>(offset + MemberHeaderSize), false);
     offset = nextHeaderOffset(offset, member->m_Size);
   }
+  m_Archive.dropMadeTables();
   if (!m_Archive.m_AreSymbolsWanted) m_Archive.m_ReadSymbolTable.reset();
   m_Archive.m_HeldFiles.assign(1, file);
   m_Archive.m_OwnFile = std::move(file);

@@ -8,6 +8,7 @@
 
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_format.h"
+#include "arlib/src/table_text.h"
 #include "elfext/interface/error_handler.h"
 #include "elfext/interface/object_module.h"
 #include "elfext/interface/read_elf_file.h"
@@ -98,10 +99,10 @@ std::span<uint8_t> ArchiveMember::replaceContents(uint32_t size) {
   return {m_Contents->bytes, size};
 }
 
-void ArchiveMember::takeContents(std::span<uint8_t> bytes) {
+void ArchiveMember::takeMade(const TableText* made) {
   freeContents();
-  m_Size = static_cast<uint32_t>(bytes.size());
-  m_Contents = Contents{bytes.data(), m_Size, m_Size};
+  m_Size = static_cast<uint32_t>(made->getSize());
+  m_Made = made;
   releaseContentsLocation();
 }
 
@@ -133,6 +134,11 @@ bool ArchiveMember::readContents(std::span<uint8_t> bytes) {
 
 bool ArchiveMember::loadContents() {
   if (m_Contents) return true;
+  if (m_Made != nullptr) {
+    TableText::Place front;
+    m_Made->take(replaceContents(m_Size), front);
+    return true;
+  }
   QUARN_ASSERT(1, m_ContentsLocation.has_value());
   if (readContents(replaceContents(m_Size))) return true;
   freeContents();
@@ -141,6 +147,7 @@ bool ArchiveMember::loadContents() {
 
 bool ArchiveMember::flushContents() {
   if (m_ContentsLocation) return true;
+  loadContents();
   support::Host& host = m_Archive->getHost();
   std::string name;
   support::FileHandle file;
@@ -187,6 +194,7 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
   // The data may be a part of the old contents.
   std::memmove(replaceContents(size).data(), data, size);
   m_Size = size;
+  m_Made = nullptr;
   m_Type = nullptr;
   determineType();
   m_Archive->noteEdit(Edit::NewBytes);
@@ -197,6 +205,7 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
 void ArchiveMember::takeFile(const std::shared_ptr<support::SourceFile>& file, uint32_t offset,
                              uint32_t size) {
   freeContents();
+  m_Made = nullptr;
   // A temporary file of the old contents is left alone: only releaseContentsLocation deletes.
   setLocation(file, offset, false);
   const support::FileStatus& status = file->getStatus();

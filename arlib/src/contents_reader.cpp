@@ -5,12 +5,25 @@
 // old and half new bytes, so it is checked when the reader turns to the next file, and at the end.
 #include "arlib/interface/contents_reader.h"
 
+#include "arlib/src/table_text.h"
 #include "support/interface/read_window.h"
 #include "support/interface/source_file.h"
 
 #include <algorithm>
+#include <vector>
 
 namespace arlib {
+
+struct ContentsReader::MadePieces {
+  const TableText& text;
+  TableText::Place place = {};
+  std::vector<uint8_t> bytes = std::vector<uint8_t>(PieceSize);
+
+  std::span<const uint8_t> take(size_t count) {
+    text.take(std::span(bytes).first(count), place);
+    return std::span(bytes).first(count);
+  }
+};
 
 ContentsReader::ContentsReader(Archive& archive)
     : m_Archive(archive), m_Window(std::make_unique<support::ReadWindow>()) {}
@@ -39,10 +52,15 @@ bool ContentsReader::failToRead(int error) {
 bool ContentsReader::start(const ArchiveMember& member) {
   m_Remaining = member.getSize();
   m_Memory = nullptr;
+  m_Made.reset();
   if (member.hasContents()) {
     const std::span<const uint8_t> bytes = member.getContents();
     m_Memory = bytes.data();
     m_Remaining = std::min<uint64_t>(m_Remaining, bytes.size());
+    return true;
+  }
+  if (member.m_Made != nullptr) {
+    m_Made.reset(new MadePieces{*member.m_Made});
     return true;
   }
   const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();
@@ -59,6 +77,8 @@ bool ContentsReader::read(std::span<const uint8_t>& piece) {
   if (m_Memory != nullptr) {
     piece = {m_Memory, wanted};
     m_Memory += wanted;
+  } else if (m_Made != nullptr) {
+    piece = m_Made->take(wanted);
   } else {
     int error = 0;
     piece = m_Window->fetch(m_Offset, wanted, error);

@@ -2,19 +2,26 @@
 //
 // The layout of an archive and its long-name table, which holds each name longer than 15 bytes
 // followed by "/" and a newline, in list order. Sums are in 64 bits; what the format can't hold is
-// refused before anything is allocated for it.
+// refused before anything is made of it. Names are not copied: thousands of members may share one.
 #include "arlib/src/derived_tables.h"
 
 #include "arlib/interface/archive_format.h"
+#include "arlib/interface/symbol_name_list.h"
 
 #include <cerrno>
-#include <cstring>
 #include <string_view>
+#include <utility>
 
 namespace arlib {
 
+namespace {
+
+constexpr size_t NamesRegionSize = 1024;
+
+} // namespace
+
 std::optional<uint64_t> DerivedTable::getSizeAfter(const ArchiveMember* table) const {
-  if (fate == Fate::Made) return bytes.size();
+  if (fate == Fate::Made) return text->getSize();
   if (fate == Fate::Dropped || table == nullptr) return std::nullopt;
   return table->getSize();
 }
@@ -37,13 +44,17 @@ MemberLayout layOut(std::span<ArchiveMember* const> members,
   return layout;
 }
 
-bool makeLongNameTable(const Archive& archive, alloclib::RegionGeneral& region,
-                       DerivedTables& tables) {
+bool makeLongNameTable(const Archive& archive, DerivedTables& tables) {
+  alloclib::RegionOwner region(
+      alloclib::RegionGeneral::Create(NamesRegionSize, "arlib::makeLongNameTable() region"));
+  auto* names = alloclib::create<SymbolNameList>(*region, region.get());
   uint64_t required = 0;
   for (const ArchiveMember* member : archive.getMembers()) {
-    if (isLongName(member->getName())) {
-      required += member->getName().size() + LongNameTerminator.size();
-    }
+    if (!isLongName(member->getName())) continue;
+    // One that doesn't fit is never used.
+    tables.nameOffsets.push_back(static_cast<uint32_t>(required));
+    names->addCopied(member->getName());
+    required += member->getName().size() + LongNameTerminator.size();
   }
   if (required == 0) {
     tables.longNames.fate = DerivedTable::Fate::Dropped;
@@ -52,19 +63,10 @@ bool makeLongNameTable(const Archive& archive, alloclib::RegionGeneral& region,
   if (required > MaximumFileSize) {
     return archive.fail(&ErrorHandler::reportWriteError, archive.getFileName(), EFBIG);
   }
-  const auto requiredFileNameTableSize = static_cast<uint32_t>(required);
-  auto* bytes = static_cast<uint8_t*>(region.allocate(requiredFileNameTableSize));
-  tables.longNames = {DerivedTable::Fate::Made, {bytes, requiredFileNameTableSize}};
-  uint32_t fileNameTableOffset = 0;
-  for (const ArchiveMember* member : archive.getMembers()) {
-    if (!isLongName(member->getName())) continue;
-    tables.nameOffsets.push_back(fileNameTableOffset);
-    for (const std::string_view part : {member->getName(), LongNameTerminator}) {
-      std::memcpy(bytes + fileNameTableOffset, part.data(), part.size());
-      fileNameTableOffset += static_cast<uint32_t>(part.size());
-    }
-  }
-  QUARN_ASSERT(1, fileNameTableOffset == requiredFileNameTableSize);
+  auto text = std::make_unique<TableText>(std::move(region));
+  text->addTexts(names->getNames(), names->getTextSize(), LongNameTerminator);
+  QUARN_ASSERT(1, text->getSize() == required);
+  tables.longNames = {DerivedTable::Fate::Made, std::move(text)};
   return true;
 }
 

@@ -8,10 +8,11 @@
 // of the long-name table.
 #pragma once
 
-#include "alloclib/interface/region_general.h"
 #include "arlib/interface/archive.h"
+#include "arlib/src/table_text.h"
 
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <span>
 #include <vector>
@@ -22,8 +23,7 @@ struct DerivedTable {
   enum class Fate : uint8_t { Kept, Dropped, Made };
 
   Fate fate = Fate::Kept;
-  // Of one that was made. They lie where members' bytes lie, and go with them.
-  std::span<uint8_t> bytes = {};
+  std::unique_ptr<TableText> text = {}; // of one that was made
 
   // The size that the table has then, if there is one; `table` is the one that there is now.
   [[nodiscard]] std::optional<uint64_t> getSizeAfter(const ArchiveMember* table) const;
@@ -50,11 +50,10 @@ struct DerivedTables {
 
 // Makes the long-name table whole, since the offsets in all headers of long-named members point
 // into it. False after a report.
-bool makeLongNameTable(const Archive& archive, alloclib::RegionGeneral& region,
-                       DerivedTables& tables);
+bool makeLongNameTable(const Archive& archive, DerivedTables& tables);
 
 // Makes the symbol table of the members' symbols, for the long-name table that there will be, and
 // the layout with both. False after a report.
-bool makeSymbolTable(Archive& archive, alloclib::RegionGeneral& region, DerivedTables& tables);
+bool makeSymbolTable(Archive& archive, DerivedTables& tables);
 
 } // namespace arlib

@@ -154,7 +154,7 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
         computeDecoration(m_Attributes[i], m_Common, m_Records);
     if (!decoration) {
       baseVariants.push_back(hosting.member);
-      output.append({hosting.place, hosting.names});
+      output.append({hosting.place, hosting.names, PlainEnding});
       continue;
     }
     // It stands also where it can't say all of the difference, which is only told of.
@@ -162,7 +162,9 @@ bool MinorVariants::addSymbols(std::span<const HostingMember> group,
         !m_Archive.goOn(&ErrorHandler::reportUndecoratableDifference, *hosting.member, m_Members))
       return false;
     const std::string suffix = std::string(AttributeMarker) + decoration->text;
-    output.append({hosting.place, decorateNames(*hosting.names, suffix)});
+    output.append({hosting.place,
+                   hosting.names,
+                   {alloclib::copyString(m_Region, suffix), suffix.size() + PlainEnding.size()}});
   }
   return reportBases(baseVariants);
 }
@@ -177,21 +179,6 @@ bool MinorVariants::findCommon() {
 bool MinorVariants::addLibrary(const ArchiveMember& member, elfext::FullAttr& attributes) const {
   return addLibraryAttributes(attributes, m_Archive.getLibraryAttributes()) ||
          m_Archive.goOn(&ErrorHandler::reportMemberAttributesIncompatible, member, attributes);
-}
-
-const SymbolNameList* MinorVariants::decorateNames(const SymbolNameList& names,
-                                                   std::string_view decoration) const {
-  auto* decorated = alloclib::create<SymbolNameList>(m_Region, &m_Region);
-  decorated->reserve(names.getSize());
-  for (uint32_t i = 0; i < names.getSize(); ++i) {
-    const std::string_view name = names[i];
-    const size_t size = name.size() + decoration.size();
-    auto* bytes = static_cast<char*>(m_Region.allocate(size, 1));
-    std::memcpy(bytes, name.data(), name.size());
-    std::memcpy(bytes + name.size(), decoration.data(), decoration.size());
-    decorated->addCopied({bytes, size});
-  }
-  return decorated;
 }
 
 bool MinorVariants::reportBases(const std::vector<const ArchiveMember*>& baseVariants) const {

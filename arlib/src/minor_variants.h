@@ -17,16 +17,20 @@
 
 namespace arlib {
 
+// What ends a name in the table that has no decoration.
+constexpr std::string_view PlainEnding("\0", 1);
+
 // Neighbours in the table to come: names that lead to one member.
 struct SymbolTableEntries {
   uint32_t place; // of the member
   const SymbolNameList* names;
+  std::string_view ending; // of each: their decoration, and a NUL
 };
 
 // Publishes the names of one group.
 class MinorVariants {
 public:
-  // Decorated names go to the region.
+  // Decorations go to the region.
   MinorVariants(Archive& archive, alloclib::RegionGeneral& region, AttributeRecords& records)
       : m_Archive(archive), m_Region(region), m_Records(records) {}
 
@@ -38,8 +42,6 @@ public:
 private:
   [[nodiscard]] bool findCommon();
   [[nodiscard]] bool addLibrary(const ArchiveMember& member, elfext::FullAttr& attributes) const;
-  [[nodiscard]] const SymbolNameList* decorateNames(const SymbolNameList& names,
-                                                    std::string_view decoration) const;
   [[nodiscard]] bool reportBases(const std::vector<const ArchiveMember*>& baseVariants) const;
 
   Archive& m_Archive;

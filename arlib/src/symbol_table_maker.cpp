@@ -13,9 +13,9 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstring>
 #include <optional>
 #include <string>
+#include <utility>
 
 namespace arlib {
 
@@ -142,7 +142,7 @@ void SymbolTableMaker::addPlainSymbols() {
     const HostingMember& hosting = m_SymbolHostingMembers[index];
     const SymbolNameList* names = hosting.names;
     if (m_Archive.getUniqueSymbolsOnly()) names = dropSeenNames(*names, seenNames);
-    m_Output.append({hosting.place, names});
+    m_Output.append({hosting.place, names, PlainEnding});
   }
 }
 
@@ -158,31 +158,35 @@ const SymbolNameList* SymbolTableMaker::dropSeenNames(const SymbolNameList& name
 uint64_t SymbolTableMaker::computeTableSize() const {
   uint64_t size = 4;
   for (const SymbolTableEntries& entries : m_Output)
-    size += (4 + 1) * uint64_t{entries.names->getSize()} + entries.names->getTextSize();
+    size += (4 + entries.ending.size()) * uint64_t{entries.names->getSize()} +
+            entries.names->getTextSize();
   return size;
 }
 
-// The count, the offset of each name's member, and the names.
-void SymbolTableMaker::fillSymbolTable(std::span<uint8_t> bytes, const MemberLayout& layout) const {
-  const size_t symbolTableSize = bytes.size();
-  size_t symbolTablePosition = 4;
-  for (const auto& [place, names] : m_Output) {
-    for (uint32_t i = 0; i < names->getSize(); ++i, symbolTablePosition += 4)
-      putBigEndian32(bytes.data() + symbolTablePosition, layout.members[place]);
+// The count, and the offset of each name's member.
+std::vector<uint8_t> SymbolTableMaker::makeHead(const MemberLayout& layout) const {
+  uint32_t count = 0;
+  for (const SymbolTableEntries& entries : m_Output)
+    count += entries.names->getSize();
+  std::vector<uint8_t> bytes(4 + 4 * size_t{count});
+  putBigEndian32(bytes.data(), count);
+  size_t position = 4;
+  for (const SymbolTableEntries& entries : m_Output) {
+    for (uint32_t i = 0; i < entries.names->getSize(); ++i, position += 4)
+      putBigEndian32(bytes.data() + position, layout.members[entries.place]);
   }
-  putBigEndian32(bytes.data(), static_cast<uint32_t>(symbolTablePosition / 4 - 1));
-  for (const auto& [place, names] : m_Output) {
-    for (uint32_t i = 0; i < names->getSize(); ++i) {
-      const std::string_view name = (*names)[i];
-      std::memcpy(bytes.data() + symbolTablePosition, name.data(), name.size());
-      symbolTablePosition += name.size();
-      bytes[symbolTablePosition++] = 0;
-    }
-  }
-  QUARN_ASSERT(1, symbolTablePosition == symbolTableSize);
+  return bytes;
 }
 
-bool makeSymbolTable(Archive& archive, alloclib::RegionGeneral& region, DerivedTables& tables) {
+std::unique_ptr<TableText> SymbolTableMaker::takeTable(const MemberLayout& layout) {
+  auto text = std::make_unique<TableText>(std::move(m_Region));
+  text->addHead(makeHead(layout));
+  for (const auto& [place, names, ending] : m_Output)
+    text->addTexts(names->getNames(), names->getTextSize(), ending);
+  return text;
+}
+
+bool makeSymbolTable(Archive& archive, DerivedTables& tables) {
   const std::optional<uint64_t> longNamesSize =
       tables.longNames.getSizeAfter(archive.getFileNameTable());
   tables.symbols.fate = DerivedTable::Fate::Dropped;
@@ -196,9 +200,8 @@ bool makeSymbolTable(Archive& archive, alloclib::RegionGeneral& region, DerivedT
     return archive.fail(&ErrorHandler::reportWriteError, archive.getFileName(), EFBIG);
   }
   tables.layout = layOut(archive.getMembers(), size, longNamesSize);
-  tables.symbols = {DerivedTable::Fate::Made,
-                    {static_cast<uint8_t*>(region.allocate(size)), static_cast<size_t>(size)}};
-  maker.fillSymbolTable(tables.symbols.bytes, tables.layout);
+  tables.symbols = {DerivedTable::Fate::Made, maker.takeTable(tables.layout)};
+  QUARN_ASSERT(1, tables.symbols.text->getSize() == size);
   return true;
 }
 

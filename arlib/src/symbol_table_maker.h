@@ -12,7 +12,7 @@
 #include "elfext/interface/fast_array.h"
 
 #include <cstdint>
-#include <span>
+#include <memory>
 #include <string_view>
 #include <unordered_map>
 #include <unordered_set>
@@ -20,7 +20,7 @@
 
 namespace arlib {
 
-// All working storage lies in one scratch region that is dropped as a whole.
+// All working storage lies in one region, which goes with the table, or is dropped as a whole.
 class SymbolTableMaker {
 public:
   explicit SymbolTableMaker(Archive& archive);
@@ -34,8 +34,8 @@ public:
   // Size of the table, which may be more than an archive can hold.
   [[nodiscard]] uint64_t computeTableSize() const;
 
-  // Writes the table, which is of that size, for members that stand there.
-  void fillSymbolTable(std::span<uint8_t> bytes, const MemberLayout& layout) const;
+  // The table, which is of that size, for members that stand there. It takes all that was found.
+  [[nodiscard]] std::unique_ptr<TableText> takeTable(const MemberLayout& layout);
 
 private:
   [[nodiscard]] bool collectKnownNames();
@@ -44,6 +44,7 @@ private:
   void collectKnown(ArchiveMember* member, uint32_t place);
   [[nodiscard]] bool hasObjects() const;
   bool addVariantSymbols();
+  [[nodiscard]] std::vector<uint8_t> makeHead(const MemberLayout& layout) const;
   void addPlainSymbols();
   [[nodiscard]] const SymbolNameList* dropSeenNames(const SymbolNameList& names,
                                                     std::unordered_set<std::string_view>& seen);

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Archives of about a megabyte whose thousands of members share the bytes of one long name. What
-// does not print these names, and does not write them, takes little time and memory.
+// does not print these names, and does not write them, takes little time and memory; what writes
+// them takes no memory for it.
 
 #include "tests/systematic/hostile_object.h"
 
@@ -34,6 +35,10 @@ std::string entry(const std::string& name) {
 
 std::string sameName() {
   return membersOf(entry(std::string(NameSize, 'n')), {0}, ManyMembers, 0);
+}
+
+std::string shorterName() {
+  return membersOf(entry(std::string(50000, 'n')), {0}, ManyMembers, 0);
 }
 
 std::string endsOfOneName() {
@@ -108,6 +113,12 @@ TEST_P(HostileNames, AreTakenOverInLittleTimeAndMemory) {
   const ToolRun replacing = run({"-r", "lib.a", "other.a"});
   EXPECT_EQ(replacing.status, isRefused ? 1 : 0);
   EXPECT_TRUE(!isRefused || m_Folder.read("lib.a") == m_Folder.read("other.a"));
+}
+
+// Each of them stands in the new table for itself, which is far larger than all else.
+TEST_F(HostileNames, AreWrittenInLittleMemory) {
+  givenLibrary(shorterName);
+  EXPECT_EQ(run({"-r", "lib.a", "word.o"}).status, 0);
 }
 
 INSTANTIATE_TEST_SUITE_P(Tool, HostileNames, testing::ValuesIn(Archives),

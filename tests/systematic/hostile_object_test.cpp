@@ -172,6 +172,10 @@ std::string tooManyNames() {
   return symbolsWithALongName(5000, Global, 3, Step, longName());
 }
 
+std::string namesOfAQuarterGigabyte() {
+  return symbolsWithALongName(35000, Global, 3, 0, '\0' + std::string(8000, 'n') + '\0');
+}
+
 // Mapping symbols and others in turn, all over the code and many at one place.
 std::string mappingSymbols() {
   std::string rows(16, '\0');
@@ -473,6 +477,12 @@ TEST_F(HostileObject, HasMoreNamesToPublishThanAnArchiveCanHold) {
     EXPECT_EQ(m_Folder.read("lib.a"), old);
     EXPECT_THAT(m_Folder.leaves(), testing::ElementsAre("lib.a", "x.o"));
   }
+}
+
+// The table is far larger than all else, and never in memory.
+TEST_F(HostileObject, PublishesNamesOfFarMoreBytesThanItHas) {
+  write(namesOfAQuarterGigabyte);
+  EXPECT_EQ(run({"-r", "lib.a", "x.o"}).status, 0);
 }
 
 // Names that are more bytes than the object has are each published whole, in their order.

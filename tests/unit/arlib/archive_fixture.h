@@ -9,6 +9,7 @@
 #include "arlib/interface/archive.h"
 #include "arlib/interface/archive_file_reader.h"
 #include "arlib/interface/archive_file_writer.h"
+#include "arlib/interface/contents_reader.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/faulty_host.h"
 #include "tests/support/memory_host.h"
@@ -53,6 +54,16 @@ inline std::vector<std::string> symbolNamesOf(const Archive& archive) {
 // The member's bytes, wherever they are; they are in memory afterwards.
 inline std::string contentsOf(ArchiveMember* member) {
   return member->loadContents() ? textOf(member->getContents()) : "(unreadable)";
+}
+
+// The same of one that may not be changed, piece by piece.
+inline std::string contentsOf(Archive& archive, const ArchiveMember* member) {
+  ContentsReader reader(archive);
+  EXPECT_TRUE(reader.start(*member));
+  std::string contents;
+  for (std::span<const uint8_t> piece; reader.read(piece) && !piece.empty();)
+    contents += textOf(piece);
+  return contents;
 }
 
 // All that there is to know of each.

@@ -127,7 +127,7 @@ protected:
 
   // The names that the table holds.
   std::string publishedNames() {
-    const std::string table = textOf(m_Archive.getSymbolTable()->getContents());
+    const std::string table = contentsOf(m_Archive, m_Archive.getSymbolTable());
     return table.substr(4 + 4 * static_cast<unsigned char>(table[3]));
   }
 };
