@@ -10,11 +10,13 @@
 
 #include "arlib/interface/archive_format.h"
 #include "elfext/interface/attribute_string.h"
+#include "support/interface/text_numbers.h"
 
 #include <algorithm>
 #include <cerrno>
 #include <optional>
 #include <string>
+#include <unordered_set>
 #include <utility>
 
 namespace arlib {
@@ -136,23 +138,56 @@ bool SymbolTableMaker::addVariantSymbols() {
 }
 
 void SymbolTableMaker::addPlainSymbols() {
-  std::unordered_set<std::string_view> seenNames;
-  for (uint32_t index = 0; index < m_SymbolHostingMembers.getSize(); ++index) {
-    if (m_IsMinorVariant[index]) continue;
-    const HostingMember& hosting = m_SymbolHostingMembers[index];
-    const SymbolNameList* names = hosting.names;
-    if (m_Archive.getUniqueSymbolsOnly()) names = dropSeenNames(*names, seenNames);
-    m_Output.append({hosting.place, names, PlainEnding});
-  }
+  if (m_Archive.getUniqueSymbolsOnly())
+    return doNamesShareBytes() ? addUniqueSymbolsOfSharedBytes() : addUniqueSymbols();
+  for (const HostingMember* hosting : getPlainMembers())
+    m_Output.append({hosting->place, hosting->names, PlainEnding});
 }
 
-const SymbolNameList* SymbolTableMaker::dropSeenNames(const SymbolNameList& names,
-                                                      std::unordered_set<std::string_view>& seen) {
-  auto* fresh = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
-  for (uint32_t i = 0; i < names.getSize(); ++i) {
-    if (seen.insert(names[i]).second) fresh->addCopied(names[i]);
+std::vector<const HostingMember*> SymbolTableMaker::getPlainMembers() const {
+  std::vector<const HostingMember*> members;
+  for (uint32_t index = 0; index < m_SymbolHostingMembers.getSize(); ++index) {
+    if (!m_IsMinorVariant[index]) members.push_back(&m_SymbolHostingMembers[index]);
   }
-  return fresh;
+  return members;
+}
+
+template <class IsKept>
+void SymbolTableMaker::addSome(const HostingMember& hosting, IsKept isKept) {
+  auto* kept = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
+  for (const std::string_view name : hosting.names->getNames()) {
+    if (isKept(name)) kept->addCopied(name);
+  }
+  m_Output.append({hosting.place, kept, PlainEnding});
+}
+
+void SymbolTableMaker::addUniqueSymbols() {
+  std::unordered_set<std::string_view> seen;
+  for (const HostingMember* hosting : getPlainMembers())
+    addSome(*hosting, [&seen](std::string_view name) { return seen.insert(name).second; });
+}
+
+// Names that are more bytes than their object has in all.
+bool SymbolTableMaker::doNamesShareBytes() const {
+  return std::any_of(m_SymbolHostingMembers.begin(), m_SymbolHostingMembers.end(),
+                     [](const HostingMember& hosting) {
+                       return hosting.key.textSize > hosting.member->getSize();
+                     });
+}
+
+// To look at each of them would take the sum of their lengths.
+void SymbolTableMaker::addUniqueSymbolsOfSharedBytes() {
+  const std::vector<const HostingMember*> members = getPlainMembers();
+  std::vector<std::string_view> names;
+  for (const HostingMember* hosting : members) {
+    const std::span<const std::string_view> own = hosting->names->getNames();
+    names.insert(names.end(), own.begin(), own.end());
+  }
+  const std::vector<bool> isFirst =
+      support::findFirst(support::numberTexts(names, [](char character) { return character; }));
+  size_t next = 0;
+  for (const HostingMember* hosting : members)
+    addSome(*hosting, [&](std::string_view) { return isFirst[next++]; });
 }
 
 uint64_t SymbolTableMaker::computeTableSize() const {

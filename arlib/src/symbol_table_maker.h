@@ -15,7 +15,6 @@
 #include <memory>
 #include <string_view>
 #include <unordered_map>
-#include <unordered_set>
 #include <vector>
 
 namespace arlib {
@@ -46,8 +45,12 @@ private:
   bool addVariantSymbols();
   [[nodiscard]] std::vector<uint8_t> makeHead(const MemberLayout& layout) const;
   void addPlainSymbols();
-  [[nodiscard]] const SymbolNameList* dropSeenNames(const SymbolNameList& names,
-                                                    std::unordered_set<std::string_view>& seen);
+  void addUniqueSymbols();
+  void addUniqueSymbolsOfSharedBytes();
+  [[nodiscard]] bool doNamesShareBytes() const;
+  [[nodiscard]] std::vector<const HostingMember*> getPlainMembers() const;
+  template <class IsKept>
+  void addSome(const HostingMember& hosting, IsKept isKept);
 
   Archive& m_Archive;
   alloclib::RegionOwner m_Region;

@@ -479,6 +479,21 @@ TEST_F(HostileObject, HasMoreNamesToPublishThanAnArchiveCanHold) {
   }
 }
 
+// Of which some are the same, in one object and in two.
+TEST_F(HostileObject, PublishesNamesThatShareTheirBytesOnce) {
+  const std::string old = m_Folder.read("lib.a");
+  write(sameName<Global, 3, 0>);
+  m_Folder.write("y.o", m_Folder.read("x.o"));
+  EXPECT_EQ(run({"-r", "--unique_symbols", "lib.a", "x.o", "y.o"}).status, 0);
+  std::string error;
+  const std::vector<ParsedMember> members = parseArchive(m_Folder.read("lib.a"), error);
+  ASSERT_FALSE(members.empty());
+  EXPECT_EQ(members.front().contents.size(), 4 + 4 + LongNameSize + 1);
+  m_Folder.write("lib.a", old);
+  write(tooManyNames<1>);
+  EXPECT_EQ(run({"-r", "--unique_symbols", "lib.a", "x.o"}).status, 1);
+}
+
 // The table is far larger than all else, and never in memory.
 TEST_F(HostileObject, PublishesNamesOfFarMoreBytesThanItHas) {
   write(namesOfAQuarterGigabyte);
