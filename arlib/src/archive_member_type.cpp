@@ -160,9 +160,8 @@ bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
                                             bool wantsAttributes, elfext::ObjectOutline& outline) {
   if (!archiveMember.flushContents()) return false;
   const ArchiveMember::ContentsLocation& location = *archiveMember.getContentsLocation();
-  const std::string name(archiveMember.getName());
   if (!outline.read(location.file->shared_from_this(), location.offset, archiveMember.getSize(),
-                    errorHandler, name.c_str(), wantsAttributes))
+                    errorHandler, archiveMember.getName(), wantsAttributes))
     return false;
   archiveMember.discardContents();
   return true;

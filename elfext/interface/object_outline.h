@@ -19,6 +19,7 @@
 #include <memory>
 #include <optional>
 #include <span>
+#include <string_view>
 #include <vector>
 
 namespace elfext {
@@ -62,10 +63,10 @@ public:
   /// Takes `size` bytes at `offset` of a file in the place of what was there. False after a report
   /// to the handler, which may be null; the outline is then empty, as it is when the handler lets a
   /// foreign machine pass. The handler must live as long as somebody asks for sizes. The object's
-  /// name, which may be null too, goes with reports and is copied. Attributes must be wanted
-  /// beforehand.
+  /// name, if there is one, goes with reports; it must be there until the next read. Attributes
+  /// must be wanted beforehand.
   [[nodiscard]] bool read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
-                          ErrorHandler* errorHandler, const char* objectName,
+                          ErrorHandler* errorHandler, std::optional<std::string_view> objectName,
                           bool wantsAttributes = false);
 
   /// Whether nothing is known of what was read last, or nothing was read.

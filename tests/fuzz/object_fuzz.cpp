@@ -90,7 +90,7 @@ void compareRoads(std::span<const uint8_t> bytes) {
   module.setErrorHandler(&modelHandler);
   ObjectOutline outline;
   const bool isRead = readElfFile(file, 0, bytes.size(), module, nullptr);
-  if (outline.read(file, 0, bytes.size(), &outlineHandler, nullptr) != isRead) std::abort();
+  if (outline.read(file, 0, bytes.size(), &outlineHandler, std::nullopt) != isRead) std::abort();
   if (outlineHandler.texts != modelHandler.texts) std::abort();
   if (outline.getSymbols().size() != module.getSymbols().size()) std::abort();
   if (!isRead) return;
@@ -111,7 +111,7 @@ void readForNames(std::span<const uint8_t> bytes) {
   ElfextErrorStringCapture handler;
   ObjectOutline outline;
   outline.setMachines(ObjectOutline::Machines::Any);
-  if (!outline.read(file, 0, bytes.size(), &handler, nullptr)) return;
+  if (!outline.read(file, 0, bytes.size(), &handler, std::nullopt)) return;
   size_t nameSize = 0;
   for (const ObjectOutline::OutlinedSymbol& symbol : outline.getSymbols())
     nameSize = std::max(nameSize, symbol.name == nullptr ? 0 : std::strlen(symbol.name));

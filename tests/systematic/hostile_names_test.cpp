@@ -16,11 +16,11 @@ std::string indexField(size_t index) {
 
 // Names by places in the table that are `step` bytes apart, in each entry of it in turn.
 std::string membersOf(const std::string& table, const std::vector<size_t>& entries, size_t count,
-                      size_t step) {
+                      size_t step, const std::string& contents = "") {
   ArchiveBuilder builder = archive().longNamesText(table);
   for (size_t i = 0; i < count; ++i) {
     const size_t index = entries[i % entries.size()] + i / entries.size() * step;
-    builder.memberWithNameField(indexField(index), "");
+    builder.memberWithNameField(indexField(index), contents);
   }
   return builder.bytes();
 }
@@ -63,6 +63,11 @@ std::string nameInAFolder() {
   return membersOf(entry("folder/" + std::string(NameSize, 'n')), {0}, ManyMembers, 0);
 }
 
+std::string nameOfObjects() {
+  const std::string table = entry(std::string(NameSize, 'n'));
+  return membersOf(table, {0}, ManyMembers, 0, object().bytes());
+}
+
 class HostileNames : public HostileObject {
 protected:
   void givenLibrary(std::string (*make)()) {
@@ -83,6 +88,7 @@ const Hostile Archives[] = {
   {"EndsOfTwoSpellings", endsOfTwoSpellings, TooMany},
   {"NamesOfSlashes",     namesOfSlashes,     ""},
   {"NameInAFolder",      nameInAFolder,      TooMany},
+  {"NameOfObjects",      nameOfObjects,      TooMany},
 };
 // clang-format on
 
@@ -97,7 +103,7 @@ TEST_P(HostileNames, AreLookedUpInLittleTimeAndMemory) {
     EXPECT_THAT(asking.errors, testing::HasSubstr("'*.x' not present in archive 'lib.a'"));
   }
   EXPECT_EQ(run({"-p", "lib.a"}).status, 0);
-  EXPECT_EQ(run({"--sizes", "lib.a"}).status, 0);
+  EXPECT_EQ(run({"--entries", "lib.a"}).status, 0);
   EXPECT_EQ(run({"--zs", "lib.a"}).status, 0);
   EXPECT_EQ(run({"-d", "lib.a", "*"}).status, 0);
   EXPECT_LT(m_Folder.read("lib.a").size(), 100u);

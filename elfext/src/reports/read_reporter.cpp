@@ -7,12 +7,14 @@
 
 #include "elfext/interface/object_module.h"
 
+#include <string>
+
 namespace elfext {
 
 ReadReporter::ReadReporter(const ObjectModule& module)
     : m_Handler(module.getErrorHandler()), m_Module(&module) {}
 
-ReadReporter::ReadReporter(ErrorHandler* handler, const char* objectName)
+ReadReporter::ReadReporter(ErrorHandler* handler, std::optional<std::string_view> objectName)
     : m_Handler(handler), m_ObjectName(objectName) {}
 
 ReadReporter::~ReadReporter() = default;
@@ -21,7 +23,7 @@ const ObjectModule& ReadReporter::getModule() const {
   // Made once: all reports of one read carry the same module.
   if (m_Module != nullptr) return *m_Module;
   m_Carrier = std::make_unique<ObjectModule>();
-  if (m_ObjectName != nullptr) m_Carrier->setObjectName(m_ObjectName);
+  if (m_ObjectName) m_Carrier->setObjectName(std::string(*m_ObjectName).c_str());
   m_Module = m_Carrier.get();
   return *m_Module;
 }

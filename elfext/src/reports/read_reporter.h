@@ -6,6 +6,8 @@
 #pragma once
 
 #include <memory>
+#include <optional>
+#include <string_view>
 
 namespace elfext {
 
@@ -16,8 +18,8 @@ class ReadReporter {
 public:
   // Tells the module's handler.
   explicit ReadReporter(const ObjectModule& module);
-  // A null handler refuses to go on. The name, which may be null, must outlive this object.
-  ReadReporter(ErrorHandler* handler, const char* objectName);
+  // A null handler refuses to go on. The name, if there is one, must outlive this object.
+  ReadReporter(ErrorHandler* handler, std::optional<std::string_view> objectName);
   ~ReadReporter();
   ReadReporter(const ReadReporter&) = delete;
   ReadReporter& operator=(const ReadReporter&) = delete;
@@ -27,7 +29,7 @@ public:
 
 private:
   ErrorHandler* m_Handler;
-  const char* m_ObjectName = nullptr;
+  std::optional<std::string_view> m_ObjectName;
   mutable const ObjectModule* m_Module = nullptr;
   mutable std::unique_ptr<ObjectModule> m_Carrier;
 };

@@ -18,7 +18,6 @@
 #include "elfext/src/tables/sizes_source.h"
 
 #include <algorithm>
-#include <string>
 #include <utility>
 
 namespace elfext {
@@ -27,12 +26,10 @@ namespace elfext {
 // their dependence.
 struct ObjectOutline::Content {
   Content(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
-          ErrorHandler* errorHandler, const char* name)
-      : objectName(name == nullptr ? "" : name),
-        reporter(errorHandler, name == nullptr ? nullptr : objectName.c_str()),
-        image(std::move(file), offset, size), tables(reporter, image) {}
+          ErrorHandler* errorHandler, std::optional<std::string_view> objectName)
+      : reporter(errorHandler, objectName), image(std::move(file), offset, size),
+        tables(reporter, image) {}
 
-  std::string objectName;
   ReadReporter reporter;
   ImageBytes image;
   ObjectTables tables;
@@ -150,7 +147,8 @@ ObjectOutline::ObjectOutline() : m_Memory(std::make_unique<ImageMemory>()) {}
 ObjectOutline::~ObjectOutline() = default;
 
 bool ObjectOutline::read(std::shared_ptr<support::SourceFile> file, uint64_t offset, uint64_t size,
-                         ErrorHandler* errorHandler, const char* objectName, bool wantsAttributes) {
+                         ErrorHandler* errorHandler, std::optional<std::string_view> objectName,
+                         bool wantsAttributes) {
   // The window serves one file; members of one archive come from the same.
   if (m_File != file) m_Memory->window.setFile(file.get());
   m_File = file;
