@@ -30,11 +30,15 @@ void putLibrary(quarn::Run& run, Document& document) {
 
 // A run of `quarn` ends at the first error, so each library has an account of its own.
 void showLibraries(support::Host& host, const Request& request) {
-  Document document;
+  Document document(host);
   for (const std::string& library : request.libraries)
     quarn::runOnArchive(host, library.c_str(), request.settings,
                         [&document](quarn::Run& run) { putLibrary(run, document); });
-  if (!quarn::hasErrors()) messages::writeRaw(document.finish());
+  if (quarn::hasErrors()) return;
+  const support::HostError error = document.finish(messages::writeRaw);
+  if (error == 0) return;
+  quarn::reportMessage(messages::ErrorWord, messages::WritingExtractedFile, document.getFileName(),
+                       quarn::hostErrorText(error));
 }
 
 } // namespace
