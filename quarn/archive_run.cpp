@@ -102,16 +102,22 @@ RunEnd openActAndWrite(Run& run, const char* archiveName, const RunAction& actio
   return writeArchive(run);
 }
 
-// A map says by a library's name what all of its members may need. One that can't be read gives way
-// to the built-in one.
-void setLibraryAttributes(arlib::Archive& archive, const char* archiveName, const char* mapName) {
-  if (mapName == nullptr) return;
+// A map says by a library's name what all of its members may need. One that isn't there gives way
+// to the built-in one. False after a report.
+bool setLibraryAttributes(arlib::Archive& archive, const char* archiveName, const char* mapName) {
+  if (mapName == nullptr) return true;
   bool usedDefault = false;
+  support::HostError error = 0;
   const elfext::LibraryAttributeMap map =
-      elfext::readLibraryAttributeMap(archive.getHost(), mapName, usedDefault);
+      elfext::readLibraryAttributeMap(archive.getHost(), mapName, usedDefault, error);
+  if (error != 0) {
+    reportMessage(messages::ErrorWord, messages::ReadingFile, mapName, hostErrorText(error));
+    return false;
+  }
   elfext::FullAttr attributes = elfext::LibraryFullAttr;
   elfext::getLibraryAttributes(attributes, archiveName, map);
   archive.setLibraryAttributes(attributes);
+  return true;
 }
 
 RunEnd runOnce(support::Host& host, const char* archiveName, const Settings& settings,
@@ -126,7 +132,8 @@ RunEnd runOnce(support::Host& host, const char* archiveName, const Settings& set
   archive.setKeepFolders(settings.keepFolders);
   archive.setTakeAnyNumbers(settings.takeAnyNumbers);
   archive.setSymbolsWanted(false);
-  setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap);
+  if (!setLibraryAttributes(archive, archiveName, settings.libraryAttributeMap))
+    return RunEnd::Done;
   ArchiveOpenStatus openStatus;
   Run run = {archive, settings, openStatus};
   const RunEnd end = openActAndWrite(run, archiveName, action, output);

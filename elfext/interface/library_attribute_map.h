@@ -29,9 +29,11 @@ struct LibraryAttributeMap {
 constexpr size_t LibraryAttributeLineLimit = 4096;
 
 /// The rows of the file. `usedDefault` tells that these are the built-in ones: the path is null, or
-/// stands for no regular file, or the file can't be read.
+/// stands for no regular file, or the file can't be read. Of the last `error` is the reason, the
+/// host's error number; else it is 0, as it is for what isn't there.
 [[nodiscard]] LibraryAttributeMap readLibraryAttributeMap(support::Host& host, const char* path,
-                                                          bool& usedDefault);
+                                                          bool& usedDefault,
+                                                          support::HostError& error);
 
 /// What the rows that match the name say together, also if that can't be on one target. Of a name
 /// with backslashes only the end counts, from the last one on. The target class stays as it was.

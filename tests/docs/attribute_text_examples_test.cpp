@@ -98,8 +98,10 @@ LibraryAttributeMap mapOf(const std::string& text) {
   testsupport::MemoryHost host;
   host.addFile("map", text);
   bool usedDefault = true;
-  LibraryAttributeMap map = elfext::readLibraryAttributeMap(host, "map", usedDefault);
+  support::HostError error = 0;
+  LibraryAttributeMap map = elfext::readLibraryAttributeMap(host, "map", usedDefault, error);
   EXPECT_FALSE(usedDefault);
+  EXPECT_EQ(error, 0);
   return map;
 }
 

@@ -27,8 +27,9 @@ LibraryAttributeMap readMap(std::string_view text) {
   testsupport::MemoryHost host;
   host.addFile("map", text);
   bool usedDefault = true;
-  LibraryAttributeMap map = readLibraryAttributeMap(host, "map", usedDefault);
-  expect(!usedDefault && host.openHandles() == 0);
+  support::HostError error = 0;
+  LibraryAttributeMap map = readLibraryAttributeMap(host, "map", usedDefault, error);
+  expect(!usedDefault && error == 0 && host.openHandles() == 0);
   return map;
 }
 

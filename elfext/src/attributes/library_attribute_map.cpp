@@ -2,16 +2,17 @@
 //
 // Reads a map, and asks it what a library's name says. The file is a user's: it is read in pieces,
 // a line without an end counts as several, and what is no line of the format says nothing. A map
-// that can't be read is replaced by the built-in one, and the caller is told.
+// that isn't there is replaced by the built-in one. So is one that can't be read, and the caller is
+// told why: who has asked for a map wants no other.
 #include "elfext/interface/library_attribute_map.h"
 
 #include "elfext/interface/attribute_relations.h"
 #include "elfext/interface/attribute_string.h"
-#include "support/interface/host_files.h"
 #include "support/interface/letters.h"
 #include "support/interface/pattern.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <cstdint>
 
 namespace elfext {
@@ -89,32 +90,43 @@ private:
   std::string m_Line;
 };
 
-// False if the host fails.
-bool readRows(support::Host& host, support::FileHandle file, LibraryAttributeMap& map) {
+support::HostError readRows(support::Host& host, support::FileHandle file,
+                            LibraryAttributeMap& map) {
   // The file is never in memory as a whole.
   std::vector<uint8_t> buffer(0x10000);
   LineGatherer lines(map);
   uint64_t offset = 0;
   size_t done = 0;
   do {
-    if (host.readAt(file, buffer, offset, done) != 0) return false;
+    const support::HostError error = host.readAt(file, buffer, offset, done);
+    if (error != 0) return error;
     lines.take({reinterpret_cast<const char*>(buffer.data()), done});
     offset += done;
   } while (done == buffer.size());
   // The last line may have no end.
   lines.finishLine();
-  return true;
+  return 0;
 }
 
-bool readFile(support::Host& host, const char* path, LibraryAttributeMap& map) {
+bool isMissing(support::HostError error) {
+  return error == ENOENT || error == ENOTDIR;
+}
+
+// False if there is no such file, or if it can't be read, for that reason.
+bool readFile(support::Host& host, const char* path, LibraryAttributeMap& map,
+              support::HostError& error) {
+  support::FileStatus status;
+  error = host.status(path, status);
   // What isn't a file has no end, or waits for somebody.
-  if (support::fileKind(host, path) != support::FileKind::RegularFile) return false;
+  if (error == 0 && status.kind != support::FileKind::RegularFile) return false;
   support::FileHandle file;
-  if (host.openForReading(path, file) != 0) return false;
-  const bool isRead = readRows(host, file, map);
+  if (error == 0) error = host.openForReading(path, file);
+  if (isMissing(error)) error = 0;
+  if (!file.isOpen()) return false;
+  error = readRows(host, file, map);
   // Nothing was written, so the close can lose nothing.
   static_cast<void>(host.close(file));
-  return isRead;
+  return error == 0;
 }
 
 // Libraries are matched from the last backslash on, with it; "/" is no divider here.
@@ -130,9 +142,10 @@ bool matches(const LibraryAttributeMap::Row& row, std::string_view part) {
 } // namespace
 
 LibraryAttributeMap readLibraryAttributeMap(support::Host& host, const char* path,
-                                            bool& usedDefault) {
+                                            bool& usedDefault, support::HostError& error) {
   LibraryAttributeMap map;
-  usedDefault = path == nullptr || !readFile(host, path, map);
+  error = 0;
+  usedDefault = path == nullptr || !readFile(host, path, map, error);
   return usedDefault ? makeBuiltInMap() : map;
 }
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // What a library's name says of its members: the built-in rows, and a map file in their place.
-// Where the file is missing or fails the built-in rows hold; an empty one has no rows, and a line
-// without an end is cut into more of them, in time that grows with the file. Files are on the
-// memory host and on the faulty one.
+// Where the file is missing or fails the built-in rows hold, and of a failure the reason is told;
+// an empty one has no rows, and a line without an end is cut into more of them, in time that grows
+// with the file. Files are on the memory host and on the faulty one.
 
 #include "elfext/interface/library_attribute_map.h"
 
@@ -28,16 +28,21 @@ protected:
   LibraryAttributeMap read(std::string_view text) {
     m_Host.addFile("map", text);
     bool usedDefault = true;
-    LibraryAttributeMap map = readLibraryAttributeMap(m_Host, "map", usedDefault);
+    support::HostError error = EIO;
+    LibraryAttributeMap map = readLibraryAttributeMap(m_Host, "map", usedDefault, error);
     EXPECT_FALSE(usedDefault);
+    EXPECT_EQ(error, 0);
     EXPECT_EQ(m_Host.openHandles(), 0u);
     return map;
   }
 
-  LibraryAttributeMap readBuiltIn(support::Host& host, const char* path) {
+  LibraryAttributeMap readBuiltIn(support::Host& host, const char* path,
+                                  support::HostError reason = 0) {
     bool usedDefault = false;
-    LibraryAttributeMap map = readLibraryAttributeMap(host, path, usedDefault);
+    support::HostError error = EDOM;
+    LibraryAttributeMap map = readLibraryAttributeMap(host, path, usedDefault, error);
     EXPECT_TRUE(usedDefault);
+    EXPECT_EQ(error, reason) << path;
     EXPECT_EQ(m_Host.openHandles(), 0u);
     return map;
   }
@@ -65,26 +70,32 @@ TEST_F(LibraryAttributeMapTest, HasBuiltInRowsForANullPath) {
                           "*_???u*", "*_????e*", "*_????n*", "g_*", "f_*", "fj_*"));
 }
 
-TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsForWhatCannotBeRead) {
+TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsForWhatIsNoFile) {
   m_Host.addDirectory("folder");
   m_Host.addSpecial("device");
-  m_Host.addFile("locked", "a $IEEE1").isUnreadable = true;
-  for (const char* path : {"nothing", "folder", "device", "locked", ""})
+  for (const char* path : {"nothing", "folder", "device", ""})
     EXPECT_THAT(readBuiltIn(m_Host, path).rows, SizeIs(14)) << path;
 }
 
-TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsWhenTheHostFails) {
+TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsAndTellsWhyForWhatCannotBeRead) {
+  m_Host.addFile("locked", "a $IEEE1").isUnreadable = true;
+  EXPECT_THAT(readBuiltIn(m_Host, "locked", EACCES).rows, SizeIs(14));
+}
+
+TEST_F(LibraryAttributeMapTest, TakesTheBuiltInRowsAndTellsWhenTheHostFails) {
   m_Host.addFile("map", "a $IEEE1\nb $IEEE1\n");
   testsupport::FaultyHost host(m_Host);
   for (uint64_t call = 1; call <= 3; ++call) {
     host.failCall(call, EIO);
-    EXPECT_THAT(readBuiltIn(host, "map").rows, SizeIs(14)) << host.getFailedOperation();
+    EXPECT_THAT(readBuiltIn(host, "map", EIO).rows, SizeIs(14)) << host.getFailedOperation();
   }
   host.failCall(4, EIO);
   bool usedDefault = true;
-  EXPECT_THAT(readLibraryAttributeMap(host, "map", usedDefault).rows, SizeIs(2));
+  support::HostError error = EDOM;
+  EXPECT_THAT(readLibraryAttributeMap(host, "map", usedDefault, error).rows, SizeIs(2));
   EXPECT_EQ(host.getFailedOperation(), "close");
   EXPECT_FALSE(usedDefault);
+  EXPECT_EQ(error, 0);
 }
 
 TEST_F(LibraryAttributeMapTest, ReadsPatternAttributesAndClass) {

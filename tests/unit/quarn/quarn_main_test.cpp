@@ -69,6 +69,18 @@ TEST_F(QuarnMainTest, KeepsAnArchiveThatMayNotBeWritten) {
 }
 
 // The table is made in front of the one look at the errors that were counted.
+// A map that isn't there gives way to the built-in one; who has one wants no other.
+TEST_F(QuarnMainTest, KeepsTheArchiveIfItsMapCannotBeRead) {
+  givenLibrary({"a.o"});
+  const std::string before = m_Host.read("lib.a");
+  m_Host.addFile("map", "lib* $IEEE1$P").isUnreadable = true;
+  const RunOutcome outcome = run({"-s", "--libattrmap=map", "lib.a"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6835E: Reading file 'map' : Permission denied\n");
+  EXPECT_EQ(m_Host.read("lib.a"), before);
+  EXPECT_EQ(run({"-s", "--libattrmap=none", "lib.a"}).status, 0);
+}
+
 TEST_F(QuarnMainTest, KeepsTheArchiveIfAWarningOfTheTableIsAnError) {
   givenLibrary({"a.o"});
   m_Host.addFile("bad.o", testsupport::object().machine(3).bytes());
