@@ -41,17 +41,6 @@ bool willHaveTable(const arlib::Archive& archive) {
          });
 }
 
-// Why the file can't be a member, as the host's error number, or 0. One that could not be opened is
-// tried again: its first bytes tell what it is.
-int findFault(FileProbe& probe) {
-  if (const int error = probe.getRefusal(); error != 0) return error;
-  if (probe.byteCount != 0 || probe.status.size == 0) return 0;
-  size_t done = 0;
-  const int error = probe.file->readAt(probe.bytes, 0, done);
-  if (error == 0) probe.byteCount = static_cast<uint32_t>(done);
-  return error;
-}
-
 // Numbers that go into no header need not fit one; the date is still asked for.
 void fitNumbers(support::FileStatus& status) {
   status.uid = 0;
@@ -69,7 +58,7 @@ public:
   [[nodiscard]] const std::vector<ArchiveMember*>& getAdded() const { return m_Added; }
 
 private:
-  [[nodiscard]] bool canTake(const std::string& file, FileProbe& probe) const;
+  [[nodiscard]] bool canTake(const std::string& file, const FileProbe& probe) const;
   [[nodiscard]] bool add(const std::string& file, const FileProbe& probe);
   [[nodiscard]] bool replace(ArchiveMember& member, const std::string& file,
                              const FileProbe& probe);
@@ -106,13 +95,13 @@ void Insertion::warnOfIntermediateCode() const {
                          m_IntermediateCode);
 }
 
-bool Insertion::canTake(const std::string& file, FileProbe& probe) const {
+bool Insertion::canTake(const std::string& file, const FileProbe& probe) const {
   if (!probe.exists()) {
     quarn::reportMessage(messages::ErrorWord, messages::FileDoesNotExist, file);
     return false;
   }
   // The library would tell it of the archive.
-  if (const int error = findFault(probe); error != 0) {
+  if (const int error = probe.getRefusal(); error != 0) {
     quarn::reportMessage(messages::ErrorWord, messages::ReadingFile, file,
                          quarn::hostErrorText(error));
     return false;

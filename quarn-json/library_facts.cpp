@@ -36,12 +36,13 @@ public:
         m_Region(alloclib::RegionGeneral::Create(NamesRegionSize, "names of a library")),
         m_Reader(archive.getMachines(), *m_Region) {}
 
-  void put();
+  // False after a report, and the document is of no use.
+  [[nodiscard]] bool put();
 
 private:
   void putHead();
-  void putMembers();
-  void putSymbols();
+  [[nodiscard]] bool putMembers();
+  [[nodiscard]] bool putSymbols();
   void putVariantGroups();
   [[nodiscard]] Json rowOf(const arlib::VariantGroup& group);
   [[nodiscard]] Json rowOf(const arlib::HostingMember& hosting, const elfext::FullAttr& attributes,
@@ -54,13 +55,13 @@ private:
   std::unordered_map<const ArchiveMember*, uint32_t> m_Places; // in the document; only to find them
 };
 
-void LibraryFacts::put() {
+bool LibraryFacts::put() {
   m_Document.startLibrary();
   putHead();
-  putMembers();
-  putSymbols();
+  if (!putMembers() || !putSymbols()) return false;
   putVariantGroups();
   m_Document.endLibrary();
+  return true;
 }
 
 void LibraryFacts::putHead() {
@@ -76,21 +77,24 @@ void LibraryFacts::putHead() {
     m_Document.putField(name, value);
 }
 
-void LibraryFacts::putMembers() {
+bool LibraryFacts::putMembers() {
   m_Document.startList("members");
   for (ArchiveMember* member : m_Archive.getMembers()) {
     if (member->isAuxiliary()) continue;
     const auto place = static_cast<uint32_t>(m_Places.size());
     m_Places.emplace(member, place);
-    m_Document.putRow(m_Reader.read(*member, place));
+    const std::optional<Json> row = m_Reader.read(*member, place);
+    if (!row) return false;
+    m_Document.putRow(*row);
   }
   m_Document.endList();
+  return true;
 }
 
-void LibraryFacts::putSymbols() {
+bool LibraryFacts::putSymbols() {
   elfext::AttributeTextCache<std::string> attributes(reprinted);
   m_Document.startList("symbols");
-  m_Archive.visitSymbols([&](const arlib::Symbol& symbol) {
+  const bool isWhole = m_Archive.visitSymbols([&](const arlib::Symbol& symbol) {
     Json row;
     putName(row, "name", symbol.getName());
     row["member"] = m_Places.at(symbol.getDefiningMember());
@@ -98,6 +102,7 @@ void LibraryFacts::putSymbols() {
     m_Document.putRow(row);
   });
   m_Document.endList();
+  return isWhole;
 }
 
 void LibraryFacts::putVariantGroups() {
@@ -138,9 +143,8 @@ Json LibraryFacts::rowOf(const arlib::HostingMember& hosting, const elfext::Full
 } // namespace
 
 void putFacts(Archive& archive, Document& document) {
-  LibraryFacts(archive, document).put();
   // A member that somebody has cut short meanwhile looks like one that can't be read.
-  archive.checkOwnFile();
+  if (LibraryFacts(archive, document).put()) archive.checkOwnFile();
 }
 
 } // namespace quarn_json

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // Each object is read once: names, attributes, sizes and entry point come from the same outline.
+// What the host can't give is an error of the run, and no document comes out of it.
 #include "quarn-json/member_facts.h"
 
 #include "elfext/interface/attribute_string.h"
@@ -37,9 +38,11 @@ Json rowOf(const quarn::ObjectSizes& sizes) {
           {"debug", sizes.debug}};
 }
 
-void addRefusal(std::string_view reason, Json& row) {
+// False if there is no reason: then it was the host, which has been reported.
+bool addRefusal(std::string_view reason, Json& row) {
   row["kind"] = "unreadable";
   row["reason"] = reason;
+  return !reason.empty();
 }
 
 // Nothing if there are more bytes of names than the object has in all: a hostile one lets a million
@@ -66,16 +69,16 @@ MemberReader::MemberReader(elfext::ObjectOutline::Machines machines,
   m_Reading.outline.setMachines(machines);
 }
 
-Json MemberReader::read(ArchiveMember& member, uint32_t place) {
+std::optional<Json> MemberReader::read(ArchiveMember& member, uint32_t place) {
   Json row = headerOf(member);
-  if (member.getType()->isObjectModule())
-    addObject(member, place, row);
-  else
+  if (!member.getType()->isObjectModule())
     row["kind"] = "file";
+  else if (!addObject(member, place, row))
+    return std::nullopt;
   return row;
 }
 
-void MemberReader::addObject(ArchiveMember& member, uint32_t place, Json& row) {
+bool MemberReader::addObject(ArchiveMember& member, uint32_t place, Json& row) {
   const auto* type = static_cast<const arlib::ObjectModuleArchiveMemberType*>(member.getType());
   auto* names = alloclib::create<arlib::SymbolNameList>(m_Region, &m_Region);
   std::optional<elfext::FullAttr> attributes;
@@ -93,16 +96,20 @@ void MemberReader::addObject(ArchiveMember& member, uint32_t place, Json& row) {
     row["kind"] = "foreign";
     row["entry"] = outline.getEntry();
   } else {
-    addOwnObject(attributes, member.getSize(), row);
+    return addOwnObject(member, attributes, row);
   }
+  return true;
 }
 
-void MemberReader::addOwnObject(const std::optional<elfext::FullAttr>& attributes,
-                                uint64_t memberSize, Json& row) {
+bool MemberReader::addOwnObject(const ArchiveMember& member,
+                                const std::optional<elfext::FullAttr>& attributes, Json& row) {
   elfext::ObjectOutline& outline = m_Reading.outline;
   const std::optional<elfext::SizesStatistics> totals = outline.computeSizes();
-  if (!totals) return addRefusal(m_Reading.failure.getText(), row);
-  std::optional<Json> entrySections = entrySectionsOf(outline, memberSize);
+  if (!totals) {
+    arlib::ElfImageArchiveMemberType::reportHostFailure(member, m_Reading.failure);
+    return addRefusal(m_Reading.failure.getText(), row);
+  }
+  std::optional<Json> entrySections = entrySectionsOf(outline, member.getSize());
   if (!entrySections)
     return addRefusal("Names of sections with the entry point share their bytes", row);
   row["kind"] = "object";
@@ -111,6 +118,7 @@ void MemberReader::addOwnObject(const std::optional<elfext::FullAttr>& attribute
   row["entrySections"] = std::move(*entrySections);
   row["attributes"] = nullptr;
   if (attributes) row["attributes"] = elfext::printAttributeString(*attributes);
+  return true;
 }
 
 } // namespace quarn_json

@@ -10,6 +10,7 @@
 #include "quarn-json/json_names.h"
 
 #include <cstdint>
+#include <optional>
 #include <vector>
 
 namespace quarn_json {
@@ -19,8 +20,9 @@ public:
   // Names of members that may be builds of one module are kept in the region.
   MemberReader(elfext::ObjectOutline::Machines machines, alloclib::RegionGeneral& region);
 
-  // All of the member, which has that place in the document's list.
-  [[nodiscard]] Json read(arlib::ArchiveMember& member, uint32_t place);
+  // All of the member, which has that place in the document's list. Nothing, after a report, if the
+  // host can't give its bytes.
+  [[nodiscard]] std::optional<Json> read(arlib::ArchiveMember& member, uint32_t place);
 
   // Of the members read so far those with names to publish.
   [[nodiscard]] const std::vector<arlib::HostingMember>& getHostingMembers() const {
@@ -29,9 +31,10 @@ public:
   [[nodiscard]] arlib::AttributeRecords& getRecords() { return m_Records; }
 
 private:
-  void addObject(arlib::ArchiveMember& member, uint32_t place, Json& row);
-  void addOwnObject(const std::optional<elfext::FullAttr>& attributes, uint64_t memberSize,
-                    Json& row);
+  // False after a report.
+  [[nodiscard]] bool addObject(arlib::ArchiveMember& member, uint32_t place, Json& row);
+  [[nodiscard]] bool addOwnObject(const arlib::ArchiveMember& member,
+                                  const std::optional<elfext::FullAttr>& attributes, Json& row);
 
   alloclib::RegionGeneral& m_Region;
   arlib::AttributeRecords m_Records;

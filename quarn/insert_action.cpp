@@ -45,6 +45,21 @@ struct SourceNames {
   LongNameMatches matches;
 };
 
+// Hears of a file that is tried as an archive. What is wrong with its bytes is nothing to tell: it
+// is a plain file then. What the host can't do says nothing of the file.
+class TrialListener final : public arlib::ErrorHandler {
+public:
+  bool report(const arlib::Archive&, arlib::Severity, std::string_view) override { return false; }
+  bool reportReadError(const arlib::Archive&, const char*, int errorNumber) override {
+    m_HostError = errorNumber;
+    return false;
+  }
+  [[nodiscard]] int getHostError() const { return m_HostError; }
+
+private:
+  int m_HostError = 0;
+};
+
 class Insertion {
 public:
   explicit Insertion(Run& run)
@@ -55,7 +70,10 @@ public:
   void moveNewMembers();
 
 private:
-  bool insertArchive(const FileProbe& probe);
+  [[nodiscard]] bool insertArchive(const FileProbe& probe);
+  void failToRead(const char* fileName, int error) {
+    m_Archive.fail(&arlib::ErrorHandler::reportReadError, fileName, error);
+  }
   ArchiveMember* findUnmodified(std::string_view name, SourceNames& names);
   void insertMemberOf(const ArchiveMember& source, SourceNames& names);
   void insertPlainFile(const std::string& word, const FileProbe& probe);
@@ -80,15 +98,22 @@ void Insertion::insert(const std::string& word) {
     reportMessage(messages::ErrorWord, messages::FileDoesNotExist, word);
     return;
   }
+  // It may be anything, an archive, too.
+  if (probe.hostError != 0) return failToRead(word.c_str(), probe.hostError);
   if (probe.hasArchiveMagic() && insertArchive(probe)) return;
   insertPlainFile(word, probe);
 }
 
-// A file that begins like an archive but can't be read as one is a plain file, and nothing is said
-// of what was wrong with it.
+// False for a file that begins like an archive and isn't one.
 bool Insertion::insertArchive(const FileProbe& probe) {
   arlib::Archive source(m_Archive.getHost());
-  if (!arlib::readFile(probe.file, source)) return false;
+  TrialListener listener;
+  source.setErrorHandler(&listener);
+  if (!arlib::readFile(probe.file, source)) {
+    const int error = listener.getHostError();
+    if (error != 0) failToRead(probe.file->getName(), error);
+    return error != 0;
+  }
   SourceNames names = {arlib::CopiedNames(source), LongNameMatches(m_Archive, source)};
   for (const ArchiveMember* member : source.getMembers()) {
     if (!member->isAuxiliary()) insertMemberOf(*member, names);

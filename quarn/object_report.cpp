@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The reports of sizes and entry points. They always cover the whole archive, whatever the words
-// of the command line say. An object that can't be read has no row and adds nothing.
+// of the command line say. An object that can't be read has no row and adds nothing. One that the
+// host can't give ends the report: without it a total would be wrong.
 #include "quarn/actions.h"
 
 #include "arlib/interface/archive_member.h"
@@ -11,9 +12,11 @@
 #include "quarn/reporting.h"
 #include "support/interface/shared_texts.h"
 
+#include <algorithm>
 #include <cstdint>
 #include <deque>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -21,6 +24,7 @@
 namespace quarn {
 
 using arlib::ArchiveMember;
+using ElfImage = arlib::ElfImageArchiveMemberType;
 
 namespace {
 
@@ -34,11 +38,14 @@ class ObjectReport {
 public:
   ObjectReport(arlib::Archive& archive, uint32_t flags) : m_Archive(archive), m_Flags(flags) {}
 
-  void print();
+  // False after a report.
+  [[nodiscard]] bool print();
 
 private:
   [[nodiscard]] bool shows(ReportFlag flag) const { return (m_Flags & flag) != 0; }
-  void addMember(ArchiveMember& member);
+  // False, after a report, if the host can't give it.
+  [[nodiscard]] bool addMember(ArchiveMember& member);
+  [[nodiscard]] bool addMembers();
   void addEntries(const ArchiveMember& member);
   void addSizes(const ObjectSizes& sizes, const ArchiveMember& member);
   void printEntries() const;
@@ -46,6 +53,7 @@ private:
   arlib::Archive& m_Archive;
   uint32_t m_Flags;
   ObjectSizes m_Totals;
+  elfext::ElfextErrorStringCapture m_Failure; // which the outline refers to
   elfext::ObjectOutline m_Outline;
   std::vector<EntryRecord> m_Entries;
   std::deque<std::string> m_SectionNames;
@@ -59,23 +67,30 @@ void printRow(const ObjectSizes& sizes, std::string_view name) {
                            name);
 }
 
-void ObjectReport::print() {
+bool ObjectReport::print() {
   if (shows(Report_Sizes)) messages::listingMessage(messages::SizesHeader);
-  for (ArchiveMember* member : m_Archive.getMembers()) {
-    if (!member->isAuxiliary()) addMember(*member);
-  }
+  if (!addMembers()) return false;
   // The row is followed by an empty line.
   if (shows(Report_Sizes)) printRow(m_Totals, "TOTAL\n");
   if (shows(Report_Entries)) printEntries();
+  return true;
 }
 
-void ObjectReport::addMember(ArchiveMember& member) {
-  if (member.getType() != arlib::ElfImageArchiveMemberType::getInstance()) return;
-  if (!arlib::ElfImageArchiveMemberType::readOutline(member, nullptr, false, m_Outline)) return;
+bool ObjectReport::addMembers() {
+  const std::span<ArchiveMember* const> members = m_Archive.getMembers();
+  return std::all_of(members.begin(), members.end(), [this](ArchiveMember* member) {
+    return member->getType() != ElfImage::getInstance() || addMember(*member);
+  });
+}
+
+bool ObjectReport::addMember(ArchiveMember& member) {
+  if (!ElfImage::readOutline(member, m_Failure, false, m_Outline))
+    return !m_Failure.getText().empty();
   const std::optional<elfext::SizesStatistics> totals = m_Outline.computeSizes();
-  if (!totals) return;
+  if (!totals) return !ElfImage::reportHostFailure(member, m_Failure);
   if (shows(Report_Entries)) addEntries(member);
   addSizes(columnsOf(*totals), member);
+  return true;
 }
 
 void ObjectReport::addEntries(const ArchiveMember& member) {
@@ -106,10 +121,9 @@ void ObjectReport::printEntries() const {
 } // namespace
 
 void reportObjects(Run& run, uint32_t flags) {
-  ObjectReport(run.archive, flags).print();
   // A member that somebody has cut short meanwhile looks like one that is no object. Too late to
   // take anything back, but not to tell.
-  run.archive.checkOwnFile();
+  if (ObjectReport(run.archive, flags).print()) run.archive.checkOwnFile();
 }
 
 } // namespace quarn

@@ -266,8 +266,10 @@ private:
     elfext::FastArray<Symbol*> byMemberAndName;
   };
 
-  /// What a file that may become a member's contents is, and the file itself. False after a report.
-  bool openSource(const char* fileName, FileProbe& probe);
+  /// Looks at a piece of a file that is to become a member's contents, which is cut as by
+  /// cutToFile. False after a report.
+  bool openRegion(const char* fileName, std::optional<std::string_view> reportedName,
+                  uint32_t& offset, uint32_t& size, FileProbe& probe);
   /// All but the archive's own, which may be locked. The error number that was reported, or 0.
   int closeInputs();
   int reportCloseErrors();

@@ -111,8 +111,9 @@ public:
   /// be determined anew. False if they could not be loaded.
   bool clearType();
 
-  /// Only while the type is not known.
-  void determineType();
+  /// Only while the type is not known. False, after a report, if the bytes that tell can't be read:
+  /// it is still not known then.
+  [[nodiscard]] bool determineType();
 
   /// Reads the member's bytes as an object. A module of the caller's reports to its own handler, a
   /// new one to nobody. It must not outlive the archive's host. Null or false if the object can't

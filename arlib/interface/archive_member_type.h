@@ -40,11 +40,13 @@ public:
   virtual ~ArchiveMemberType() = default;
 
   [[nodiscard]] virtual bool isObjectModule() const { return false; }
+  /// By the bytes. False, after a report, also if the host can't give them.
   [[nodiscard]] virtual bool isElfImage(const ArchiveMember*) const { return false; }
   [[nodiscard]] virtual bool isAuxiliaryType() const = 0;
 
   /// The one rule that decides a member's type: an ELF image by the test of its bytes, or unknown.
-  /// The auxiliary types are set by the reader and by the rebuild of the tables alone.
+  /// The auxiliary types are set by the reader and by the rebuild of the tables alone. Null, after
+  /// a report, if the host can't give the bytes.
   [[nodiscard]] static const ArchiveMemberType* decide(const ArchiveMember* archiveMember);
 
   /// The same rule for a caller that has the first elfext::RecognizedBytes at hand.
@@ -83,7 +85,7 @@ public:
 
   /// What the member needs of its target: as its decoration symbols say, or with
   /// `useObjectAttributes` what the object as a whole has. False if the object can't be read, or
-  /// says nothing.
+  /// says nothing; the handler hears only of what the host could not do.
   virtual bool getBuildAttributes(ArchiveMember* archiveMember, elfext::FullAttr& attributes,
                                   bool useObjectAttributes) const = 0;
 
@@ -106,10 +108,16 @@ public:
                     std::optional<elfext::FullAttr>& attributes,
                     std::string& reason) const override;
 
-  /// Reads what the member's object says of itself, under that handler, which may be null. False
-  /// after a report, if any.
-  static bool readOutline(ArchiveMember& archiveMember, elfext::ErrorHandler* errorHandler,
+  /// Reads what the member's object says of itself. False if that can't be had: `failure` then says
+  /// what is wrong with the object, or is empty if it was the host, which has been reported. It
+  /// must live as long as somebody asks the outline for sizes.
+  static bool readOutline(ArchiveMember& archiveMember, elfext::ElfextErrorStringCapture& failure,
                           bool wantsAttributes, elfext::ObjectOutline& outline);
+
+  /// What keeps the host from giving a member's bytes is no fault of the object: the archive's
+  /// handler is told, and the failure is empty from then on. False if there was no such thing.
+  static bool reportHostFailure(const ArchiveMember& archiveMember,
+                                elfext::ElfextErrorStringCapture& failure);
 };
 
 } // namespace arlib

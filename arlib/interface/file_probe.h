@@ -16,17 +16,20 @@
 namespace arlib {
 
 struct FileProbe {
-  support::HostError statusError = 0; ///< why the host told nothing, or 0
+  /// Why the host told nothing of the file, or nothing of its bytes: the error number, or 0.
+  support::HostError hostError = 0;
   support::FileStatus status;
   std::array<uint8_t, elfext::RecognizedBytes> bytes = {};
-  uint32_t byteCount = 0; ///< 0 also for a file that can't be opened
-  /// Of a regular file. One that can't be opened now is tried again when its bytes are wanted, and
-  /// tells why then.
+  uint32_t byteCount = 0;
+  /// Of a regular file that the host could open.
   std::shared_ptr<support::SourceFile> file;
 
   [[nodiscard]] std::span<const uint8_t> getFirstBytes() const {
     return std::span(bytes).first(byteCount);
   }
+  /// Takes the first bytes of a piece of the file, which is open, or tells in `hostError` why not.
+  void look(uint64_t offset, uint64_t size);
+
   [[nodiscard]] bool exists() const { return status.kind != support::FileKind::Nothing; }
 
   /// Whether the file begins as an archive does.

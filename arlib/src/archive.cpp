@@ -268,9 +268,15 @@ ArchiveMember* Archive::addMemberFromFile(const char* fileName, const FileProbe&
   return member;
 }
 
-bool Archive::openSource(const char* fileName, FileProbe& probe) {
+bool Archive::openRegion(const char* fileName, std::optional<std::string_view> reportedName,
+                         uint32_t& offset, uint32_t& size, FileProbe& probe) {
   probe = openProbe(m_SourceFiles, fileName);
-  const int error = probe.getRefusal();
+  int error = probe.getRefusal();
+  if (error == 0) {
+    if (!cutToFile(fileName, reportedName, offset, size, probe.status.size)) return false;
+    probe.look(offset, size);
+    error = probe.hostError;
+  }
   return error == 0 || fail(&ErrorHandler::reportReadError, fileName, error);
 }
 
@@ -280,12 +286,11 @@ ArchiveMember* Archive::addMemberFromFileRegion(std::string_view memberName, con
   QUARN_ASSERT(1, fileName != NULL);
   QUARN_ASSERT(1, !m_ReadOnly);
   FileProbe probe;
-  if (!openSource(fileName, probe)) return nullptr;
-  if (!cutToFile(fileName, reportedName, offset, size, probe.status.size)) return nullptr;
+  if (!openRegion(fileName, reportedName, offset, size, probe)) return nullptr;
   const std::string_view name = memberNameOf(memberName);
   ArchiveMember* member =
       appendFileMember({copyToRegion(name), name.size()}, probe.file, offset, size);
-  member->m_Type = ArchiveMemberType::decide(member);
+  member->m_Type = ArchiveMemberType::decide(probe.getFirstBytes());
   return member;
 }
 
@@ -543,7 +548,7 @@ bool Archive::isLaidOutAs(const MemberLayout& layout) const {
 
 bool Archive::updateAuxiliaryMembers() {
   for (ArchiveMember* member : m_ArchiveMembers) {
-    if (member->m_Type == nullptr) member->determineType();
+    if (member->m_Type == nullptr && !member->determineType()) return false;
   }
   DerivedTables tables;
   if (!m_FileNameTableUpToDate && !rebuildLongNames(tables)) return false;

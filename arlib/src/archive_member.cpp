@@ -180,11 +180,12 @@ bool ArchiveMember::discardContents() {
   return true;
 }
 
-void ArchiveMember::determineType() {
+bool ArchiveMember::determineType() {
   QUARN_ASSERT(1, m_Type == NULL);
   // The test looks at the contents or their location, which want a member of some type.
   m_Type = UnknownArchiveMemberType::getInstance();
   m_Type = ArchiveMemberType::decide(this);
+  return m_Type != nullptr;
 }
 
 void ArchiveMember::setContents(const void* data, uint32_t size) {
@@ -195,8 +196,7 @@ void ArchiveMember::setContents(const void* data, uint32_t size) {
   std::memmove(replaceContents(size).data(), data, size);
   m_Size = size;
   m_Made = nullptr;
-  m_Type = nullptr;
-  determineType();
+  m_Type = ArchiveMemberType::decide(getContents());
   m_Archive->noteEdit(Edit::NewBytes);
   m_Modified = true;
   releaseContentsLocation();
@@ -238,12 +238,10 @@ bool ArchiveMember::setContentsFromFileRegion(const char* fileName, uint32_t off
   QUARN_ASSERT(1, fileName != NULL);
   QUARN_ASSERT(1, m_Type != NULL);
   FileProbe probe;
-  if (!m_Archive->openSource(fileName, probe)) return false;
-  if (!m_Archive->cutToFile(fileName, std::nullopt, offset, size, probe.status.size)) return false;
+  if (!m_Archive->openRegion(fileName, std::nullopt, offset, size, probe)) return false;
   takeFile(probe.file, offset, size);
   m_Archive->noteEdit(Edit::NewFile);
-  m_Type = nullptr;
-  determineType();
+  m_Type = ArchiveMemberType::decide(probe.getFirstBytes());
   return true;
 }
 

@@ -48,11 +48,31 @@ const ElfImageArchiveMemberType* ElfImageArchiveMemberType::getInstance() {
   return &Instance;
 }
 
+namespace {
+
+using FirstBytes = std::array<uint8_t, elfext::RecognizedBytes>;
+
+// As many as there are. Nothing, after a report, if the host can't give them.
+std::optional<std::span<const uint8_t>> firstBytesOf(const ArchiveMember& archiveMember,
+                                                     FirstBytes& bytes) {
+  if (archiveMember.hasContents()) return archiveMember.getContents();
+  const ArchiveMember::ContentsLocation& location = *archiveMember.getContentsLocation();
+  const std::span<uint8_t> wanted =
+      std::span(bytes).first(std::min<size_t>(archiveMember.getSize(), bytes.size()));
+  size_t done = 0;
+  const int error = location.file->readAt(wanted, location.offset, done);
+  if (error == 0) return wanted.first(done);
+  archiveMember.getArchive()->fail(&ErrorHandler::reportReadError, location.fileName, error);
+  return std::nullopt;
+}
+
+} // namespace
+
 const ArchiveMemberType* ArchiveMemberType::decide(const ArchiveMember* archiveMember) {
   QUARN_ASSERT(1, archiveMember != NULL);
-  const ElfImageArchiveMemberType* elfImage = ElfImageArchiveMemberType::getInstance();
-  if (elfImage->isElfImage(archiveMember)) return elfImage;
-  return UnknownArchiveMemberType::getInstance();
+  FirstBytes buffer;
+  const std::optional<std::span<const uint8_t>> bytes = firstBytesOf(*archiveMember, buffer);
+  return bytes ? decide(*bytes) : nullptr;
 }
 
 const ArchiveMemberType* ArchiveMemberType::decide(std::span<const uint8_t> firstBytes) {
@@ -62,14 +82,9 @@ const ArchiveMemberType* ArchiveMemberType::decide(std::span<const uint8_t> firs
 
 bool ElfImageArchiveMemberType::isElfImage(const ArchiveMember* archiveMember) const {
   QUARN_ASSERT(1, archiveMember != NULL);
-  if (archiveMember->hasContents()) return elfext::isElfData(archiveMember->getContents());
-  const ArchiveMember::ContentsLocation& location = *archiveMember->getContentsLocation();
-  std::array<uint8_t, elfext::RecognizedBytes> bytes;
-  const std::span<uint8_t> wanted =
-      std::span(bytes).first(std::min<size_t>(archiveMember->getSize(), bytes.size()));
-  size_t done = 0;
-  return location.file->readAt(wanted, location.offset, done) == 0 &&
-         elfext::isElfData(wanted.first(done));
+  FirstBytes buffer;
+  const std::optional<std::span<const uint8_t>> bytes = firstBytesOf(*archiveMember, buffer);
+  return bytes && elfext::isElfData(*bytes);
 }
 
 namespace {
@@ -156,14 +171,27 @@ void findNames(OutlinedSymbols symbols, const ArchiveMember& archiveMember, Symb
 } // namespace
 
 bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
-                                            elfext::ErrorHandler* errorHandler,
+                                            elfext::ElfextErrorStringCapture& failure,
                                             bool wantsAttributes, elfext::ObjectOutline& outline) {
+  failure = {};
   if (!archiveMember.flushContents()) return false;
   const ArchiveMember::ContentsLocation& location = *archiveMember.getContentsLocation();
   if (!outline.read(location.file->shared_from_this(), location.offset, archiveMember.getSize(),
-                    errorHandler, archiveMember.getName(), wantsAttributes))
+                    &failure, archiveMember.getName(), wantsAttributes)) {
+    reportHostFailure(archiveMember, failure);
     return false;
+  }
   archiveMember.discardContents();
+  return true;
+}
+
+bool ElfImageArchiveMemberType::reportHostFailure(const ArchiveMember& archiveMember,
+                                                  elfext::ElfextErrorStringCapture& failure) {
+  const int error = failure.getHostError();
+  if (error == 0) return false;
+  failure = {};
+  archiveMember.getArchive()->fail(&ErrorHandler::reportReadError,
+                                   archiveMember.getContentsLocation()->fileName, error);
   return true;
 }
 
@@ -181,11 +209,10 @@ bool ElfImageArchiveMemberType::getPublished(ArchiveMember* archiveMember, Objec
                                              std::string& reason) const {
   QUARN_ASSERT(1, archiveMember != NULL);
   const bool useObjectAttributes = archiveMember->getArchive()->getUseObjectBuildAttributes();
-  reading.failure = elfext::ElfextErrorStringCapture();
   elfext::ObjectOutline& outline = reading.outline;
   reason.clear();
   attributes.reset();
-  if (!readOutline(*archiveMember, &reading.failure, useObjectAttributes, outline)) {
+  if (!readOutline(*archiveMember, reading.failure, useObjectAttributes, outline)) {
     reason = reading.failure.getText();
     return false;
   }
@@ -205,7 +232,7 @@ bool ElfImageArchiveMemberType::getBuildAttributes(ArchiveMember* archiveMember,
   AttributeRecords records(elfext::parseAttributeString);
   ObjectReading reading{records};
   elfext::ObjectOutline& outline = reading.outline;
-  if (!readOutline(*archiveMember, nullptr, useObjectAttributes, outline)) return false;
+  if (!readOutline(*archiveMember, reading.failure, useObjectAttributes, outline)) return false;
   return findAttributes(outline, outline.getSymbols(), archiveMember->getSize(),
                         useObjectAttributes, reading.records, attributes);
 }

@@ -2,7 +2,8 @@
 //
 // Looks at a file that may become a member: what it is, its numbers, and its first bytes, which
 // decide the member's type. The header has room for 32-bit numbers only, and a directory or a
-// device has no contents to keep, so both are refused here, before the archive has changed.
+// device has no contents to keep, so both are refused here, before the archive has changed. So is
+// what the host can't give: of a file without its bytes nobody knows whether it is an object.
 #include "arlib/interface/file_probe.h"
 
 #include "arlib/interface/archive_format.h"
@@ -21,7 +22,14 @@ bool FileProbe::hasArchiveMagic() const {
 }
 
 support::HostError FileProbe::getRefusal() const {
-  return statusError != 0 ? statusError : refusalOf(status);
+  return hostError != 0 ? hostError : refusalOf(status);
+}
+
+void FileProbe::look(uint64_t offset, uint64_t size) {
+  size_t done = 0;
+  const std::span<uint8_t> wanted = std::span(bytes).first(std::min<uint64_t>(size, bytes.size()));
+  hostError = file->readAt(wanted, offset, done);
+  if (hostError == 0) byteCount = static_cast<uint32_t>(done);
 }
 
 support::HostError refusalOf(const FileStatus& status) {
@@ -38,21 +46,17 @@ support::HostError refusalOf(const FileStatus& status) {
 
 FileProbe openProbe(support::SourceFiles& files, const char* fileName) {
   FileProbe probe;
-  probe.statusError = files.getHost().status(fileName, probe.status);
-  if (probe.statusError != 0 || probe.status.kind != FileKind::RegularFile) return probe;
-  if (files.openToKeep(fileName, probe.file) == 0) {
-    probe.status = probe.file->getStatus();
-  } else {
-    probe.file = files.remember(fileName, probe.status);
-  }
+  probe.hostError = files.getHost().status(fileName, probe.status);
+  if (probe.hostError != 0 || probe.status.kind != FileKind::RegularFile) return probe;
+  probe.hostError = files.openToKeep(fileName, probe.file);
+  if (probe.hostError == 0) probe.status = probe.file->getStatus();
   return probe;
 }
 
 FileProbe probeFile(support::SourceFiles& files, const char* fileName) {
   FileProbe probe = openProbe(files, fileName);
-  if (probe.getRefusal() != 0) return probe;
-  size_t done = 0;
-  if (probe.file->readAt(probe.bytes, 0, done) == 0) probe.byteCount = static_cast<uint32_t>(done);
+  const bool isOpen = probe.hostError == 0 && probe.status.kind == FileKind::RegularFile;
+  if (isOpen) probe.look(0, probe.bytes.size());
   return probe;
 }
 

@@ -2,7 +2,8 @@
 //
 // The order of the table is the order in which a linker finds a name: builds of one module first,
 // each with its decoration, then all other members in file order. An object that can't be read is
-// told of and publishes nothing; it stays a member, and the others are published as ever.
+// told of and publishes nothing; it stays a member, and the others are published as ever. One that
+// the host can't give may publish anything: there is no table then.
 //
 // Members that are no objects have nothing to publish, but for what the table that was read says of
 // them, where objects of any machine are taken.
@@ -42,6 +43,7 @@ SymbolTableMaker::SymbolTableMaker(Archive& archive)
 bool SymbolTableMaker::collect() {
   if (!collectKnownNames()) return false;
   collectSymbolHostingMembers();
+  if (m_HasHostFailed) return false;
   if (!isTableWanted()) return true;
   if (!addVariantSymbols()) return false;
   addPlainSymbols();
@@ -109,9 +111,12 @@ bool SymbolTableMaker::collectObject(ArchiveMember* member, uint32_t place,
   auto* names = alloclib::create<SymbolNameList>(*m_Region, m_Region.get());
   std::optional<elfext::FullAttr> attributes;
   std::string reason;
-  if (!type->getPublished(member, reading, *names, attributes, reason) &&
-      !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
-    return false;
+  if (!type->getPublished(member, reading, *names, attributes, reason)) {
+    m_HasHostFailed = reason.empty();
+    if (m_HasHostFailed ||
+        !m_Archive.goOn(&ErrorHandler::reportUnreadableMemberSymbols, *member, reason)) {
+      return false;
+    }
   }
   if (names->getSize() == 0) return true;
   m_SymbolHostingMembers.append({member, place, names, NamesKey(*names),

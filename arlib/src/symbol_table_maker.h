@@ -60,6 +60,7 @@ private:
   elfext::FastArray<HostingMember> m_SymbolHostingMembers; // in file order
   // By hosting member: whether it is in a group of minor variants.
   std::vector<bool> m_IsMinorVariant;
+  bool m_HasHostFailed = false; // while the members were collected; it has been reported
   elfext::FastArray<SymbolTableEntries> m_Output; // in the order of the table
 };
 

@@ -18,12 +18,20 @@ public:
     m_Text = text;
     return false;
   }
+  bool ioErrorReading(const ObjectModule& module, int errorNumber) override {
+    m_HostError = errorNumber;
+    return ErrorHandler::ioErrorReading(module, errorNumber);
+  }
 
   /// The last report's text; empty before the first.
   [[nodiscard]] const std::string& getText() const { return m_Text; }
+  /// What kept the host from giving the bytes, of which nothing is known then: its error number. 0
+  /// where the bytes themselves were at fault, or too few.
+  [[nodiscard]] int getHostError() const { return m_HostError; }
 
 private:
   std::string m_Text;
+  int m_HostError = 0;
 };
 
 } // namespace elfext

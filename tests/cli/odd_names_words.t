@@ -125,10 +125,7 @@ An object that can't be read, one that is none, and one that may not be.
   $ file "text $utf8" x; quarn -r lib.a "text $utf8"
   Warning: L6875W: Adding non-ELF object 'text caf\xc3\xa9.o' to archive 'lib.a' (esc)
   $ touch "closed $bytes"; chmod 0 "closed $bytes"; chmod 777 .; chmod 666 lib.a; asNobody -rv lib.a "closed $bytes"
-  Warning: L6875W: Adding non-ELF object 'closed \xff\x80bad\xfe.o' to archive 'lib.a' (esc)
-  a - closed \xff\x80bad\xfe.o (esc)
   Error: L6835E: Reading file 'lib.a' : Permission denied
-  Error: L6830E: Writing file 'lib.a' : Permission denied
   [1]
   $ cp start.a "kept $utf8.a"; chmod 444 "kept $utf8.a"; asNobody -d "kept $utf8.a" plain.o
   Error: L6979E: Output file 'kept caf\xc3\xa9.o.a' is read-only (esc)

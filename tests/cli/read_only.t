@@ -70,9 +70,7 @@ A file that may not be read can't be put in.
 
   $ cp b.o secret.o; chmod 000 secret.o; cp before.a open.a; chmod 666 open.a
   $ both asNobody -rv --diag_suppress=L6875 open.a secret.o
-  out: a - secret.o
   err: Error: L6835E: Reading file 'open.a' : Permission denied
-  err: Error: L6830E: Writing file 'open.a' : Permission denied
   status 1
   $ cmp open.a before.a
   $ chmod 600 secret.o

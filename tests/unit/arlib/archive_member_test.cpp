@@ -313,7 +313,7 @@ TEST_F(ArchiveMemberTest, IsLoadedAndOfNoTypeWhileItIsEdited) {
   EXPECT_EQ(member(0)->getType(), nullptr);
   EXPECT_TRUE(member(0)->hasContents());
   EXPECT_TRUE(member(0)->isModified());
-  member(0)->determineType();
+  EXPECT_TRUE(member(0)->determineType());
   EXPECT_EQ(member(0)->getType(), UnknownArchiveMemberType::getInstance());
   EXPECT_FALSE(member(0)->getContentsLocation().has_value());
 }

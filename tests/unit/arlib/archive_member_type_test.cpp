@@ -43,9 +43,17 @@ TEST_F(ArchiveMemberTypeTest, IsDecidedByTheBytesWhereverTheyAre) {
   EXPECT_EQ(ArchiveMemberType::decide(onDisk), ElfImageArchiveMemberType::getInstance());
   onDisk->discardContents();
   EXPECT_EQ(ArchiveMemberType::decide(onDisk), ElfImageArchiveMemberType::getInstance());
-  m_Archive.closeFiles();
-  EXPECT_EQ(ArchiveMemberType::decide(onDisk), UnknownArchiveMemberType::getInstance());
   EXPECT_THAT(reports(), IsEmpty());
+}
+
+TEST_F(ArchiveMemberTypeTest, IsNotDecidedWithoutTheBytes) {
+  ArchiveMember* onDisk = add("a.o", object().bytes());
+  m_Host.remove("a.o");
+  m_Archive.closeFiles();
+  EXPECT_EQ(ArchiveMemberType::decide(onDisk), nullptr);
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': No such file or directory"));
+  EXPECT_FALSE(ElfImageArchiveMemberType::getInstance()->isElfImage(onDisk));
+  EXPECT_EQ(onDisk->getType(), ElfImageArchiveMemberType::getInstance());
 }
 
 TEST_F(ArchiveMemberTypeTest, IsElfForAnyMachineAndKindOfImage) {

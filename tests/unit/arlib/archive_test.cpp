@@ -7,6 +7,7 @@
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>
+#include <functional>
 
 namespace arlib {
 
@@ -137,12 +138,42 @@ TEST_F(ArchiveListTest, TakesAMemberOverThroughTheFileOfItsOwnArchive) {
   EXPECT_EQ(contentsOf(member(0)), object().bytes());
 }
 
-TEST_F(ArchiveListTest, TakesAFileItCannotOpenForOneOfUnknownType) {
+// Nobody knows what it is.
+TEST_F(ArchiveListTest, AddsNothingThatItCannotOpen) {
   m_Host.addFile("a.o", object().bytes()).isUnreadable = true;
-  const ArchiveMember* added = m_Archive.addMemberFromFile("a.o");
-  ASSERT_NE(added, nullptr);
-  EXPECT_EQ(added->getType(), UnknownArchiveMemberType::getInstance());
-  EXPECT_THAT(reports(), IsEmpty());
+  EXPECT_EQ(m_Archive.addMemberFromFile("a.o"), nullptr);
+  EXPECT_EQ(m_Archive.addMemberFromFileRegion("m", "a.o", 0, 4, std::nullopt), nullptr);
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Permission denied",
+                                     "0 I/O error reading file 'a.o': Permission denied"));
+  EXPECT_TRUE(m_Archive.getMembers().empty());
+}
+
+// The reading ahead of a small file may fail; what decides the member's type may not.
+TEST_F(ArchiveListTest, AddsAndReplacesNothingWhoseFirstBytesItCannotRead) {
+  MemoryHost host;
+  host.addFile("large.o", object().tail(std::string(100000, 'x')).bytes());
+  host.addFile("a.o", "plain");
+  FaultyHost faulty(host);
+  RecordingHandler handler;
+  Archive archive(faulty);
+  archive.setErrorHandler(&handler);
+  ArchiveMember* member = archive.addMemberFromFile("a.o");
+  const std::vector<std::function<bool()>> operations = {
+      [&] { return archive.addMemberFromFile("large.o") != nullptr; },
+      [&] {
+        return archive.addMemberFromFileRegion("m", "large.o", 0, 60, std::nullopt) != nullptr;
+      },
+      [&] { return member->setContentsFromFile("large.o"); },
+      [&] { return member->setContentsFromFileRegion("large.o", 0, 60); }};
+  for (const auto& operation : operations) {
+    faulty.failCall(4, EIO);
+    EXPECT_FALSE(operation());
+    EXPECT_EQ(faulty.getFailedOperation(), "readAt");
+    EXPECT_THAT(handler.take(),
+                ElementsAre("0 I/O error reading file 'large.o': Input/output error"));
+    EXPECT_THAT(namesOf(archive), ElementsAre("a.o"));
+    EXPECT_EQ(contentsOf(member), "plain");
+  }
 }
 
 TEST_F(ArchiveListTest, AddsNothingThatIsNoRegularFile) {

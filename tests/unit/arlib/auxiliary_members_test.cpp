@@ -263,14 +263,18 @@ TEST_F(AuxiliaryMembersTest, DeterminesTypesThatAreNotKnown) {
   EXPECT_EQ(edited->getType(), ElfImageArchiveMemberType::getInstance());
 }
 
-TEST_F(AuxiliaryMembersTest, DeterminesTheTypeOfAMemberThatCannotBeRead) {
+TEST_F(AuxiliaryMembersTest, AreNotMadeWithoutTheTypeOfAMemberThatCannotBeRead) {
   ArchiveMember* edited = add("a.o", object().bytes());
   m_Archive.closeFiles();
   m_Host.at("a.o").isUnreadable = true;
   EXPECT_FALSE(edited->clearType());
   EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Permission denied"));
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Permission denied"));
+  EXPECT_EQ(edited->getType(), nullptr);
+  m_Host.at("a.o").isUnreadable = false;
   EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
-  EXPECT_EQ(edited->getType(), UnknownArchiveMemberType::getInstance());
+  EXPECT_EQ(edited->getType(), ElfImageArchiveMemberType::getInstance());
 }
 
 TEST_F(AuxiliaryMembersTest, LoadsATableThatWasDiscarded) {

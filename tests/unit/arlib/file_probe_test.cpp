@@ -6,6 +6,7 @@
 
 #include "arlib/interface/file_probe.h"
 
+#include "tests/support/faulty_host.h"
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>
@@ -34,12 +35,9 @@ TEST(FileProbeTest, TellsArchivesByTheirMagic) {
 TEST(FileProbeTest, TakesTheFirstBytesOfRegularFilesOnly) {
   MemoryHost host;
   host.addFile("file", std::string(100, 'x'));
-  host.addFile("locked", "secret").isUnreadable = true;
   host.addSpecial("fifo").bytes = "never looked at";
   EXPECT_EQ(probe(host, "file").getFirstBytes().size(), elfext::RecognizedBytes);
   EXPECT_TRUE(probe(host, "file").exists());
-  EXPECT_EQ(probe(host, "locked").getFirstBytes().size(), 0u);
-  EXPECT_EQ(probe(host, "locked").getRefusal(), 0);
   EXPECT_EQ(probe(host, "fifo").getFirstBytes().size(), 0u);
   EXPECT_FALSE(probe(host, "gone").exists());
   EXPECT_EQ(host.openHandles(), 0u);
@@ -52,12 +50,31 @@ TEST(FileProbeTest, SaysWhyAFileCannotBeTaken) {
   host.addDirectory("dir");
   host.addSpecial("fifo");
   host.addFile("untold", "x").mode = 0;
+  host.addFile("locked", "secret").isUnreadable = true;
   EXPECT_EQ(probe(host, "file").getRefusal(), 0);
   EXPECT_EQ(probe(host, "untold").getRefusal(), EINVAL);
   EXPECT_EQ(probe(host, "big").getRefusal(), EOVERFLOW);
   EXPECT_EQ(probe(host, "dir").getRefusal(), EISDIR);
   EXPECT_EQ(probe(host, "fifo").getRefusal(), EINVAL);
   EXPECT_EQ(probe(host, "gone").getRefusal(), ENOENT);
+  EXPECT_EQ(probe(host, "locked").getRefusal(), EACCES);
+}
+
+// What a file is nobody knows without its bytes. That one of the calls fails which would keep a
+// small file in memory only costs the memory.
+TEST(FileProbeTest, IsRefusedWhereTheHostFails) {
+  MemoryHost host;
+  host.addFile("large", std::string(100000, 'x'));
+  testsupport::FaultyHost faulty(host);
+  const auto probeFailing = [&](uint64_t call) {
+    faulty.failCall(call, EIO);
+    support::SourceFiles files(faulty);
+    return probeFile(files, "large").getRefusal();
+  };
+  std::vector<std::string> failed;
+  for (uint64_t call = 1; probeFailing(call) != 0; ++call)
+    failed.push_back(faulty.getFailedOperation());
+  EXPECT_THAT(failed, ElementsAre("status", "openForReading", "statusOf", "readAt"));
 }
 
 // What is read of it later is read of the file that was looked at.

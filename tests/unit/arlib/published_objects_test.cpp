@@ -303,6 +303,21 @@ TEST_F(UnreadableMemberTest, IsToldOfAndHasNoEntries) {
   EXPECT_THAT(reports(), IsEmpty());
 }
 
+// The host's failure is not the object's: a table without what it defines would be wrong.
+TEST_F(UnreadableMemberTest, IsNoneThatTheHostCannotGive) {
+  const std::string bytes = objectWith({{"g", elfext::STB_GLOBAL}});
+  add("large.o", bytes + std::string(100000, 'x'));
+  m_Archive.closeFiles();
+  m_Host.at("large.o").isUnreadable = true;
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_THAT(reports(), ElementsAre(testing::HasSubstr("'b.o'"),
+                                     "0 I/O error reading file 'large.o': Permission denied"));
+  EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
+  m_Host.at("large.o").isUnreadable = false;
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(publishedNames(), std::string("f\0h\0g\0", 6));
+}
+
 TEST_F(UnreadableMemberTest, EndsTheCollectionWhereTheAnswerIsToStop) {
   RecordingHandler handler(Answer::GiveUp);
   m_Archive.setErrorHandler(&handler);
@@ -415,6 +430,14 @@ TEST_F(ObjectMemberTest, TellsWhyAnObjectHasNoNames) {
   m_Host.setRoom(0);
   EXPECT_THAT(published(inMemory), ElementsAre("no: "));
   EXPECT_EQ(reports().size(), 1u);
+}
+
+TEST_F(ObjectMemberTest, HasNoReasonOfItsOwnWhereTheHostFails) {
+  ArchiveMember* member = add("a.o", objectWith({}) + std::string(100000, 'x'));
+  m_Archive.closeFiles();
+  m_Host.at("a.o").isUnreadable = true;
+  EXPECT_THAT(published(member), ElementsAre("no: "));
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error reading file 'a.o': Permission denied"));
 }
 
 TEST_F(ObjectMemberTest, MakesAModuleOfItsObject) {

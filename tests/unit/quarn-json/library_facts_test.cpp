@@ -3,7 +3,10 @@
 // What the document says of libraries: members of each kind, symbols, builds, and that a hostile
 // object makes it no longer than the library is.
 #include "elfext/interface/elf_constants.h"
+#include "tests/support/faulty_host.h"
 #include "tests/unit/quarn-json/json_fixture.h"
+
+#include <cerrno>
 
 namespace quarn_json {
 
@@ -210,5 +213,27 @@ TEST_F(LibraryFactsTest, LeaveTheLibraryAsItIs) {
 }
 
 } // namespace
+
+// What the host can't give is no fault of an object, so there is nothing that the document could
+// say.
+TEST_F(LibraryFactsTest, AreAllOrNoneWhereTheHostFails) {
+  testsupport::ArchiveBuilder library = archive();
+  for (const char* name : {"a.o", "b.o"})
+    library.member(name,
+                   objectWith({"f", "BuildAttributes$$P"}).tail(std::string(70000, 'x')).bytes());
+  m_Host.addFile("lib.a", library.bytes());
+  const std::string whole = json({"lib.a"}).output;
+  testsupport::FaultyHost faulty(m_Host);
+  uint32_t failures = 0;
+  for (uint64_t call = 1;; ++call) {
+    faulty.failCall(call, EIO);
+    const RunOutcome outcome = runWork(jsonMain, "quarn-json", {"lib.a"}, faulty);
+    if (faulty.getFailedOperation().empty()) break;
+    EXPECT_EQ(outcome.output, outcome.status == 0 ? whole : "") << faulty.getFailedOperation();
+    EXPECT_EQ(outcome.status == 0, outcome.errors.empty()) << outcome.errors;
+    failures += outcome.status != 0;
+  }
+  EXPECT_GT(failures, 5U);
+}
 
 } // namespace quarn_json

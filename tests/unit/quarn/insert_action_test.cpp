@@ -4,7 +4,10 @@
 // members and files decide in the update modes; a file that is not there must leave the old archive
 // as it was.
 
+#include "tests/support/faulty_host.h"
 #include "tests/unit/quarn/driver_fixture.h"
+
+#include <cerrno>
 
 namespace quarn {
 
@@ -165,6 +168,48 @@ TEST_F(InsertActionTest, KeepsTheArchiveIfAFileIsNotThere) {
   EXPECT_EQ(outcome.status, 1);
   EXPECT_EQ(outcome.errors, "Error: L6833E: File 'none.o' does not exist\n");
   EXPECT_EQ(m_Host.read("lib.a"), before);
+}
+
+// What could not be looked at may be anything, an archive, too, so its date doesn't count. The run
+// goes on with the next word.
+TEST_F(InsertActionTest, KeepsTheArchiveIfAFileCannotBeRead) {
+  givenLibrary({"a.o"});
+  givenFile("a.o", "older", OldDate - 1);
+  m_Host.at("a.o").isUnreadable = true;
+  givenFile("b.o");
+  const std::string before = m_Host.read("lib.a");
+  const RunOutcome outcome = run({"-rv", "--new_files_only", "lib.a", "a.o", "b.o"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6835E: Reading file 'lib.a' : Permission denied\n");
+  EXPECT_EQ(outcome.output, "a - b.o\n");
+  EXPECT_EQ(m_Host.read("lib.a"), before);
+}
+
+// As a file that it is not it would go in whole.
+TEST_F(InsertActionTest, TakesAnArchiveForAPlainFileOnlyIfItsBytesAreAtFault) {
+  givenLibrary({"a.o"});
+  const std::string large(100000, 'x');
+  m_Host.addFile("bad.a", "!<arch>\n" + large);
+  const RunOutcome malformed = run({"-r", "--diag_suppress=6875", "lib.a", "bad.a"});
+  EXPECT_EQ(malformed.status, 0);
+  EXPECT_EQ(malformed.errors, "");
+  EXPECT_THAT(names(), ElementsAre("a.o", "bad.a"));
+  m_Host.addFile("good.a", testsupport::archive().member("b.o", large).bytes());
+  const std::string before = m_Host.read("lib.a");
+  testsupport::FaultyHost faulty(m_Host);
+  uint32_t failures = 0;
+  for (uint64_t call = 1; failures == 0 || !faulty.getFailedOperation().empty(); ++call) {
+    faulty.failCall(call, EIO);
+    const RunOutcome outcome =
+        runWork(quarnMain, "quarn", {"-r", "--diag_suppress=6875", "lib.a", "good.a"}, faulty);
+    if (faulty.getFailedName() != "good.a" || outcome.status == 0) {
+      m_Host.addFile("lib.a", before);
+      continue;
+    }
+    failures += outcome.errors.starts_with("Error: L6835E: Reading file 'lib.a' : Input/output");
+    EXPECT_EQ(m_Host.read("lib.a"), before);
+  }
+  EXPECT_GT(failures, 4U);
 }
 
 TEST_F(InsertActionTest, MakesANewArchiveAndSaysSo) {
