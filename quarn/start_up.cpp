@@ -45,7 +45,8 @@ void startUp(int argc, const char* const* argv, support::Host& host, Work work) 
 }
 
 // Objects of the work may still be alive where a message ends the run, so what the regions hold is
-// left to the host. Half a file is not: it looks like a whole one to whoever finds it.
+// left to the host. Half a file is not: it looks like a whole one to whoever finds it. What could
+// not be written is told by the status at least.
 void shutDown(int code) {
   if (usedHost != nullptr) usedHost->removeUnfinished();
   messages::closeStreams();
@@ -53,7 +54,8 @@ void shutDown(int code) {
     driverRegion->Destroy(false);
     session->leave();
   }
-  std::exit(code);
+  const bool isOutputLost = messages::hasStdoutFailed() || messages::hasStderrFailed();
+  std::exit(code == 0 && isOutputLost ? 1 : code);
 }
 
 } // namespace quarn

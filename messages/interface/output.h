@@ -28,7 +28,7 @@ void closeStreams();
 
 /// Puts other sinks in place of the descriptors; null brings the descriptor back. The sinks belong
 /// to the caller and must outlive their use. What is still buffered goes to the sink it was
-/// written for, and an earlier failure of stdout is forgotten.
+/// written for, and earlier failures of the streams are forgotten.
 void setOutputSinks(OutputSink* output, OutputSink* error);
 
 /// Writes a text with its control bytes as backslash and three octal digits, other than tab and
@@ -63,7 +63,9 @@ bool flushAll();
 
 /// Whether a write to stdout failed; from then on everything for stdout is dropped.
 [[nodiscard]] bool hasStdoutFailed();
-/// The host's error number of that failure, or 0.
+/// Whether a write to stderr failed. The next one is tried all the same.
+[[nodiscard]] bool hasStderrFailed();
+/// The host's error number of stdout's failure, or 0.
 [[nodiscard]] int getStdoutError();
 
 } // namespace messages

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// A private duplicate of a descriptor as the end of a stream.
+// A private duplicate of a descriptor as the end of a stream, or where there can be none the
+// descriptor itself.
 
 #pragma once
 
@@ -12,7 +13,7 @@ class DescriptorSink final : public OutputSink {
 public:
   constexpr DescriptorSink() = default;
 
-  // Duplicates the descriptor, unless that was done before. A closed one leaves the sink closed.
+  // Takes the descriptor, unless that was done before. A closed one leaves the sink closed.
   void open(int descriptor);
   // 0, or the host's error number.
   int close();

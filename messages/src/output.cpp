@@ -6,7 +6,7 @@
 // so that on a terminal a complaint comes behind the lines that were listed before it.
 //
 // A failure of stdout is remembered and told by the driver as an error of the run; one of stderr
-// can't be told to anybody.
+// can't be told to anybody, and shows in the exit status alone.
 
 #include "messages/interface/output.h"
 
@@ -28,6 +28,7 @@ constinit DescriptorSink outputDescriptor;
 constinit DescriptorSink errorDescriptor;
 constinit OutputBuffer outputBuffer(&outputDescriptor);
 constinit OutputSink* errorSink = &errorDescriptor;
+constinit bool hasErrorSinkFailed = false;
 
 // What is held back, in the order in which it was written.
 struct HeldPiece {
@@ -85,8 +86,7 @@ void passOn(Stream stream, std::string_view bytes) {
     return;
   }
   outputBuffer.flush();
-  // There is nobody left to tell when stderr fails.
-  static_cast<void>(errorSink->write(bytes));
+  hasErrorSinkFailed |= errorSink->write(bytes) != 0;
 }
 
 void releaseHeld() {
@@ -136,12 +136,13 @@ void closeStreams() {
   releaseHeld();
   outputBuffer.flush();
   outputBuffer.noteError(outputDescriptor.close());
-  static_cast<void>(errorDescriptor.close());
+  hasErrorSinkFailed |= errorDescriptor.close() != 0;
 }
 
 void setOutputSinks(OutputSink* output, OutputSink* error) {
   outputBuffer.setSink(output ? output : &outputDescriptor);
   errorSink = error ? error : &errorDescriptor;
+  hasErrorSinkFailed = false;
 }
 
 void writeText(Stream stream, std::string_view text) {
@@ -164,6 +165,10 @@ bool flushAll() {
 
 bool hasStdoutFailed() {
   return outputBuffer.getError() != 0;
+}
+
+bool hasStderrFailed() {
+  return hasErrorSinkFailed;
 }
 
 int getStdoutError() {

@@ -2,7 +2,8 @@
 //
 // The descriptors that a process is started with, as far as its output needs them. A program may be
 // started with stdout or stderr closed, and the first file that it opens would get that number, an
-// archive perhaps, and be written into by the next message: so output goes to duplicates.
+// archive perhaps, and be written into by the next message: so output goes to duplicates. Where the
+// process may have no more descriptors an open one serves itself: no file can get its number.
 
 #pragma once
 
@@ -16,8 +17,8 @@ namespace support {
 inline constexpr int OutputDescriptor = 1;
 inline constexpr int ErrorDescriptor = 2;
 
-/// A duplicate that isn't one of the standard descriptors and that no child gets, or -1 if the
-/// descriptor is closed.
+/// A duplicate that isn't one of the standard descriptors and that no child gets; the descriptor
+/// itself if the host gives no duplicate; or -1 if the descriptor is closed.
 [[nodiscard]] int duplicateDescriptor(int descriptor);
 
 /// Writes until all is out, in binary: interrupted calls, short writes and a full pipe that doesn't

@@ -29,7 +29,8 @@ bool mayTryAgain(int descriptor, int errorNumber) {
 } // namespace
 
 int duplicateDescriptor(int descriptor) {
-  return fcntl(descriptor, F_DUPFD_CLOEXEC, LowestDuplicate);
+  const int duplicate = fcntl(descriptor, F_DUPFD_CLOEXEC, LowestDuplicate);
+  return duplicate >= 0 || errno == EBADF ? duplicate : descriptor;
 }
 
 HostError writeToDescriptor(int descriptor, std::string_view bytes) {

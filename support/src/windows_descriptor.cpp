@@ -77,7 +77,9 @@ int duplicateAbove(int descriptor) {
 } // namespace
 
 int duplicateDescriptor(int descriptor) {
-  return isOpen(descriptor) ? duplicateAbove(descriptor) : -1;
+  if (!isOpen(descriptor)) return -1;
+  const int duplicate = duplicateAbove(descriptor);
+  return duplicate >= 0 ? duplicate : descriptor;
 }
 
 HostError writeToDescriptor(int descriptor, std::string_view bytes) {

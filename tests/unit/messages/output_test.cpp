@@ -209,6 +209,9 @@ TEST_F(OutputTest, AFailureOfStderrStopsNothing) {
   EXPECT_TRUE(report(WarningWord, nullptr, NoArchiveSpecified));
   EXPECT_EQ(m_Error.writeCount(), 1u);
   EXPECT_FALSE(hasStdoutFailed());
+  EXPECT_TRUE(hasStderrFailed());
+  setOutputSinks(&m_Output, &m_Error);
+  EXPECT_FALSE(hasStderrFailed());
 }
 
 // ---- Output that is held back

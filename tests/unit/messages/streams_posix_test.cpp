@@ -15,6 +15,7 @@
 #include <cstdio>
 #include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <thread>
 #include <unistd.h>
@@ -172,6 +173,27 @@ TEST(Streams, AFileThatGetsTheNumberOfAClosedStdoutIsNotWritten) {
               flushAll();
             }),
             "");
+}
+
+// The limit may leave room for one duplicate, or for none.
+TEST(Streams, WhatHasNoDuplicateServesItself) {
+  for (const rlim_t limit : {rlim_t{STDERR_FILENO + 1}, rlim_t{STDERR_FILENO + 2}}) {
+    EXPECT_EQ(inChild([limit](int descriptor) {
+                dup2(descriptor, STDOUT_FILENO);
+                dup2(descriptor, STDERR_FILENO);
+                for (int other = STDERR_FILENO + 1; other < 100; ++other)
+                  close(other);
+                const rlimit few{limit, limit};
+                if (setrlimit(RLIMIT_NOFILE, &few) != 0) _exit(1);
+                openStreams();
+                writeText(Stream::Output, "out\n");
+                writeText(Stream::Error, "err\n");
+                writeText(Stream::Output, "out again\n");
+                closeStreams();
+                if (hasStdoutFailed() || hasStderrFailed()) _exit(1);
+              }),
+              "out\nerr\nout again\n");
+  }
 }
 
 TEST(Streams, ClosingFlushesAndDropsTheRest) {
