@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 //
 // The quoting rules are those of the two families of build systems: what a POSIX compiler driver
-// reads, and what a Windows program makes of its command line. A file is read whole, since its size
-// is known; how many there may be is bounded, as two files that name a third twice each could go on
-// doubling.
+// reads, and what a Windows program makes of its command line. A file is read to its end, whatever
+// size it tells; how many there may be is bounded, as two files that name a third twice each could
+// go on doubling.
 #include "quarn-ar/response_file.h"
 
 #include "quarn-ar/refusal.h"
@@ -16,6 +16,7 @@ namespace quarn_ar {
 namespace {
 
 constexpr size_t MostFiles = 2000;
+constexpr size_t PieceSize = 0x10000; // bytes
 constexpr std::string_view Blanks = " \t\n\v\f\r";
 
 bool isBlank(char character) {
@@ -106,7 +107,8 @@ public:
 
 private:
   bool expandFile(const std::string& name);
-  bool readFile(const std::string& name, support::FileHandle file, std::string& text);
+  bool readFile(const std::string& name, support::FileHandle file, size_t minimum,
+                std::string& text);
   bool expandOpenFile(const std::string& name, support::FileHandle file);
 
   support::Host& m_Host;
@@ -146,8 +148,8 @@ bool Expansion::expandOpenFile(const std::string& name, support::FileHandle file
   const auto isSame = [&](const support::FileStatus& other) { return other.isSameFile(status); };
   if (std::any_of(m_Open.begin(), m_Open.end(), isSame))
     return refuse("the response file '%s' leads back to itself", name);
-  std::string text(static_cast<size_t>(status.size), '\0');
-  if (!readFile(name, file, text)) return false;
+  std::string text;
+  if (!readFile(name, file, static_cast<size_t>(status.size), text)) return false;
   const std::optional<std::vector<std::string>> words = splitWords(text, m_Quoting);
   if (!words) return refuse("the response file '%s' has a quote without an end", name);
   m_Open.push_back(status);
@@ -156,13 +158,21 @@ bool Expansion::expandOpenFile(const std::string& name, support::FileHandle file
   return isDone;
 }
 
-bool Expansion::readFile(const std::string& name, support::FileHandle file, std::string& text) {
-  size_t done = 0;
-  auto* bytes = reinterpret_cast<uint8_t*>(text.data());
-  const support::HostError error = m_Host.readAt(file, {bytes, text.size()}, 0, done);
-  if (error != 0 || done < text.size()) {
-    return refuse("the response file '%s' can't be read: %s", name, quarn::hostErrorText(error));
+bool Expansion::readFile(const std::string& name, support::FileHandle file, size_t minimum,
+                         std::string& text) {
+  size_t done = PieceSize;
+  while (done == PieceSize) {
+    const size_t offset = text.size();
+    text.resize(offset + PieceSize);
+    auto* bytes = reinterpret_cast<uint8_t*>(text.data() + offset);
+    const support::HostError error = m_Host.readAt(file, {bytes, PieceSize}, offset, done);
+    if (error != 0)
+      return refuse("the response file '%s' can't be read: %s", name, quarn::hostErrorText(error));
+    text.resize(offset + done);
   }
+  // Somebody has cut it meanwhile.
+  if (text.size() < minimum)
+    return refuse("the response file '%s' can't be read: %s", name, quarn::hostErrorText(0));
   if (text.find('\0') != std::string::npos)
     return refuse("the response file '%s' holds a NUL character", name);
   return true;

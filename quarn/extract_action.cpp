@@ -39,11 +39,24 @@ std::string Extraction::outputName(std::string_view name) const {
   return std::string(leaf.substr(0, LongestFileName).substr(0, LongestHostName));
 }
 
-// A member that is called like the archive would be written over it before its bytes are read.
-bool Extraction::mayWrite(const std::string& name) const {
+// A member that is called like the archive would be written over it before its bytes are read, and
+// nobody knows whether it is where the host can't tell.
+bool Extraction::mayWrite(const ArchiveMember& member, const std::string& name) const {
   support::FileStatus status;
-  if (m_Host.status(name.c_str(), status) != 0) return true;
-  return m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus);
+  const int error = m_Host.status(name.c_str(), status);
+  if (error != 0 && error != ENOENT) return failToWrite(member, error);
+  // A symbolic link that leads nowhere is there as well.
+  const bool exists = error == 0 || m_Host.followLinks(name.c_str()) != name;
+  if (!exists) return true;
+  if (m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus)) return true;
+  reportMessage(messages::ErrorWord, messages::AlreadyExists, name);
+  return false;
+}
+
+bool Extraction::failToWrite(const ArchiveMember& member, int error) {
+  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
+                hostErrorText(error));
+  return false;
 }
 
 void Extraction::operator()(ArchiveMember& member) {
@@ -54,19 +67,14 @@ void Extraction::operator()(ArchiveMember& member) {
   const std::string name = outputName(member.getName());
   // Nor may it open a device, or a stream that no listing of the folder shows.
   if (!support::isPlainLeaf(name, m_Host.getPathStyle())) {
-    reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
-                  support::hostErrorText(EINVAL));
+    failToWrite(member, EINVAL);
     return;
   }
-  if (!mayWrite(name)) {
-    reportMessage(messages::ErrorWord, messages::AlreadyExists, name);
-    return;
-  }
+  if (!mayWrite(member, name)) return;
   support::FileHandle file;
   const int error = m_Files.openOther([&] { return m_Host.openForWriting(name.c_str(), file); });
   if (error != 0) {
-    reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
-                  hostErrorText(error));
+    failToWrite(member, error);
     return;
   }
   verboseMessage(m_Settings, messages::ExtractedMember, member.getName());
@@ -102,9 +110,7 @@ void Extraction::write(const ArchiveMember& member, const std::string& name,
   restoreStatus(member, file);
   const int closeError = m_Host.endWriting(file, name.c_str(), isRead && error == 0);
   if (error == 0) error = closeError;
-  if (!isRead || error == 0) return;
-  reportMessage(messages::ErrorWord, messages::WritingExtractedFile, member.getName(),
-                hostErrorText(error));
+  if (isRead && error != 0) failToWrite(member, error);
 }
 
 void ContentsPrinter::print(const ArchiveMember& member) {

@@ -22,7 +22,10 @@ public:
 
 private:
   [[nodiscard]] std::string outputName(std::string_view name) const;
-  [[nodiscard]] bool mayWrite(const std::string& name) const;
+  // False after a report.
+  [[nodiscard]] bool mayWrite(const arlib::ArchiveMember& member, const std::string& name) const;
+  // Always false.
+  static bool failToWrite(const arlib::ArchiveMember& member, int error);
   bool copy(const arlib::ArchiveMember& member, support::FileHandle file, int& writeError);
   void restoreStatus(const arlib::ArchiveMember& member, support::FileHandle file);
   void write(const arlib::ArchiveMember& member, const std::string& name, support::FileHandle file);

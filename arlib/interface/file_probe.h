@@ -36,7 +36,8 @@ struct FileProbe {
   [[nodiscard]] bool hasArchiveMagic() const;
 
   /// Why the file can't become a member: 0, or the error number to report. It must be a regular
-  /// file, and the numbers that go in the header must not be negative as signed 32-bit values.
+  /// file that has no more bytes than it says, if it says none, and the numbers that go in the
+  /// header must not be negative as signed 32-bit values.
   [[nodiscard]] support::HostError getRefusal() const;
 };
 

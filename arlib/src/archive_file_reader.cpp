@@ -106,8 +106,15 @@ bool ArchiveFileReader::readMagic() {
   if (magic.size() < ArchiveMagic.size()) {
     return m_Archive.stop(&ErrorHandler::reportReadError, nullptr, error);
   }
-  if (magic == ArchiveMagic) return true;
-  return m_Archive.stop(&ErrorHandler::reportBadArchiveMagic);
+  if (magic != ArchiveMagic) return m_Archive.stop(&ErrorHandler::reportBadArchiveMagic);
+  return checkToldSize();
+}
+
+// A file that the host makes up as it is read says that it is empty. Taken at its word, it would be
+// an archive without members.
+bool ArchiveFileReader::checkToldSize() {
+  if (static_cast<uint64_t>(m_Status.size) >= ArchiveMagic.size()) return true;
+  return checkUnchanged() && m_Archive.stop(&ErrorHandler::reportReadError, nullptr, EINVAL);
 }
 
 bool ArchiveFileReader::readMembers() {

@@ -35,6 +35,7 @@ private:
   bool readOpenFile();
   bool readTables();
   bool readMagic();
+  bool checkToldSize();
   bool readMembers();
   Pass readMember();
   Pass readHeader();

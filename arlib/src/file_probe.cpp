@@ -22,7 +22,9 @@ bool FileProbe::hasArchiveMagic() const {
 }
 
 support::HostError FileProbe::getRefusal() const {
-  return hostError != 0 ? hostError : refusalOf(status);
+  if (hostError != 0) return hostError;
+  // Files that the host makes up as they are read say that they are empty.
+  return status.size == 0 && byteCount != 0 ? EINVAL : refusalOf(status);
 }
 
 void FileProbe::look(uint64_t offset, uint64_t size) {

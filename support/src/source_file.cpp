@@ -154,9 +154,11 @@ void SourceFile::keepIfSmall() {
   const auto size = static_cast<uint64_t>(m_Status.size);
   if (m_Status.kind != FileKind::RegularFile || size > SourceFiles::LargestKept) return;
   if (m_Shared->kept + size > m_Shared->mostKept) return;
-  auto bytes = std::make_unique_for_overwrite<uint8_t[]>(static_cast<size_t>(size));
+  // One byte more than there should be: some files hold more than they say.
+  const auto wanted = static_cast<size_t>(size) + 1;
+  auto bytes = std::make_unique_for_overwrite<uint8_t[]>(wanted);
   size_t done = 0;
-  if (readAt({bytes.get(), static_cast<size_t>(size)}, 0, done) != 0 || done < size) return;
+  if (readAt({bytes.get(), wanted}, 0, done) != 0 || done != size) return;
   // Between the opening and here somebody may have written: bytes of two versions are not kept.
   if (checkUnchanged() != 0) return;
   m_Kept = std::move(bytes);

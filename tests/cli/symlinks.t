@@ -74,3 +74,16 @@ Extraction goes through a link that is in the way.
   $ quarn -x ../real/lib.a; readlink a.o; cat ../target.o; echo
   ../target.o
   a
+
+With -C it leaves a link alone, also one that leads to nothing.
+
+  $ both quarn -xC ../real/lib.a
+  err: Error: L6836E: 'a.o' already exists, so will not be extracted
+  status 1
+  $ rm ../target.o
+  $ both quarn -xC ../real/lib.a
+  err: Error: L6836E: 'a.o' already exists, so will not be extracted
+  status 1
+  $ readlink a.o; ls ..  | grep target
+  ../target.o
+  [1]

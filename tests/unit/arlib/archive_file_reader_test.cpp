@@ -534,6 +534,14 @@ TEST(ArchiveFileReader, RefusesAFileWhoseNumbersDontFit) {
   }
 }
 
+// Else it would be an archive without members, and be replaced by one with new ones alone.
+TEST(ArchiveFileReader, RefusesAnArchiveThatSaysItIsEmpty) {
+  Reading reading(archive().member("a", "x"));
+  reading.host.at("lib.a").toldSize = 0;
+  EXPECT_FALSE(readFile("lib.a", reading.archive));
+  EXPECT_THAT(reading.handler.reports, ElementsAre("0 I/O error reading file: Invalid argument"));
+}
+
 TEST(ArchiveFileReader, RefusesAnArchiveOfTwoGibibytes) {
   Reading reading(archive().member("a", ""));
   reading.host.at("lib.a").toldSize = 0x80000000;

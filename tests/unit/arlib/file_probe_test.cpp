@@ -60,6 +60,15 @@ TEST(FileProbeTest, SaysWhyAFileCannotBeTaken) {
   EXPECT_EQ(probe(host, "locked").getRefusal(), EACCES);
 }
 
+// Of files that are made up as they are read nobody knows the size.
+TEST(FileProbeTest, RefusesAFileThatSaysItIsEmptyAndIsNot) {
+  MemoryHost host;
+  host.addFile("empty", "");
+  host.addFile("made up", "x").toldSize = 0;
+  EXPECT_EQ(probe(host, "empty").getRefusal(), 0);
+  EXPECT_EQ(probe(host, "made up").getRefusal(), EINVAL);
+}
+
 // What a file is nobody knows without its bytes. That one of the calls fails which would keep a
 // small file in memory only costs the memory.
 TEST(FileProbeTest, IsRefusedWhereTheHostFails) {

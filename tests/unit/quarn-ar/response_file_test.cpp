@@ -85,6 +85,16 @@ TEST_F(ResponseFileTest, IsQuotedAsTheCommandLineSays) {
             "quarn-ar: Error: there is no quoting 'odd'\n");
 }
 
+TEST_F(ResponseFileTest, IsReadToItsEndWhateverSizeItTells) {
+  std::string words = "rc lib.a a.o";
+  words.append(100000, ' ');
+  m_Host.addFile("words", words + "b.o").toldSize = 0;
+  givenFile("a.o");
+  givenFile("b.o");
+  EXPECT_EQ(ar({"@words"}).status, 0);
+  EXPECT_THAT(names(), ElementsAre("a.o", "b.o"));
+}
+
 TEST_F(ResponseFileTest, IsRefusedWhereItCannotBeRead) {
   m_Host.addFile("open", std::string_view("lib.a \"a.o"));
   m_Host.addFile("nul", std::string_view("lib.a a.o\0b.o", 13));

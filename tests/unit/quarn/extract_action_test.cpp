@@ -1,11 +1,46 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// Which files an archive may make where names lead to more than files: on such a host no member can
-// open a device or a stream, nor take the place of a file of another name.
+// Which files an archive may make: none where something is and shall stay, nor where the host can't
+// tell. Where names lead to more than files no member can open a device or a stream, nor take the
+// place of a file of another name.
 
+#include "tests/support/faulty_host.h"
 #include "tests/unit/quarn/driver_fixture.h"
 
+#include <cerrno>
+
 namespace quarn {
+
+using ExtractTest = DriverTest;
+
+// With -C a link is there, wherever it leads.
+TEST_F(ExtractTest, LeavesLinksThatLeadNowhere) {
+  givenLibrary({"a.o"});
+  m_Host.addLink("a.o", "nowhere");
+  const RunOutcome outcome = run({"-xC", "lib.a"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6836E: 'a.o' already exists, so will not be extracted\n");
+  EXPECT_FALSE(m_Host.has("nowhere"));
+  EXPECT_EQ(run({"-x", "lib.a"}).status, 0);
+  EXPECT_TRUE(m_Host.has("nowhere"));
+}
+
+// It may be the archive itself, or a file that was to stay.
+TEST_F(ExtractTest, WritesNothingWhereTheHostCannotTellWhatIsThere) {
+  givenLibrary({"a.o"});
+  m_Host.addFile("a.o", "old");
+  testsupport::FaultyHost faulty(m_Host);
+  uint32_t failures = 0;
+  for (uint64_t call = 1; failures == 0; ++call) {
+    faulty.failCall(call, EIO);
+    const RunOutcome outcome = runWork(quarnMain, "quarn", {"-xC", "lib.a"}, faulty);
+    EXPECT_EQ(outcome.status, 1);
+    EXPECT_EQ(m_Host.read("a.o"), "old") << faulty.getFailedOperation();
+    if (faulty.getFailedOperation() != "status" || faulty.getFailedName() != "a.o") continue;
+    ++failures;
+    EXPECT_EQ(outcome.errors, "Error: L6843E: Writing file 'a.o' : Input/output error\n");
+  }
+}
 
 class WindowsExtractTest : public DriverTest {
 protected:

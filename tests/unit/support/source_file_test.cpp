@@ -273,4 +273,17 @@ TEST_F(SourceFileTest, IsNotKeptIfItCannotBeReadAsItIs) {
   }
 }
 
+// What is made up as it is read says that it is empty.
+TEST_F(SourceFileTest, IsNotKeptIfItHasMoreThanItSays) {
+  m_Disk.addFile("a", "small").toldSize = 0;
+  m_Disk.addFile("empty", "");
+  std::shared_ptr<SourceFile> file;
+  std::shared_ptr<SourceFile> empty;
+  ASSERT_EQ(m_Files.openToKeep("a", file), 0);
+  ASSERT_EQ(m_Files.openToKeep("empty", empty), 0);
+  EXPECT_FALSE(file->isKept());
+  EXPECT_EQ(textOf(*file), "small");
+  EXPECT_TRUE(empty->isKept());
+}
+
 } // namespace support
