@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Which faults a call can have follows from what it is, and from what it did undisturbed.
 #include "tests/disturbed/fault.h"
 
 #include <algorithm>

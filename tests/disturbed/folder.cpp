@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// A file that is put back is a new file with its old date: runs see nothing of the one before.
 #include "tests/disturbed/folder.h"
 
 #include <array>

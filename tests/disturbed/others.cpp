@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// Everything that is changed gets a date of its own: between two looks at a file no clock may stand
+// still.
 #include "tests/disturbed/others.h"
 
 #include "tests/disturbed/folder.h"

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+//
+// One row for each call; one that has no row can be killed at, and get signals, but does not fail.
 #include "tests/disturbed/system_calls.h"
 
 #include <algorithm>

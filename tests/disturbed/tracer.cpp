@@ -212,6 +212,13 @@ std::string Stream::takeAll() const {
   return text;
 }
 
+bool canTrace() {
+  const pid_t process = fork();
+  if (process == 0) _exit(ptrace(PTRACE_TRACEME, 0, nullptr, nullptr) == 0 ? 0 : 1);
+  int state = 0;
+  return waitpid(process, &state, 0) == process && WIFEXITED(state) && WEXITSTATUS(state) == 0;
+}
+
 void Tracer::start(const Command& command) const {
   std::vector<const char*> arguments;
   for (const std::string& word : command.words)

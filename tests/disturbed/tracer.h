@@ -45,6 +45,9 @@ private:
   int m_Descriptor;
 };
 
+// Not every machine lets a process do it to its own child.
+[[nodiscard]] bool canTrace();
+
 class Tracer {
 public:
   // `change` is what somebody else does, where the fault is of that kind.

@@ -1,0 +1,64 @@
+// SPDX-License-Identifier: Apache-2.0
+//
+// What our programs are known not to keep yet. A row is deleted where its fault is mended; a run of
+// everything tells of rows that nothing needs any more.
+
+#pragma once
+
+#include "tests/disturbed/scenarios.h"
+
+#include <array>
+#include <cerrno>
+#include <csignal>
+#include <sys/syscall.h>
+
+namespace disturbed {
+
+struct KnownFailure {
+  const char* what;
+  bool (*isMet)(const Scenario& scenario, const Fault& fault, const SystemCall& call);
+};
+
+inline constexpr std::array<KnownFailure, 8> KnownFailures = {{
+    {"a signal leaves half of an extracted file",
+     [](const Scenario& scenario, const Fault& fault, const SystemCall&) {
+       return fault.kind == FaultKind::Signal && scenario.effect == Effect::Extracted;
+     }},
+    {"a signal that is not handled leaves a temporary",
+     [](const Scenario&, const Fault& fault, const SystemCall&) {
+       return fault.kind == FaultKind::Signal &&
+              (fault.value == SIGQUIT || fault.value == SIGXCPU || fault.value == SIGALRM ||
+               fault.value == SIGUSR1 || fault.value == SIGUSR2);
+     }},
+    {"out of memory leaves temporaries and half of an extracted file",
+     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+       return fault.kind == FaultKind::AllErrors && call.kind() == CallKind::Memory;
+     }},
+    {"an object or a table that can't be read is taken for none, with status 0",
+     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+       return fault.kind == FaultKind::Error &&
+              (call.number == SYS_pread64 || call.number == SYS_newfstatat);
+     }},
+    {"permissions that can't be kept are lost without a word",
+     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+       return fault.kind == FaultKind::Error && call.number == SYS_fchmod;
+     }},
+    {"a stdout that can't be duplicated swallows what is printed, with status 0",
+     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+       return fault.value == EMFILE && call.number == SYS_fcntl;
+     }},
+    {"a symbolic link that can't be read is replaced by a file",
+     [](const Scenario&, const Fault&, const SystemCall& call) {
+       return call.number == SYS_readlink;
+     }},
+    {"an interrupted opening of a folder is told of as a missing file",
+     [](const Scenario& scenario, const Fault& fault, const SystemCall& call) {
+       return scenario.input == std::string_view("c.o") && fault.value == EINTR &&
+              call.number == SYS_openat;
+     }},
+}};
+
+// Whether a kill may still leave a temporary wherever the archive is being written.
+inline constexpr bool AreManyPlacesKnown = true;
+
+} // namespace disturbed
