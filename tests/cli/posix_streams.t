@@ -55,3 +55,38 @@ A full device on stdout is told of, and does not harm the archive.
   before.a
   lib.a
   lib2.a
+
+Where nothing can be said, the status says it.
+
+  $ quarn -t lib.a none > /dev/full 2> /dev/full; echo $?
+  1
+  $ quarn -r lib.a none.o a.o 2> /dev/full; echo $?; cmp lib.a before.a
+  1
+
+A reader that is gone before the first line ends a run, whose archive is the old one or the new one.
+
+  $ for words in '-t lib.a' '-p lib.a' '-t -s lib.a' '-rv lib.a b.o'; do
+  >   cp before.a lib.a
+  >   (sleep 0.1; exec quarn --diag_suppress=6875 $words) | true
+  >   echo "${PIPESTATUS[0]}"; quarn -t lib.a | xargs; ls *.a*
+  > done
+  141
+  a.o b.o
+  before.a
+  lib.a
+  lib2.a
+  141
+  a.o b.o
+  before.a
+  lib.a
+  lib2.a
+  141
+  a.o b.o
+  before.a
+  lib.a
+  lib2.a
+  141
+  a.o b.o
+  before.a
+  lib.a
+  lib2.a
