@@ -52,10 +52,14 @@ std::vector<int> shortCounts(const SystemCall& call) {
   return {1, half};
 }
 
-// Memory or disk are all used up, and stay so.
+// Memory, descriptors or disk are all used up, or the disk can't be read any more, and that stays
+// so.
 std::vector<int> lastingErrors(const SystemCall& call) {
-  if (call.kind() == CallKind::Memory) return {ENOMEM};
-  if (call.kind() == CallKind::Write && !call.isToErrorStream) return {ENOSPC};
+  const CallKind kind = call.kind();
+  if (kind == CallKind::Memory) return {ENOMEM};
+  if (kind == CallKind::Open) return {EMFILE};
+  if (kind == CallKind::Read) return {EIO};
+  if (kind == CallKind::Write && !call.isToErrorStream) return {ENOSPC};
   return {};
 }
 

@@ -36,8 +36,8 @@ inline constexpr std::array<KnownFailure, 8> KnownFailures = {{
      }},
     {"an object or a table that can't be read is taken for none, with status 0",
      [](const Scenario&, const Fault& fault, const SystemCall& call) {
-       return fault.kind == FaultKind::Error &&
-              (call.number == SYS_pread64 || call.number == SYS_newfstatat);
+       const bool isError = fault.kind == FaultKind::Error || fault.kind == FaultKind::AllErrors;
+       return isError && (call.number == SYS_pread64 || call.number == SYS_newfstatat);
      }},
     {"permissions that can't be kept are lost without a word",
      [](const Scenario&, const Fault& fault, const SystemCall& call) {

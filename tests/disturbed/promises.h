@@ -6,7 +6,8 @@
 //   whole; or 1, and then it has said why.
 // - The archive is the old one, to the byte and with its mode and its names, or the complete new
 //   one; so is every file that is extracted, or it is not there. All else is as it was.
-// - Nothing is left behind. SIGKILL alone may leave one temporary beside the archive.
+// - Nothing is left behind. SIGKILL alone may leave one temporary beside the archive, which is
+//   in no other run's way.
 // - A call that was interrupted, or moved fewer bytes than it was told to, makes no difference.
 // - Where somebody else has changed a file meanwhile, it is as he has left it, or a complete new
 //   one; what the run tells is of the file before the change, or behind it.

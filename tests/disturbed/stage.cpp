@@ -63,6 +63,10 @@ void Stage::change(const Fault& fault) const {
 
 Outcome Stage::runOn(const Entries& entries, const Fault& fault) const {
   m_Folder.put(entries);
+  return runHere(fault);
+}
+
+Outcome Stage::runHere(const Fault& fault) const {
   Outcome outcome;
   const Command command = commandOf(m_Scenario, m_Folder.getName());
   outcome.run = m_Tracer.run(command, fault, [&] { change(fault); });
@@ -93,6 +97,19 @@ const ChangedExpectation& Stage::expectChange(const Fault& fault) {
   return expected;
 }
 
+// What a kill leaves is in nobody's way: the same run made once more does all of its work.
+std::string Stage::findObstacle() const {
+  const Outcome again = runHere({});
+  if (again.run.status != 0) return "the next run fails: " + again.run.errors;
+  for (const auto& [name, entry] : m_Expected.plain.entries) {
+    const auto found = again.entries.find(name);
+    if (found == again.entries.end() || found->second != entry) {
+      return "the next run does not make '" + name + "'";
+    }
+  }
+  return {};
+}
+
 Verdict Stage::play(const Fault& fault) {
   std::optional<ChangedExpectation> changed;
   if (isChange(fault.kind)) changed = expectChange(fault);
@@ -102,7 +119,9 @@ Verdict Stage::play(const Fault& fault) {
   if (!hasSameCalls(outcome.run.calls, getCalls(), same)) {
     return {"makes other calls than undisturbed", false};
   }
-  return judge(m_Scenario, fault, m_Expected, changed, std::move(outcome));
+  Verdict verdict = judge(m_Scenario, fault, m_Expected, changed, std::move(outcome));
+  if (verdict.leavesTemporary && verdict.broken.empty()) verdict.broken = findObstacle();
+  return verdict;
 }
 
 } // namespace disturbed

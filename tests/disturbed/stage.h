@@ -26,6 +26,8 @@ public:
 
 private:
   [[nodiscard]] Outcome runOn(const Entries& entries, const Fault& fault) const;
+  [[nodiscard]] Outcome runHere(const Fault& fault) const;
+  [[nodiscard]] std::string findObstacle() const;
   void change(const Fault& fault) const;
   [[nodiscard]] Entries changed(const Entries& entries, const Fault& fault) const;
   const ChangedExpectation& expectChange(const Fault& fault);

@@ -229,7 +229,9 @@ void Tracer::start(const Command& command) const {
   dup2(nothing, STDIN_FILENO);
   dup2(m_Output.getDescriptor(), STDOUT_FILENO);
   dup2(m_Errors.getDescriptor(), STDERR_FILENO);
+  clearenv(); // the user's language and time zone are no part of the run
   setenv("TMPDIR", command.folder.c_str(), 1);
+  setenv("TZ", "UTC", 1);
   umask(022);
   // A signal that was ignored when the tests were started would stay so.
   for (int number = 1; number < NSIG; ++number)
