@@ -3,7 +3,7 @@
 // What holds at the end of each run, whatever has happened to it:
 //
 // - It ends, by itself or by the signal that was sent. Its status is 0, and then the result is
-//   whole; or 1, and then it has said why.
+//   whole and nothing else is said; or 1, and then it has said why.
 // - The archive is the old one, to the byte and with its mode and its names, or the complete new
 //   one; so is every file that is extracted, or it is not there. All else is as it was.
 // - Nothing is left behind. SIGKILL alone may leave one temporary beside the archive, which is
