@@ -16,43 +16,50 @@ namespace disturbed {
 
 struct KnownFailure {
   const char* what;
-  bool (*isMet)(const Scenario& scenario, const Fault& fault, const SystemCall& call);
+  // `broken` is the verdict's words.
+  bool (*isMet)(const Scenario& scenario, const Fault& fault, const SystemCall& call,
+                const std::string& broken);
 };
 
-inline constexpr std::array<KnownFailure, 8> KnownFailures = {{
+inline constexpr std::array<KnownFailure, 9> KnownFailures = {{
     {"a signal leaves half of an extracted file",
-     [](const Scenario& scenario, const Fault& fault, const SystemCall&) {
+     [](const Scenario& scenario, const Fault& fault, const SystemCall&, const std::string&) {
        return fault.kind == FaultKind::Signal && scenario.effect == Effect::Extracted;
      }},
     {"a signal that is not handled leaves a temporary",
-     [](const Scenario&, const Fault& fault, const SystemCall&) {
+     [](const Scenario&, const Fault& fault, const SystemCall&, const std::string&) {
        return fault.kind == FaultKind::Signal &&
               (fault.value == SIGQUIT || fault.value == SIGXCPU || fault.value == SIGALRM ||
                fault.value == SIGUSR1 || fault.value == SIGUSR2);
      }},
+    {"out of memory in the first moments is not told of",
+     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string& broken) {
+       return fault.value == ENOMEM && call.kind() == CallKind::Memory &&
+              broken == "status 1 without a report";
+     }},
     {"out of memory leaves temporaries and half of an extracted file",
-     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
        return fault.kind == FaultKind::AllErrors && call.kind() == CallKind::Memory;
      }},
     {"an object or a table that can't be read is taken for none, with status 0",
-     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
        const bool isError = fault.kind == FaultKind::Error || fault.kind == FaultKind::AllErrors;
        return isError && (call.number == SYS_pread64 || call.number == SYS_newfstatat);
      }},
     {"permissions that can't be kept are lost without a word",
-     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
        return fault.kind == FaultKind::Error && call.number == SYS_fchmod;
      }},
     {"a stdout that can't be duplicated swallows what is printed, with status 0",
-     [](const Scenario&, const Fault& fault, const SystemCall& call) {
+     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
        return fault.value == EMFILE && call.number == SYS_fcntl;
      }},
     {"a symbolic link that can't be read is replaced by a file",
-     [](const Scenario&, const Fault&, const SystemCall& call) {
+     [](const Scenario&, const Fault&, const SystemCall& call, const std::string&) {
        return call.number == SYS_readlink;
      }},
     {"an interrupted opening of a folder is told of as a missing file",
-     [](const Scenario& scenario, const Fault& fault, const SystemCall& call) {
+     [](const Scenario& scenario, const Fault& fault, const SystemCall& call, const std::string&) {
        return scenario.input == std::string_view("c.o") && fault.value == EINTR &&
               call.number == SYS_openat;
      }},

@@ -2,7 +2,7 @@
 //
 // The real programs, on real files, with each of their system calls disturbed in turn: it fails, it
 // does half of its work, the program is killed at it or gets a signal, or somebody else changes a
-// file there. promises.h says what must hold all the same.
+// file there. promises.h says what must hold all the same, and known_failures.h what does not yet.
 //
 //   disturbed                        a sample of all that can happen in each scenario
 //   disturbed --all                  all of it
@@ -66,7 +66,8 @@ private:
   [[nodiscard]] std::vector<Fault> select(std::vector<Fault> faults, size_t index) const;
   void play(Stage& stage, size_t index, const Fault& fault);
   void fail(const Scenario& scenario, const std::string& what);
-  [[nodiscard]] bool isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call);
+  [[nodiscard]] bool isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call,
+                             const std::string& broken);
 
   const Request& m_Request;
   Totals& m_Totals;
@@ -82,9 +83,10 @@ void Worker::fail(const Scenario& scenario, const std::string& what) {
   std::fflush(stdout);
 }
 
-bool Worker::isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call) {
+bool Worker::isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call,
+                     const std::string& broken) {
   for (size_t i = 0; i < KnownFailures.size(); ++i) {
-    if (!KnownFailures[i].isMet(scenario, fault, call)) continue;
+    if (!KnownFailures[i].isMet(scenario, fault, call, broken)) continue;
     ++m_Totals.known[i];
     return true;
   }
@@ -99,8 +101,9 @@ void Worker::play(Stage& stage, size_t index, const Fault& fault) {
     const bool isBefore = fault.kind == FaultKind::KillBefore;
     m_Totals.places[index][fault.call - (isBefore ? 1 : 0)] = true;
   }
+  if (verdict.broken.empty()) return;
   const SystemCall& call = stage.getCalls()[fault.call - 1];
-  if (verdict.broken.empty() || isKnown(scenario, fault, call)) return;
+  if (isKnown(scenario, fault, call, verdict.broken)) return;
   fail(scenario, textOf(fault) + "  # " + call.name() + ": " + verdict.broken);
 }
 
