@@ -6,7 +6,6 @@
 knownFailures='
 ulimit -n [34]: status 1 without a report
 ulimit -n [34]: status 0 with another output
-ulimit -v [0-9]*: .* is neither old nor new
 '
 
 # planned COMMAND...: what the command does where nothing is in its way.

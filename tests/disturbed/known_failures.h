@@ -9,7 +9,6 @@
 
 #include <array>
 #include <cerrno>
-#include <csignal>
 #include <sys/syscall.h>
 
 namespace disturbed {
@@ -21,25 +20,11 @@ struct KnownFailure {
                 const std::string& broken);
 };
 
-inline constexpr std::array<KnownFailure, 9> KnownFailures = {{
-    {"a signal leaves half of an extracted file",
-     [](const Scenario& scenario, const Fault& fault, const SystemCall&, const std::string&) {
-       return fault.kind == FaultKind::Signal && scenario.effect == Effect::Extracted;
-     }},
-    {"a signal that is not handled leaves a temporary",
-     [](const Scenario&, const Fault& fault, const SystemCall&, const std::string&) {
-       return fault.kind == FaultKind::Signal &&
-              (fault.value == SIGQUIT || fault.value == SIGXCPU || fault.value == SIGALRM ||
-               fault.value == SIGUSR1 || fault.value == SIGUSR2);
-     }},
+inline constexpr std::array<KnownFailure, 6> KnownFailures = {{
     {"out of memory in the first moments is not told of",
      [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string& broken) {
        return fault.value == ENOMEM && call.kind() == CallKind::Memory &&
               broken == "status 1 without a report";
-     }},
-    {"out of memory leaves temporaries and half of an extracted file",
-     [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
-       return fault.kind == FaultKind::AllErrors && call.kind() == CallKind::Memory;
      }},
     {"an object or a table that can't be read is taken for none, with status 0",
      [](const Scenario&, const Fault& fault, const SystemCall& call, const std::string&) {
