@@ -46,7 +46,10 @@ bool Extraction::mayWrite(const ArchiveMember& member, const std::string& name) 
   const int error = m_Host.status(name.c_str(), status);
   if (error != 0 && error != ENOENT) return failToWrite(member, error);
   // A symbolic link that leads nowhere is there as well.
-  const bool exists = error == 0 || m_Host.followLinks(name.c_str()) != name;
+  std::string place = name;
+  const int linkError = error == 0 ? 0 : m_Host.resolveLinks(name.c_str(), place);
+  if (linkError != 0) return failToWrite(member, linkError);
+  const bool exists = error == 0 || place != name;
   if (!exists) return true;
   if (m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus)) return true;
   reportMessage(messages::ErrorWord, messages::AlreadyExists, name);

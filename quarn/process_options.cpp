@@ -72,7 +72,7 @@ void showCommandLine(const Parser& parser, const char* toolName) {
 
 [[noreturn]] void showVersionNumber() {
   messages::writeRaw(support::versionNumberText(support::getBuildData()) + "\n");
-  std::exit(flushOutput() ? 0 : 1);
+  std::exit(finishOutput() ? 0 : 1);
 }
 
 void applyAction(const Parser& parser, const ActionOption& row, Settings& settings) {

@@ -17,8 +17,8 @@ std::string hostErrorText(int errorNumber) {
   return errorNumber == 0 ? "Unexpected end of file" : support::hostErrorText(errorNumber);
 }
 
-bool flushOutput() {
-  if (messages::flushAll()) return true;
+bool finishOutput() {
+  if (messages::finishOutput()) return true;
   reportMessage(messages::ErrorWord, messages::WritingExtractedFile, "stdout",
                 hostErrorText(messages::getStdoutError()));
   return false;

@@ -27,6 +27,6 @@ bool reportMessage(uint32_t severityWord, messages::Key key, const Arguments&...
 
 // Hands over what stdout has held back. False after a report: what it could not take must not look
 // like success to whoever reads the status only.
-bool flushOutput();
+bool finishOutput();
 
 } // namespace quarn

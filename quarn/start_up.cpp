@@ -40,7 +40,7 @@ void startUp(int argc, const char* const* argv, support::Host& host, Work work) 
   std::array<char, support::ToolNameSize> toolName;
   support::toolNameFrom(argc > 0 ? argv[0] : nullptr, toolName);
   work(argc, argv, toolName.data(), host, *driverRegion);
-  flushOutput();
+  finishOutput();
   shutDown(hasErrors() ? 1 : 0);
 }
 

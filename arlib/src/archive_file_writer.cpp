@@ -102,8 +102,8 @@ public:
   enum class Others { AreReported, Overtake, OvertakeIfThereIsAny };
 
   ArchiveFileWriter(const char* fileName, Archive& archive, Others others)
-      : m_FileName(fileName), m_Archive(archive), m_Host(archive.getHost()),
-        m_Target(m_Host.followLinks(fileName)), m_Contents(archive), m_Others(others) {}
+      : m_FileName(fileName), m_Archive(archive), m_Host(archive.getHost()), m_Contents(archive),
+        m_Others(others) {}
 
   bool write();
   [[nodiscard]] WriteEnd writeToTheEnd() {
@@ -116,15 +116,16 @@ private:
   [[nodiscard]] bool isOvertaken(int error) const;
   [[nodiscard]] bool replacesFile() const { return m_OldStatus.kind == FileKind::RegularFile; }
   bool checkTarget();
-  bool tryNames(const std::function<int(const char*)>& step);
+  int tryNames(const std::function<int(const char*)>& step);
   bool createTemporary();
-  bool nameTemporary();
+  int nameTemporary();
+  int closeTemporary();
   bool writeTemporary();
   int flushToDisk();
   bool writeMember(GatheringOutput& output, const ArchiveMember& member);
   static int writeHeader(GatheringOutput& output, const ArchiveMember& member);
   bool writeContents(GatheringOutput& output, const ArchiveMember& member);
-  bool closeTemporary();
+  bool finishTemporary();
   bool replaceTarget();
   // 0 if the file to replace is the one that was read, or the reason not to replace it.
   [[nodiscard]] int checkIsOwnTarget() const;
@@ -132,6 +133,7 @@ private:
   // Does it until it doesn't give EBUSY any more, but not for ever.
   int takeStep(const std::function<int()>& step);
   int replaceOwnTarget();
+  int takeFreeName();
   bool takeName();
   bool removeTemporary();
   void relocateMembers();
@@ -179,6 +181,10 @@ bool ArchiveFileWriter::isOvertaken(int error) const {
 
 bool ArchiveFileWriter::checkTarget() {
   // A target that the host can't tell about (a circle of links) is not taken for a new file.
+  // Nor is a link replaced that the host can't follow.
+  if (const int error = m_Host.resolveLinks(m_FileName, m_Target); error != 0) {
+    return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
+  }
   const int statusError = m_Host.status(m_Target.c_str(), m_OldStatus);
   if (statusError != 0 && statusError != ENOENT) {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, statusError);
@@ -199,11 +205,8 @@ bool ArchiveFileWriter::write() {
     return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, EFBIG);
   }
   if (!createTemporary()) return false;
-  if (!writeTemporary()) {
-    [[maybe_unused]] const int error = m_Host.close(m_Temporary.handle);
-    return removeTemporary();
-  }
-  if (!closeTemporary() || !replaceTarget()) return removeTemporary();
+  if (!writeTemporary() || !finishTemporary() || !replaceTarget()) return removeTemporary();
+  [[maybe_unused]] const int error = closeTemporary();
   m_Archive.setFileName(m_FileName);
   relocateMembers();
   return true;
@@ -212,7 +215,7 @@ bool ArchiveFileWriter::write() {
 // The first free name of lib.a.0, lib.a.1 and so on, beside the target, so that the rename stays
 // within one file system. A name of almost the greatest length has room for a number only when it
 // loses its end.
-bool ArchiveFileWriter::tryNames(const std::function<int(const char*)>& step) {
+int ArchiveFileWriter::tryNames(const std::function<int(const char*)>& step) {
   std::string_view beginning = m_Target;
   int error = EEXIST;
   while (error == EEXIST) {
@@ -223,23 +226,30 @@ bool ArchiveFileWriter::tryNames(const std::function<int(const char*)>& step) {
     error = EEXIST;
     m_TemporaryNumber = 0;
   }
-  return error == 0 || failToWrite(error);
+  return error;
 }
 
 // What takes the place of an old archive is nobody else's to read before it is as protected as that
 // one was.
 bool ArchiveFileWriter::createTemporary() {
   const uint32_t mode = replacesFile() ? PrivateMode : UsualMode;
-  return tryNames([&](const char* name) {
+  const int error = tryNames([&](const char* name) {
     return m_Archive.m_SourceFiles.openOther(
         [&] { return m_Host.createTemporary(name, mode, m_Temporary); });
   });
+  return error == 0 || failToWrite(error);
 }
 
-bool ArchiveFileWriter::nameTemporary() {
+// The name that was free in the beginning may be taken by now.
+int ArchiveFileWriter::nameTemporary() {
   const int error = m_Host.giveName(m_Temporary, m_TemporaryName.c_str());
-  if (error != EEXIST) return error == 0 || failToWrite(error);
+  if (error != EEXIST) return error;
   return tryNames([this](const char* name) { return m_Host.giveName(m_Temporary, name); });
+}
+
+int ArchiveFileWriter::closeTemporary() {
+  const support::FileHandle handle = std::exchange(m_Temporary.handle, {});
+  return handle.isOpen() ? m_Host.close(handle) : 0;
 }
 
 bool ArchiveFileWriter::writeTemporary() {
@@ -293,13 +303,12 @@ bool ArchiveFileWriter::writeContents(GatheringOutput& output, const ArchiveMemb
   }
 }
 
-bool ArchiveFileWriter::closeTemporary() {
-  if (!nameTemporary()) {
-    [[maybe_unused]] const int error = m_Host.close(m_Temporary.handle);
-    return false;
-  }
+// One that has no name yet is gone when it is closed: it gets one when it is going to be renamed at
+// once, so that whatever ends the process in between finds almost no time to leave it behind.
+bool ArchiveFileWriter::finishTemporary() {
   if (replacesFile()) m_Host.copyProtection(m_Target.c_str(), m_OldStatus, m_Temporary.handle);
-  const int error = m_Host.close(m_Temporary.handle);
+  if (!m_Temporary.hasName) return true;
+  const int error = closeTemporary();
   if (error == 0) return true;
   return m_Archive.fail(&ErrorHandler::reportCloseError, m_TemporaryName.c_str(), error);
 }
@@ -340,16 +349,19 @@ int ArchiveFileWriter::takeStep(const std::function<int()>& step) {
 int ArchiveFileWriter::replaceOwnTarget() {
   const support::SourceFile* own = m_Archive.getOwnFile().get();
   return m_Host.replaceAlone(own != nullptr ? own->getStatus() : m_OldStatus, [this] {
-    const int error = checkIsOwnTarget();
+    int error = checkIsOwnTarget();
+    if (error == 0) error = nameTemporary();
     return error != 0 ? error : m_Host.rename(m_TemporaryName.c_str(), m_Target.c_str());
   });
 }
 
+int ArchiveFileWriter::takeFreeName() {
+  const int error = nameTemporary();
+  return error != 0 ? error : m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str());
+}
+
 bool ArchiveFileWriter::takeName() {
-  const int error = takeStep([this] {
-    return mustBeNew() ? m_Host.renameNew(m_TemporaryName.c_str(), m_Target.c_str())
-                       : replaceOwnTarget();
-  });
+  const int error = takeStep([this] { return mustBeNew() ? takeFreeName() : replaceOwnTarget(); });
   m_WasOvertaken = isOvertaken(error);
   if (error == 0 || m_WasOvertaken) return error == 0;
   return m_Archive.fail(&ErrorHandler::reportWriteError, m_FileName, error);
@@ -367,6 +379,7 @@ bool ArchiveFileWriter::replaceTarget() {
 // The one way out of every failure. What made it necessary has been reported, so a temporary that
 // can't be removed is not told of as well.
 bool ArchiveFileWriter::removeTemporary() {
+  [[maybe_unused]] const int closeError = closeTemporary();
   if (!m_Temporary.hasName) return false;
   [[maybe_unused]] const int error =
       takeStep([this] { return m_Host.remove(m_TemporaryName.c_str()); });

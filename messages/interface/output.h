@@ -61,6 +61,10 @@ public:
 /// Call at every way out of the process. False if stdout has failed, now or earlier.
 bool flushAll();
 
+/// The same where nothing more is going to be printed: some failures show at the close alone, and
+/// stderr is still there to tell of them.
+bool finishOutput();
+
 /// Whether a write to stdout failed; from then on everything for stdout is dropped.
 [[nodiscard]] bool hasStdoutFailed();
 /// Whether a write to stderr failed. The next one is tried all the same.

@@ -132,10 +132,14 @@ bool HeldOutput::drop() {
   return isDropped;
 }
 
-void closeStreams() {
-  releaseHeld();
-  outputBuffer.flush();
+bool finishOutput() {
+  flushAll();
   outputBuffer.noteError(outputDescriptor.close());
+  return !hasStdoutFailed();
+}
+
+void closeStreams() {
+  finishOutput();
   hasErrorSinkFailed |= errorDescriptor.close() != 0;
 }
 

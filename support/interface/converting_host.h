@@ -62,7 +62,7 @@ public:
   void copyProtection(const char* from, const FileStatus& status, FileHandle file) override;
   void setTimes(FileHandle file, int64_t seconds) override;
   /// The name as it was given where it is no link, else one of the host's behind.
-  std::string followLinks(const char* name) override;
+  HostError resolveLinks(const char* name, std::string& place) override;
   HostError listDirectory(const char* name, std::vector<std::string>& names) override;
   HostError findNames(std::string_view directory, std::string_view leaf,
                       std::vector<std::string>& names) override;

@@ -116,7 +116,8 @@ public:
                                                   TemporaryFile& file) = 0;
 
   /// Lets a temporary that has no name so far stand at that one, if nothing has come to stand there
-  /// meanwhile (else EEXIST). Before it is closed.
+  /// meanwhile (else EEXIST). Before it is closed; all failures that a close could tell of are told
+  /// here.
   [[nodiscard]] virtual HostError giveName(TemporaryFile&, const char*) { return 0; }
 
   /// Creates a temporary with a name of the host's choice in a writable place, and stores the name.
@@ -198,9 +199,12 @@ public:
   /// later may change it again.
   virtual void setTimes(FileHandle file, int64_t seconds) = 0;
 
-  /// The name that a chain of symbolic links leads to, also when nothing is there. A name that is
-  /// no link is returned as it is.
-  [[nodiscard]] virtual std::string followLinks(const char* name) = 0;
+  /// Stores the name that a chain of symbolic links leads to, also when nothing is there. That of a
+  /// name that is no link, or of a circle, or where the host can't tell, is the name itself.
+  [[nodiscard]] virtual HostError resolveLinks(const char* name, std::string& place) = 0;
+
+  /// The same where it does no harm if the host can't tell.
+  [[nodiscard]] std::string followLinks(const char* name);
 
   /// All names of a directory but "." and "..", in the host's order.
   [[nodiscard]] virtual HostError listDirectory(const char* name,

@@ -91,10 +91,11 @@ void ConvertingHost::setTimes(FileHandle file, int64_t seconds) {
   m_Host.setTimes(file, seconds);
 }
 
-std::string ConvertingHost::followLinks(const char* name) {
+HostError ConvertingHost::resolveLinks(const char* name, std::string& place) {
   const std::string converted = m_Convert(name);
-  std::string target = m_Host.followLinks(converted.c_str());
-  return target == converted ? name : target;
+  const HostError error = m_Host.resolveLinks(converted.c_str(), place);
+  if (place == converted) place = name;
+  return error;
 }
 
 HostError ConvertingHost::listDirectory(const char* name, std::vector<std::string>& names) {

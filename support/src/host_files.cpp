@@ -36,6 +36,12 @@ std::string_view directoryPart(std::string_view word) {
   return slash == std::string_view::npos ? std::string_view() : word.substr(0, slash + 1);
 }
 
+std::string Host::followLinks(const char* name) {
+  std::string place;
+  [[maybe_unused]] const HostError error = resolveLinks(name, place);
+  return place;
+}
+
 HostError Host::endWriting(FileHandle file, const char* name, bool isWhole) {
   FileStatus written;
   const bool isKnown = statusOf(file, written) == 0 && written.kind == FileKind::RegularFile;

@@ -154,12 +154,19 @@ HostError renameNewNative(const char* from, const char* to) {
   return std::rename(from, to) == 0 ? 0 : errno;
 }
 
-// One step of followLinks: the text of a link, or empty if the name is no link.
-std::string linkText(const std::string& name) {
-  std::array<char, LongestLink> text;
-  const ssize_t length = readlink(name.c_str(), text.data(), text.size());
-  if (length <= 0 || static_cast<size_t>(length) == text.size()) return {};
-  return std::string(text.data(), static_cast<size_t>(length));
+// One step of resolveLinks: the text of a link, or empty if the name is no link.
+HostError readLink(const std::string& name, std::string& text) {
+  std::array<char, LongestLink> bytes;
+  const ssize_t length = readlink(name.c_str(), bytes.data(), bytes.size());
+  text.assign(bytes.data(), length > 0 ? static_cast<size_t>(length) : 0);
+  return length >= 0 || errno == EINVAL || errno == ENOENT ? 0 : errno;
+}
+
+DIR* openDirectory(const char* name) {
+  for (;;) {
+    DIR* directory = opendir(name);
+    if (directory != nullptr || errno != EINTR) return directory;
+  }
 }
 
 class PosixHost final : public Host {
@@ -207,11 +214,14 @@ public:
 
   HostError giveName(TemporaryFile& file, const char* name) override {
     if (file.hasName) return 0;
+    if (const HostError error = closeCopy(file.handle); error != 0) return error;
     const SignalHold hold;
+    // Entered beforehand, so that nothing keeps it from being renamed at once.
+    enterIfRegular(name, file.handle);
     HostError error = linkOwn(file.handle, name);
+    if (error != 0) forgetUnfinished(name);
     if (error != 0 && error != EEXIST) error = moveToNamed(file.handle, name);
     file.hasName = error == 0;
-    if (file.hasName) enterIfRegular(name, file.handle);
     return error;
   }
 
@@ -230,9 +240,11 @@ public:
     constexpr int Flags = O_WRONLY | O_CREAT | O_TRUNC | O_NONBLOCK;
     const SignalHold hold;
     HostError error = openNative(name, Flags | O_NOFOLLOW, file);
-    const bool isLink = error == ELOOP || error == EMLINK;
-    const std::string place = isLink ? followLinks(name) : name;
-    if (isLink) error = openNative(place.c_str(), Flags, file);
+    std::string place = name;
+    if (error == ELOOP || error == EMLINK) {
+      error = resolveLinks(name, place);
+      if (error == 0) error = openNative(place.c_str(), Flags, file);
+    }
     if (error == 0) enterIfRegular(place.c_str(), file, file.number);
     return error;
   }
@@ -350,22 +362,27 @@ public:
     [[maybe_unused]] const int result = futimens(file.number, times);
   }
 
-  std::string followLinks(const char* name) override {
+  HostError resolveLinks(const char* name, std::string& place) override {
     constexpr int MaximumLinks = 40; // as the kernel: a longer chain is a circle
-    std::string place = name;
+    std::string end = name;
+    std::string text;
+    place = name;
     for (int i = 0; i < MaximumLinks; ++i) {
-      const std::string text = linkText(place);
-      if (text.empty()) return place;
+      if (const HostError error = readLink(end, text); error != 0) return error;
+      if (text.empty()) {
+        place = end;
+        return 0;
+      }
       // A relative link starts from the folder that it lies in.
-      place.resize(text.front() == '/' ? 0 : place.rfind('/') + 1);
-      place += text;
+      end.resize(text.front() == '/' ? 0 : end.rfind('/') + 1);
+      end += text;
     }
-    return name;
+    return 0;
   }
 
   HostError listDirectory(const char* name, std::vector<std::string>& names) override {
     names.clear();
-    const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(name), closedir);
+    const std::unique_ptr<DIR, int (*)(DIR*)> directory(openDirectory(name), closedir);
     if (!directory) return errno;
     for (;;) {
       errno = 0;
@@ -377,6 +394,13 @@ public:
   }
 
 private:
+  // What a file system has to say at a close it says at this one, before the file replaces another.
+  // Where there is no room for one more, it says it too late.
+  HostError closeCopy(FileHandle file) {
+    const FileHandle copy = {fcntl(file.number, F_DUPFD_CLOEXEC, 0)};
+    return copy.isOpen() ? close(copy) : 0;
+  }
+
   // Who keeps a process from naming its files in that way (a profile of the machine, an emulated
   // root) lets it create others: the handle is one of a copy from now on.
   HostError moveToNamed(FileHandle file, const char* name) {
@@ -386,10 +410,11 @@ private:
     HostError error =
         openNative(name, O_RDWR | O_CREAT | O_EXCL, named, native.st_mode & UsualMode);
     if (error != 0) return error;
+    enterIfRegular(name, named);
     error = copyAll(file, named);
     if (error == 0 && dup2(named.number, file.number) < 0) error = errno;
     if (error == 0) fcntl(file.number, F_SETFD, FD_CLOEXEC);
-    if (error != 0) unlink(name);
+    if (error != 0 && unlink(name) == 0) forgetUnfinished(name);
     ::close(named.number);
     return error;
   }

@@ -536,18 +536,22 @@ public:
     SetFileTime(handleOf(file), nullptr, &time, &time);
   }
 
-  std::string followLinks(const char* name) override {
+  HostError resolveLinks(const char* name, std::string& place) override {
     constexpr int MaximumLinks = 63; // as the system: a longer chain is a circle
-    std::string place = name;
+    std::string end = name;
+    place = name;
     for (int i = 0; i < MaximumLinks; ++i) {
       std::wstring native;
-      if (nativeName(place, native) != 0 || !hasAttribute(native, FILE_ATTRIBUTE_REPARSE_POINT))
-        return place;
-      const std::wstring text = readLink(native);
-      if (text.empty()) return place;
-      place = placeOfLink(place, narrow(text));
+      std::wstring text;
+      if (nativeName(end, native) == 0 && hasAttribute(native, FILE_ATTRIBUTE_REPARSE_POINT))
+        text = readLink(native);
+      if (text.empty()) {
+        place = end;
+        return 0;
+      }
+      end = placeOfLink(end, narrow(text));
     }
-    return name;
+    return 0;
   }
 
   HostError listDirectory(const char* name, std::vector<std::string>& names) override {

@@ -165,6 +165,12 @@ void FaultyHost::setTimes(FileHandle file, int64_t seconds) {
   if (fault("setTimes", m_OpenNames[file.number]) == 0) m_Host.setTimes(file, seconds);
 }
 
+HostError FaultyHost::resolveLinks(const char* name, std::string& place) {
+  place = name;
+  const HostError error = fault("resolveLinks", name);
+  return error != 0 ? error : m_Host.resolveLinks(name, place);
+}
+
 HostError FaultyHost::listDirectory(const char* name, std::vector<std::string>& names) {
   names.clear();
   const HostError error = fault("listDirectory", name);

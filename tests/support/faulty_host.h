@@ -92,7 +92,7 @@ public:
   void copyProtection(const char* from, const support::FileStatus& status,
                       support::FileHandle file) override;
   void setTimes(support::FileHandle file, int64_t seconds) override;
-  std::string followLinks(const char* name) override { return m_Host.followLinks(name); }
+  support::HostError resolveLinks(const char* name, std::string& place) override;
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
   support::HostError findNames(std::string_view directory, std::string_view leaf,
                                std::vector<std::string>& names) override;

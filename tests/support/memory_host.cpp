@@ -272,13 +272,13 @@ void MemoryHost::setTimes(FileHandle file, int64_t seconds) {
   m_Open.at(static_cast<size_t>(file.number))->modificationTime = seconds;
 }
 
-std::string MemoryHost::followLinks(const char* name) {
-  std::string place = name;
+HostError MemoryHost::resolveLinks(const char* name, std::string& place) {
+  place = name;
   for (auto found = m_Files.find(place); found != m_Files.end() && !found->second->link.empty();
        found = m_Files.find(place)) {
     place = found->second->link;
   }
-  return place;
+  return 0;
 }
 
 HostError MemoryHost::listDirectory(const char* name, std::vector<std::string>& names) {

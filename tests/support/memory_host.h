@@ -119,7 +119,7 @@ public:
   void copyProtection(const char* from, const support::FileStatus& status,
                       support::FileHandle file) override;
   void setTimes(support::FileHandle file, int64_t seconds) override;
-  std::string followLinks(const char* name) override;
+  support::HostError resolveLinks(const char* name, std::string& place) override;
   support::HostError listDirectory(const char* name, std::vector<std::string>& names) override;
 
 private:
