@@ -2,7 +2,7 @@
 //
 // The real programs, on real files, with each of their system calls disturbed in turn: it fails, it
 // does half of its work, the program is killed at it or gets a signal, or somebody else changes a
-// file there. promises.h says what must hold all the same, and known_failures.h what does not yet.
+// file there. promises.h says what must hold all the same.
 //
 //   disturbed                        a sample of all that can happen in each scenario
 //   disturbed --all                  all of it
@@ -10,7 +10,6 @@
 //   disturbed add 17:error:ENOSPC    one run again, which shows what it did
 //
 // Each core has a process with a folder of its own; they count together in shared memory.
-#include "tests/disturbed/known_failures.h"
 #include "tests/disturbed/stage.h"
 
 #include <algorithm>
@@ -42,7 +41,6 @@ constexpr ptrdiff_t MostPlacesOfTemporary = 4;
 
 struct Totals {
   std::array<std::atomic<uint64_t>, KindCount> runs;
-  std::array<std::atomic<uint64_t>, KnownFailures.size()> known;
   std::atomic<uint64_t> failures;
   // For each scenario, behind which calls a kill leaves a temporary.
   std::array<std::array<std::atomic<bool>, MostCalls>, MostScenarios> places;
@@ -66,8 +64,6 @@ private:
   [[nodiscard]] std::vector<Fault> select(std::vector<Fault> faults, size_t index) const;
   void play(Stage& stage, size_t index, const Fault& fault);
   void fail(const Scenario& scenario, const std::string& what);
-  [[nodiscard]] bool isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call,
-                             const std::string& broken);
 
   const Request& m_Request;
   Totals& m_Totals;
@@ -83,16 +79,6 @@ void Worker::fail(const Scenario& scenario, const std::string& what) {
   std::fflush(stdout);
 }
 
-bool Worker::isKnown(const Scenario& scenario, const Fault& fault, const SystemCall& call,
-                     const std::string& broken) {
-  for (size_t i = 0; i < KnownFailures.size(); ++i) {
-    if (!KnownFailures[i].isMet(scenario, fault, call, broken)) continue;
-    ++m_Totals.known[i];
-    return true;
-  }
-  return false;
-}
-
 void Worker::play(Stage& stage, size_t index, const Fault& fault) {
   const Scenario& scenario = getScenarios()[index];
   const Verdict verdict = stage.play(fault);
@@ -103,7 +89,6 @@ void Worker::play(Stage& stage, size_t index, const Fault& fault) {
   }
   if (verdict.broken.empty()) return;
   const SystemCall& call = stage.getCalls()[fault.call - 1];
-  if (isKnown(scenario, fault, call, verdict.broken)) return;
   fail(scenario, textOf(fault) + "  # " + call.name() + ": " + verdict.broken);
 }
 
@@ -170,23 +155,12 @@ void reportPlaces(Totals& totals) {
     const bool isTooMany = count > MostPlacesOfTemporary;
     std::printf("%s: a kill at %td places leaves a temporary%s\n", getScenarios()[i].name, count,
                 isTooMany ? ", which is too many" : "");
-    if (isTooMany && !AreManyPlacesKnown) ++totals.failures;
+    if (isTooMany) ++totals.failures;
   }
 }
 
-void reportKnown(const Totals& totals, const Request& request) {
-  for (size_t i = 0; i < KnownFailures.size(); ++i) {
-    const uint64_t count = totals.known[i];
-    if (count != 0)
-      std::printf("known: %s (%" PRIu64 " times)\n", KnownFailures[i].what, count);
-    else if (request.isAll)
-      std::printf("no longer met: %s\n", KnownFailures[i].what);
-  }
-}
-
-int report(Totals& totals, const Request& request) {
+int report(Totals& totals) {
   reportPlaces(totals);
-  reportKnown(totals, request);
   uint64_t all = 0;
   for (size_t kind = 0; kind < KindCount; ++kind) {
     const uint64_t count = totals.runs[kind];
@@ -248,5 +222,5 @@ int main(int argc, char** argv) {
   if (argc > 1 && !request.isAll) request.scenario = argv[1];
   Totals& totals = makeSharedTotals();
   playOnAllCores(request, totals);
-  return report(totals, request);
+  return report(totals);
 }

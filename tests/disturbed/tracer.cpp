@@ -130,7 +130,7 @@ void Trace::handleStop(int stopSignal) {
 }
 
 bool Trace::isToErrorStream(const SystemCall& call) const {
-  if (call.kind() != CallKind::Write) return false;
+  if (call.kind() != CallKind::Write && call.kind() != CallKind::Close) return false;
   struct stat to;
   struct stat errors;
   const std::string link =
