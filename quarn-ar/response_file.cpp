@@ -143,7 +143,10 @@ bool Expansion::expandFile(const std::string& name) {
 
 bool Expansion::expandOpenFile(const std::string& name, support::FileHandle file) {
   support::FileStatus status;
-  if (m_Host.statusOf(file, status) != 0 || status.kind != support::FileKind::RegularFile)
+  if (const support::HostError error = m_Host.statusOf(file, status); error != 0) {
+    return refuse("the response file '%s' can't be read: %s", name, quarn::hostErrorText(error));
+  }
+  if (status.kind != support::FileKind::RegularFile)
     return refuse("the response file '%s' is no regular file", name);
   const auto isSame = [&](const support::FileStatus& other) { return other.isSameFile(status); };
   if (std::any_of(m_Open.begin(), m_Open.end(), isSame))

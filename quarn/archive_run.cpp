@@ -25,6 +25,21 @@ namespace {
 // How a run ended. Who has been overtaken has written nothing.
 enum class RunEnd { Done, Overtaken };
 
+// By the many ways in which hosts say that there can be no such file. What else they say of a file
+// that they told nothing of is the reason why it was not found.
+int reasonOfAbsence(support::HostError error) {
+  switch (error) {
+  case 0:
+  case EILSEQ:
+  case EINVAL:
+  case ELOOP:
+  case ENAMETOOLONG:
+  case ENOTDIR:
+    return ENOENT;
+  }
+  return error;
+}
+
 // A new archive is made where the file is missing or --create says to look away from what it holds.
 // Who is going to write waits for his turn at the file first.
 bool openArchive(Run& run, const char* name) {
@@ -32,10 +47,11 @@ bool openArchive(Run& run, const char* name) {
   run.archive.setFileName(name);
   std::shared_ptr<support::SourceFile> file;
   support::FileKind kind = support::FileKind::Nothing;
+  support::HostError error = 0;
   if (run.settings.accessMode == Access_Write) {
-    file = arlib::takeTurn(run.archive.getSourceFiles(), name, kind);
+    file = arlib::takeTurn(run.archive.getSourceFiles(), name, kind, error);
   } else {
-    kind = support::fileKind(run.archive.getHost(), name);
+    kind = support::fileKind(run.archive.getHost(), name, error);
   }
   const bool exists = kind != support::FileKind::Nothing;
   if (exists && !run.settings.createArchive) {
@@ -44,7 +60,7 @@ bool openArchive(Run& run, const char* name) {
   }
   run.archive.setOwnFile(std::move(file));
   run.openStatus.missing = true;
-  run.openStatus.errorNumber = exists ? 0 : ENOENT;
+  run.openStatus.errorNumber = exists ? 0 : reasonOfAbsence(error);
   return true;
 }
 

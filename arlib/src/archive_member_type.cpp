@@ -52,7 +52,8 @@ namespace {
 
 using FirstBytes = std::array<uint8_t, elfext::RecognizedBytes>;
 
-// As many as there are. Nothing, after a report, if the host can't give them.
+// As many as there are. Nothing, after a report, if the host can't give them, or no longer: of a
+// file that was cut meanwhile nobody knows what its members are.
 std::optional<std::span<const uint8_t>> firstBytesOf(const ArchiveMember& archiveMember,
                                                      FirstBytes& bytes) {
   if (archiveMember.hasContents()) return archiveMember.getContents();
@@ -61,7 +62,7 @@ std::optional<std::span<const uint8_t>> firstBytesOf(const ArchiveMember& archiv
       std::span(bytes).first(std::min<size_t>(archiveMember.getSize(), bytes.size()));
   size_t done = 0;
   const int error = location.file->readAt(wanted, location.offset, done);
-  if (error == 0) return wanted.first(done);
+  if (error == 0 && done == wanted.size()) return wanted;
   archiveMember.getArchive()->fail(&ErrorHandler::reportReadError, location.fileName, error);
   return std::nullopt;
 }
@@ -187,8 +188,8 @@ bool ElfImageArchiveMemberType::readOutline(ArchiveMember& archiveMember,
 
 bool ElfImageArchiveMemberType::reportHostFailure(const ArchiveMember& archiveMember,
                                                   elfext::ElfextErrorStringCapture& failure) {
+  if (!failure.isUnreadable()) return false;
   const int error = failure.getHostError();
-  if (error == 0) return false;
   failure = {};
   archiveMember.getArchive()->fail(&ErrorHandler::reportReadError,
                                    archiveMember.getContentsLocation()->fileName, error);

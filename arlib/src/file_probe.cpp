@@ -31,6 +31,10 @@ void FileProbe::look(uint64_t offset, uint64_t size) {
   size_t done = 0;
   const std::span<uint8_t> wanted = std::span(bytes).first(std::min<uint64_t>(size, bytes.size()));
   hostError = file->readAt(wanted, offset, done);
+  // What has lost bytes since its size was taken is neither an object nor none.
+  const bool isCut =
+      refusalOf(status) == 0 && done < wanted.size() && status.holds(offset + done, 1);
+  if (hostError == 0 && isCut) hostError = support::FileHasChanged;
   if (hostError == 0) byteCount = static_cast<uint32_t>(done);
 }
 

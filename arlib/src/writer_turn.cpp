@@ -25,16 +25,17 @@ bool isStillThere(const SourceFile& file, const char* fileName) {
 } // namespace
 
 std::shared_ptr<SourceFile> takeTurn(support::SourceFiles& files, const char* fileName,
-                                     support::FileKind& kind) {
+                                     support::FileKind& kind, support::HostError& error) {
   for (;;) {
     support::FileStatus status;
-    if (files.getHost().status(fileName, status) != 0) status = {};
+    error = files.getHost().status(fileName, status);
+    if (error != 0) status = {};
     kind = status.kind;
     if (kind != support::FileKind::RegularFile) return nullptr;
     std::shared_ptr<SourceFile> file;
-    const support::HostError error = files.openForUpdate(fileName, file);
-    if (error == ENOENT) continue;
-    if (error != 0) return files.remember(fileName, status);
+    const support::HostError openError = files.openForUpdate(fileName, file);
+    if (openError == ENOENT) continue;
+    if (openError != 0) return files.remember(fileName, status);
     // Without locks one goes on as best one can: the writer looks again before it replaces the
     // file.
     if (file->lock() != 0 || isStillThere(*file, fileName)) return file;

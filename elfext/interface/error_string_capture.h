@@ -19,18 +19,22 @@ public:
     return false;
   }
   bool ioErrorReading(const ObjectModule& module, int errorNumber) override {
+    m_IsUnreadable = true;
     m_HostError = errorNumber;
     return ErrorHandler::ioErrorReading(module, errorNumber);
   }
 
   /// The last report's text; empty before the first.
   [[nodiscard]] const std::string& getText() const { return m_Text; }
-  /// What kept the host from giving the bytes, of which nothing is known then: its error number. 0
-  /// where the bytes themselves were at fault, or too few.
+  /// Whether the bytes were not to be had, of which nothing is known then. Otherwise they were at
+  /// fault themselves.
+  [[nodiscard]] bool isUnreadable() const { return m_IsUnreadable; }
+  /// The host's error number then; 0 where its file has become shorter.
   [[nodiscard]] int getHostError() const { return m_HostError; }
 
 private:
   std::string m_Text;
+  bool m_IsUnreadable = false;
   int m_HostError = 0;
 };
 

@@ -18,6 +18,8 @@ namespace support {
 /// What a name stands for. A name that the host can't tell about counts as nothing, but for a drive
 /// alone.
 [[nodiscard]] FileKind fileKind(Host& host, const char* name);
+/// The same; `error` is what the host said, or 0.
+[[nodiscard]] FileKind fileKind(Host& host, const char* name, HostError& error);
 
 /// Modification time in seconds since 1970, or -1 if the host doesn't tell.
 [[nodiscard]] int64_t fileTime(Host& host, const char* name);

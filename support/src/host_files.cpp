@@ -14,8 +14,14 @@
 namespace support {
 
 FileKind fileKind(Host& host, const char* name) {
+  HostError error = 0;
+  return fileKind(host, name, error);
+}
+
+FileKind fileKind(Host& host, const char* name, HostError& error) {
   FileStatus status;
-  if (host.status(name, status) == 0) return status.kind;
+  error = host.status(name, status);
+  if (error == 0) return status.kind;
   // A drive without a medium is there all the same.
   const bool isDrive = host.getPathStyle() == PathStyle_Windows && isDriveName(name);
   return isDrive ? FileKind::Directory : FileKind::Nothing;

@@ -2,7 +2,7 @@
 //
 // A host on which one call goes wrong: the k-th, counted over all operations that can fail. Or a
 // signal comes in front of it, or somebody else does something to the files. All others go to the
-// host behind it.
+// host behind it. A read can also get fewer bytes than there are.
 //
 // By going through k until a run makes fewer calls, a test sees the failure of every call that
 // there is, also of those that are added later.
@@ -30,7 +30,15 @@ public:
     m_Calls = 0;
     m_FailingSignal = 0;
     m_Disturbance = nullptr;
+    m_IsShort = false;
     m_FailedOperation.clear();
+  }
+  // The call with this number, if it reads, gets fewer bytes than there are and no error: of a
+  // sequence one, since more of them follow, and of a file half, which then ends there. Counting
+  // starts anew.
+  void shortenCall(uint64_t number) {
+    failCall(number, 0);
+    m_IsShort = true;
   }
   // A signal comes when the call with this number is made, which then goes on as always if the
   // process still lives. Counting starts anew.
@@ -100,6 +108,10 @@ public:
 private:
   // Counts a call; the error that it is to fail with, or 0.
   support::HostError fault(const char* operation, const std::string& name);
+  // Of the call that was counted last.
+  [[nodiscard]] bool isShort() const { return m_IsShort && m_Calls == m_FailingCall; }
+  support::HostError readHalf(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
+                              size_t& done);
   support::HostError remember(support::HostError error, const std::string& name,
                               support::FileHandle file);
 
@@ -108,6 +120,7 @@ private:
   support::HostError m_FailingError = 0;
   int m_FailingSignal = 0;
   std::function<void()> m_Disturbance;
+  bool m_IsShort = false;
   uint64_t m_Calls = 0;
   std::string m_FailedOperation;
   std::string m_FailedName;

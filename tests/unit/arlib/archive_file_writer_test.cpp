@@ -375,7 +375,7 @@ TEST_F(ArchiveFileWriterTest, NeverReplacesADirectoryOrADevice) {
 
 TEST_F(ArchiveFileWriterTest, RefusesALayoutOfTwoGibibytesBeforeItBegins) {
   for (const char* name : {"a", "b"}) {
-    m_Host.addFile(name, "").toldSize = 0x40000000;
+    m_Host.addFile(name, std::string(elfext::RecognizedBytes, 'x')).toldSize = 0x40000000;
     ASSERT_NE(m_Archive.addMemberFromFile(name), nullptr);
   }
   EXPECT_FALSE(write());

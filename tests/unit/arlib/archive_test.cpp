@@ -422,7 +422,7 @@ TEST_F(ArchiveListTest, FindsSymbolsByExactNameInTableOrder) {
 
 TEST_F(ArchiveListTest, SumsItsSizeInSixtyFourBits) {
   for (const char* name : {"a", "b", "c"}) {
-    m_Host.addFile(name, "").toldSize = 0x7FFFFFFF;
+    m_Host.addFile(name, std::string(elfext::RecognizedBytes, 'x')).toldSize = 0x7FFFFFFF;
     ASSERT_NE(m_Archive.addMemberFromFile(name), nullptr);
   }
   EXPECT_EQ(m_Archive.computeFileSize(), 8 + 3 * (60 + 0x80000000ull));

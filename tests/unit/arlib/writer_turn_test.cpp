@@ -22,12 +22,13 @@ protected:
 
   // What this writer would add to.
   std::string readInTurn() {
-    const auto file = takeTurn(m_Archive.getSourceFiles(), "lib.a", m_Kind);
+    const auto file = takeTurn(m_Archive.getSourceFiles(), "lib.a", m_Kind, m_Error);
     if (file == nullptr || !readFile(file, m_Archive)) return "(none)";
     return contentsOf(member(0));
   }
 
   support::FileKind m_Kind = support::FileKind::Special;
+  support::HostError m_Error = 0;
 };
 
 const std::string StaleWrite = "0 I/O error writing file 'lib.a': Stale file handle";
@@ -75,7 +76,7 @@ TEST_F(WriterTurnTest, TellsWhatWasThereWhenItLooked) {
   FaultyHost host(m_Host);
   support::SourceFiles files(host);
   host.disturbCall(2, [&] { put("first"); });
-  EXPECT_EQ(takeTurn(files, "lib.a", m_Kind), nullptr);
+  EXPECT_EQ(takeTurn(files, "lib.a", m_Kind, m_Error), nullptr);
   EXPECT_EQ(m_Kind, support::FileKind::Nothing);
 }
 
@@ -105,7 +106,7 @@ TEST_F(WriterTurnTest, OpensNeitherDirectoriesNorDevices) {
       {"pipe", support::FileKind::Special},
       {"gone", support::FileKind::Nothing}};
   for (const auto& [name, kind] : places) {
-    EXPECT_EQ(takeTurn(m_Archive.getSourceFiles(), name, m_Kind), nullptr);
+    EXPECT_EQ(takeTurn(m_Archive.getSourceFiles(), name, m_Kind, m_Error), nullptr);
     EXPECT_EQ(m_Kind, kind);
   }
 }
