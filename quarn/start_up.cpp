@@ -6,6 +6,7 @@
 // in use.
 #include "quarn/start_up.h"
 
+#include "alloclib/interface/handlers.h"
 #include "alloclib/interface/region.h"
 #include "alloclib/interface/session.h"
 #include "messages/interface/messages.h"
@@ -17,6 +18,7 @@
 
 #include <array>
 #include <cstdlib>
+#include <new>
 
 namespace quarn {
 
@@ -29,10 +31,16 @@ alloclib::Session* session = nullptr;
 alloclib::RegionGeneral* driverRegion = nullptr;
 support::Host* usedHost = nullptr;
 
+// Until there are messages to tell it.
+void endWithoutMemory() {
+  alloclib::outOfMemory(sizeof(alloclib::Session));
+}
+
 } // namespace
 
 void startUp(int argc, const char* const* argv, support::Host& host, Work work) {
   usedHost = &host;
+  std::set_new_handler(endWithoutMemory);
   session = new alloclib::Session;
   driverRegion = alloclib::RegionGeneral::Create(DriverRegionSize, "quarn memory");
   messages::initialise();

@@ -6,6 +6,7 @@
 
 #include "alloclib/interface/handlers.h"
 #include "checking/interface/checking.h"
+#include "messages/interface/output.h"
 #include "messages/interface/process_end.h"
 #include "messages/src/message_state.h"
 
@@ -15,7 +16,9 @@ namespace messages {
 
 namespace {
 
+// What is held back comes out first, since holding more of it would need memory.
 void onOutOfMemory() {
+  HeldOutput().release();
   report(FatalWord, nullptr, OutOfMemory);
   endProcess(1);
 }

@@ -2,8 +2,10 @@
 //
 // The tool on a host of which one call fails, told by the environment: QUARN_FAIL_CALL is the
 // number of the call from 1 (0 or unset: none), QUARN_FAIL_ERROR the error number it fails with, or
-// QUARN_FAIL_SIGNAL the signal that comes with it instead.
-// At exit the number of calls that were made is written to the file QUARN_CALL_COUNT.
+// QUARN_FAIL_SIGNAL the signal that comes with it instead. QUARN_FAIL_ALLOCATION is the number of
+// the allocation that fails, and QUARN_FAIL_ALLOCATIONS_TO the one that is the last to do so.
+// At exit the numbers of calls and of allocations that were made are written to the file
+// QUARN_CALL_COUNT.
 //
 // It is a program of its own, so that signals end a real process and the temporaries of the real
 // host are looked for on a real disk.
@@ -11,6 +13,7 @@
 #include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
+#include "tests/support/failing_memory.h"
 #include "tests/support/faulty_host.h"
 
 #include <cstdio>
@@ -33,7 +36,8 @@ void writeCallCount() {
   if (name == nullptr) return;
   std::FILE* file = std::fopen(name, "w");
   if (file == nullptr) return;
-  std::fprintf(file, "%llu\n", static_cast<unsigned long long>(getFaultyHost().getCallCount()));
+  std::fprintf(file, "%llu %llu\n", static_cast<unsigned long long>(getFaultyHost().getCallCount()),
+               static_cast<unsigned long long>(testsupport::getAllocationCount()));
   std::fclose(file);
 }
 
@@ -48,5 +52,7 @@ int main(int argc, char** argv) {
   else
     getFaultyHost().failCall(call, static_cast<support::HostError>(numberFrom("QUARN_FAIL_ERROR")));
   std::atexit(writeCallCount);
+  testsupport::failAllocations(numberFrom("QUARN_FAIL_ALLOCATION"),
+                               numberFrom("QUARN_FAIL_ALLOCATIONS_TO"));
   quarn::startUp(argc, argv, getFaultyHost(), quarn::quarnMain);
 }

@@ -21,6 +21,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <sstream>
 #include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -197,24 +198,45 @@ ToolFolder::runAtOnce(const std::vector<std::vector<std::string>>& runs) const {
   return results;
 }
 
-ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
-                                    uint64_t& callCount) const {
+ToolRun ToolFolder::runFaulty(const std::vector<std::string>& words, const Variables& variables,
+                              int signal, std::array<uint64_t, 2>& counts) const {
   const std::string countName = m_Notes + "/count";
   fs::remove(countName);
   std::fflush(nullptr);
   const pid_t process = fork();
   if (process == 0) {
     enter();
-    setenv("QUARN_FAIL_CALL", std::to_string(fault.call).c_str(), 1);
-    setenv("QUARN_FAIL_ERROR", std::to_string(fault.error).c_str(), 1);
-    setenv("QUARN_FAIL_SIGNAL", std::to_string(fault.signal).c_str(), 1);
-    // A signal that was ignored when the tests were started would stay so.
-    if (fault.signal != 0) std::signal(fault.signal, SIG_DFL);
+    for (const auto& [name, value] : variables)
+      setenv(name, std::to_string(value).c_str(), 1);
     setenv("QUARN_CALL_COUNT", countName.c_str(), 1);
+    // One that was ignored when the tests were started would stay so.
+    if (signal != 0) std::signal(signal, SIG_DFL);
     startProgram(QUARN_ON_FAULTY_HOST, words);
   }
   const ToolRun result = collect(process);
-  callCount = std::strtoull(readWhole(countName).c_str(), nullptr, 10);
+  counts = {};
+  std::istringstream(readWhole(countName)) >> counts[0] >> counts[1];
+  return result;
+}
+
+ToolRun ToolFolder::runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
+                                    uint64_t& callCount) const {
+  std::array<uint64_t, 2> counts = {};
+  const ToolRun result = runFaulty(words,
+                                   {{"QUARN_FAIL_CALL", fault.call},
+                                    {"QUARN_FAIL_ERROR", static_cast<uint64_t>(fault.error)},
+                                    {"QUARN_FAIL_SIGNAL", static_cast<uint64_t>(fault.signal)}},
+                                   fault.signal, counts);
+  callCount = counts[0];
+  return result;
+}
+
+ToolRun ToolFolder::runWithoutMemory(const std::vector<std::string>& words, uint64_t first,
+                                     uint64_t last, uint64_t& allocationCount) const {
+  std::array<uint64_t, 2> counts = {};
+  const ToolRun result = runFaulty(
+      words, {{"QUARN_FAIL_ALLOCATION", first}, {"QUARN_FAIL_ALLOCATIONS_TO", last}}, 0, counts);
+  allocationCount = counts[1];
   return result;
 }
 

@@ -9,8 +9,10 @@
 
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace support {
@@ -42,6 +44,8 @@ public:
   ToolFolder(const ToolFolder&) = delete;
   ToolFolder& operator=(const ToolFolder&) = delete;
 
+  [[nodiscard]] const std::string& getName() const { return m_Folder; }
+
   void write(const std::string& leaf, const std::string& bytes) const;
   [[nodiscard]] std::string read(const std::string& leaf) const;
   // Everything in the folder, sorted.
@@ -67,7 +71,15 @@ public:
   [[nodiscard]] ToolRun runOnFaultyHost(const std::vector<std::string>& words, const Fault& fault,
                                         uint64_t& callCount) const;
 
+  // The same where these allocations, counted from 1, fail; none if they are 0.
+  [[nodiscard]] ToolRun runWithoutMemory(const std::vector<std::string>& words, uint64_t first,
+                                         uint64_t last, uint64_t& allocationCount) const;
+
 private:
+  using Variables = std::vector<std::pair<const char*, uint64_t>>;
+  // `counts` become the numbers of calls and of allocations.
+  [[nodiscard]] ToolRun runFaulty(const std::vector<std::string>& words, const Variables& variables,
+                                  int signal, std::array<uint64_t, 2>& counts) const;
   [[nodiscard]] ToolRun runFile(const char* file, const std::vector<std::string>& words) const;
   // `notes` tells apart what runs at the same time print.
   [[nodiscard]] ToolRun collect(int process, const std::string& notes = "") const;

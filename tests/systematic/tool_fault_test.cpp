@@ -153,6 +153,35 @@ INSTANTIATE_TEST_SUITE_P(
                     Words{"-m", "lib.a", "a.o"}, Words{"-s", "lib.a"}, Words{"-n", "-s", "lib.a"},
                     Words{"--create", "--normalise=5", "lib.a", "a.o", "other.a"}));
 
+// Once, and for good: what is told then needs no memory.
+TEST_P(FaultInAnEdit, KeepsTheOldArchiveWithoutMemory) {
+  uint64_t needed = 0;
+  fill();
+  const ToolRun undisturbed = m_Folder.runWithoutMemory(GetParam(), 0, 0, needed);
+  ASSERT_EQ(undisturbed.status, 0);
+  const std::string newArchive = m_Folder.read("lib.a");
+  ASSERT_GT(needed, 20u);
+  for (uint64_t first = 1; first <= needed; ++first) {
+    for (const uint64_t last : {first, UINT64_MAX}) {
+      SCOPED_TRACE("allocation " + std::to_string(first) + " to " + std::to_string(last) + " of " +
+                   std::to_string(needed));
+      fill();
+      uint64_t made = 0;
+      const ToolRun run = m_Folder.runWithoutMemory(GetParam(), first, last, made);
+      EXPECT_EQ(m_Folder.leaves(), AllFiles);
+      // Memory may still run out when the new archive is in its place.
+      const std::string now = m_Folder.read("lib.a");
+      EXPECT_TRUE(now == newArchive || (run.status == 1 && now == oldArchive()));
+      ASSERT_TRUE(run.status == 0 || run.status == 1) << run.signal << run.errors;
+      const bool isTold = run.errors.find("Out of memory") != std::string::npos;
+      EXPECT_EQ(run.status == 1, isTold) << run.errors;
+      if (run.status == 0) {
+        EXPECT_EQ(run.errors, undisturbed.errors);
+      }
+    }
+  }
+}
+
 TEST_P(FaultInARunThatReads, TellsAllAndLeavesNoHalfFile) {
   uint64_t needed = 0;
   fill();

@@ -8,6 +8,7 @@
 #include "tests/support/messages_fixture.h"
 
 #include <cerrno>
+#include <new>
 
 namespace messages {
 
@@ -259,6 +260,14 @@ TEST_F(HeldOutputTest, MayBeDroppedAndBegunAgain) {
   writeBoth();
   held.release();
   EXPECT_EQ(written(), Both);
+}
+
+TEST_F(HeldOutputTest, ComesOutWhereMemoryHasRunOut) {
+  HeldOutput held;
+  held.hold();
+  writeText(Stream::Output, "out\n");
+  EXPECT_EQ(statusOf([] { std::get_new_handler()(); }), 1);
+  EXPECT_EQ(m_All, "out\nFatal error: L6800U: Out of memory\n");
 }
 
 TEST_F(HeldOutputTest, ComesOutAtTheEnd) {
