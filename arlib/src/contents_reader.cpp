@@ -15,6 +15,8 @@
 namespace arlib {
 
 struct ContentsReader::MadePieces {
+  explicit MadePieces(const TableText& made) : text(made) {}
+
   const TableText& text;
   TableText::Place place = {};
   std::vector<uint8_t> bytes = std::vector<uint8_t>(PieceSize);
@@ -60,7 +62,7 @@ bool ContentsReader::start(const ArchiveMember& member) {
     return true;
   }
   if (member.m_Made != nullptr) {
-    m_Made.reset(new MadePieces{*member.m_Made});
+    m_Made = std::make_unique<MadePieces>(*member.m_Made);
     return true;
   }
   const ArchiveMember::ContentsLocation& location = *member.getContentsLocation();

@@ -87,6 +87,14 @@ inline void stepTo(size_t number, size_t size, size_t common, std::vector<Common
   if (ends.back().size < size) ends.push_back({size, number});
 }
 
+/// Of the text of that size at the end of the whole at hand.
+inline uint64_t numberOf(size_t size, const std::vector<CommonEnd>& ends) {
+  const auto end =
+      std::lower_bound(ends.begin(), ends.end(), size,
+                       [](const CommonEnd& each, size_t wanted) { return each.size < wanted; });
+  return uint64_t{end->first} << 32 | size;
+}
+
 } // namespace numbering
 
 /// What is one number for all texts that are equal, but for what `fold` makes equal of characters,
@@ -105,13 +113,8 @@ template <class Fold>
   for (size_t i = 0; i < wholes.size(); ++i) {
     const std::string_view text = wholes[i].text;
     stepTo(i, text.size(), i == 0 ? 0 : commonEnd(wholes[i - 1].text, text, fold), ends);
-    for (const size_t index : wholes[i].ends) {
-      const size_t size = texts[index].size();
-      const auto end =
-          std::lower_bound(ends.begin(), ends.end(), size,
-                           [](const CommonEnd& each, size_t wanted) { return each.size < wanted; });
-      numbers[index] = uint64_t{end->first} << 32 | size;
-    }
+    for (const size_t index : wholes[i].ends)
+      numbers[index] = numberOf(texts[index].size(), ends);
   }
   return numbers;
 }
