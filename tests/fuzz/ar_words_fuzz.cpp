@@ -3,13 +3,13 @@
 // Any bytes as a response file of quarn-ar, in either way of quoting, which may name itself and two
 // more. Its words, all in quotes, are read back as they are; as a command line they are a request
 // that can be done or are refused, and never both.
-#include "alloclib/interface/region.h"
 #include "messages/interface/messages.h"
-#include "messages/interface/output.h"
 #include "quarn-ar/command_line.h"
 #include "quarn-ar/response_file.h"
 #include "quarn/reporting.h"
+#include "tests/fuzz/memory_bound.h"
 #include "tests/fuzz/quoted_words.h"
+#include "tests/fuzz/silence.h"
 #include "tests/support/memory_host.h"
 
 #include <cstdlib>
@@ -24,19 +24,6 @@ using Words = std::vector<std::string>;
 
 void expect(bool condition) {
   if (!condition) std::abort();
-}
-
-// Nobody reads what is refused.
-class Silence final : public messages::OutputSink {
-public:
-  int write(std::string_view) override { return 0; }
-};
-
-bool initialise() {
-  static Silence silence;
-  alloclib::initialise();
-  messages::setOutputSinks(&silence, &silence);
-  return true;
 }
 
 std::string quotedForWindows(const Words& words) {
@@ -90,8 +77,9 @@ void expand(std::string_view text, Quoting quoting) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-  static const bool IsInitialised = initialise();
+  static const bool IsInitialised = fuzzing::silenceMessages();
   if (!IsInitialised) return 0;
+  const fuzzing::MemoryBound bound(size);
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   readBack(text);
   expand(text, Quoting::Posix);

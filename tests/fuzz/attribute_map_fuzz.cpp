@@ -5,6 +5,7 @@
 #include "alloclib/interface/region.h"
 #include "elfext/interface/attribute_string.h"
 #include "elfext/interface/library_attribute_map.h"
+#include "tests/fuzz/memory_bound.h"
 #include "tests/support/memory_host.h"
 
 #include <algorithm>
@@ -84,6 +85,7 @@ void lookUp(std::string_view name, const LibraryAttributeMap& map) {
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised) return 0;
+  const fuzzing::MemoryBound bound(size);
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const LibraryAttributeMap map = readMap(text);
   const std::vector<std::string_view> lines = linesOf(text);

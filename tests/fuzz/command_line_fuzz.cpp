@@ -9,6 +9,7 @@
 #include "tabledrivenparser/interface/option_report.h"
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/text_sink.h"
+#include "tests/fuzz/memory_bound.h"
 #include "tests/fuzz/one_file.h"
 
 #include <cstdlib>
@@ -66,6 +67,7 @@ void parse(const std::vector<std::string>& words, std::string_view file, size_t 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
+  const fuzzing::MemoryBound bound(size);
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   parse(linesOf(text), text, size_t{data[0]} + 1);
   parse({"--via", "itself"}, text, size_t{data[0]} + 1);

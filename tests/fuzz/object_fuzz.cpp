@@ -12,6 +12,7 @@
 #include "elfext/interface/section.h"
 #include "elfext/interface/sizes_statistics.h"
 #include "support/interface/source_file.h"
+#include "tests/fuzz/memory_bound.h"
 #include "tests/support/memory_host.h"
 
 #include <algorithm>
@@ -123,6 +124,7 @@ void readForNames(std::span<const uint8_t> bytes) {
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
+  const fuzzing::MemoryBound bound(size);
   ElfextErrorStringCapture refusing;
   AcceptingHandler accepting;
   for (ErrorHandler* handler :

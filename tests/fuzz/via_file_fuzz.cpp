@@ -9,6 +9,7 @@
 #include "tabledrivenparser/interface/parser.h"
 #include "tabledrivenparser/interface/reporter.h"
 #include "tabledrivenparser/interface/via_file.h"
+#include "tests/fuzz/memory_bound.h"
 #include "tests/fuzz/one_file.h"
 #include "tests/fuzz/quoted_words.h"
 
@@ -108,6 +109,7 @@ bool isPrefix(const std::vector<std::string>& front, const std::vector<std::stri
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   static const bool IsInitialised = (static_cast<void>(alloclib::initialise()), true);
   if (!IsInitialised || size == 0) return 0;
+  const fuzzing::MemoryBound bound(size);
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const Reading reading = readFile(text, ViaFile::BufferSize);
   expect(readFile(text, size_t{data[0]} + 1) == reading);
