@@ -46,7 +46,8 @@ std::string lookUpName(std::string_view field, std::string_view longNames, std::
     const size_t start = std::strtoul(std::string(field.substr(1)).c_str(), nullptr, 10);
     const size_t end = longNames.find("/\n", start);
     // An offset into the middle of a name would read as a shorter name, and pass.
-    if (start > 0 && (start > longNames.size() || longNames.substr(start - 2, 2) != "/\n")) {
+    const bool isBehindAName = start > 1 && start <= longNames.size();
+    if (start > 0 && (!isBehindAName || longNames.substr(start - 2, 2) != "/\n")) {
       error = "a long name's offset is not the start of an entry";
     }
     if (end == longNames.npos) {
