@@ -53,10 +53,23 @@ void* operator new(size_t size) {
   }
 }
 
+// As the standard library's own: who asks so goes the same way first.
+void* operator new(size_t size, const std::nothrow_t&) noexcept {
+  try {
+    return ::operator new(size);
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
+}
+
 void operator delete(void* memory) noexcept {
   std::free(memory);
 }
 
 void operator delete(void* memory, size_t) noexcept {
+  std::free(memory);
+}
+
+void operator delete(void* memory, const std::nothrow_t&) noexcept {
   std::free(memory);
 }

@@ -12,6 +12,7 @@
 #include "elfext/interface/elf_constants.h"
 #include "tests/support/archive_builder.h"
 #include "tests/support/object_builder.h"
+#include "tests/support/sanitized.h"
 #include "tests/support/tool_folder.h"
 #include "tests/systematic/two_roads.h"
 
@@ -29,14 +30,6 @@ namespace testsupport {
 constexpr uint32_t Megabyte = 0x100000;
 constexpr uint32_t ManySections = 60000; // nearly as many as there can be
 constexpr uint32_t LongNameSize = Megabyte / 2;
-
-#if defined(__SANITIZE_ADDRESS__)
-constexpr bool IsSanitized = true;
-#elif defined(__has_feature)
-constexpr bool IsSanitized = __has_feature(address_sanitizer);
-#else
-constexpr bool IsSanitized = false;
-#endif
 
 // What a run may take, beyond the object's own size.
 constexpr double MostSeconds = 1;
