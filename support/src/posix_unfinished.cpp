@@ -129,15 +129,15 @@ void removeUnfinishedFiles() {
 
 void installSignalCleanUp() {
   useOwnStack();
+  struct sigaction action = {};
+  action.sa_sigaction = removeUnfinishedAndEnd;
+  action.sa_flags = SA_SIGINFO | SA_ONSTACK | SA_RESTART;
   for (size_t i = 0; i < EndingSignals.size(); ++i) {
-    // A signal that the parent process ignores (a job in the background) stays ignored.
     struct sigaction& before = actionsBefore[i];
-    if (sigaction(EndingSignals[i], nullptr, &before) != 0 || before.sa_handler == SIG_IGN)
-      continue;
-    struct sigaction action = {};
-    action.sa_sigaction = removeUnfinishedAndEnd;
-    action.sa_flags = SA_SIGINFO | SA_ONSTACK | SA_RESTART;
-    sigaction(EndingSignals[i], &action, nullptr);
+    if (sigaction(EndingSignals[i], &action, &before) != 0) continue;
+    // A signal that the parent process ignores (a job in the background) stays ignored; one that
+    // comes before this line finds nothing to remove, and is ignored in the end as well.
+    if (before.sa_handler == SIG_IGN) sigaction(EndingSignals[i], &before, nullptr);
   }
   // The write then fails with EFBIG, and the clean-up of a failed write runs as for a full disk.
   std::signal(SIGXFSZ, SIG_IGN);
