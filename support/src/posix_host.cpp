@@ -238,9 +238,10 @@ public:
 
   HostError openForWriting(const char* name, FileHandle& file) override {
     constexpr int Flags = O_WRONLY | O_CREAT | O_TRUNC | O_NONBLOCK;
+    // Before the file is there: memory may run out here.
+    std::string place = name;
     const SignalHold hold;
     HostError error = openNative(name, Flags | O_NOFOLLOW, file);
-    std::string place = name;
     if (error == ELOOP || error == EMLINK) {
       error = resolveLinks(name, place);
       if (error == 0) error = openNative(place.c_str(), Flags, file);

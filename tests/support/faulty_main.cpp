@@ -7,9 +7,13 @@
 // At exit the numbers of calls and of allocations that were made are written to the file
 // QUARN_CALL_COUNT.
 //
+// A first word that is the name of another of our programs is taken for it.
+//
 // It is a program of its own, so that signals end a real process and the temporaries of the real
 // host are looked for on a real disk.
 
+#include "quarn-ar/ar_main.h"
+#include "quarn-json/json_main.h"
 #include "quarn/quarn_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
@@ -18,6 +22,7 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <string_view>
 
 namespace {
 
@@ -41,6 +46,12 @@ void writeCallCount() {
   std::fclose(file);
 }
 
+quarn::Work workNamed(std::string_view word) {
+  if (word == "quarn-ar") return quarn_ar::arMain;
+  if (word == "quarn-json") return quarn_json::jsonMain;
+  return quarn::quarnMain;
+}
+
 } // namespace
 
 int main(int argc, char** argv) {
@@ -54,5 +65,7 @@ int main(int argc, char** argv) {
   std::atexit(writeCallCount);
   testsupport::failAllocations(numberFrom("QUARN_FAIL_ALLOCATION"),
                                numberFrom("QUARN_FAIL_ALLOCATIONS_TO"));
-  quarn::startUp(argc, argv, getFaultyHost(), quarn::quarnMain);
+  const quarn::Work work = workNamed(argc > 1 ? argv[1] : "");
+  const int skipped = work == quarn::quarnMain ? 0 : 1;
+  quarn::startUp(argc - skipped, argv + skipped, getFaultyHost(), work);
 }

@@ -151,7 +151,10 @@ INSTANTIATE_TEST_SUITE_P(
                     Words{"-r", "--normalise=5", "--via", "words"},
                     Words{"-s", "--libattrmap=map", "lib.a"}, Words{"-d", "lib.a", "a.o"},
                     Words{"-m", "lib.a", "a.o"}, Words{"-s", "lib.a"}, Words{"-n", "-s", "lib.a"},
-                    Words{"--create", "--normalise=5", "lib.a", "a.o", "other.a"}));
+                    Words{"--create", "--normalise=5", "lib.a", "a.o", "other.a"},
+                    Words{"quarn-ar", "rcsD", "lib.a", "a.o", "large.o"},
+                    Words{"quarn-ar", "ds", "lib.a", "a.o"}, Words{"quarn-ar", "sD", "lib.a"},
+                    Words{"quarn-ar", "qD", "lib.a", "large.o"}));
 
 // Once, and for good: what is told then needs no memory.
 TEST_P(FaultInAnEdit, KeepsTheOldArchiveWithoutMemory) {
@@ -210,10 +213,42 @@ TEST_P(FaultInARunThatReads, TellsAllAndLeavesNoHalfFile) {
   }
 }
 
-INSTANTIATE_TEST_SUITE_P(Tool, FaultInARunThatReads,
-                         testing::Values(Words{"-x", "lib.a"}, Words{"-t", "lib.a"},
-                                         Words{"-tv", "lib.a"}, Words{"-p", "lib.a"},
-                                         Words{"--zs", "lib.a"}, Words{"--sizes", "lib.a"},
-                                         Words{"--entries", "lib.a"}, Words{"--zt", "lib.a"}));
+TEST_P(FaultInARunThatReads, TellsThatMemoryRanOut) {
+  uint64_t needed = 0;
+  fill();
+  m_Folder.removeAllBut({"lib.a"});
+  const ToolRun undisturbed = m_Folder.runWithoutMemory(GetParam(), 0, 0, needed);
+  ASSERT_EQ(undisturbed.status, 0);
+  const Words wholeLeaves = m_Folder.leaves();
+  const Words wholeFiles = {oldArchive(), "odd", objectOf("f", 3000), objectOf("g", 70000)};
+  ASSERT_GT(needed, 10u);
+  for (uint64_t first = 1; first <= needed; ++first) {
+    for (const uint64_t last : {first, UINT64_MAX}) {
+      SCOPED_TRACE("allocation " + std::to_string(first) + " to " + std::to_string(last) + " of " +
+                   std::to_string(needed));
+      m_Folder.removeAllBut({"lib.a"});
+      uint64_t made = 0;
+      const ToolRun run = m_Folder.runWithoutMemory(GetParam(), first, last, made);
+      ASSERT_TRUE(run.status == 0 || run.status == 1) << run.signal << run.errors;
+      const bool isTold = run.errors.find("Out of memory") != std::string::npos;
+      EXPECT_EQ(run.status == 1, isTold) << run.errors;
+      if (run.status == 0) {
+        EXPECT_TRUE(run.output == undisturbed.output);
+        EXPECT_EQ(m_Folder.leaves(), wholeLeaves);
+      }
+      for (const std::string& leaf : m_Folder.leaves()) {
+        EXPECT_TRUE(isOneOf(m_Folder.read(leaf), wholeFiles)) << leaf;
+      }
+    }
+  }
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Tool, FaultInARunThatReads,
+    testing::Values(Words{"-x", "lib.a"}, Words{"-t", "lib.a"}, Words{"-tv", "lib.a"},
+                    Words{"-p", "lib.a"}, Words{"--zs", "lib.a"}, Words{"--sizes", "lib.a"},
+                    Words{"--entries", "lib.a"}, Words{"--zt", "lib.a"},
+                    Words{"quarn-ar", "xo", "lib.a"}, Words{"quarn-ar", "tv", "lib.a"},
+                    Words{"quarn-ar", "p", "lib.a"}, Words{"quarn-json", "lib.a"}));
 
 } // namespace testsupport
