@@ -26,6 +26,7 @@
 #include <cstring>
 #include <functional>
 #include <memory>
+#include <utility>
 #include <windows.h>
 
 namespace support {
@@ -66,7 +67,8 @@ public:
   TableHold(const TableHold&) = delete;
   TableHold& operator=(const TableHold&) = delete;
 
-  void enter(const std::wstring& name) { replace({}, name); }
+  // Takes the name as it is: behind a lock and a file that is made, memory must not run out.
+  void enter(std::wstring name) { replace({}, std::move(name)); }
   void forget(const std::wstring& name) { replace(name, {}); }
   static void removeAll() {
     for (std::wstring& name : temporaries().names) {
@@ -76,10 +78,10 @@ public:
   }
 
 private:
-  static void replace(const std::wstring& before, const std::wstring& after) {
+  static void replace(const std::wstring& before, std::wstring after) {
     auto& names = temporaries().names;
     const auto slot = std::find(names.begin(), names.end(), before);
-    if (slot != names.end()) *slot = after;
+    if (slot != names.end()) *slot = std::move(after);
   }
 };
 
@@ -386,12 +388,13 @@ public:
     std::wstring native;
     file = {};
     if (const HostError error = nativeName(name, native); error != 0) return error;
+    std::wstring place = nativePlace(name);
     TableHold table;
     if (const HostError error = openNative(native, GENERIC_WRITE, OPEN_ALWAYS, file); error != 0)
       return error;
     if (GetFileType(handleOf(file)) != FILE_TYPE_DISK) return 0;
     if (SetEndOfFile(handleOf(file)) != 0) {
-      table.enter(nativePlace(name));
+      table.enter(std::move(place));
       return 0;
     }
     const HostError error = lastHostError();
@@ -589,7 +592,7 @@ private:
     // A link that leads nowhere would be followed, and the file made where it leads.
     const HostError error = openNative(native, GENERIC_READ | GENERIC_WRITE, CREATE_NEW, file,
                                        FILE_FLAG_OPEN_REPARSE_POINT);
-    if (error == 0) table.enter(native);
+    if (error == 0) table.enter(std::move(native));
     // A folder in the place is said to deny access.
     return error == EISDIR ? EEXIST : error;
   }

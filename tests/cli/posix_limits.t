@@ -22,30 +22,31 @@ A file may not become too large. The limit counts parts of 1024 bytes.
   0 1
   $ rm -r before; mv inputs before
 
-So few of them may be open at a time that there is none for some step.
+So few of them may be open at a time that there is none for some step, from what lets the program begin.
 
-  $ each 'ulimit -n' 3 10 1 quarn -r lib.a matrix_debug.o
+  $ begins() { (ulimit "$@"; exec quarn --vsn) > /dev/null 2>&1; }
+  $ fewest=3; until begins -n $fewest || [ $fewest = 10 ]; do fewest=$(( fewest + 1 )); done
+  $ each 'ulimit -n' $fewest 10 1 quarn -r lib.a matrix_debug.o
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn -r lib.a large.a
+  $ each 'ulimit -n' $fewest 10 1 quarn -r lib.a large.a
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn -r lib.a 'm*.o'
+  $ each 'ulimit -n' $fewest 10 1 quarn -r lib.a 'm*.o'
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn -s lib.a
+  $ each 'ulimit -n' $fewest 10 1 quarn -s lib.a
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn -d lib.a calendar_plain.o
+  $ each 'ulimit -n' $fewest 10 1 quarn -d lib.a calendar_plain.o
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn --sizes lib.a
+  $ each 'ulimit -n' $fewest 10 1 quarn --sizes lib.a
   0 1
-  $ each 'ulimit -n' 3 10 1 quarn-ar rcs lib.a matrix_debug.o
+  $ each 'ulimit -n' $fewest 10 1 quarn-ar rcs lib.a matrix_debug.o
   0 1
-  $ cp -a before inputs; rm before/large before/*.o; each 'ulimit -n' 3 10 1 quarn -x large.a
+  $ cp -a before inputs; rm before/large before/*.o; each 'ulimit -n' $fewest 10 1 quarn -x large.a
   0 1
   $ rm -r before; mv inputs before
 
 Memory is short, from what lets the program begin to what is enough.
 
-  $ isEnough() { (ulimit -v "$1"; exec quarn --vsn) > /dev/null; }
-  $ first=1000; until isEnough $first || [ $first -gt 100000 ]; do first=$(( first + 100 )); done 2> /dev/null
+  $ first=1000; until begins -v $first || [ $first -gt 100000 ]; do first=$(( first + 100 )); done 2> /dev/null
   $ rm before/large
   $ for words in '-s lib.a' '-r lib.a matrix_debug.o' '-x large.a lar*' '-p large.a'; do
   >   planned quarn $words
