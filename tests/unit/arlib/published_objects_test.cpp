@@ -285,7 +285,16 @@ TEST_F(MinorVariantsTest, TakeWhatTheLibraryNeedsEvenIfNoTargetHasBoth) {
   EXPECT_FALSE(addLibraryAttributes(attributes, &impossible));
 }
 
-TEST_F(MinorVariantsTest, LibraryAttributesStayAndMakeTheTableStale) {
+TEST_F(MinorVariantsTest, MakeTheTableStaleByOtherLibraryAttributes) {
+  read(archive().symbolTable({{"s", "a.o"}}).member("a.o", "no object"));
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_NE(m_Archive.getSymbolTable(), nullptr);
+  m_Archive.setLibraryAttributes(parseAttributeString("$J"));
+  EXPECT_TRUE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
+}
+
+TEST_F(MinorVariantsTest, LibraryAttributesStay) {
   read(archive().symbolTable({}).member("a.o", "text"));
   EXPECT_EQ(m_Archive.getLibraryAttributes(), nullptr);
   m_Archive.setLibraryAttributes(parseAttributeString("$J"));
