@@ -73,3 +73,15 @@ Longer ones than files have come from other archives, and are as good.
   inin20000
   11 20004
   new.txt
+
+The words of the tool are compared up to their 1029th byte, and those of quarn-ar whole.
+
+  $ same=$(named 1029); table="${same}1/"$'\n'"${same}2/"$'\n'
+  $ { magic; member // "$table"; member /0 1; member /1032 2; } > two.a
+  $ quarn -p two.a "${same}1"; echo; quarn -p two.a "${same}3"; echo; quarn-ar p two.a "${same}2"; echo
+  12
+  12
+  2
+  $ quarn-ar t two.a "${same}3" 2>&1 | sed 's/n\{1029\}/<1029>/'
+  quarn-ar: Error: L6831E: '<1029>3' not present in archive 'two.a'
+  $ quarn -d two.a "${same}1"; quarn -t two.a

@@ -384,6 +384,21 @@ TEST_F(ArchiveFileWriterTest, RefusesALayoutOfTwoGibibytesBeforeItBegins) {
   EXPECT_FALSE(m_Host.has("lib.a.0"));
 }
 
+// Sizes are even. Where the largest isn't refused, it comes to light that nobody has the bytes.
+TEST_F(ArchiveFileWriterTest, TakesTheLargestLayoutBelowTwoGibibytes) {
+  constexpr int64_t Largest = 0x7FFFFFFE - 8 - 60;
+  m_Host.addFile("a", std::string(elfext::RecognizedBytes, 'x')).toldSize = Largest;
+  ASSERT_NE(m_Archive.addMemberFromFile("a"), nullptr);
+  EXPECT_FALSE(write());
+  EXPECT_THAT(reports(),
+              ElementsAre("0 I/O error reading file 'a'", "0 I/O error writing file 'lib.a.0'"));
+  m_Archive.clear();
+  m_Host.at("a").toldSize = Largest + 1;
+  ASSERT_NE(m_Archive.addMemberFromFile("a"), nullptr);
+  EXPECT_FALSE(write());
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error writing file 'lib.a': File too large"));
+}
+
 TEST_F(ArchiveFileWriterTest, ReportsAMemberThatHasBecomeShorter) {
   read(archive().member("old", "x"));
   const std::string before = written();
