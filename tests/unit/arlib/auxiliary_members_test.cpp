@@ -286,6 +286,20 @@ TEST_F(AuxiliaryMembersTest, LoadsATableThatWasDiscarded) {
   EXPECT_EQ(longNameTable(), Long1 + "/\n");
 }
 
+// They share their bytes in a table of some megabytes, and would be written one by one.
+TEST_F(AuxiliaryMembersTest, RefusesLongNamesThatAreMoreThanAnArchiveHolds) {
+  ArchiveBuilder library = archive();
+  library.longNamesText(std::string(4'000'000, 'n') + "/\n");
+  for (int i = 0; i < 1100; ++i)
+    library.memberWithNameField("/0", "");
+  read(library);
+  const std::string before = m_Host.read("lib.a");
+  m_Archive.removeMember(member(1));
+  EXPECT_FALSE(writeFile("lib.a", m_Archive));
+  EXPECT_THAT(reports(), ElementsAre("0 I/O error writing file 'lib.a': File too large"));
+  EXPECT_EQ(m_Host.read("lib.a"), before);
+}
+
 // A long name that comes, goes or changes shifts all members, and the symbol table leads to them.
 TEST_F(AuxiliaryMembersTest, KeepsSymbolsRightWhenNamesChangeTheLayout) {
   const std::string defining = objectThatDefines("f").bytes();

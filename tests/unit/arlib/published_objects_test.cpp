@@ -252,6 +252,19 @@ TEST_F(MinorVariantsTest, StopAtTheFirstReportThatIsAnsweredSo) {
   EXPECT_EQ(handler.take().size(), 1u);
 }
 
+TEST_F(MinorVariantsTest, StopWhereADifferenceThatCannotBeToldIsAnsweredSo) {
+  RecordingHandler handler(Answer::GiveUp);
+  m_Archive.setErrorHandler(&handler);
+  add("a.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$J$IEEE1"}}));
+  add("b.o", objectWith({{"f", elfext::STB_GLOBAL}, {"BuildAttributes$$R:L22$IEEE1"}}));
+  EXPECT_FALSE(m_Archive.updateAuxiliaryMembers());
+  EXPECT_EQ(m_Archive.getSymbolTable(), nullptr);
+  EXPECT_THAT(
+      handler.take(),
+      ElementsAre("1 Member #1 'b.o' of minor variant group beginning witharchive member "
+                  "#0 'a.o' includes attribute(s) with nosymbol decoration representation"));
+}
+
 // Which names the table has is told elsewhere; here, that who asks beforehand gets the same answer.
 TEST_F(MinorVariantsTest, HaveADecorationUnlessTheyAreTheBase) {
   AttributeRecords records(parseAttributeString);

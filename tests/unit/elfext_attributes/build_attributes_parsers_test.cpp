@@ -395,6 +395,13 @@ TEST(QobixAttributesTest, TellEachPrefix) {
   }
 }
 
+// Who derives hears of what he asks for and steps over the rest.
+TEST(QobixAttributesTest, AreWalkedToTheEndThoughNobodyHears) {
+  const std::vector<uint8_t> bytes = ownBytes(tag(6, 300) + tag(5, "cpu") + tag(32, 1, "v") +
+                                              "\x41" + tag(5, "x") + "\x41" + tag(32, 1, "v"));
+  EXPECT_TRUE(QobixBuildAttributesSubSubsectionParser().parse(bytes));
+}
+
 // ---- Vendor "ZEV"
 
 class RecordingZevParser final : public ZevBuildAttributesSubSubsectionParser {
@@ -427,6 +434,11 @@ TEST(ZevAttributesTest, AreNumbersIfEven) {
   parser.m_Answer = false;
   EXPECT_FALSE(parser.parse(bytesOf(tag(4, 1) + tag(6, 1))));
   EXPECT_THAT(parser.m_Seen, ElementsAre("4=1", "6=1"));
+}
+
+TEST(ZevAttributesTest, AreWalkedToTheEndThoughNobodyHears) {
+  EXPECT_TRUE(ZevBuildAttributesSubSubsectionParser().parse(ownBytes(tag(4, 1) + tag(5, "x"))));
+  EXPECT_FALSE(ZevBuildAttributesSubSubsectionParser().parse(ownBytes(tag(4, 1) + "\4")));
 }
 
 // ---- Decoding

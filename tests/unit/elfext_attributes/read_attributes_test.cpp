@@ -247,6 +247,25 @@ TEST_F(ReadAttributesTest, IndicesAreThoseOfSectionsAndSymbols) {
                Corrupt);
 }
 
+// A long run that is for many symbols, each of which has something else already.
+TEST_F(ReadAttributesTest, SymbolsThatTakeTooManyStepsCorruptASection) {
+  std::vector<testsupport::SymbolSpec> symbols;
+  std::vector<AttributePart> parts;
+  std::vector<uint32_t> all;
+  for (uint32_t i = 1; i <= 100; ++i) {
+    symbols.push_back({.name = "f", .section = 3});
+    parts.push_back(symbolPart({i}, tag(6, i)));
+    all.push_back(i);
+  }
+  const auto longRun = [&](size_t size) {
+    std::vector<AttributePart> whole = parts;
+    whole.push_back(symbolPart(all, tag(5, std::string(size, 'x'))));
+    return withAttributes(attributeSection({vendorPart("qobix", whole)}), symbols);
+  };
+  readGood(longRun(1000));
+  expectMended(longRun(30000), Corrupt);
+}
+
 TEST_F(ReadAttributesTest, WithoutSymbolsThereIsNoIndex) {
   ObjectBuilder file = object();
   file.section(".ZEV.attributes", SHT_ZEV_ATTRIBUTES)

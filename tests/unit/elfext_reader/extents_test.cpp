@@ -65,6 +65,27 @@ TEST(ExtentsTest, FindsTheSamePairAsAllComparisonsDo) {
   }
 }
 
+// Code and what belongs to it take turns, each kind going up by itself; then what is found rests on
+// these being put together well. Of too many such kinds it rests on sorting.
+TEST(ExtentsTest, FindsTheSamePairWhereSomeOrdersTakeTurns) {
+  std::mt19937 random(3);
+  for (int round = 0; round < 500; ++round) {
+    const auto orders = static_cast<uint32_t>(1 + random() % 6);
+    std::vector<uint64_t> next(orders);
+    for (uint32_t i = 0; i < orders; ++i)
+      next[i] = i * uint64_t{2000};
+    std::vector<Extent> extents;
+    for (uint32_t id = 0; id < 65 + random() % 40; ++id) {
+      uint64_t& start = next[random() % orders];
+      const uint64_t size = 1 + random() % 8;
+      extents.push_back({start, start + size, id});
+      // Now and then one touches or overlaps the one in front of it.
+      start += random() % 100 == 0 ? random() % size : size + random() % 8;
+    }
+    EXPECT_EQ(findFirstOverlap(extents), plainOverlap(extents));
+  }
+}
+
 TEST(ExtentsTest, FindsTheSameHolderAsAllComparisonsDo) {
   std::mt19937 random(2);
   for (int round = 0; round < 2000; ++round) {

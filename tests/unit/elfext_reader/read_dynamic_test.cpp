@@ -434,6 +434,33 @@ TEST_F(ReadDynamicTest, VersionCountsAreLimits) {
       readGood(withVersions({.definitionCount = 0xFFFFFFFF, .requirementCount = 0xFFFFFFFF}))));
 }
 
+TEST_F(ReadDynamicTest, RequirementsAreThoseOfEachFileAndEachOfItsVersions) {
+  ObjectBuilder file = object();
+  dynamic(file).dynamic(DT_VERNEEDNUM, 2);
+  SectionBuilder& symbols = file.section(".dynsym", SHT_DYNSYM).link(2);
+  for (const char* name : {"one", "two", "three"})
+    symbols.symbol({.name = name});
+  const auto version = [](SectionBuilder& section, uint16_t number, const char* name,
+                          uint32_t next) {
+    section.word(0).half(0).half(number).textOffset(name).word(next);
+  };
+  SectionBuilder& files = file.section(".verneed", SHT_GNU_verneed).link(2);
+  files.half(1).half(2).textOffset("libv").word(16).word(48);
+  version(files, 2, "v1", 16);
+  version(files, 3, "v2", 0);
+  files.half(1).half(1).textOffset("libw").word(16).word(0);
+  version(files, 4, "w1", 0);
+  file.section(".versym", SHT_GNU_versym).link(3).half(0).half(2).half(3).half(4);
+  const ReadResult result = readGood(file);
+  std::vector<std::string> all;
+  for (const Symbol* symbol : result.module->getDynamicSymbols()) {
+    ASSERT_NE(symbol->getVersionRequirement(), nullptr);
+    all.push_back(std::string(symbol->getVersionRequirement()->versionName) + " of " +
+                  symbol->getVersionRequirement()->fileName);
+  }
+  EXPECT_EQ(all, (std::vector<std::string>{"v1 of libv", "v2 of libv", "w1 of libw"}));
+}
+
 TEST_F(ReadDynamicTest, VersionNamesOutsideTheTableAreEmpty) {
   ObjectBuilder file = object();
   dynamic(file).dynamic(DT_VERDEFNUM, 1);

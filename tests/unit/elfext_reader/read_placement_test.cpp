@@ -492,4 +492,21 @@ TEST_F(ReadPlacementTest, ConditionsTellOfBuildAttributesInFilesWithSegments) {
   EXPECT_EQ(readGood(file).module->getReadConditions() & both, both);
 }
 
+// An absolute one is such a symbol also where the text begins inside of its name; and names may be
+// ends of one another.
+TEST_F(ReadPlacementTest, ConditionsTellOfBuildAttributesAmongAbsoluteSymbols) {
+  const auto conditions = [this](const std::vector<const char*>& names) {
+    ObjectBuilder file = object();
+    testsupport::SectionBuilder& table = file.section(".symtab", SHT_SYMTAB).link(2);
+    for (const char* name : names)
+      table.symbol({.name = name, .section = SHN_ABS});
+    file.section(".strtab", SHT_STRTAB);
+    file.segment({.type = PT_NOTE});
+    return readGood(file).module->getReadConditions() & ReadCondition_HasBuildAttributesSymbol;
+  };
+  EXPECT_EQ(conditions({"first", "second", "third"}), 0U);
+  EXPECT_NE(conditions({"first", "second", "f$$BuildAttributes$x"}), 0U);
+  EXPECT_NE(conditions({"f$$BuildAttributes$x", "second", "third"}), 0U);
+}
+
 } // namespace elfext

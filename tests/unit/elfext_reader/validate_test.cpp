@@ -745,6 +745,24 @@ TEST_F(ValidateLinkedTest, SectionsOfOneTreeShareNoBytes) {
   expectReport(*result.module, "Sections #1 and #2 overlap in the file");
 }
 
+// Which two are told must not depend on how they were sorted.
+TEST_F(ValidateLinkedTest, SectionsAtOnePlaceAreToldBySizeAndNumber) {
+  const uint64_t start = textOffset(1);
+  ObjectBuilder file = object().type(ET_EXEC);
+  for (const size_t size : std::initializer_list<size_t>{0, 0, 8})
+    file.section(".text", SHT_PROGBITS).flags(CodeFlags).address(Address + start).zeros(size);
+  SegmentSpec segment = load(start, 8);
+  segment.vaddr += Address;
+  file.segment(segment);
+  const ReadResult result = readGood(file);
+  ModuleBuilder::adoptSize(*result.section(1), 16);
+  ModuleBuilder::adoptSize(*result.section(2), 8);
+  EXPECT_EQ(validateWith(*result.module, true),
+            (std::vector<std::string>{"Loadable section #1 is not contained in a loadable segment",
+                                      "Sections #2 and #3 overlap in the file",
+                                      "Sections #1 and #2 overlap in the file"}));
+}
+
 TEST_F(ValidateLinkedTest, SectionsOfOtherTreesHideNothing) {
   const ReadResult result = readGood(linked({load(0, 32)}));
   Section* large = result.module->createSection(".large", SHT_PROGBITS, 0);
