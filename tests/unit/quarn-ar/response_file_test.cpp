@@ -111,6 +111,12 @@ TEST_F(ResponseFileTest, IsRefusedWhereItCannotBeRead) {
             "quarn-ar: Error: the response file 'self' leads back to itself\n");
   EXPECT_EQ(refusal({"rc", "@one"}),
             "quarn-ar: Error: the response file 'one' leads back to itself\n");
+  m_Host.addFile("cut", std::string_view("lib.a a.o")).toldSize = 100;
+  EXPECT_EQ(refusal({"rc", "@cut"}), "quarn-ar: Error: the response file 'cut' can't be read: "
+                                     "Unexpected end of file\n");
+  m_Host.addFile("pipe", std::string_view("lib.a a.o")).kind = support::FileKind::Special;
+  EXPECT_EQ(refusal({"rc", "@pipe"}),
+            "quarn-ar: Error: the response file 'pipe' is no regular file\n");
   EXPECT_FALSE(m_Host.has("lib.a"));
 }
 

@@ -4,8 +4,7 @@
 
 #include "quarn-ar/usage.h"
 
-#include <gmock/gmock.h>
-#include <gtest/gtest.h>
+#include "tests/unit/quarn-ar/ar_fixture.h"
 
 #include <regex>
 
@@ -13,7 +12,6 @@ namespace quarn_ar {
 
 namespace {
 
-using testing::HasSubstr;
 using testing::Not;
 
 TEST(Usage, KnowsTheProgramByTheEndOfItsName) {
@@ -42,6 +40,19 @@ TEST(Usage, NamesTheLettersThatBuildSystemsLookFor) {
   EXPECT_THAT(help, HasSubstr("@<"));
   EXPECT_THAT(help, Not(HasSubstr("[T]")));
   EXPECT_THAT(helpText(Program::Ranlib, "quarn-ranlib"), HasSubstr("-D"));
+}
+
+class UsageTest : public ArTest {};
+
+TEST_F(UsageTest, IsShownToWhoAsks) {
+  const RunOutcome help = ar({"--help"});
+  EXPECT_EQ(help.status, 0);
+  EXPECT_EQ(help.output, helpText(Program::Ar, "quarn-ar"));
+  EXPECT_EQ(help.errors, "");
+  const RunOutcome version = ranlib({"--version"});
+  EXPECT_EQ(version.status, 0);
+  EXPECT_EQ(version.output, versionText(Program::Ranlib));
+  EXPECT_EQ(version.errors, "");
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 // What the document says of libraries: members of each kind, symbols, builds, and that a hostile
 // object makes it no longer than the library is.
 #include "elfext/interface/elf_constants.h"
+#include "quarn-json/document.h"
 #include "tests/support/faulty_host.h"
 #include "tests/unit/quarn-json/json_fixture.h"
 
@@ -221,6 +222,11 @@ TEST_F(LibraryFactsTest, AreAllOrNoneWhereTheHostFails) {
   for (const char* name : {"a.o", "b.o"})
     library.member(name,
                    objectWith({"f", "BuildAttributes$$P"}).tail(std::string(70000, 'x')).bytes());
+  // Whose sizes rest on bytes that nothing else asks for.
+  library.member("c.o", objectWith({"g"})
+                            .segment({.filesz = 60000, .memsz = 60000})
+                            .tail(std::string(70000, 'x'))
+                            .bytes());
   m_Host.addFile("lib.a", library.bytes());
   const std::string whole = json({"lib.a"}).output;
   testsupport::FaultyHost faulty(m_Host);
@@ -234,6 +240,21 @@ TEST_F(LibraryFactsTest, AreAllOrNoneWhereTheHostFails) {
     failures += outcome.status != 0;
   }
   EXPECT_GT(failures, 5U);
+}
+
+TEST_F(LibraryFactsTest, AreNoneWhereTheDiskHasNoRoomForThem) {
+  const std::string first(Document::MostInMemory / 2, 'a');
+  const std::string second(Document::MostInMemory / 2, 'b');
+  m_Host.addFile(
+      "lib.a", archive().longNames({first, second}).member(first, "x").member(second, "y").bytes());
+  EXPECT_EQ(json({"lib.a"}).status, 0);
+  m_Host.setRoom(0);
+  const RunOutcome outcome = json({"lib.a"});
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.output, "");
+  EXPECT_EQ(outcome.errors,
+            "quarn-json: Error: L6843E: Writing file '/tmp/quarn.1' : No space left "
+            "on device\n");
 }
 
 } // namespace quarn_json

@@ -11,6 +11,7 @@
 #include "tests/support/memory_host.h"
 #include "tests/support/messages_fixture.h"
 
+#include <cerrno>
 #include <vector>
 
 namespace quarn {
@@ -67,6 +68,18 @@ TEST_F(ArlibErrorHandlerTest, KeepsTheClashesToItselfUnlessAsked) {
             "'a.o' are incompatible with library attributes.\n"
             "Warning: L6879W: Attributes of minor variant member object 'a.o' are "
             "incompatible with library attributes.\n");
+}
+
+TEST_F(ArlibErrorHandlerTest, TellsOfAPlaceInAFileThatCannotBeReached) {
+  m_Archive.setFileName("lib.a");
+  EXPECT_FALSE(ArlibErrorHandler(false).reportSeekError(m_Archive, "a.o", EINVAL));
+  EXPECT_EQ(getErrorText(), "Error: L6976E: Seeking in file 'lib.a' : Invalid argument\n");
+}
+
+// The run ends there: what is missing would be missing in what it does next.
+TEST_F(ArlibErrorHandlerTest, EndsTheRunWithoutMemory) {
+  EXPECT_EQ(statusOf([this] { ArlibErrorHandler(false).reportOutOfMemory(m_Archive); }), 1);
+  EXPECT_EQ(getErrorText(), "Fatal error: L6800U: Out of memory\n");
 }
 
 } // namespace quarn

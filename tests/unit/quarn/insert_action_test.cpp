@@ -139,6 +139,25 @@ TEST_F(InsertActionTest, InsertsTheMembersOfAnArchive) {
   EXPECT_THAT(names(), ElementsAre("b.o", "a.o"));
 }
 
+// So long that they are looked for all at once.
+TEST_F(InsertActionTest, ReplacesMembersOfVeryLongNamesByThoseOfAnArchive) {
+  const std::string first = std::string(2000, 'n') + "1.o";
+  const std::string second = std::string(2000, 'n') + "2.o";
+  const std::string other = std::string(2000, 'N') + "2.O";
+  const auto library = [](const Words& names, const std::string& text) {
+    testsupport::ArchiveBuilder builder = testsupport::archive();
+    builder.longNames(names);
+    for (size_t i = 0; i < names.size(); ++i)
+      builder.member(names[i], objectBytes(text + std::to_string(i)));
+    return builder.bytes();
+  };
+  m_Host.addFile("lib.a", library({first, second, first}, "old"));
+  // In one letter of a name, and the case of letters counts for nothing.
+  m_Host.addFile("other.a", library({other, first, first, first}, "new"));
+  EXPECT_EQ(run({"-r", "lib.a", "other.a"}).status, 0);
+  EXPECT_THAT(texts(), ElementsAre("new1", "new0", "new2", "new3"));
+}
+
 // The member stays; its header becomes that of the source all the same.
 TEST_F(InsertActionTest, TakesTheHeaderOfATooOldMemberOfAnArchive) {
   m_Host.addFile("other.a", testsupport::archive()
@@ -230,6 +249,55 @@ TEST_F(InsertActionTest, PutsACreatedArchiveInThePlaceOfAnOldOne) {
   givenFile("x.o");
   EXPECT_EQ(run({"--create", "lib.a", "x.o"}).errors, "");
   EXPECT_THAT(names(), ElementsAre("x.o"));
+}
+
+// ---- Others at work
+
+namespace {
+
+// Somebody makes the archive whenever it is about to be written, and removes it before it is
+// opened.
+class BusyHost final : public testsupport::FaultyHost {
+public:
+  explicit BusyHost(testsupport::MemoryHost& host) : FaultyHost(host), m_Files(host) {}
+
+  support::HostError openForReading(const char* name, support::FileHandle& file) override {
+    removeArchive(name);
+    return FaultyHost::openForReading(name, file);
+  }
+  support::HostError openForUpdate(const char* name, support::FileHandle& file) override {
+    removeArchive(name);
+    return FaultyHost::openForUpdate(name, file);
+  }
+  support::HostError createTemporary(const char* name, uint32_t mode,
+                                     support::TemporaryFile& file) override {
+    m_Files.addFile("lib.a", testsupport::archive().bytes());
+    ++m_Times;
+    return FaultyHost::createTemporary(name, mode, file);
+  }
+  [[nodiscard]] int getTimes() const { return m_Times; }
+
+private:
+  void removeArchive(std::string_view name) {
+    if (name != "lib.a" || !m_Files.has(name)) return;
+    EXPECT_EQ(m_Files.remove("lib.a"), 0);
+  }
+
+  testsupport::MemoryHost& m_Files;
+  int m_Times = 0;
+};
+
+} // namespace
+
+TEST_F(InsertActionTest, GivesUpWhereAnotherIsAlwaysFaster) {
+  givenFile("a.o");
+  BusyHost host(m_Host);
+  const RunOutcome outcome = runWork(quarnMain, "quarn", {"-rv", "lib.a", "a.o"}, host);
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.output, "");
+  EXPECT_EQ(outcome.errors, "Error: L6830E: Writing file 'lib.a' : File exists\n");
+  EXPECT_EQ(host.getTimes(), 100);
+  EXPECT_EQ(m_Host.read("lib.a"), testsupport::archive().bytes());
 }
 
 } // namespace quarn
