@@ -6,6 +6,7 @@
 #include "support/interface/converting_host.h"
 
 #include "support/interface/host_files.h"
+#include "tests/support/faulty_host.h"
 #include "tests/support/memory_host.h"
 
 #include <gmock/gmock.h>
@@ -147,6 +148,27 @@ TEST_F(ConvertingHostTest, AsksTheHostBehindForItsWays) {
   EXPECT_EQ(m_Host.getPathStyle(), PathStyle_Windows);
   m_Host.pause(12);
   EXPECT_EQ(m_Disk.getTimePaused(), 12U);
+}
+
+TEST_F(ConvertingHostTest, SetsPermissionsOfAnOpenFile) {
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting("/m/new", file), 0);
+  m_Host.setPermissions(file, 0100600);
+  EXPECT_EQ(m_Host.endWriting(file, "/m/new", true), 0);
+  EXPECT_EQ(m_Disk.at("disk/new").mode & 0777, 0600U);
+}
+
+TEST_F(ConvertingHostTest, HasTheHostBehindRemoveWhatIsUnfinished) {
+  class Counting final : public testsupport::FaultyHost {
+  public:
+    using FaultyHost::FaultyHost;
+    void removeUnfinished() override { ++m_Times; }
+    int m_Times = 0;
+  } behind(m_Disk);
+  ConvertingHost(behind, [](std::string_view name) {
+    return std::string(name);
+  }).removeUnfinished();
+  EXPECT_EQ(behind.m_Times, 1);
 }
 
 TEST_F(ConvertingHostTest, FollowsLinks) {
