@@ -234,6 +234,8 @@ TEST(Format, KeepsWhatCameOutBeforeTheFault) {
 TEST(Format, TellsTheFirstFaultOfAConversion) {
   EXPECT_EQ(format("%1$*2$.*21$d", 1, "a").status, FormatStatus::BadFormat);
   EXPECT_EQ(format("%1$*3$.*21$d", 1, 2).status, FormatStatus::BadFormat);
+  EXPECT_EQ(format("%1$*2$.*3$d", 1, 2, "a").status, FormatStatus::BadFormat);
+  EXPECT_EQ(format("%1$*2$.*3$d", 1, 2).status, FormatStatus::BadFormat);
   EXPECT_EQ(format("%1$*2$.*21$d", 1, 2).status, FormatStatus::TooManyArguments);
   EXPECT_EQ(format("%21$*2$.*2$d", 1, 2).status, FormatStatus::TooManyArguments);
   EXPECT_EQ(format("%21$*2$.*2$", 1, 2).status, FormatStatus::BadFormat);

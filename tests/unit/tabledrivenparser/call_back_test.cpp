@@ -41,6 +41,28 @@ protected:
   Session m_Session;
 };
 
+TEST_F(CallBackOption, IsItsDefaultWhileTheHandlerIsTheSame) {
+  EXPECT_TRUE(m_Session.parser().isDefault(Id_CallBack));
+  m_Session.m_Records[Id_CallBack].value.handler = nullptr;
+  EXPECT_FALSE(m_Session.parser().isDefault(Id_CallBack));
+  m_Session.m_Definitions[Id_CallBack].defaultKind = Default_None;
+  EXPECT_TRUE(m_Session.parser().isDefault(Id_CallBack));
+}
+
+// Who keeps nothing has nothing to write and to forget.
+TEST_F(CallBackOption, MayLeaveNothingInTheCommandLine) {
+  class Forgetful final : public CallBackHandler {
+  public:
+    bool takeArgument(Parser&, const MatchString&, const char*, uint32_t&) override { return true; }
+  };
+  Forgetful handler;
+  m_Session.m_Definitions[Id_CallBack].defaultValue.handler = &handler;
+  m_Session.parse({"--call=a", "-x"});
+  EXPECT_EQ(m_Session.commandLine(), "-x");
+  m_Session.parser().releaseValues();
+  EXPECT_EQ(m_Session.commandLine(), "-x");
+}
+
 TEST_F(CallBackOption, HandsTheWordOver) {
   m_Session.parse({"--call=a", "--call", "b", "-k"});
   EXPECT_THAT(m_Handler.m_Lines, ElementsAre("call/a/1", "call/b/2", "k/<null>/1"));

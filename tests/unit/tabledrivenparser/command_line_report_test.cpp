@@ -197,6 +197,25 @@ TEST(CommandLineReport, GivesTheFallbackHandlerItsTurnBeforeTheWords) {
   EXPECT_EQ(session.commandLine(), "--int=2 --mine -- word");
 }
 
+TEST(CommandLineReport, HasNothingOfAFallbackHandlerThatKeepsNothing) {
+  class Fallback final : public FallbackHandler {
+  public:
+    uint32_t takeWord(Parser&, const char*, const char*, uint32_t) override { return 1; }
+  };
+  Fallback fallback;
+  types::Session session;
+  session.m_Table.fallback = &fallback;
+  session.parse({"--odd", "-x"});
+  EXPECT_EQ(session.commandLine(), "-x");
+}
+
+TEST(CommandLineReport, HasTheOnlyWordOfATableThatKeepsOne) {
+  types::Session session;
+  session.m_Definitions[types::Id_Words].type = Type_String;
+  session.parse({"first", "last word"});
+  EXPECT_EQ(session.commandLine(), "\"last word\"");
+}
+
 TEST(CommandLineReport, TellsTheSizeNeeded) {
   tool::Session session;
   session.parse({"-t", "lib.a"});

@@ -98,6 +98,16 @@ TEST(TableDump, JoinsSeveralMasksAndFlags) {
                             "restriction: 0x1,0xABC\n");
 }
 
+TEST(TableDump, HasNoValueOfATypeThatThereIsNot) {
+  static constexpr MatchString OddRow[] = {{"odd", 0, Kind_Implied, {}, nullptr, 0, 0}};
+  static constexpr auto OddRows = rowsNamed(OddRow, "odd");
+  static constexpr ValueDefinition OddDefinitions[] = {
+      {static_cast<ValueType>(11), Default_Fixed, {}, {}, OddRows.data()}};
+  const OptionTable odd{OddRow, indexByFirstLetter(OddRow)};
+  ParserSession session(odd, OddDefinitions);
+  EXPECT_THAT(session.dump(), HasSubstr("\"odd\" no-flags implied parameter:<none>\n"));
+}
+
 TEST(TableDump, TellsTheSizeNeeded) {
   Session session;
   const size_t size = session.dump().size() + 1;

@@ -21,6 +21,28 @@ TEST(ValueRecordTest, StartsAsItsDefaultAndUnset) {
   EXPECT_TRUE(session.parser().isDefault(Id_Int));
 }
 
+TEST(ValueRecordTest, OfAListIsItsDefaultWhereAllElementsAre) {
+  const alloclib::RegionOwner region = makeRegion();
+  const auto list = [&region](std::initializer_list<int> numbers) {
+    auto* numbersOfList = alloclib::create<IntegerList>(*region, *region);
+    for (const int number : numbers)
+      numbersOfList->append(number);
+    return numbersOfList;
+  };
+  Session session;
+  session.m_Definitions[Id_IntVector].defaultValue.integers = list({1, 2});
+  const Parser& parser = session.parser();
+  const auto isDefault = [&](IntegerList* value) {
+    session.m_Records[Id_IntVector].value.integers = value;
+    return parser.isDefault(Id_IntVector);
+  };
+  EXPECT_TRUE(isDefault(list({1, 2})));
+  EXPECT_FALSE(isDefault(list({1})));
+  EXPECT_FALSE(isDefault(list({1, 3})));
+  EXPECT_FALSE(isDefault(list({1, 2, 3})));
+  EXPECT_FALSE(isDefault(nullptr));
+}
+
 TEST(ValueRecordTest, CountsTheFirstAndTheLastTimeItWasSet) {
   Session session;
   session.parse({"--int=1", "-x", "--int=2"});
