@@ -82,6 +82,31 @@ ObjectBuilder largeSample() {
   return sample(LargestEagerFile);
 }
 
+// One of each table, so far from each other that each is read by itself.
+ObjectBuilder tablesApart(uint16_t type) {
+  constexpr size_t Apart = 0x20000;
+  ObjectBuilder file = object().type(type);
+  const auto table = [&file](const char* name, uint32_t kind) -> SectionBuilder& {
+    file.section("gap", SHT_PROGBITS).zeros(Apart);
+    return file.section(name, kind);
+  };
+  // The tables have the even numbers.
+  table(".symtab", SHT_SYMTAB).link(4).symbol({.name = "main", .section = 1});
+  table(".strtab", SHT_STRTAB);
+  table(".shndx", SHT_SYMTAB_SHNDX).link(2).word(0).word(0);
+  table(".rel", SHT_REL).link(2).info(1).relocation({});
+  table(".note", SHT_NOTE).note("v", 1, {1});
+  table(".group", SHT_GROUP).link(2).info(1).word(1).word(14);
+  table(".member", SHT_PROGBITS).flags(SHF_GROUP).zeros(4);
+  table(".dynstr", SHT_STRTAB);
+  table(".dynsym", SHT_DYNSYM).link(16).symbol({.name = "shown", .section = 1});
+  table(".dynamic", SHT_DYNAMIC).link(16).dynamic(DT_VERDEFNUM, 1).dynamic(DT_NULL, 0);
+  table(".versym", SHT_GNU_versym).link(18).half(0).half(1);
+  table(".verdef", SHT_GNU_verdef).link(16).zeros(20);
+  table("end", SHT_PROGBITS);
+  return file;
+}
+
 } // namespace
 
 class ReadElfFileTest : public ReaderTest {
@@ -197,6 +222,13 @@ TEST_P(ReadElfFileInEachWayTest, ReportsEachFailureOfTheHostWithASmallObject) {
 TEST_P(ReadElfFileInEachWayTest, ReportsEachFailureOfTheHostWithALargeObject) {
   put(largeSample());
   expectEachFailureReported(GetParam(), nullptr);
+}
+
+TEST_P(ReadElfFileInEachWayTest, ReportsEachFailureOfTheHostWhereTablesLieApart) {
+  for (const uint16_t type : std::initializer_list<uint16_t>{ET_REL, ET_DYN}) {
+    put(tablesApart(type));
+    expectEachFailureReported(GetParam(), nullptr);
+  }
 }
 
 TEST_P(ReadElfFileInEachWayTest, ReportsEachFailureOfTheHostWithDeferredContents) {
