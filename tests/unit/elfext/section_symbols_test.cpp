@@ -43,16 +43,6 @@ TEST_F(SectionSymbolsTest, HaveIndexesInTheirOwnListOnly) {
                    "symbol->getHostedSymbolSection() == this");
 }
 
-// What is looked for is no other list's, which checks of a higher level look for, too.
-TEST_F(SectionSymbolsTest, HaveTheirIndexesAlsoWhereMoreIsChecked) {
-  Symbol* plain = makeHosted("a", section);
-  Symbol* dynamic = makeHostedDynamic("d", section);
-  checking::checkingLevel = checking::Level_Medium;
-  EXPECT_EQ(section->getHostedSymbolIndex(plain), 0u);
-  EXPECT_EQ(section->getHostedDynamicSymbolIndex(dynamic), 0u);
-  checking::checkingLevel = checking::Level_Low;
-}
-
 TEST_F(SectionSymbolsTest, MoveAmongEachOther) {
   Symbol* first = makeHosted("same", section, 4);
   Symbol* second = makeHosted("same", section, 4);
