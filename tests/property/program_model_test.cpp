@@ -17,6 +17,7 @@
 #include <algorithm>
 #include <chrono>
 #include <cstdlib>
+#include <fcntl.h>
 #include <filesystem>
 #include <random>
 #include <sched.h>
@@ -260,8 +261,11 @@ public:
   SomebodyElse(const SomebodyElse&) = delete;
   SomebodyElse& operator=(const SomebodyElse&) = delete;
 
-  // The program may lie where only its builder can start it.
-  static bool canStartIt() { return ToolFolder().runProgram({"--vsn"}).status == 0; }
+  // The program may lie where only its builder can start it, and folders where only he makes some.
+  static bool canStartIt() {
+    return faccessat(AT_FDCWD, testing::TempDir().c_str(), W_OK, AT_EACCESS) == 0 &&
+           ToolFolder().runProgram({"--vsn"}).status == 0;
+  }
 
 private:
   const uid_t m_User = geteuid();
