@@ -114,6 +114,8 @@ RunEnd openActAndWrite(Run& run, const char* archiveName, const RunAction& actio
   if (!findPosition(run)) return RunEnd::Done;
   action(run);
   if (run.isCancelled || hasErrors()) return RunEnd::Done;
+  // What nobody can be told of is not done either, where it is not held back until it is.
+  if (!messages::HeldOutput::isOn() && !messages::flushAll()) return RunEnd::Done;
   chooseSymbolTableMode(run);
   return writeArchive(run);
 }

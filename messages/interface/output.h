@@ -54,6 +54,8 @@ public:
   void hold();
   /// Lets what is held come out; what follows is written at once again.
   void release();
+  /// Whether anything that is written now would be kept.
+  [[nodiscard]] static bool isOn();
   /// Forgets what was written since `hold`. False if some of it is out already.
   [[nodiscard]] bool drop();
 };

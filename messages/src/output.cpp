@@ -126,6 +126,10 @@ void HeldOutput::release() {
   releaseHeld();
 }
 
+bool HeldOutput::isOn() {
+  return currentHold.isOn;
+}
+
 bool HeldOutput::drop() {
   const bool isDropped = currentHold.isOn;
   currentHold = {};

@@ -56,6 +56,15 @@ A full device on stdout is told of, and does not harm the archive.
   lib.a
   lib2.a
 
+What can't be told is not done, so that it can be tried again.
+
+  $ quarn -dv lib.a a.o > /dev/full; echo $?; cmp lib.a before.a
+  Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+  $ quarn-ar qv lib.a a.o > /dev/full; echo $?; cmp lib.a before.a
+  quarn-ar: Error: L6843E: Writing file 'stdout' : No space left on device
+  1
+
 Where nothing can be said, the status says it.
 
   $ quarn -t lib.a none > /dev/full 2> /dev/full; echo $?
