@@ -60,6 +60,7 @@ FileStatus statusFrom(const struct stat& native) {
 }
 
 constexpr mode_t UsualMode = 0666; // which the user's mask cuts
+constexpr mode_t PrivateMode = 0600;
 constexpr size_t CopiedPiece = 0x40000;
 constexpr size_t LongestLink = 4096;
 
@@ -70,20 +71,21 @@ HostError openNative(const char* name, int flags, FileHandle& file, mode_t mode 
   return file.isOpen() ? 0 : errno;
 }
 
-// A device or a FIFO is never one.
-void enterIfRegular(const char* name, FileHandle file, int descriptor = NoDescriptor) {
+// A device or a FIFO is never one, for which the answer is false.
+bool enterIfRegular(const char* name, FileHandle file, int descriptor = NoDescriptor) {
   struct stat native;
-  if (fstat(file.number, &native) == 0 && S_ISREG(native.st_mode))
-    enterUnfinished(name, native, descriptor);
+  if (fstat(file.number, &native) != 0 || !S_ISREG(native.st_mode)) return false;
+  enterUnfinished(name, native, descriptor);
+  return true;
 }
-
-#ifdef O_TMPFILE
 
 // The one way to name a file that has none which needs no rights of an administrator. Where it
 // isn't there (a process that sees no /proc) the file could never get a name.
 std::string ownName(FileHandle file) {
   return "/proc/self/fd/" + std::to_string(file.number);
 }
+
+#ifdef O_TMPFILE
 
 // False where the file system, or the process, can't have files without names.
 bool openWithoutName(std::string_view name, mode_t mode, FileHandle& file) {
@@ -246,7 +248,9 @@ public:
       error = resolveLinks(name, place);
       if (error == 0) error = openNative(place.c_str(), Flags, file);
     }
-    if (error == 0) enterIfRegular(place.c_str(), file, file.number);
+    // Only the opening must not wait: whoever reads from a FIFO takes his time.
+    if (error == 0 && !enterIfRegular(place.c_str(), file, file.number))
+      fcntl(file.number, F_SETFL, O_WRONLY);
     return error;
   }
 
@@ -368,7 +372,7 @@ public:
     std::string end = name;
     std::string text;
     place = name;
-    for (int i = 0; i < MaximumLinks; ++i) {
+    for (int i = 0; i <= MaximumLinks; ++i) {
       if (const HostError error = readLink(end, text); error != 0) return error;
       if (text.empty()) {
         place = end;
@@ -403,16 +407,18 @@ private:
   }
 
   // Who keeps a process from naming its files in that way (a profile of the machine, an emulated
-  // root) lets it create others: the handle is one of a copy from now on.
+  // root) lets it create others: the handle is one of a copy from now on, which is as protected,
+  // and on the disk if the file was.
   HostError moveToNamed(FileHandle file, const char* name) {
     struct stat native;
     if (fstat(file.number, &native) != 0) return errno;
     FileHandle named;
-    HostError error =
-        openNative(name, O_RDWR | O_CREAT | O_EXCL, named, native.st_mode & UsualMode);
+    HostError error = openNative(name, O_RDWR | O_CREAT | O_EXCL, named, PrivateMode);
     if (error != 0) return error;
     enterIfRegular(name, named);
     error = copyAll(file, named);
+    if (error == 0) copyProtectionTo(named.number, ownName(file).c_str(), statusFrom(native));
+    if (error == 0) error = flushToDisk(named);
     if (error == 0 && dup2(named.number, file.number) < 0) error = errno;
     if (error == 0) fcntl(file.number, F_SETFD, FD_CLOEXEC);
     if (error != 0 && unlink(name) == 0) forgetUnfinished(name);

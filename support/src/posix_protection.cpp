@@ -5,6 +5,7 @@
 // the file comes to belong to somebody else, it must not run with the rights of its owner.
 #include "support/src/posix_protection.h"
 
+#include <cerrno>
 #include <string>
 #include <string_view>
 #include <sys/stat.h>
@@ -20,19 +21,32 @@ namespace {
 
 constexpr mode_t ModeBits = 07777;
 
-// Whether owner and group are those of the status now.
-bool copyOwner(int descriptor, const FileStatus& status) {
+// Who owns a file now, and who should.
+struct Owners {
+  bool isUserKept = false;
+  bool isGroupKept = false;
+};
+
+Owners copyOwners(int descriptor, const FileStatus& status) {
   const auto uid = static_cast<uid_t>(status.uid);
   const auto gid = static_cast<gid_t>(status.gid);
   struct stat now;
-  const auto isSame = [&] {
-    return fstat(descriptor, &now) == 0 && now.st_uid == uid && now.st_gid == gid;
+  const auto compare = [&]() -> Owners {
+    if (fstat(descriptor, &now) != 0) return {};
+    return {.isUserKept = now.st_uid == uid, .isGroupKept = now.st_gid == gid};
   };
-  if (isSame()) return true;
+  const Owners before = compare();
+  if (before.isUserKept && before.isGroupKept) return before;
   // A user may mostly give a file to another of his groups, but not to another user.
   if (fchown(descriptor, uid, gid) != 0 && fchown(descriptor, static_cast<uid_t>(-1), gid) != 0)
-    return false;
-  return isSame();
+    return before;
+  return compare();
+}
+
+// Another group may do no more than everybody.
+mode_t withoutGroupRights(mode_t mode) {
+  const mode_t ofAll = (mode & S_IRWXO) << 3;
+  return (mode & ~static_cast<mode_t>(S_IRWXG)) | (mode & ofAll);
 }
 
 #ifdef __linux__
@@ -43,16 +57,23 @@ constexpr size_t LargestAttribute = 0x10000;
 // What speaks of the file's bytes (signatures, capabilities of a program) is not true of the new
 // ones.
 bool isCopied(std::string_view attribute) {
-  return attribute.starts_with("user.") || attribute == "system.posix_acl_access" ||
-         attribute == "security.selinux";
+  return attribute.starts_with("user.") || attribute == "security.selinux";
 }
 
-void copyAttribute(int descriptor, const char* from, const char* attribute) {
+constexpr const char* AccessList = "system.posix_acl_access";
+
+bool copyAttribute(int descriptor, const char* from, const char* attribute) {
   std::string value(LargestAttribute, '\0');
   const ssize_t size = getxattr(from, attribute, value.data(), value.size());
-  if (size < 0) return;
-  [[maybe_unused]] const int result =
-      fsetxattr(descriptor, attribute, value.data(), static_cast<size_t>(size), 0);
+  if (size < 0) return false;
+  return fsetxattr(descriptor, attribute, value.data(), static_cast<size_t>(size), 0) == 0;
+}
+
+// A new file may have a list that its folder gives, with more in it than the old one's group.
+bool copyAccessList(int descriptor, const char* from) {
+  if (getxattr(from, AccessList, nullptr, 0) > 0)
+    return copyAttribute(descriptor, from, AccessList);
+  return fremovexattr(descriptor, AccessList) == 0 || errno == ENODATA || errno == ENOTSUP;
 }
 
 // The names come one behind the other, each with a NUL.
@@ -69,6 +90,10 @@ void copyAttributes(int descriptor, const char* from) {
 
 #else
 
+bool copyAccessList(int, const char*) {
+  return true;
+}
+
 void copyAttributes(int, const char*) {}
 
 #endif
@@ -77,7 +102,10 @@ void copyAttributes(int, const char*) {}
 
 void copyProtectionTo(int descriptor, const char* from, const FileStatus& status) {
   mode_t mode = status.mode & ModeBits;
-  if (!copyOwner(descriptor, status)) mode &= ~static_cast<mode_t>(S_ISUID | S_ISGID);
+  const Owners owners = copyOwners(descriptor, status);
+  if (!owners.isUserKept || !owners.isGroupKept) mode &= ~static_cast<mode_t>(S_ISUID | S_ISGID);
+  const bool isListKept = copyAccessList(descriptor, from);
+  if (!owners.isGroupKept || !isListKept) mode = withoutGroupRights(mode);
   copyAttributes(descriptor, from);
   [[maybe_unused]] const int result = fchmod(descriptor, mode);
 }

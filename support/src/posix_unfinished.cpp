@@ -21,9 +21,14 @@ namespace support {
 
 namespace {
 
-constexpr std::array EndingSignals = {SIGINT,  SIGTERM,   SIGHUP,  SIGPIPE, SIGQUIT, SIGXCPU,
-                                      SIGALRM, SIGVTALRM, SIGPROF, SIGUSR1, SIGUSR2, SIGABRT,
-                                      SIGSEGV, SIGBUS,    SIGFPE,  SIGILL,  SIGSYS,  SIGTRAP};
+// Not those of real time, which only programs send each other that have agreed on it.
+constexpr std::array EndingSignals = {
+    SIGINT,  SIGTERM, SIGHUP,    SIGPIPE, SIGQUIT, SIGXCPU, SIGALRM, SIGVTALRM, SIGPROF,
+    SIGUSR1, SIGUSR2, SIGABRT,   SIGSEGV, SIGBUS,  SIGFPE,  SIGILL,  SIGSYS,    SIGTRAP,
+#ifdef __linux__
+    SIGIO,   SIGPWR,  SIGSTKFLT,
+#endif
+};
 
 // One archive is written and one member extracted at a time, and members rarely have temporaries of
 // their own.

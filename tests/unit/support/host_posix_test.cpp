@@ -11,6 +11,7 @@
 #include <cerrno>
 #include <csignal>
 #include <cstring>
+#include <fcntl.h>
 #include <functional>
 #include <sys/resource.h>
 #include <sys/socket.h>
@@ -189,6 +190,40 @@ TEST_F(PosixHostTest, KeepsAccessLists) {
   EXPECT_EQ(copied, list);
 }
 
+TEST_F(PosixHostTest, TakesNoAccessListFromItsFolder) {
+  make("old", "");
+  chmod(at("old").c_str(), 0660);
+  constexpr uint8_t ListOfTheFolder[] = {2,    0, 0, 0,                          // the version
+                                         0x01, 0, 6, 0, 0xFF, 0xFF, 0xFF, 0xFF,  // the owner,
+                                         0x02, 0, 6, 0, 77,   0,    0,    0,     // somebody,
+                                         0x04, 0, 0, 0, 0xFF, 0xFF, 0xFF, 0xFF,  // the group,
+                                         0x10, 0, 6, 0, 0xFF, 0xFF, 0xFF, 0xFF,  // at most,
+                                         0x20, 0, 0, 0, 0xFF, 0xFF, 0xFF, 0xFF}; // and others
+  if (setxattr(getFolder().c_str(), "system.posix_acl_default", ListOfTheFolder,
+               sizeof ListOfTheFolder, 0) != 0)
+    GTEST_SKIP() << "this file system has no access lists";
+  FileStatus status;
+  ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
+  TemporaryFile file;
+  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
+  m_Host.copyProtection(at("old").c_str(), status, file.handle);
+  EXPECT_EQ(fgetxattr(file.handle.number, "system.posix_acl_access", nullptr, 0), -1);
+  ASSERT_EQ(m_Host.statusOf(file.handle, status), 0);
+  EXPECT_EQ(status.mode & 07777U, 0660U);
+  EXPECT_EQ(m_Host.close(file.handle), 0);
+  m_Host.removeUnfinished();
+}
+
+TEST_F(PosixHostTest, WaitsForTheReaderOfAFifo) {
+  ASSERT_EQ(mkfifo(at("fifo").c_str(), 0600), 0);
+  const int reader = open(at("fifo").c_str(), O_RDONLY | O_NONBLOCK);
+  FileHandle file;
+  ASSERT_EQ(m_Host.openForWriting(at("fifo").c_str(), file), 0);
+  EXPECT_EQ(fcntl(file.number, F_GETFL) & O_NONBLOCK, 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("fifo").c_str(), true), 0);
+  close(reader);
+}
+
 // An administrator may give a file away; nobody else may, and then it must not run as another user.
 TEST_F(PosixHostTest, KeepsTheOwnerWhereItMay) {
   make("old", "");
@@ -212,13 +247,14 @@ TEST_F(PosixHostTest, KeepsTheOwnerWhereItMay) {
   }
 }
 
+// Nor may the group that the new file has instead do what the old one's did.
 TEST_F(PosixHostTest, GivesNobodyElsesRightsAway) {
   if (getuid() != 0) GTEST_SKIP() << "the test above has shown it";
   fs::permissions(m_Folder, fs::perms::all);
   make("old", "");
   FileStatus status;
   ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
-  status.mode = 0106755;
+  status.mode = 0106775;
   runApart([&] {
     FileHandle file;
     if (setgid(77) != 0 || setuid(77) != 0) _exit(1);
@@ -247,6 +283,18 @@ TEST_F(PosixHostTest, FollowsLinksToTheirEnd) {
   EXPECT_EQ(m_Host.followLinks(at("dangling").c_str()), at("nowhere"));
 }
 
+// As the host itself: the longest chain that it follows, and the first that it does not.
+TEST_F(PosixHostTest, FollowsAsManyLinksAsTheHost) {
+  make("0", "");
+  for (int i = 1; i <= 41; ++i)
+    fs::create_symlink(std::to_string(i - 1), at(std::to_string(i)));
+  FileStatus status;
+  EXPECT_EQ(m_Host.status(at("40").c_str(), status), 0);
+  EXPECT_EQ(m_Host.followLinks(at("40").c_str()), at("0"));
+  EXPECT_EQ(m_Host.status(at("41").c_str(), status), ELOOP);
+  EXPECT_EQ(m_Host.followLinks(at("41").c_str()), at("41"));
+}
+
 TEST_F(PosixHostTest, GivesACircleOfLinksUpUnderItsOwnName) {
   fs::create_symlink("b", at("a"));
   fs::create_symlink("a", at("b"));
@@ -269,9 +317,9 @@ TEST_F(PosixHostTest, FindsNamesInTheOrderOfTheirBytes) {
 }
 
 TEST_F(PosixHostTest, LeavesNothingUnfinishedBehindASignal) {
-  for (const int signal :
-       {SIGINT, SIGTERM, SIGHUP, SIGPIPE, SIGQUIT, SIGXCPU, SIGALRM, SIGVTALRM, SIGPROF, SIGUSR1,
-        SIGUSR2, SIGABRT, SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGSYS, SIGTRAP}) {
+  for (const int signal : {SIGINT,    SIGTERM, SIGHUP,  SIGPIPE, SIGQUIT, SIGXCPU, SIGALRM,
+                           SIGVTALRM, SIGPROF, SIGUSR1, SIGUSR2, SIGABRT, SIGSEGV, SIGBUS,
+                           SIGFPE,    SIGILL,  SIGSYS,  SIGTRAP, SIGIO,   SIGPWR,  SIGSTKFLT}) {
     const int state = runApart([&] {
       forgetSanitizers();
       installSignalCleanUp();
@@ -373,7 +421,10 @@ TEST_F(PosixHostTest, CopiesAFileThatItMayNotName) {
   if (file.hasName) GTEST_SKIP() << "this file system has no files without names";
   const std::string text(1'000'000, 'x');
   EXPECT_EQ(m_Host.write(file.handle, bytesOf(text)), 0);
+  m_Host.setPermissions(file.handle, 0666);
   EXPECT_EQ(m_Host.giveName(file, elsewhere.c_str()), 0);
+  ASSERT_EQ(m_Host.status(elsewhere.c_str(), there), 0);
+  EXPECT_EQ(there.mode & 0777U, 0666U);
   m_Host.setPermissions(file.handle, 0640);
   EXPECT_EQ(m_Host.close(file.handle), 0);
   ASSERT_EQ(m_Host.status(elsewhere.c_str(), there), 0);
