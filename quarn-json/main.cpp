@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 //
-// The program: the host's real files, and clean-up on signals from the first moment on. The document
-// waits in a temporary file until it is whole.
+// The program: the host's real files, and clean-up on signals from the first moment on. The
+// document waits in a temporary file until it is whole.
 #include "quarn-json/json_main.h"
 #include "quarn/start_up.h"
 #include "support/interface/host.h"
