@@ -52,6 +52,22 @@ bool Extraction::mayWrite(const ArchiveMember& member, const std::string& name) 
   const bool exists = error == 0 || place != name;
   if (!exists) return true;
   if (m_Settings.overwriteOnExtract && !status.isSameFile(m_ArchiveStatus)) return true;
+  return failToOverwrite(name);
+}
+
+// What has come to stand there since it was looked at must stay as well.
+bool Extraction::open(const ArchiveMember& member, const std::string& name,
+                      support::FileHandle& file) {
+  const int error = m_Files.openOther([&] {
+    return m_Settings.overwriteOnExtract ? m_Host.openForWriting(name.c_str(), file)
+                                         : m_Host.createForWriting(name.c_str(), file);
+  });
+  if (error == 0) return true;
+  const bool isTaken = error == EEXIST && !m_Settings.overwriteOnExtract;
+  return isTaken ? failToOverwrite(name) : failToWrite(member, error);
+}
+
+bool Extraction::failToOverwrite(const std::string& name) {
   reportMessage(messages::ErrorWord, messages::AlreadyExists, name);
   return false;
 }
@@ -75,11 +91,7 @@ void Extraction::operator()(ArchiveMember& member) {
   }
   if (!mayWrite(member, name)) return;
   support::FileHandle file;
-  const int error = m_Files.openOther([&] { return m_Host.openForWriting(name.c_str(), file); });
-  if (error != 0) {
-    failToWrite(member, error);
-    return;
-  }
+  if (!open(member, name, file)) return;
   verboseMessage(m_Settings, messages::ExtractedMember, member.getName());
   write(member, name, file);
 }

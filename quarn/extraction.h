@@ -22,9 +22,11 @@ public:
 
 private:
   [[nodiscard]] std::string outputName(std::string_view name) const;
-  // False after a report.
+  // All three are false after a report.
+  [[nodiscard]] bool open(const arlib::ArchiveMember& member, const std::string& name,
+                          support::FileHandle& file);
   [[nodiscard]] bool mayWrite(const arlib::ArchiveMember& member, const std::string& name) const;
-  // Always false.
+  static bool failToOverwrite(const std::string& name);
   static bool failToWrite(const arlib::ArchiveMember& member, int error);
   bool copy(const arlib::ArchiveMember& member, support::FileHandle file, int& writeError);
   void restoreStatus(const arlib::ArchiveMember& member, support::FileHandle file);

@@ -39,6 +39,7 @@ public:
   /// The name is one of the host's behind, and must be its own conversion.
   HostError createUnnamedTemporary(std::string& name, FileHandle& file) override;
   HostError openForWriting(const char* name, FileHandle& file) override;
+  HostError createForWriting(const char* name, FileHandle& file) override;
   HostError endWriting(FileHandle file, const char* name, bool isWhole) override;
   void removeUnfinished() override { m_Host.removeUnfinished(); }
   HostError readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,

@@ -126,7 +126,10 @@ public:
   /// Creates a file, or empties the one that is there. It is unfinished until `endWriting`.
   [[nodiscard]] virtual HostError openForWriting(const char* name, FileHandle& file) = 0;
 
-  /// Closes what `openForWriting` has opened under that name. Unless all has arrived in it, and the
+  /// The same where nothing stands, not even a link that leads nowhere; else EEXIST.
+  [[nodiscard]] virtual HostError createForWriting(const char* name, FileHandle& file) = 0;
+
+  /// Closes what one of these two has opened under that name. Unless all has arrived in it, and the
   /// close goes well, too, the file is removed: a regular one alone, and only where it still
   /// stands; never a device or a FIFO, and of a link the file that it leads to.
   [[nodiscard]] virtual HostError endWriting(FileHandle file, const char* name, bool isWhole);

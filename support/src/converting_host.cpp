@@ -42,6 +42,10 @@ HostError ConvertingHost::openForWriting(const char* name, FileHandle& file) {
   return m_Host.openForWriting(m_Convert(name).c_str(), file);
 }
 
+HostError ConvertingHost::createForWriting(const char* name, FileHandle& file) {
+  return m_Host.createForWriting(m_Convert(name).c_str(), file);
+}
+
 HostError ConvertingHost::endWriting(FileHandle file, const char* name, bool isWhole) {
   return m_Host.endWriting(file, m_Convert(name).c_str(), isWhole);
 }

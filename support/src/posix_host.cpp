@@ -254,6 +254,13 @@ public:
     return error;
   }
 
+  HostError createForWriting(const char* name, FileHandle& file) override {
+    const SignalHold hold;
+    const HostError error = openNative(name, O_WRONLY | O_CREAT | O_EXCL, file);
+    if (error == 0) enterIfRegular(name, file, file.number);
+    return error;
+  }
+
   HostError endWriting(FileHandle file, const char*, bool isWhole) override {
     const SignalHold hold;
     const HostError error = close(file);

@@ -403,6 +403,10 @@ public:
     return error;
   }
 
+  HostError createForWriting(const char* name, FileHandle& file) override {
+    return createNew(name, file);
+  }
+
   HostError endWriting(FileHandle file, const char* name, bool isWhole) override {
     const std::wstring native = nativePlace(name);
     const HostError error = Host::endWriting(file, name, isWhole);

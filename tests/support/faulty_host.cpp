@@ -84,6 +84,12 @@ HostError FaultyHost::openForWriting(const char* name, FileHandle& file) {
   return remember(error, name, file);
 }
 
+HostError FaultyHost::createForWriting(const char* name, FileHandle& file) {
+  if (const HostError error = fault("createForWriting", name)) return error;
+  const HostError error = m_Host.createForWriting(name, file);
+  return remember(error, name, file);
+}
+
 HostError FaultyHost::endWriting(FileHandle file, const char* name, bool isWhole) {
   const HostError error = fault("close", name);
   m_OpenNames.erase(file.number);

@@ -72,6 +72,7 @@ public:
   support::HostError giveName(support::TemporaryFile& file, const char* name) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
+  support::HostError createForWriting(const char* name, support::FileHandle& file) override;
   // What goes wrong is the close.
   support::HostError endWriting(support::FileHandle file, const char* name, bool isWhole) override;
   void removeUnfinished() override { m_Host.removeUnfinished(); }

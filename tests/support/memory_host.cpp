@@ -151,6 +151,11 @@ HostError MemoryHost::openForWriting(const char* name, FileHandle& file) {
   return 0;
 }
 
+HostError MemoryHost::createForWriting(const char* name, FileHandle& file) {
+  if (has(name) || followLinks(name) != name) return EEXIST;
+  return openForWriting(name, file);
+}
+
 HostError MemoryHost::readAt(FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                              size_t& done) {
   done = 0;

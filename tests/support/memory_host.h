@@ -101,6 +101,7 @@ public:
   support::HostError giveName(support::TemporaryFile& file, const char* name) override;
   support::HostError createUnnamedTemporary(std::string& name, support::FileHandle& file) override;
   support::HostError openForWriting(const char* name, support::FileHandle& file) override;
+  support::HostError createForWriting(const char* name, support::FileHandle& file) override;
   support::HostError readAt(support::FileHandle file, std::span<uint8_t> bytes, uint64_t offset,
                             size_t& done) override;
   support::HostError write(support::FileHandle file, std::span<const uint8_t> bytes) override;

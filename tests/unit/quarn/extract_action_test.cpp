@@ -25,6 +25,27 @@ TEST_F(ExtractTest, LeavesLinksThatLeadNowhere) {
   EXPECT_TRUE(m_Host.has("nowhere"));
 }
 
+// Somebody else makes the file just when it is going to be made.
+TEST_F(ExtractTest, LeavesWhatHasComeToStandThereMeanwhile) {
+  class HurriedHost final : public testsupport::FaultyHost {
+  public:
+    explicit HurriedHost(testsupport::MemoryHost& host) : FaultyHost(host), m_Files(host) {}
+    support::HostError createForWriting(const char* name, support::FileHandle& file) override {
+      m_Files.addFile(name, "somebody's");
+      return FaultyHost::createForWriting(name, file);
+    }
+
+  private:
+    testsupport::MemoryHost& m_Files;
+  };
+  givenLibrary({"a.o"});
+  HurriedHost host(m_Host);
+  const RunOutcome outcome = runWork(quarnMain, "quarn", {"-xC", "lib.a"}, host);
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.errors, "Error: L6836E: 'a.o' already exists, so will not be extracted\n");
+  EXPECT_EQ(m_Host.read("a.o"), "somebody's");
+}
+
 // It may be the archive itself, or a file that was to stay.
 TEST_F(ExtractTest, WritesNothingWhereTheHostCannotTellWhatIsThere) {
   givenLibrary({"a.o"});

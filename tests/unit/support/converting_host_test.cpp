@@ -150,6 +150,14 @@ TEST_F(ConvertingHostTest, AsksTheHostBehindForItsWays) {
   EXPECT_EQ(m_Disk.getTimePaused(), 12U);
 }
 
+TEST_F(ConvertingHostTest, CreatesFilesThatAreNotThere) {
+  FileHandle file;
+  ASSERT_EQ(m_Host.createForWriting("/m/new", file), 0);
+  EXPECT_EQ(m_Host.endWriting(file, "/m/new", true), 0);
+  EXPECT_TRUE(m_Disk.has("disk/new"));
+  EXPECT_EQ(m_Host.createForWriting("/m/new", file), EEXIST);
+}
+
 TEST_F(ConvertingHostTest, SetsPermissionsOfAnOpenFile) {
   FileHandle file;
   ASSERT_EQ(m_Host.openForWriting("/m/new", file), 0);

@@ -281,6 +281,8 @@ TEST_F(PosixHostTest, FollowsLinksToTheirEnd) {
   EXPECT_EQ(m_Host.followLinks(at("two").c_str()), at("dir/../file"));
   EXPECT_EQ(m_Host.followLinks(at("absolute").c_str()), at("file"));
   EXPECT_EQ(m_Host.followLinks(at("dangling").c_str()), at("nowhere"));
+  FileHandle file;
+  EXPECT_EQ(m_Host.createForWriting(at("dangling").c_str(), file), EEXIST);
 }
 
 // As the host itself: the longest chain that it follows, and the first that it does not.

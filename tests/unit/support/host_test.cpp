@@ -71,6 +71,20 @@ TEST_F(HostTest, ReadsFromBeginningToEnd) {
   EXPECT_EQ(m_Host.close(file), 0);
 }
 
+TEST_F(HostTest, CreatesNoFileWhereOneIs) {
+  make("file", "old");
+  FileHandle file;
+  EXPECT_EQ(m_Host.createForWriting(at("file").c_str(), file), EEXIST);
+  EXPECT_EQ(read("file"), "old");
+  ASSERT_EQ(m_Host.createForWriting(at("new").c_str(), file), 0);
+  EXPECT_EQ(m_Host.write(file, bytesOf("text")), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("new").c_str(), true), 0);
+  EXPECT_EQ(read("new"), "text");
+  ASSERT_EQ(m_Host.createForWriting(at("half").c_str(), file), 0);
+  EXPECT_EQ(m_Host.endWriting(file, at("half").c_str(), false), 0);
+  EXPECT_FALSE(fs::exists(pathOf("half")));
+}
+
 TEST_F(HostTest, FailsToOpenWithTheErrorNumber) {
   make("file", "");
   fs::create_directory(pathOf("dir"));
