@@ -22,11 +22,11 @@ namespace {
 
 constexpr std::string_view QuotingOption = "--rsp-quoting";
 
-// Asked for before the response files are read, so by a word of the command line itself. Nothing
-// after a refusal.
+// Asked for before the response files are read, so by a word of the command line itself. Behind
+// `--` all are names. Nothing after a refusal.
 std::optional<Quoting> findQuoting(const std::vector<std::string>& words) {
   Quoting quoting = Quoting::Posix;
-  for (size_t i = 0; i < words.size(); ++i) {
+  for (size_t i = 0; i < words.size() && words[i] != "--"; ++i) {
     const std::string_view word = words[i];
     if (!word.starts_with(QuotingOption)) continue;
     std::string_view value = word.substr(QuotingOption.size());

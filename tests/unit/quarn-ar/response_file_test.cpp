@@ -85,6 +85,12 @@ TEST_F(ResponseFileTest, IsQuotedAsTheCommandLineSays) {
             "quarn-ar: Error: there is no quoting 'odd'\n");
 }
 
+TEST_F(ResponseFileTest, IsNotQuotedAsTheNameOfAFileSays) {
+  givenFile("--rsp-quoting-notes.o");
+  EXPECT_EQ(ar({"rc", "lib.a", "--", "--rsp-quoting-notes.o"}).status, 0);
+  EXPECT_THAT(names(), ElementsAre("--rsp-quoting-notes.o"));
+}
+
 TEST_F(ResponseFileTest, IsReadToItsEndWhateverSizeItTells) {
   std::string words = "rc lib.a a.o";
   words.append(100000, ' ');
