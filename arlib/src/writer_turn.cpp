@@ -15,6 +15,9 @@ namespace {
 
 using support::SourceFile;
 
+// Not the work of other writers, who rename: a host that tells of a file which it can't open.
+constexpr int MostTimesGone = 1000;
+
 // Whether the name still leads to the file: who had the turn before may have put a new one in its
 // place while one waited for it.
 bool isStillThere(const SourceFile& file, const char* fileName) {
@@ -26,7 +29,7 @@ bool isStillThere(const SourceFile& file, const char* fileName) {
 
 std::shared_ptr<SourceFile> takeTurn(support::SourceFiles& files, const char* fileName,
                                      support::FileKind& kind, support::HostError& error) {
-  for (;;) {
+  for (int timesGone = 0;;) {
     support::FileStatus status;
     error = files.getHost().status(fileName, status);
     if (error != 0) status = {};
@@ -34,7 +37,7 @@ std::shared_ptr<SourceFile> takeTurn(support::SourceFiles& files, const char* fi
     if (kind != support::FileKind::RegularFile) return nullptr;
     std::shared_ptr<SourceFile> file;
     const support::HostError openError = files.openForUpdate(fileName, file);
-    if (openError == ENOENT) continue;
+    if (openError == ENOENT && ++timesGone < MostTimesGone) continue;
     if (openError != 0) return files.remember(fileName, status);
     // Without locks one goes on as best one can: the writer looks again before it replaces the
     // file.

@@ -6,6 +6,7 @@
 
 #include "arlib/interface/writer_turn.h"
 
+#include "tests/support/faulty_host.h"
 #include "tests/unit/arlib/archive_fixture.h"
 
 #include <cerrno>
@@ -56,6 +57,17 @@ TEST_F(WriterTurnTest, EndsWhereTheFileIsGoneWhenItsTurnHasCome) {
   m_Host.setLocks([&] { return m_Host.remove("lib.a"); });
   EXPECT_EQ(readInTurn(), "(none)");
   EXPECT_EQ(m_Kind, support::FileKind::Nothing);
+}
+
+TEST_F(WriterTurnTest, EndsWhereTheHostTellsOfAFileThatItDoesNotOpen) {
+  class Dreaming final : public testsupport::FaultyHost {
+  public:
+    using FaultyHost::FaultyHost;
+    support::HostError openForUpdate(const char*, support::FileHandle&) override { return ENOENT; }
+  } host(m_Host);
+  put("first");
+  support::SourceFiles files(host);
+  EXPECT_NE(takeTurn(files, "lib.a", m_Kind, m_Error), nullptr);
 }
 
 // It has read nothing yet, and so there is nothing that could be old.
