@@ -32,13 +32,26 @@ bool memberMatches(const ArchiveMember& member, std::string_view word) {
   return leafMatches(leafOf(word), member);
 }
 
-std::vector<ArchiveMember*> MemberSelection::find(std::string_view word) const {
+// A name that is cut for the comparison is not the name that the look-up knows.
+bool MemberSelection::isName(std::string_view word) {
   const std::string_view pattern = leafOf(word);
-  // A name that is cut for the comparison is not the name that the look-up knows.
-  if (!support::hasWildcard(pattern) && pattern.size() < support::LongestPathComponent) {
-    const std::span<ArchiveMember* const> named = m_Names.find(pattern);
+  return !support::hasWildcard(pattern) && pattern.size() < support::LongestPathComponent;
+}
+
+std::span<ArchiveMember* const> MemberSelection::findNamed(std::string_view word) const {
+  return m_Names.find(leafOf(word));
+}
+
+std::span<ArchiveMember* const> MemberSelection::findNamesakes(const ArchiveMember& member) const {
+  return m_Names.find(member.getName());
+}
+
+std::vector<ArchiveMember*> MemberSelection::find(std::string_view word) const {
+  if (isName(word)) {
+    const std::span<ArchiveMember* const> named = findNamed(word);
     return {named.begin(), named.end()};
   }
+  const std::string_view pattern = leafOf(word);
   std::vector<ArchiveMember*> found;
   for (ArchiveMember* member : m_Archive.getMembers()) {
     if (!member->isAuxiliary() && leafMatches(pattern, *member)) found.push_back(member);

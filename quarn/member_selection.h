@@ -6,6 +6,7 @@
 #include "arlib/interface/archive.h"
 #include "quarn/member_names.h"
 
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -24,6 +25,13 @@ public:
   explicit MemberSelection(const arlib::Archive& archive) : m_Archive(archive), m_Names(archive) {}
 
   [[nodiscard]] std::vector<arlib::ArchiveMember*> find(std::string_view word) const;
+
+  // Whether a word means the members of one name, which `findNamed` has for it without a copy.
+  [[nodiscard]] static bool isName(std::string_view word);
+  [[nodiscard]] std::span<arlib::ArchiveMember* const> findNamed(std::string_view word) const;
+  // The same span, if any word can name the member.
+  [[nodiscard]] std::span<arlib::ArchiveMember* const>
+  findNamesakes(const arlib::ArchiveMember& member) const;
 
 private:
   const arlib::Archive& m_Archive;

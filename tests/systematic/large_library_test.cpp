@@ -168,6 +168,18 @@ TEST_F(LargeLibrary, OfAHundredThousandMembersIsEdited) {
   EXPECT_EQ(run({"-t", "lib.a"}), "");
 }
 
+TEST_F(LargeLibrary, OfManyMembersOfOneNameIsMovedByAsManyWords) {
+  constexpr uint32_t Count = ManyMembers / 2;
+  ArchiveBuilder library = archive();
+  for (uint32_t i = 0; i < Count; ++i)
+    library.member("t", std::to_string(i));
+  m_Folder.write("lib.a", library.bytes());
+  m_Folder.write("words", lines(std::vector<std::string>(Count - 1, "t")));
+  run({"-m", "-n", "lib.a", "--via", "words"});
+  const std::string moved = run({"-p", "lib.a"});
+  EXPECT_THAT(moved, StartsWith(std::to_string(Count - 1) + "0" + "1" + "2"));
+}
+
 TEST_F(LargeLibrary, OfAMillionSymbolsInOneObject) {
   m_Folder.write("x.o", objectOf(0, ManySymbols));
   run({"--create", "lib.a", "x.o"});
