@@ -35,6 +35,7 @@ constexpr size_t MostWords = 20; // of a run
 constexpr size_t MostLetters = 40;
 constexpr std::string_view Magic = "!<arch>\n";
 constexpr std::string_view Wildcards = "*?";
+constexpr std::string_view NoLetters("/\\\0", 3); // of a name that the tool writes
 
 using Words = std::vector<std::string>;
 
@@ -109,7 +110,7 @@ std::optional<MemberList> findList(const std::string& archive) {
   for (testsupport::ParsedMember& member : testsupport::parseArchive(archive, error)) {
     const bool isTable = member.nameField == "/" || member.nameField == "//";
     if (member.nameField == "/" && !list.empty()) return std::nullopt;
-    if (member.name.find_first_of("/\\") != std::string::npos) return std::nullopt;
+    if (member.name.find_first_of(NoLetters) != std::string::npos) return std::nullopt;
     list.push_back({std::move(member.name), std::move(member.contents), isTable});
   }
   if (!error.empty()) return std::nullopt;
