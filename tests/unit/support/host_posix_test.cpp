@@ -43,6 +43,46 @@ protected:
     return state;
   }
 
+  static constexpr const char* AccessList = "system.posix_acl_access";
+
+  // As the host keeps it in that attribute.
+  static std::vector<uint8_t> listOfSomebody() {
+    std::vector<uint8_t> list = {2, 0, 0, 0}; // the version
+    const auto add = [&list](uint8_t tag, uint8_t rights, uint32_t id) {
+      list.insert(list.end(), {tag, 0, rights, 0});
+      for (int shift = 0; shift < 32; shift += 8)
+        list.push_back(static_cast<uint8_t>(id >> shift));
+    };
+    constexpr uint32_t Nobody = 0xFFFFFFFF;
+    add(0x01, 6, Nobody); // the owner reads and writes,
+    add(0x02, 4, 77);     // somebody else reads,
+    add(0x04, 0, Nobody); // the group does nothing,
+    add(0x10, 4, Nobody); // nobody but the owner ever does more than read,
+    add(0x20, 0, Nobody); // and all others do nothing
+    return list;
+  }
+
+  static std::vector<uint8_t> accessListOf(const std::string& name) {
+    std::vector<uint8_t> list(1024);
+    const ssize_t size = getxattr(name.c_str(), AccessList, list.data(), list.size());
+    list.resize(size < 0 ? 0 : static_cast<size_t>(size));
+    return list;
+  }
+
+  // A temporary that can have a name on its own disk alone, and a name on another one; the name is
+  // empty where there is no other disk, or no file without a name.
+  std::string makeForElsewhere(TemporaryFile& file) {
+    FileStatus here;
+    FileStatus there;
+    EXPECT_EQ(m_Host.status(getFolder().c_str(), here), 0);
+    if (m_Host.status("/dev/shm", there) != 0 || here.device == there.device) return "";
+    EXPECT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
+    if (!file.hasName) return "/dev/shm/quarn-host." + std::to_string(getpid());
+    EXPECT_EQ(m_Host.close(file.handle), 0);
+    m_Host.removeUnfinished();
+    return "";
+  }
+
   // A sanitizer takes faults for its own; the tool's process has none of its handlers.
   static void forgetSanitizers() {
     for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGTRAP})
@@ -163,20 +203,8 @@ TEST_F(PosixHostTest, MakesAFileAsProtectedAsAnother) {
 TEST_F(PosixHostTest, KeepsAccessLists) {
   make("old", "");
   make("new", "");
-  constexpr const char* Name = "system.posix_acl_access";
-  std::vector<uint8_t> list = {2, 0, 0, 0}; // the version
-  const auto add = [&list](uint8_t tag, uint8_t rights, uint32_t id) {
-    list.insert(list.end(), {tag, 0, rights, 0});
-    for (int shift = 0; shift < 32; shift += 8)
-      list.push_back(static_cast<uint8_t>(id >> shift));
-  };
-  constexpr uint32_t Nobody = 0xFFFFFFFF;
-  add(0x01, 6, Nobody); // the owner reads and writes,
-  add(0x02, 4, 77);     // somebody else reads,
-  add(0x04, 0, Nobody); // the group does nothing,
-  add(0x10, 4, Nobody); // nobody but the owner ever does more than read,
-  add(0x20, 0, Nobody); // and all others do nothing
-  if (setxattr(at("old").c_str(), Name, list.data(), list.size(), 0) != 0)
+  const std::vector<uint8_t> list = listOfSomebody();
+  if (setxattr(at("old").c_str(), AccessList, list.data(), list.size(), 0) != 0)
     GTEST_SKIP() << "this file system has no access lists";
   FileStatus status;
   ASSERT_EQ(m_Host.status(at("old").c_str(), status), 0);
@@ -184,10 +212,7 @@ TEST_F(PosixHostTest, KeepsAccessLists) {
   ASSERT_EQ(m_Host.openForWriting(at("new").c_str(), file), 0);
   m_Host.copyProtection(at("old").c_str(), status, file);
   EXPECT_EQ(m_Host.endWriting(file, at("new").c_str(), true), 0);
-  std::vector<uint8_t> copied(2 * list.size());
-  const ssize_t size = getxattr(at("new").c_str(), Name, copied.data(), copied.size());
-  copied.resize(size < 0 ? 0 : static_cast<size_t>(size));
-  EXPECT_EQ(copied, list);
+  EXPECT_EQ(accessListOf(at("new")), list);
 }
 
 TEST_F(PosixHostTest, TakesNoAccessListFromItsFolder) {
@@ -412,19 +437,15 @@ TEST_F(PosixHostTest, GivesNoNameThatIsTakenMeanwhile) {
 
 // Another disk can't have a second name of the file, as a guarded process can't give one.
 TEST_F(PosixHostTest, CopiesAFileThatItMayNotName) {
-  const std::string elsewhere = "/dev/shm/quarn-host." + std::to_string(getpid());
-  FileStatus here;
-  FileStatus there;
-  ASSERT_EQ(m_Host.status(getFolder().c_str(), here), 0);
-  if (m_Host.status("/dev/shm", there) != 0 || here.device == there.device)
-    GTEST_SKIP() << "there is one file system alone";
   TemporaryFile file;
-  ASSERT_EQ(m_Host.createTemporary(at("new").c_str(), 0600, file), 0);
-  if (file.hasName) GTEST_SKIP() << "this file system has no files without names";
+  const std::string elsewhere = makeForElsewhere(file);
+  if (elsewhere.empty())
+    GTEST_SKIP() << "there is one file system alone, or no file without a name";
   const std::string text(1'000'000, 'x');
   EXPECT_EQ(m_Host.write(file.handle, bytesOf(text)), 0);
   m_Host.setPermissions(file.handle, 0666);
   EXPECT_EQ(m_Host.giveName(file, elsewhere.c_str()), 0);
+  FileStatus there;
   ASSERT_EQ(m_Host.status(elsewhere.c_str(), there), 0);
   EXPECT_EQ(there.mode & 0777U, 0666U);
   m_Host.setPermissions(file.handle, 0640);
@@ -432,6 +453,32 @@ TEST_F(PosixHostTest, CopiesAFileThatItMayNotName) {
   ASSERT_EQ(m_Host.status(elsewhere.c_str(), there), 0);
   EXPECT_EQ(there.size, 1'000'000);
   EXPECT_EQ(there.mode & 0777U, 0640U);
+  EXPECT_EQ(m_Host.remove(elsewhere.c_str()), 0);
+}
+
+TEST_F(PosixHostTest, ProtectsTheCopyOfAFileThatItMayNotName) {
+  TemporaryFile file;
+  const std::string elsewhere = makeForElsewhere(file);
+  if (elsewhere.empty())
+    GTEST_SKIP() << "there is one file system alone, or no file without a name";
+  if (getuid() == 0) {
+    ASSERT_EQ(fchown(file.handle.number, 77, 78), 0);
+  }
+  FileStatus before;
+  ASSERT_EQ(m_Host.statusOf(file.handle, before), 0);
+  const std::vector<uint8_t> list = listOfSomebody();
+  const bool hasList = fsetxattr(file.handle.number, AccessList, list.data(), list.size(), 0) == 0;
+  const bool hasNote = fsetxattr(file.handle.number, "user.note", "text", 4, 0) == 0;
+  EXPECT_EQ(m_Host.giveName(file, elsewhere.c_str()), 0);
+  EXPECT_EQ(m_Host.close(file.handle), 0);
+  FileStatus after;
+  ASSERT_EQ(m_Host.status(elsewhere.c_str(), after), 0);
+  EXPECT_EQ(after.uid, before.uid);
+  EXPECT_EQ(after.gid, before.gid);
+  EXPECT_EQ(accessListOf(elsewhere), hasList ? list : std::vector<uint8_t>{});
+  // The other disk may have no attributes of users.
+  const bool canHaveNote = setxattr(elsewhere.c_str(), "user.other", "", 0, 0) == 0;
+  EXPECT_EQ(getxattr(elsewhere.c_str(), "user.note", nullptr, 0), hasNote && canHaveNote ? 4 : -1);
   EXPECT_EQ(m_Host.remove(elsewhere.c_str()), 0);
 }
 
