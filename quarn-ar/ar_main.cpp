@@ -34,11 +34,9 @@ std::optional<Quoting> findQuoting(const std::vector<std::string>& words) {
       value.remove_prefix(1);
     else if (value.empty() && i + 1 < words.size())
       value = words[i + 1];
-    if (value != "posix" && value != "windows") {
-      refuse("there is no quoting '%s'", value);
-      return std::nullopt;
-    }
-    quoting = value == "posix" ? Quoting::Posix : Quoting::Windows;
+    const std::optional<Quoting> named = quotingNamed(value);
+    if (!named) return std::nullopt;
+    quoting = *named;
   }
   return quoting;
 }

@@ -7,6 +7,7 @@
 
 #include "messages/interface/diagnostic_control.h"
 #include "quarn-ar/refusal.h"
+#include "quarn-ar/response_file.h"
 #include "quarn/option_table.h"
 #include "quarn/reporting.h"
 
@@ -138,6 +139,11 @@ bool applyAttributeSections(CommandLine& line, std::string_view) {
   return true;
 }
 
+// The response files are read already; from one of them it comes too late, but is no less a word.
+bool checkQuoting(CommandLine&, std::string_view value) {
+  return quotingNamed(value).has_value();
+}
+
 bool acceptValue(CommandLine&, std::string_view) {
   return true;
 }
@@ -153,7 +159,7 @@ constexpr LongOption LongOptions[] = {
     {"libattrmap",      true,  applyAttributeMap},
     {"plugin",          true,  acceptValue}, // symbols are read without one
     {"qobix_buildattr", false, applyAttributeSections},
-    {"rsp-quoting",     true,  acceptValue}, // done with the response files
+    {"rsp-quoting",     true,  checkQuoting},
     {"target",          true,  applyTarget},
     {"thin",            false, [](CommandLine&, std::string_view) { return refuse("thin archives are not made"); }},
     {"version",         false, [](CommandLine& line, std::string_view) { line.answer(Answer::Version); return true; }},

@@ -183,6 +183,13 @@ bool Expansion::readFile(const std::string& name, support::FileHandle file, size
 
 } // namespace
 
+std::optional<Quoting> quotingNamed(std::string_view name) {
+  if (name == "posix") return Quoting::Posix;
+  if (name == "windows") return Quoting::Windows;
+  refuse("there is no quoting '%s'", name);
+  return std::nullopt;
+}
+
 std::optional<std::vector<std::string>> splitWords(std::string_view text, Quoting quoting) {
   std::vector<std::string> words;
   WordSplitter splitter(text);

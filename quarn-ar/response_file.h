@@ -19,6 +19,9 @@ enum class Quoting {
   Windows, // double quotes alone; a backslash counts only in front of one
 };
 
+// Refuses any name but "posix" and "windows".
+[[nodiscard]] std::optional<Quoting> quotingNamed(std::string_view name);
+
 // The words of a text. Nothing if a quote has no end.
 [[nodiscard]] std::optional<std::vector<std::string>> splitWords(std::string_view text,
                                                                  Quoting quoting);

@@ -68,6 +68,9 @@ Words.
   $ refused --rsp-quoting=dos t lib.a
   err: quarn-ar: Error: there is no quoting 'dos'
   status 1
+  $ echo --rsp-quoting=dos t lib.a > words; refused @words
+  err: quarn-ar: Error: there is no quoting 'dos'
+  status 1
 
 Members and files.
 
