@@ -365,6 +365,19 @@ TEST_F(AttributesOfMemberTest, AreTheMergeOfItsDecorationSymbols) {
   EXPECT_EQ(elfext::printAttributeString(m_Attributes), "$E$P$J$D$IEEE1$IW$REQ8");
 }
 
+// Texts that share their bytes a few times are all read, and those of a trap are not.
+TEST_F(AttributesOfMemberTest, AreThoseOfTheFirstMegabyteOfTexts) {
+  std::string text = "BuildAttributes$";
+  for (int i = 0; i < 30000; ++i)
+    text += "$P";
+  for (const size_t count : {2U, 20U}) {
+    std::vector<Definition> symbols(count, Definition{text});
+    symbols.push_back({"BuildAttributes$$J"});
+    EXPECT_TRUE(ask(add("a.o", objectWith(symbols)), false));
+    EXPECT_EQ(m_Attributes.m_Features.contains(elfext::features::JAVA_STATE), count == 2);
+  }
+}
+
 TEST_F(AttributesOfMemberTest, AreNotToldByOtherObjects) {
   EXPECT_FALSE(ask(add("a.o", objectWith({{"f"}, {"xBuildAttributes$$J"}})), false));
   ArchiveMember* broken = add("b.o", objectWith({{"BuildAttributes$$J"}}).substr(0, 100));
